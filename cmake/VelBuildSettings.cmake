@@ -1,0 +1,71 @@
+# SPDX-FileCopyrightText: The veluiextra developers
+# SPDX-License-Identifier: LGPL-2.1-or-later
+
+# Options and the settings that all of our own targets share.
+
+option(VEL_BUILD_TESTS "Build the tests" ON)
+option(VEL_BUILD_BENCHMARKS "Build the benchmarks" OFF)
+option(VEL_WARNINGS_AS_ERRORS "Stop at a compiler warning" OFF)
+set(VEL_PLATFORM "bundled" CACHE STRING
+    "Which platform libraries to use: \"bundled\" builds those under platform/, \"system\" takes installed ones")
+set_property(CACHE VEL_PLATFORM PROPERTY STRINGS bundled system)
+set(VEL_TRANSLATIONS_DIR "/usr/share/vel/translations" CACHE STRING
+    "Directory of the translation catalogues; empty switches the look-up off")
+set(VEL_SANITIZE "" CACHE STRING "Sanitizers to build with, for instance \"address,undefined\"")
+
+if(NOT VEL_PLATFORM MATCHES "^(bundled|system)$")
+    message(FATAL_ERROR "VEL_PLATFORM is \"${VEL_PLATFORM}\", it has to be \"bundled\" or \"system\"")
+endif()
+
+find_program(VEL_CCACHE ccache)
+if(VEL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
+    set(CMAKE_CXX_COMPILER_LAUNCHER "${VEL_CCACHE}")
+endif()
+
+set(CMAKE_CXX_STANDARD 17)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_CXX_VISIBILITY_PRESET hidden)
+set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
+set(CMAKE_POSITION_INDEPENDENT_CODE ON)
+set(CMAKE_AUTOMOC ON)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+
+# Libraries and programs side by side: a program run from the build tree finds its neighbours.
+set(CMAKE_RUNTIME_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/bin")
+set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/lib")
+set(CMAKE_ARCHIVE_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/lib")
+
+if(VEL_SANITIZE)
+    add_compile_options("-fsanitize=${VEL_SANITIZE}" -fno-omit-frame-pointer)
+    if(VEL_SANITIZE MATCHES "undefined")
+        add_compile_options(-fno-sanitize-recover=undefined)
+    endif()
+    add_link_options("-fsanitize=${VEL_SANITIZE}")
+endif()
+
+# vel_compile_settings(<target>): the warnings and definitions of our own code.
+function(vel_compile_settings target)
+    target_compile_options(${target} PRIVATE
+        -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wconversion
+        $<$<CXX_COMPILER_ID:GNU>:-Wsuggest-override>
+        # Every qCDebug trips over this one in clang 14.
+        $<$<CXX_COMPILER_ID:Clang>:-Wno-gnu-zero-variadic-macro-arguments>
+        $<$<BOOL:${VEL_WARNINGS_AS_ERRORS}>:-Werror>)
+    target_compile_definitions(${target} PRIVATE
+        QT_NO_KEYWORDS
+        QT_NO_CAST_FROM_ASCII
+        QT_NO_CAST_TO_ASCII
+        QT_NO_URL_CAST_FROM_STRING
+        QT_NO_FOREACH
+        QT_NO_NARROWING_CONVERSIONS_IN_CONNECT
+        QT_STRICT_ITERATORS
+        QT_DISABLE_DEPRECATED_BEFORE=0x050F00)
+endfunction()
+
+# vel_link_settings(<target>): a shared library has to name all that it needs.
+function(vel_link_settings target)
+    if(NOT (VEL_SANITIZE AND CMAKE_CXX_COMPILER_ID STREQUAL "Clang"))
+        target_link_options(${target} PRIVATE LINKER:--no-undefined)
+    endif()
+endfunction()

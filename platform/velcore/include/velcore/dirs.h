@@ -1,0 +1,29 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <velcore/velcore_export.h>
+
+#include <string>
+
+/**
+ * The standard directories of the desktop, by the numbers that its programs use.
+ */
+enum class VelDir {
+    WindowManagerConfig = 2, ///< files of the window manager, the shortcut file among them
+    StartMenu = 4, ///< the user's start menu
+    Desktop = 6, ///< the user's desktop folder
+    Pictures = 15, ///< pictures that stand in where the icon theme lacks one
+    ToolBar = 17 ///< the user's tool bar
+};
+
+/**
+ * Returns the absolute path of a standard directory, in UTF-8 and without a trailing "/".
+ *
+ * The environment is read at every call and nothing is created by asking.
+ *
+ * @param kind the directory asked for
+ * @return the path; empty for a kind that is not listed in VelDir
+ */
+VELCORE_EXPORT std::string GetVelDir(VelDir kind);
