@@ -1,0 +1,238 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "veluiextra_export.h"
+
+#include <QList>
+#include <QModelIndex>
+#include <QString>
+#include <QTreeView>
+#include <QUrl>
+
+#include <memory>
+
+class QMimeData;
+class VelMenuViewPrivate;
+
+/**
+ * A tree of a menu directory: the start menu, the tool bar, the desktop folder or any other
+ * folder of desktop entries.
+ *
+ * Folders and entries are shown under the names and in the order that the desktop's own menu
+ * gives them. A view made for editing offers a context menu, shortcuts, drag and drop and the
+ * clipboard to create, edit, delete, move and run entries, and writes every change to disk at
+ * once; a view that is not made for editing is a read-only browser to select from.
+ *
+ * The edit actions are also the view's own actions(), for hosts that show them in a tool bar.
+ * Their object names are "dirNewAction", "fileNewAction", "editAction", "deleteAction",
+ * "executeAction", "findAction", "findNextAction", "cutAction", "copyAction", "pasteAction",
+ * "recreateAction" (only in a view of the start menu), "upAction" and "downAction".
+ *
+ * Indices that the operations take and return belong to the file-system model under the
+ * sorting model, unless said otherwise.
+ *
+ * A menu directory that does not exist gives an empty tree; looking creates nothing.
+ */
+class VELUIEXTRA_EXPORT VelMenuView : public QTreeView
+{
+    Q_OBJECT
+
+public:
+    /**
+     * Builds a read-only view of the start menu with icons of the style's size.
+     *
+     * @param parent the widget that owns the view, or null
+     */
+    explicit VelMenuView(QWidget *parent = nullptr);
+
+    /**
+     * Builds a view of a menu directory.
+     *
+     * @param menuDir the directory; empty for the start menu
+     * @param iconSize the edge of the item icons in pixels; -1 leaves it to the style
+     * @param editable whether the user can change the menu
+     * @param parent the widget that owns the view, or null
+     */
+    VelMenuView(const QString &menuDir, int iconSize, bool editable, QWidget *parent = nullptr);
+
+    /// Takes the models and the menu along. A program that was started from the view lives on.
+    ~VelMenuView() override;
+
+    /**
+     * Shows a menu directory; the constructors end here.
+     *
+     * A second call starts afresh on another directory: models, actions and find state are
+     * replaced, connections to the former selection model end.
+     *
+     * @param menuDir the directory; empty for the start menu
+     * @param iconSize the edge of the item icons in pixels; -1 leaves it to the style
+     * @param editable whether the user can change the menu
+     * @param parent the widget that the view belongs to; null leaves it where it is
+     */
+    void init(const QString &menuDir, int iconSize, bool editable, QWidget *parent);
+
+    /// The menu directory that the view was built on, as it was given.
+    QString menuDir() const;
+
+    /// The first selected item in the file-system model; invalid when nothing is selected.
+    QModelIndex selectedItem() const;
+
+    /// The path of the first selected item; empty when nothing is selected.
+    QString selectedPath() const;
+
+    /**
+     * Selects the item of a file alone, opens the folder that holds it and scrolls to it.
+     *
+     * The scrolling is done once the event loop runs, so that rows which the model adds
+     * meanwhile do not push the item out of sight.
+     *
+     * @param path the absolute path of a file or folder below the menu directory
+     */
+    void showAndSelect(const QString &path);
+
+    /**
+     * Forgets the order that was read for a folder and sorts the tree anew.
+     *
+     * @param sourceIndex the folder
+     */
+    void invalidateSortOrder(const QModelIndex &sourceIndex);
+
+    /// Drops the matches of the last search; the next Find Next searches again.
+    void clearFindResults();
+
+    /**
+     * Searches the names of the whole tree for the text asked for last and selects a match.
+     *
+     * Folders that were never opened are read first, for a bounded time. Nothing happens when
+     * no text was given yet; when nothing matches, a message box says so.
+     *
+     * @param next whether to go on to the next match of the last search instead
+     * @return whether a match was selected
+     */
+    bool findAndSelect(bool next);
+
+    /**
+     * Puts an item on the clipboard.
+     *
+     * The clipboard gets "text/uri-list" and, for Qt::MoveAction, "text/uri-move-list", which
+     * marks the item as cut.
+     *
+     * @param item the item; an invalid one leaves the clipboard empty
+     * @param action Qt::MoveAction for a cut, anything else for a copy
+     */
+    void FillClipboard(QModelIndex item, Qt::DropAction action);
+
+    /**
+     * Tells in which format clipboard or drag data holds files.
+     *
+     * @param data the data; null is allowed
+     * @return "text/uri-move-list" when that is there, else "text/uri-list" when that is
+     *         there, else an empty text
+     */
+    QString dndFormat(const QMimeData *data) const;
+
+    /**
+     * Decodes a list of files of clipboard or drag data.
+     *
+     * @param data the data; null gives an empty list
+     * @param format the format to read, as dndFormat() tells it
+     * @return one URL for each line; percent-escaped and plain local text are both understood
+     */
+    QList<QUrl> dndUrls(const QMimeData *data, const QString &format) const;
+
+    /**
+     * Creates a folder or an entry beside or in the selected item and opens the editor on it.
+     *
+     * When the editor is cancelled, what was created is taken away again.
+     *
+     * @param folder whether to create a folder instead of an entry
+     * @return whether the item was made and kept
+     */
+    bool createNew(bool folder);
+
+    /**
+     * Writes a name into the order of a folder.
+     *
+     * The folder's list then names all its children in the order shown. A ".directory" file
+     * is made where the folder has none.
+     *
+     * @param name the file name of the item
+     * @param row the row in the file-system model of the child that is to follow the item; the
+     *        folder's row count puts it last, any other row without a child does not list it
+     * @param folder the folder
+     * @return false when \a folder is invalid or has no path; a list that cannot be saved is
+     *         not noticed here
+     */
+    bool fixSortOrderForNew(const QString &name, int row, const QModelIndex &folder);
+
+    /**
+     * Moves an item by one place in the order of its folder.
+     *
+     * @param item the item
+     * @param up whether to move it up; else it moves down
+     */
+    void fixSortOrderInDir(const QModelIndex &item, bool up);
+
+    /// Shows the edit menu where the view is editable.
+    void contextMenuEvent(QContextMenuEvent *event) override;
+
+    /// Asks what is to be done with the dropped files and does it.
+    void dropEvent(QDropEvent *event) override;
+
+public Q_SLOTS:
+    /// Enables the edit actions that make sense for the selection and the clipboard.
+    void setActionsEnabled();
+    /// Creates a folder; see createNew().
+    void slotDirNew();
+    /// Creates an entry; see createNew().
+    void slotFileNew();
+    /**
+     * Opens the editor on the selected entry or folder.
+     *
+     * @return whether it was edited and saved
+     */
+    bool slotEdit();
+    /// Deletes the selected item, a folder with everything in it, after asking.
+    void slotDel();
+    /// Runs the selected entry.
+    void slotExe();
+    /// Puts the selected item on the clipboard, to be moved where it is pasted.
+    void slotCut();
+    /// Puts the selected item on the clipboard, to be copied where it is pasted.
+    void slotCopy();
+    /// Moves or copies what is on the clipboard into the selected folder or beside the selected item.
+    void slotPaste();
+    /// Moves the selected item up by one place.
+    void slotUp();
+    /// Moves the selected item down by one place.
+    void slotDown();
+    /// Builds the default start menu anew, after asking.
+    void slotRecreate();
+    /// Asks for a text and selects the first item whose name contains it.
+    void slotFind();
+    /// Selects the next item whose name contains the text asked for last.
+    void slotFindNext();
+    /// Emits selectionChanged(const QString &) with the path selected now.
+    void selectionChangedSlot();
+
+Q_SIGNALS:
+    /// The menu on disk was changed.
+    void changed();
+
+// The signal's name is that of a virtual function of the base, which is not overridden.
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Woverloaded-virtual"
+    /**
+     * The selection has changed.
+     *
+     * @param path the path of the first selected item; empty when nothing is selected
+     */
+    void selectionChanged(const QString &path);
+#pragma GCC diagnostic pop
+
+private:
+    friend class VelMenuViewPrivate;
+    std::unique_ptr<VelMenuViewPrivate> d;
+};
