@@ -3,7 +3,10 @@
 
 #include <velcore/session.h>
 
-std::string velSessionConfigSuffix(int)
+#include "environment.h"
+
+std::string velSessionConfigSuffix(int sessionKind)
 {
-    return {};
+    const std::string session = sessionKind == 0 ? variable("VEL_SESSION") : std::string();
+    return session.empty() ? std::string() : "." + session;
 }

@@ -21,6 +21,12 @@ enum class VelDir {
 /**
  * Returns the absolute path of a standard directory, in UTF-8 and without a trailing "/".
  *
+ * The configuration root is VEL_CONFIG_HOME, else "vel" in XDG_CONFIG_HOME, else ".config/vel"
+ * in HOME: the window manager's files lie in it, "startmenu" and "toolbar" below it. The
+ * desktop folder is the one of user-dirs.dirs, else "Desktop" in HOME. The pictures lie in
+ * "pixmaps" below VEL_DATA_DIR, else below the installed data. A variable that holds no
+ * absolute path counts as not set.
+ *
  * The environment is read at every call and nothing is created by asking.
  *
  * @param kind the directory asked for
