@@ -1,0 +1,14 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "GalleryPages.h"
+
+// Each stands in the source file of its name.
+GalleryPage radioGroupBoxPage();
+
+QVector<GalleryPage> galleryPages()
+{
+    return {
+        radioGroupBoxPage(),
+    };
+}

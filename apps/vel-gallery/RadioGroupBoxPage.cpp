@@ -1,0 +1,102 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "GalleryPage.h"
+
+#include <VelRadioGroupBox.h>
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QCoreApplication>
+#include <QFormLayout>
+#include <QLabel>
+#include <QLineEdit>
+#include <QSpinBox>
+#include <QVBoxLayout>
+
+namespace {
+
+QString text(const char *source)
+{
+    return QCoreApplication::translate("RadioGroupBoxPage", source);
+}
+
+VelRadioGroupBox *automaticBox(QWidget *parent)
+{
+    auto *box = new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Automatic configuration")),
+                                     parent);
+    auto *form = new QFormLayout(box);
+    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Script address:")), new QLineEdit(box));
+    form->addRow(
+        new QCheckBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Ask again at every start")), box));
+    return box;
+}
+
+VelRadioGroupBox *manualBox(QWidget *parent)
+{
+    auto *box =
+        new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Manual configuration")), parent);
+    auto *port = new QSpinBox(box);
+    port->setRange(1, 65535);
+    port->setValue(8080);
+    auto *protocol = new QComboBox(box);
+    protocol->addItems({QStringLiteral("HTTP"), QStringLiteral("SOCKS")});
+    auto *form = new QFormLayout(box);
+    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Host:")), new QLineEdit(box));
+    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Port:")), port);
+    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Protocol:")), protocol);
+    return box;
+}
+
+VelRadioGroupBox *noneBox(QWidget *parent)
+{
+    auto *box =
+        new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Direct connection")), parent);
+    auto *note = new QLabel(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Nothing has to be set.")), box);
+    auto *layout = new QVBoxLayout(box);
+    layout->addWidget(note);
+    return box;
+}
+
+QWidget *createPage(const GalleryContext &context, QWidget *parent)
+{
+    Q_UNUSED(context)
+    auto *page = new QWidget(parent);
+    VelRadioGroupBox *automatic = automaticBox(page);
+    automatic->setObjectName(QStringLiteral("automaticBox"));
+    VelRadioGroupBox *manual = manualBox(page);
+    manual->setObjectName(QStringLiteral("manualBox"));
+    VelRadioGroupBox *none = noneBox(page);
+    none->setObjectName(QStringLiteral("noneBox"));
+    manual->setChecked(true);
+
+    auto *layout = new QVBoxLayout(page);
+    for (VelRadioGroupBox *box : {automatic, manual, none})
+        layout->addWidget(box);
+    layout->addStretch();
+    return page;
+}
+
+} // namespace
+
+GalleryPage radioGroupBoxPage()
+{
+    GalleryPage page;
+    page.name = QStringLiteral("radio-group-box");
+    page.title = text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Radio group boxes"));
+    page.category = text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Widgets"));
+    page.snippet =
+        QStringLiteral(R"(auto *automatic = new VelRadioGroupBox(tr("&Automatic configuration"), page);
+auto *manual = new VelRadioGroupBox(tr("&Manual configuration"), page);
+auto *none = new VelRadioGroupBox(tr("&Direct connection"), page);
+
+// One group: the boxes below one parent.
+manual->setChecked(true);
+
+connect(manual, &QGroupBox::toggled, this, [](bool on) {
+    if (on)
+        applyManualConfiguration();
+});)");
+    page.create = createPage;
+    return page;
+}

@@ -1,0 +1,101 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "GalleryPages.h"
+#include "GalleryPictures.h"
+#include "GalleryWindow.h"
+
+#include <QApplication>
+#include <QCommandLineParser>
+
+#include <algorithm>
+#include <cstdio>
+
+namespace {
+
+struct Options
+{
+    QString page;
+    QString screenshots;
+    int scale = 0; // 0: pictures at every scale
+    GalleryContext context;
+};
+
+Options parse(const QApplication &application)
+{
+    QCommandLineParser parser;
+    parser.setApplicationDescription(
+        QCoreApplication::translate("main", "Shows the widgets, dialogs and models of the library at work."));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    const QCommandLineOption page(QStringLiteral("page"),
+                                  QCoreApplication::translate("main", "Begin with the page <name>."),
+                                  QStringLiteral("name"));
+    const QCommandLineOption screenshots(
+        QStringLiteral("screenshots"),
+        QCoreApplication::translate(
+            "main", "Write pictures of every page, or of that given with --page, to <dir> and end."),
+        QStringLiteral("dir"));
+    QCommandLineOption scale(QStringLiteral("scale"), QString(), QStringLiteral("factor"),
+                             QStringLiteral("0"));
+    scale.setFlags(QCommandLineOption::HiddenFromHelp);
+    parser.addOptions({page, screenshots, scale});
+    parser.addPositionalArgument(
+        QStringLiteral("file"),
+        QCoreApplication::translate("main", "The settings file that the settings page edits."),
+        QStringLiteral("[file]"));
+    parser.process(application);
+
+    Options options;
+    options.page = parser.value(page);
+    options.screenshots = parser.value(screenshots);
+    options.scale = parser.value(scale).toInt();
+    options.context.settingsFile = parser.positionalArguments().value(0);
+    return options;
+}
+
+bool writePictures(const QVector<GalleryPage> &pages, const Options &options, const QStringList &arguments)
+{
+    if (options.scale == 0)
+        return GalleryPictures::runAtEveryScale(arguments);
+    QVector<GalleryPage> chosen;
+    std::copy_if(pages.begin(), pages.end(), std::back_inserter(chosen), [&options](const GalleryPage &page) {
+        return options.page.isEmpty() || page.name == options.page;
+    });
+    return GalleryPictures::writeAtThisScale(chosen, options.context, options.screenshots, options.scale);
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    // All of them, before the application object takes out those that are Qt's own.
+    QStringList arguments;
+    for (int i = 1; i < argc; ++i)
+        arguments.append(QString::fromLocal8Bit(argv[i]));
+
+    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    QApplication application(argc, argv);
+    QApplication::setApplicationName(QStringLiteral("vel-gallery"));
+    QApplication::setApplicationDisplayName(QCoreApplication::translate("main", "Widget gallery"));
+    QApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+    QApplication::setDesktopFileName(QStringLiteral("vel-gallery"));
+
+    const Options options = parse(application);
+    const QVector<GalleryPage> pages = galleryPages();
+    const bool known = options.page.isEmpty()
+        || std::any_of(pages.begin(), pages.end(),
+                       [&options](const GalleryPage &page) { return page.name == options.page; });
+    if (!known) {
+        std::fprintf(stderr, "vel-gallery: there is no page %s\n", qPrintable(options.page));
+        return 1;
+    }
+    if (!options.screenshots.isEmpty())
+        return writePictures(pages, options, arguments) ? 0 : 1;
+
+    GalleryWindow window(pages, options.context);
+    if (!options.page.isEmpty())
+        window.showPage(options.page);
+    window.show();
+    return QApplication::exec();
+}
