@@ -1,0 +1,5 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+// The library's start-up routine alone, on the directory that the build names.
+#include "TranslationCatalogue.cpp"
