@@ -5,7 +5,8 @@
 # miss in any other tree; QFINDTESTDATA, which needs it, is not used.
 set_target_properties(Qt5::Test PROPERTIES INTERFACE_COMPILE_DEFINITIONS QT_TESTLIB_LIB)
 
-# vel_add_test(<name> [X11] [SHARED] [BARE] [SOURCES <file>...] [LIBRARIES <target>...])
+# vel_add_test(<name> [X11] [SHARED] [BARE] [SOURCES <file>...] [LIBRARIES <target>...]
+#              [LABELS <label>...])
 #
 # Builds <name>.cpp into a test program and registers it.
 #   X11     runs it on an X server of its own with a window manager; without it the
@@ -13,8 +14,10 @@ set_target_properties(Qt5::Test PROPERTIES INTERFACE_COMPILE_DEFINITIONS QT_TEST
 #   SHARED  links the shared library, as a host application does, instead of the
 #           internal objects that let a test reach the classes that are not exported.
 #   BARE    links neither of the two (tests of the platform libraries and of programs).
+#   LABELS  "random" for a test whose rounds VEL_TEST_ROUNDS sets, "threads" for one that the
+#           thread sanitizer runs.
 function(vel_add_test name)
-    cmake_parse_arguments(ARG "X11;SHARED;BARE" "" "SOURCES;LIBRARIES" ${ARGN})
+    cmake_parse_arguments(ARG "X11;SHARED;BARE" "" "SOURCES;LIBRARIES;LABELS" ${ARGN})
     add_executable(${name} ${name}.cpp ${ARG_SOURCES})
     vel_compile_settings(${name})
     # The address of a test slot is never taken by number: conversions in tests are harmless.
@@ -28,7 +31,7 @@ function(vel_add_test name)
     endif()
     if(ARG_X11)
         add_test(NAME ${name} COMMAND "${PROJECT_SOURCE_DIR}/tests/support/with-x-server" $<TARGET_FILE:${name}>)
-        set_tests_properties(${name} PROPERTIES LABELS x11)
+        list(APPEND ARG_LABELS x11)
     else()
         add_test(NAME ${name} COMMAND ${name})
         set_tests_properties(${name} PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen")
@@ -38,5 +41,5 @@ function(vel_add_test name)
         "LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/support/lsan.supp:print_suppressions=0"
         "UBSAN_OPTIONS=print_stacktrace=1"
         "TSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/support/tsan.supp")
-    set_tests_properties(${name} PROPERTIES TIMEOUT 600)
+    set_tests_properties(${name} PROPERTIES TIMEOUT 600 LABELS "${ARG_LABELS}")
 endfunction()
