@@ -2,6 +2,7 @@
 # SPDX-License-Identifier: LGPL-2.1-or-later
 
 include(GenerateExportHeader)
+include(VelPkgConfig)
 
 # vel_add_platform_library(<name> DESCRIPTION <text> [REQUIRES <pkg-config module>...]
 #                          HEADERS <file>... SOURCES <file>... [PUBLIC <target>...] [PRIVATE <target>...])
@@ -37,7 +38,6 @@ function(vel_add_platform_library name)
     list(JOIN ARG_REQUIRES " " requires)
     set(library_name ${name})
     set(library_description "${ARG_DESCRIPTION}")
-    configure_file("${PROJECT_SOURCE_DIR}/cmake/platform-library.pc.in" "${CMAKE_CURRENT_BINARY_DIR}/${name}.pc" @ONLY)
-    install(FILES "${CMAKE_CURRENT_BINARY_DIR}/${name}.pc"
-        DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig COMPONENT platform-devel)
+    vel_install_pkgconfig(${name} COMPONENT platform-devel
+        TEMPLATE "${PROJECT_SOURCE_DIR}/cmake/platform-library.pc.in")
 endfunction()
