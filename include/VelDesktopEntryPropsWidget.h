@@ -1,0 +1,101 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "veluiextra_export.h"
+
+#include <QString>
+#include <QStringList>
+#include <QWidget>
+
+class VelDesktopEntryPropsWidgetPrivate;
+class VelUIDesktopEntry;
+
+/**
+ * A form that shows and edits every key of one desktop entry.
+ *
+ * It has a row for each key, with a second row for the user's own language where the key has
+ * one; rows that do not belong to the type of the entry (Application, Link or Directory) are
+ * hidden and emptied. Values go into the entry exactly as they were typed.
+ *
+ * The form keeps no record: values come in with loadFrom() and go out with saveTo(), which
+ * may be given another record. It neither checks the values nor touches a file;
+ * VelDesktopEntryEditDialog does.
+ */
+class VELUIEXTRA_EXPORT VelDesktopEntryPropsWidget : public QWidget
+{
+    Q_OBJECT
+
+public:
+    /**
+     * Makes an empty form of the type Application in which every type may be chosen.
+     *
+     * @param parent the widget that shows and owns the form
+     */
+    explicit VelDesktopEntryPropsWidget(QWidget *parent = nullptr);
+    ~VelDesktopEntryPropsWidget() override;
+
+    /**
+     * Sets the type of the entry and the types among which the user may choose.
+     *
+     * @param type "Application", "Link" or "Directory"; nothing changes when it is empty or
+     *             not among the allowed types
+     * @param allowedTypes the types to choose from; all three when empty
+     */
+    void setType(const QString &type, const QStringList &allowedTypes);
+
+    /**
+     * Shows the values of an entry, with its type where that is allowed.
+     *
+     * @param entry the entry; of one that is not valid only the type is taken, and the other
+     *              fields keep what they show
+     */
+    void loadFrom(const VelUIDesktopEntry &entry);
+
+    /**
+     * Writes the values of the form into an entry, which is not saved by that.
+     *
+     * Of the two lists of desktop environments the chosen one is written; the other one is
+     * emptied when the choice was changed and is left alone when it was not.
+     *
+     * @param entry the entry to write to; nothing happens when it is null
+     */
+    void saveTo(VelUIDesktopEntry *entry);
+
+    /**
+     * Switches between showing and editing.
+     *
+     * @param readOnly whether the user can look at the values only; false at the start
+     */
+    void setReadOnly(bool readOnly);
+
+    /**
+     * Sets the frame around the form.
+     *
+     * @param style a shape and a shadow, as QFrame::setFrameStyle() takes them
+     */
+    void setFrameStyle(int style);
+
+    /**
+     * Shows or hides the button beside the field of a Link's address.
+     *
+     * @param show whether to show it; false at the start
+     */
+    void setShowURLInfoButton(bool show);
+
+Q_SIGNALS:
+    /// Emitted when the user changed a value; loading an entry may emit it as well.
+    void changed();
+
+    /**
+     * Emitted when the button beside the field of a Link's address was pressed.
+     *
+     * @param url the text of that field
+     */
+    void requestedURLInfo(const QString &url);
+
+private:
+    Q_DISABLE_COPY(VelDesktopEntryPropsWidget)
+    VelDesktopEntryPropsWidgetPrivate *const d;
+};

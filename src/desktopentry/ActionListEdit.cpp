@@ -1,0 +1,76 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ActionListEdit.h"
+
+#include "EditActionsDialog.h"
+#include "GuardedDialog.h"
+
+#include <QToolButton>
+
+namespace VelUI {
+
+namespace {
+
+const ListLineForm::Names formNames = {
+    "ActionListEdit",
+    "actionListShow",
+    "editActionsButton",
+    QT_TRANSLATE_NOOP("ActionListEdit", "Form"),
+    QT_TRANSLATE_NOOP("ActionListEdit", "..."),
+};
+
+QStringList idsOf(const QList<VelUIDesktopAction> &actions)
+{
+    QStringList ids;
+    for (const VelUIDesktopAction &action : actions)
+        ids.append(action.getId());
+    return ids;
+}
+
+} // namespace
+
+ActionListEdit::ActionListEdit(QWidget *parent)
+    : QWidget(parent)
+{
+    m_ui.setupUi(this, formNames);
+    connect(m_ui.button, &QToolButton::clicked, this, &ActionListEdit::editActions);
+}
+
+void ActionListEdit::setActions(const QList<VelUIDesktopAction> &actions)
+{
+    // The platform promises no comparison of actions, and an equal list does no harm.
+    m_actions = actions;
+    m_ui.show(idsOf(m_actions));
+}
+
+QList<VelUIDesktopAction> ActionListEdit::actions() const
+{
+    return m_actions;
+}
+
+void ActionListEdit::setTexts(const QString &title, const QString &addTitle, const QString &editTitle)
+{
+    m_title = title;
+    m_addTitle = addTitle;
+    m_editTitle = editTitle;
+}
+
+void ActionListEdit::setReadOnly(bool readOnly)
+{
+    m_ui.setReadOnly(readOnly);
+}
+
+void ActionListEdit::editActions()
+{
+    GuardedDialog<EditActionsDialog> dialog(m_actions, this);
+    dialog->setWindowTitle(m_title);
+    if (!m_addTitle.isNull() || !m_editTitle.isNull())
+        dialog->setTexts(m_addTitle, m_editTitle);
+    if (!dialog.run())
+        return;
+    setActions(dialog->actions());
+    Q_EMIT changed();
+}
+
+} // namespace VelUI

@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "ListLineForm.h"
+
+#include <frame/DesktopEntryRecord.h>
+
+#include <QList>
+#include <QWidget>
+
+namespace VelUI {
+
+/// A field that shows the ids of an entry's actions in one line and edits them in a dialog.
+class ActionListEdit : public QWidget
+{
+    Q_OBJECT
+
+public:
+    explicit ActionListEdit(QWidget *parent = nullptr);
+
+    void setActions(const QList<VelUIDesktopAction> &actions);
+    QList<VelUIDesktopAction> actions() const;
+
+    /// Sets the title of the dialog and those of the dialogs of a new and of an edited action.
+    void setTexts(const QString &title, const QString &addTitle, const QString &editTitle);
+    void setReadOnly(bool readOnly);
+
+public Q_SLOTS:
+    void editActions();
+
+Q_SIGNALS:
+    void changed();
+
+private:
+    ListLineForm m_ui;
+    QList<VelUIDesktopAction> m_actions;
+    QString m_title;
+    QString m_addTitle;
+    QString m_editTitle;
+};
+
+} // namespace VelUI

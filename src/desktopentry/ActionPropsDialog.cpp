@@ -1,0 +1,152 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ActionPropsDialog.h"
+
+#include "FormLayout.h"
+#include "IconEdit.h"
+#include "LocalisedLabel.h"
+#include "PathEdit.h"
+#include "ShowInChoice.h"
+#include "StringListEdit.h"
+
+#include <QDialogButtonBox>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QVBoxLayout>
+
+#include <climits>
+
+namespace VelUI {
+
+namespace {
+
+template <typename Field>
+Field *make(const QString &name, QWidget *parent)
+{
+    auto *field = new Field(parent);
+    field->setObjectName(name);
+    return field;
+}
+
+QLineEdit *makeLine(const QString &name, QWidget *parent)
+{
+    auto *line = make<QLineEdit>(name, parent);
+    line->setMaxLength(INT_MAX);
+    return line;
+}
+
+bool isBlank(const QString &text)
+{
+    return text.trimmed().isEmpty();
+}
+
+} // namespace
+
+ActionPropsDialog::ActionPropsDialog(const VelUIDesktopAction &action, QWidget *parent)
+    : QDialog(parent)
+{
+    build();
+    load(action);
+    connectChanges();
+    setChanged(false);
+}
+
+void ActionPropsDialog::build()
+{
+    auto *layout = new QVBoxLayout(this);
+    auto *form = new FormLayout;
+    layout->addLayout(form);
+    addRows(form);
+
+    layout->addStretch();
+    m_buttonBox = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+    m_buttonBox->setObjectName(QStringLiteral("buttonBox"));
+    layout->addWidget(m_buttonBox);
+    connect(m_buttonBox, &QDialogButtonBox::accepted, this, &ActionPropsDialog::accept);
+    connect(m_buttonBox, &QDialogButtonBox::rejected, this, &ActionPropsDialog::reject);
+}
+
+void ActionPropsDialog::addRows(FormLayout *layout)
+{
+    m_id = makeLine(QStringLiteral("idEdit"), this);
+    layout->setRowLabelBold(layout->addRow(tr("Id"), m_id));
+    m_name = makeLine(QStringLiteral("nameEdit"), this);
+    layout->setRowLabelBold(layout->addRow(tr("Name"), m_name));
+    m_localName = makeLine(QStringLiteral("localNameEdit"), this);
+    layout->addRow(localisedLabel(tr("Name")), m_localName);
+    m_icon = make<IconEdit>(QStringLiteral("iconEdit"), this);
+    layout->addRow(tr("Icon"), m_icon);
+    m_localIcon = make<IconEdit>(QStringLiteral("localIconEdit"), this);
+    layout->addRow(localisedLabel(tr("Icon")), m_localIcon);
+    addShowInRows(layout);
+    m_exec = make<PathEdit>(QStringLiteral("execEdit"), this);
+    layout->setRowLabelBold(layout->addRow(tr("Exec"), m_exec));
+}
+
+void ActionPropsDialog::addShowInRows(FormLayout *layout)
+{
+    m_onlyShowInButton = new RowRadioButton(tr("Only show in"), this);
+    m_onlyShowInButton->setObjectName(QStringLiteral("onlyShowInButton"));
+    m_onlyShowIn = make<StringListEdit>(QStringLiteral("onlyShowInEdit"), this);
+    m_onlyShowIn->setTexts(tr("Only show in"), tr("Only show in"), tr("Add desktop environment:"),
+                           tr("Only show in"), tr("Edit desktop environment:"));
+    layout->addRow(m_onlyShowInButton, m_onlyShowIn);
+
+    m_notShowInButton = new RowRadioButton(tr("Not show in"), this);
+    m_notShowInButton->setObjectName(QStringLiteral("notShowInButton"));
+    m_notShowIn = make<StringListEdit>(QStringLiteral("notShowInEdit"), this);
+    m_notShowIn->setTexts(tr("Not show in"), tr("Not show in"), tr("Add desktop environment:"),
+                          tr("Not show in"), tr("Edit desktop environment:"));
+    layout->addRow(m_notShowInButton, m_notShowIn);
+
+    ShowInChoice{m_onlyShowInButton, m_onlyShowIn, m_notShowInButton, m_notShowIn}.connectUp(this);
+}
+
+void ActionPropsDialog::load(const VelUIDesktopAction &action)
+{
+    m_id->setText(action.getId());
+    m_name->setText(action.getName());
+    m_localName->setText(action.getLocalName());
+    m_icon->setIcon(action.getIcon());
+    m_localIcon->setIcon(action.getLocalIcon());
+    m_exec->setText(action.getExec());
+    ShowInChoice{m_onlyShowInButton, m_onlyShowIn, m_notShowInButton, m_notShowIn}.load(
+        action.getOnlyShowIn(), action.getNotShowIn());
+}
+
+void ActionPropsDialog::connectChanges()
+{
+    const auto mark = [this] { setChanged(true); };
+    const auto lines = findChildren<QLineEdit *>();
+    for (QLineEdit *line : lines)
+        connect(line, &QLineEdit::textEdited, this, mark);
+    for (IconEdit *icon : {m_icon, m_localIcon})
+        connect(icon, &IconEdit::iconChanged, this, mark);
+    connect(m_exec, &PathEdit::changed, this, mark);
+    for (StringListEdit *list : {m_onlyShowIn, m_notShowIn})
+        connect(list, &StringListEdit::changed, this, mark);
+}
+
+VelUIDesktopAction ActionPropsDialog::action() const
+{
+    VelUIDesktopAction action(m_id->text());
+    action.setName(m_name->text());
+    action.setLocalName(m_localName->text());
+    action.setIcon(m_icon->icon());
+    action.setLocalIcon(m_localIcon->icon());
+    action.setExec(m_exec->text());
+    if (m_onlyShowInButton->isChecked())
+        action.setOnlyShowIn(m_onlyShowIn->strings());
+    else
+        action.setNotShowIn(m_notShowIn->strings());
+    return action;
+}
+
+void ActionPropsDialog::setChanged(bool changed)
+{
+    const bool complete = !isBlank(m_name->text()) && !isBlank(m_id->text()) && !isBlank(m_exec->text());
+    m_buttonBox->button(QDialogButtonBox::Ok)->setEnabled(changed && complete);
+}
+
+} // namespace VelUI

@@ -1,0 +1,48 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ListDialogForm.h"
+
+#include <QCoreApplication>
+#include <QDialog>
+#include <QDialogButtonBox>
+#include <QFrame>
+#include <QPushButton>
+#include <QVBoxLayout>
+
+namespace VelUI {
+
+void ListDialogForm::setupUi(QDialog *dialog, QWidget *listWidget, const Names &names)
+{
+    if (dialog->objectName().isEmpty())
+        dialog->setObjectName(QLatin1String(names.form));
+    dialog->resize(400, 300);
+
+    verticalLayout = new QVBoxLayout(dialog);
+    verticalLayout->setObjectName(QStringLiteral("verticalLayout"));
+
+    listWidget->setObjectName(QStringLiteral("listWidget"));
+    verticalLayout->addWidget(listWidget);
+
+    line = new QFrame(dialog);
+    line->setObjectName(QStringLiteral("line"));
+    line->setFrameShape(QFrame::HLine);
+    line->setFrameShadow(QFrame::Sunken);
+    verticalLayout->addWidget(line);
+
+    buttonBox = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, Qt::Horizontal, dialog);
+    buttonBox->setObjectName(QStringLiteral("buttonBox"));
+    verticalLayout->addWidget(buttonBox);
+    QObject::connect(buttonBox, &QDialogButtonBox::accepted, dialog, &QDialog::accept);
+    QObject::connect(buttonBox, &QDialogButtonBox::rejected, dialog, &QDialog::reject);
+
+    dialog->setWindowTitle(QCoreApplication::translate(names.form, names.windowTitle));
+    QMetaObject::connectSlotsByName(dialog);
+}
+
+void ListDialogForm::setOkEnabled(bool enabled)
+{
+    buttonBox->button(QDialogButtonBox::Ok)->setEnabled(enabled);
+}
+
+} // namespace VelUI

@@ -1,0 +1,15 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "LocalisedLabel.h"
+
+#include <velcore/language.h>
+
+namespace VelUI {
+
+QString localisedLabel(const QString &label)
+{
+    return label + QStringLiteral(" [") + QString::fromStdString(velLanguageCode()) + QLatin1Char(']');
+}
+
+} // namespace VelUI

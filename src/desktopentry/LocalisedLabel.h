@@ -1,0 +1,13 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+namespace VelUI {
+
+/// The label of the field that holds a key in the user's language: "Name" gives "Name [de]".
+QString localisedLabel(const QString &label);
+
+} // namespace VelUI

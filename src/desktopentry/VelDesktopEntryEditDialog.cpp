@@ -1,0 +1,260 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include <VelDesktopEntryEditDialog.h>
+
+#include "GuardedDialog.h"
+
+#include <VelDesktopEntryPropsWidget.h>
+#include <VelMenuDialog.h>
+#include <frame/DesktopEntryRecord.h>
+#include <velcore/dirs.h>
+#include <velintegration/desktopitems.h>
+
+#include <QCoreApplication>
+#include <QDialogButtonBox>
+#include <QFileInfo>
+#include <QMessageBox>
+#include <QPointer>
+#include <QPushButton>
+#include <QSettings>
+#include <QVBoxLayout>
+
+namespace {
+
+// The name of another dialog; sizes are kept under it.
+QString widthKey()
+{
+    return QStringLiteral("/VelMimeTypesSelectDialog/Width");
+}
+
+QString heightKey()
+{
+    return QStringLiteral("/VelMimeTypesSelectDialog/Height");
+}
+
+QString standardDirectory(VelDir kind)
+{
+    return QString::fromStdString(GetVelDir(kind));
+}
+
+} // namespace
+
+class VelDesktopEntryEditDialogPrivate
+{
+    Q_DECLARE_TR_FUNCTIONS(VelDesktopEntryEditDialog)
+
+public:
+    explicit VelDesktopEntryEditDialogPrivate(VelDesktopEntryEditDialog *dialog)
+        : q(dialog)
+    {
+    }
+
+    void warn(const QString &text);
+    void markModified();
+    bool checkSuitable(const VelUIDesktopEntry &entry);
+    void savePosition();
+
+    VelDesktopEntryEditDialog *const q;
+    QPointer<VelDesktopEntryPropsWidget> props;
+    QString path;
+    int posX = -1;
+    int posY = -1;
+    int posSet = 0;
+    // As it was read; saving through a copy writes only what differs from it, so that what
+    // another program changed meanwhile stays.
+    VelUIDesktopEntry loaded{QString()};
+};
+
+void VelDesktopEntryEditDialogPrivate::warn(const QString &text)
+{
+    QMessageBox::warning(q, tr("Warning"), text, QMessageBox::Ok, QMessageBox::NoButton);
+}
+
+void VelDesktopEntryEditDialogPrivate::markModified()
+{
+    // The caller may have set a title without a place for the mark, which Qt would warn about.
+    if (q->windowTitle().contains(QLatin1String("[*]")))
+        q->setWindowModified(true);
+    else
+        q->setAttribute(Qt::WA_WindowModified);
+}
+
+bool VelDesktopEntryEditDialogPrivate::checkSuitable(const VelUIDesktopEntry &entry)
+{
+    VelUIDesktopEntry::SuitableError error = 0;
+    if (entry.isSuitable(&error))
+        return true;
+    switch (error) {
+    case 1:
+        warn(tr("no executable"));
+        break;
+    case 2:
+    case 3:
+    case 4:
+        warn(tr("can't find executable"));
+        break;
+    case 5:
+    case 6:
+        warn(tr("can't find try executable"));
+        break;
+    case 7:
+        warn(tr("can't find URL"));
+        break;
+    default:
+        warn(tr("wrong/incomplete desktop entry"));
+        break;
+    }
+    return false;
+}
+
+void VelDesktopEntryEditDialogPrivate::savePosition()
+{
+    const QFileInfo file(path);
+    if (file.absolutePath() != standardDirectory(VelDir::Desktop)) {
+        warn(tr("Can't save position on desktop for %1").arg(path));
+        return;
+    }
+    SaveDesktopItemPosition(file.fileName().toLocal8Bit().constData(), posX, posY);
+}
+
+VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
+    : QDialog(parent)
+    , d(std::make_unique<VelDesktopEntryEditDialogPrivate>(this))
+{
+    d->props = new VelDesktopEntryPropsWidget(this);
+    d->props->setObjectName(QStringLiteral("props"));
+    connect(d->props, &VelDesktopEntryPropsWidget::changed, this, [this] { d->markModified(); });
+
+    auto *buttonBox = new QDialogButtonBox(
+        QDialogButtonBox::Ok | QDialogButtonBox::Cancel | QDialogButtonBox::Help, Qt::Horizontal, this);
+    buttonBox->setObjectName(QStringLiteral("buttonBox"));
+    auto *copyButton = new QPushButton(tr("Copy from..."), this);
+    copyButton->setObjectName(QStringLiteral("copyButton"));
+    connect(copyButton, &QPushButton::clicked, this, &VelDesktopEntryEditDialog::copyFrom);
+    buttonBox->addButton(copyButton, QDialogButtonBox::ResetRole);
+    buttonBox->button(QDialogButtonBox::Help)->setShortcut(QKeySequence(Qt::Key_F1));
+    connect(buttonBox, &QDialogButtonBox::accepted, this, &VelDesktopEntryEditDialog::accept);
+    connect(buttonBox, &QDialogButtonBox::rejected, this, &VelDesktopEntryEditDialog::reject);
+    connect(buttonBox, &QDialogButtonBox::helpRequested, this, &VelDesktopEntryEditDialog::helpSlot);
+
+    auto *layout = new QVBoxLayout(this);
+    layout->addWidget(d->props);
+    layout->addWidget(buttonBox);
+
+    const QSettings settings;
+    const int height = settings.value(heightKey(), 440).toInt();
+    const int width = settings.value(widthKey(), 560).toInt();
+    resize(width, height);
+}
+
+VelDesktopEntryEditDialog::~VelDesktopEntryEditDialog()
+{
+    QSettings settings;
+    settings.setValue(widthKey(), width());
+    settings.setValue(heightKey(), height());
+}
+
+bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool create, const QString &pattern)
+{
+    if (!d->props)
+        return false;
+    VelUIDesktopEntry entry{QString()};
+    entry.setFilePath(path);
+    const bool loaded = entry.load();
+    if (!loaded && !create) {
+        d->warn(tr("Can't load file %1").arg(path));
+        return false;
+    }
+    const VelUIDesktopEntry own = entry;
+    if (!pattern.isEmpty()) {
+        VelUIDesktopEntry source{QString()};
+        source.setFilePath(pattern);
+        if (source.load())
+            entry.inheritFrom(source);
+        else
+            d->warn(tr("Can't load file %1").arg(pattern));
+    }
+    d->props->loadFrom(entry);
+    d->path = path;
+    d->loaded = own;
+    if (!loaded) {
+        if (path.endsWith(QLatin1String("/.directory")))
+            d->props->setType(QStringLiteral("Directory"), {QStringLiteral("Directory")});
+        else if (path.endsWith(QLatin1String(".desktop")))
+            d->props->setType(QStringLiteral("Application"),
+                              {QStringLiteral("Application"), QStringLiteral("Link")});
+    }
+    setWindowTitle(tr("Desktop Entry Editor") + QStringLiteral(" - ") + path + QStringLiteral("[*]"));
+    // Filling the form is not a change of the user's.
+    setWindowModified(false);
+    return true;
+}
+
+void VelDesktopEntryEditDialog::setDesktopEntryCoords(int xx, int yy)
+{
+    if (!d->props)
+        return;
+    d->posX = xx;
+    d->posY = yy;
+    d->posSet = 1;
+}
+
+void VelDesktopEntryEditDialog::accept()
+{
+    if (!d->props) {
+        QDialog::accept();
+        return;
+    }
+    VelUIDesktopEntry entry = d->loaded;
+    entry.setFilePath(d->path);
+    d->props->saveTo(&entry);
+    if (!d->checkSuitable(entry))
+        return;
+    VelUIDesktopEntry::DisplayableError displayError = 0;
+    if (!entry.isDisplayable(&displayError))
+        d->warn(tr("You create hidden desktop entry"));
+    if (!entry.save()) {
+        d->warn(tr("Can't save file %1").arg(d->path));
+        return;
+    }
+    d->loaded = entry;
+    if (d->posSet)
+        d->savePosition();
+    QDialog::accept();
+}
+
+void VelDesktopEntryEditDialog::copyFrom()
+{
+    if (!d->props)
+        return;
+    VelUI::GuardedDialog<VelMenuDialog> picker(standardDirectory(VelDir::StartMenu), -1, false, false, this);
+    if (!picker.run())
+        return;
+    const QString source = picker->selectedItemPath();
+    if (source.isEmpty() || !d->props)
+        return;
+    VelUIDesktopEntry entry(source);
+    if (!entry.load())
+        return;
+    d->props->loadFrom(entry);
+    d->markModified();
+}
+
+void VelDesktopEntryEditDialog::helpSlot()
+{
+    VelUI::GuardedDialog<QMessageBox> box(
+        QMessageBox::Information, tr("Help"),
+        tr("<b>Desktop entry</b> is a multipurpose info file for installed apps, devices, etc. "
+           "It can be used to build menu entries, shortcuts, etc. "
+           "This dialog implements the 'Desktop Entry Standard' of "
+           "<a href=\"https://www.freedesktop.org\">https://www.freedesktop.org</a>."
+           "<br><br>"
+           "Desktop entry file is a text ini-like file with one main section [Desktop Entry] and possible "
+           "additional sections for each action defined in the main section field 'Actions'. "
+           "All fields are text string pairs: key=value. "
+           "Value can also be a semicolon separated string list."),
+        QMessageBox::Close, this);
+    box->setTextFormat(Qt::RichText);
+    box.exec();
+}
