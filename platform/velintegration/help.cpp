@@ -3,7 +3,48 @@
 
 #include <velintegration/help.h>
 
-bool velHelpShow(const std::string &)
+#include <QFile>
+#include <QFileInfo>
+#include <QProcess>
+#include <QString>
+#include <QStringList>
+
+namespace {
+
+bool leadsOutside(const QString &page)
 {
-    return false;
+    return page.split(QLatin1Char('/')).contains(QStringLiteral(".."));
+}
+
+// The first of the help folders that has the page; empty when none has.
+QString pagePath(const QString &page)
+{
+    QStringList folders = {QStringLiteral(VEL_INSTALLED_DATA_DIR)};
+    const QString data = QFile::decodeName(qgetenv("VEL_DATA_DIR"));
+    if (!data.isEmpty())
+        folders.prepend(data);
+    for (const QString &folder : qAsConst(folders)) {
+        const QFileInfo file(folder + QLatin1String("/doc/") + page + QLatin1String(".html"));
+        if (file.isFile())
+            return file.absoluteFilePath();
+    }
+    return {};
+}
+
+} // namespace
+
+bool velHelpShow(const std::string &page)
+{
+    const QString name = page.empty() ? QStringLiteral("index") : QFile::decodeName(page.c_str());
+    const QString path = leadsOutside(name) ? QString() : pagePath(name);
+    if (path.isEmpty())
+        return false;
+
+    QProcess browser;
+    browser.setProgram(QStringLiteral("xdg-open"));
+    browser.setArguments({path});
+    browser.setStandardInputFile(QProcess::nullDevice());
+    browser.setStandardOutputFile(QProcess::nullDevice());
+    browser.setStandardErrorFile(QProcess::nullDevice());
+    return browser.startDetached();
 }

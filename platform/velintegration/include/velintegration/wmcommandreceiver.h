@@ -1,0 +1,86 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <velintegration/velintegration_export.h>
+
+#include <functional>
+#include <memory>
+#include <string>
+
+class WmCommandReceiverPrivate;
+
+/**
+ * The window manager's side of the command channel.
+ *
+ * Takes the manager selection VelWmCommand::selectionName() of the default screen as the
+ * ICCCM describes (with a time stamp, announced by a MANAGER message to the root window,
+ * answering TARGETS, MULTIPLE and TIMESTAMP) and calls back with each line that is sent.
+ *
+ * It has an X connection of its own, so it needs no toolkit and disturbs none: wait until
+ * connectionFd() can be read and call processEvents(). In a Qt program:
+ *
+ * \code
+ * WmCommandReceiver receiver([](const std::string &line) { obey(line); });
+ * if (!receiver.acquire())
+ *     return 1;
+ * QSocketNotifier notifier(receiver.connectionFd(), QSocketNotifier::Read);
+ * QObject::connect(&notifier, &QSocketNotifier::activated, [&] { receiver.processEvents(); });
+ * \endcode
+ *
+ * All calls come from one thread. The callbacks run inside acquire() and processEvents() and
+ * may not delete the receiver.
+ */
+class VELINTEGRATION_EXPORT WmCommandReceiver
+{
+public:
+    /// Called with one line, without its line feed.
+    using LineHandler = std::function<void(const std::string &line)>;
+    /// Called when another program has taken the selection.
+    using LostHandler = std::function<void()>;
+
+    /**
+     * Connects to the display; does not take the selection yet.
+     *
+     * @param onLine called with each line that arrives
+     * @param displayName the display; null for that of the environment
+     */
+    explicit WmCommandReceiver(LineHandler onLine, const char *displayName = nullptr);
+
+    /// Gives the selection up and ends the connection.
+    ~WmCommandReceiver();
+
+    WmCommandReceiver(const WmCommandReceiver &) = delete;
+    WmCommandReceiver &operator=(const WmCommandReceiver &) = delete;
+
+    /// Sets what is called when another program has taken the selection.
+    void setLostHandler(LostHandler onLost);
+
+    /**
+     * Takes the selection.
+     *
+     * @param replace true takes it from the program that has it, and waits up to five seconds
+     *        for that program to let go; false leaves it there
+     * @return whether this receiver owns the selection now; false without a display
+     */
+    bool acquire(bool replace = false);
+
+    /// Gives the selection up; lines that have arrived are handed out first.
+    void release();
+
+    /// Whether this receiver owns the selection, as far as processed events tell.
+    bool isOwner() const;
+
+    /// The file descriptor to wait on for reading; -1 without a display.
+    int connectionFd() const;
+
+    /// The id of the X window that owns the selection; 0 when there is none.
+    unsigned long windowId() const;
+
+    /// Handles all events that have arrived; never waits.
+    void processEvents();
+
+private:
+    std::unique_ptr<WmCommandReceiverPrivate> d;
+};

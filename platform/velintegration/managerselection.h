@@ -1,0 +1,50 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <string>
+
+#include <X11/Xlib.h>
+
+/**
+ * A manager selection of the default screen, as the ICCCM describes it: who has it, has the
+ * say. Does not own the display. Every operation needs a display.
+ */
+class ManagerSelection
+{
+public:
+    ManagerSelection(Display *display, const std::string &name);
+    ~ManagerSelection();
+    ManagerSelection(const ManagerSelection &) = delete;
+    ManagerSelection &operator=(const ManagerSelection &) = delete;
+
+    /// Takes the selection with a new window; from its owner only if \a replace is true.
+    bool acquire(bool replace);
+
+    /// Destroys the window, by which others see that the selection is free.
+    void release();
+
+    /// The window that owns the selection, None without; properties of it are watched.
+    Window window() const { return m_window; }
+
+    /// Answers a question about the selection.
+    void answer(const XSelectionRequestEvent &request);
+
+    /// Whether \a event tells that another client has taken the selection.
+    bool isLoss(const XEvent &event) const;
+
+private:
+    Atom atom(const char *name) const;
+    void makeWindow();
+    Time serverTime();
+    void waitForRelease(Window previous);
+    void announce();
+    bool convert(Window requestor, Atom target, Atom property);
+    bool convertMultiple(Window requestor, Atom property);
+
+    Display *m_display;
+    Atom m_selection;
+    Window m_window = None;
+    Time m_time = CurrentTime;
+};
