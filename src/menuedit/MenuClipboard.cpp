@@ -1,0 +1,205 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuClipboard.h"
+
+#include <velcore/text.h>
+
+#include <QDir>
+#include <QFileInfo>
+
+#include <cstdio>
+
+namespace MenuClipboard {
+
+namespace {
+
+const char UriPrefix[] = "file:/";
+
+// What other programs look for: a list with proper URLs, and a mark that the item was cut.
+QString copiedFilesFormat()
+{
+    return QStringLiteral("x-special/gnome-copied-files");
+}
+
+QString cutMarkFormat()
+{
+    return QStringLiteral("application/x-kde-cutselection");
+}
+
+bool existsOnDisk(const QString &path)
+{
+    const QFileInfo info(path);
+    return info.isSymLink() || info.exists();
+}
+
+// A clean absolute path, a leading double slash being the root; empty when \a path is not one.
+QString cleaned(const QString &path)
+{
+    int slashes = 0;
+    while (slashes < path.size() && path.at(slashes) == QLatin1Char('/'))
+        ++slashes;
+    return slashes == 0 ? QString() : QDir::cleanPath(path.mid(slashes - 1));
+}
+
+// The path in a line of ours: whatever follows the prefix, read as it stands or, if there is
+// no such file, with its percent escapes resolved.
+QString pathInLine(const QByteArray &line)
+{
+    if (!line.startsWith(UriPrefix))
+        return QString();
+    const QByteArray rest = '/' + line.mid(int(sizeof UriPrefix) - 1);
+    const QString literal = cleaned(QString::fromLocal8Bit(rest));
+    if (existsOnDisk(literal))
+        return literal;
+    const QString decoded = cleaned(QString::fromLocal8Bit(QByteArray::fromPercentEncoding(rest)));
+    return existsOnDisk(decoded) ? decoded : QString();
+}
+
+QString pathOf(const QUrl &url, const QByteArray &line)
+{
+    const QString path = cleaned(url.toLocalFile());
+    if (url.isValid() && existsOnDisk(path))
+        return path;
+    const QString fromLine = pathInLine(line);
+    return fromLine.isEmpty() ? path : fromLine;
+}
+
+QList<QByteArray> linesOf(const QByteArray &text)
+{
+    QList<QByteArray> lines;
+    const QList<QByteArray> parts = text.split('\n');
+    for (QByteArray line : parts) {
+        if (line.endsWith('\r'))
+            line.chop(1);
+        if (!line.isEmpty() && !line.startsWith('#'))
+            lines.append(line);
+    }
+    return lines;
+}
+
+// The paths in the format of other programs, the only one that is clear about every name.
+QStringList pathsOfCopiedFiles(const QMimeData *data)
+{
+    QStringList paths;
+    QList<QByteArray> lines = linesOf(data->data(copiedFilesFormat()));
+    if (lines.isEmpty() || (lines.constFirst() != "cut" && lines.constFirst() != "copy"))
+        return paths;
+    lines.removeFirst();
+    for (const QByteArray &line : qAsConst(lines)) {
+        const QString path = cleaned(QUrl::fromEncoded(line, QUrl::StrictMode).toLocalFile());
+        if (!existsOnDisk(path))
+            return QStringList();
+        paths.append(path);
+    }
+    return paths;
+}
+
+} // namespace
+
+QString copyFormat()
+{
+    return QStringLiteral("text/uri-list");
+}
+
+QString moveFormat()
+{
+    return QStringLiteral("text/uri-move-list");
+}
+
+QByteArray encoded(const QString &path)
+{
+    return UriPrefix + path.toLocal8Bit() + '\n';
+}
+
+ItemData::ItemData(const QString &path, Qt::DropAction action)
+    : m_path(path)
+    , m_isCut(action == Qt::MoveAction)
+{
+}
+
+QStringList ItemData::formats() const
+{
+    QStringList formats{copyFormat(), copiedFilesFormat()};
+    if (m_isCut) {
+        formats.prepend(moveFormat());
+        formats.append(cutMarkFormat());
+    }
+    return formats;
+}
+
+bool ItemData::hasFormat(const QString &mimeType) const
+{
+    return formats().contains(mimeType);
+}
+
+QByteArray ItemData::bytesOf(const QString &mimeType) const
+{
+    if (!hasFormat(mimeType))
+        return QByteArray();
+    if (mimeType == copiedFilesFormat()) {
+        const QByteArray url = QUrl::fromLocalFile(m_path).toEncoded(QUrl::FullyEncoded);
+        return (m_isCut ? "cut\n" : "copy\n") + url;
+    }
+    return mimeType == cutMarkFormat() ? QByteArrayLiteral("1") : encoded(m_path);
+}
+
+QVariant ItemData::retrieveData(const QString &mimeType, QVariant::Type type) const
+{
+    if (mimeType == copyFormat() && type == QVariant::List)
+        return QVariantList{QUrl::fromLocalFile(m_path)};
+    const QByteArray bytes = bytesOf(mimeType);
+    return bytes.isNull() ? QVariant() : QVariant(bytes);
+}
+
+QString format(const QMimeData *data)
+{
+    if (!data)
+        return QString();
+    const QStringList formats = data->formats();
+    for (const QString &ours : {moveFormat(), copyFormat()}) {
+        if (formats.contains(ours))
+            return ours;
+    }
+    return QString();
+}
+
+QList<QUrl> urls(const QMimeData *data, const QString &format)
+{
+    QList<QUrl> urls;
+    if (!data)
+        return urls;
+    const QByteArray bytes = data->data(format);
+    QByteArray buffer(bytes.size() + 1, '\0');
+    const bool isEscaped = Vel::isEscapedUtf8(reinterpret_cast<const unsigned char *>(bytes.constData()),
+                                              reinterpret_cast<unsigned char *>(buffer.data()));
+    const QString text = isEscaped ? QString::fromUtf8(buffer.constData()) : QString::fromLocal8Bit(bytes);
+
+    const bool hasCrLf = text.contains(QLatin1String("\r\n"));
+    if (!hasCrLf && !text.contains(QLatin1Char('\n')))
+        std::fputs("VelMenuModel: wrong separator in url list (mime data)\n", stderr);
+    const QStringList parts =
+        text.split(hasCrLf ? QStringLiteral("\r\n") : QStringLiteral("\n"), Qt::SkipEmptyParts);
+    for (const QString &part : parts)
+        urls.append(QUrl(part.simplified(), QUrl::TolerantMode));
+    return urls;
+}
+
+QStringList localPaths(const QMimeData *data)
+{
+    if (const auto *item = qobject_cast<const ItemData *>(data))
+        return QStringList{cleaned(item->path())};
+    if (data->hasFormat(copiedFilesFormat())) {
+        const QStringList paths = pathsOfCopiedFiles(data);
+        if (!paths.isEmpty())
+            return paths;
+    }
+    const QList<QUrl> urls = data->urls();
+    const QList<QByteArray> lines = linesOf(data->data(copyFormat()));
+    QStringList paths;
+    for (int i = 0; i < urls.size(); ++i)
+        paths.append(pathOf(urls.at(i), lines.size() == urls.size() ? lines.at(i) : QByteArray()));
+    return paths;
+}
+
+} // namespace MenuClipboard

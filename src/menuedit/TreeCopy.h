@@ -1,0 +1,28 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <filesystem>
+#include <system_error>
+
+/**
+ * Copying, moving and removing of one file or folder with everything in it, on the bytes that
+ * the file system knows: names that are no valid text are carried along like any other.
+ *
+ * No operation overwrites anything; a target that exists is errc::file_exists.
+ */
+namespace TreeCopy {
+
+using Path = std::filesystem::path;
+
+/// Copies \a source to \a target, which appears when the copy is complete.
+std::error_code copy(const Path &source, const Path &target);
+
+/// Moves \a source to \a target, by copying where they lie on different file systems.
+std::error_code move(const Path &source, const Path &target);
+
+/// Removes \a path, folders that may not be written included.
+void removeTree(const Path &path);
+
+} // namespace TreeCopy

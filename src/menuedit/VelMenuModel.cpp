@@ -1,0 +1,156 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "VelMenuModel.h"
+
+#include "EntryName.h"
+
+#include <frame/DesktopEntryRecord.h>
+
+#include <QDir>
+#include <QFileIconProvider>
+#include <QFileInfo>
+
+namespace {
+
+const QLatin1String DirectorySuffix("/.directory");
+const QLatin1String EntrySuffix(".desktop");
+
+// The columns that the base class uses in signals of its own, whatever columnCount() says.
+constexpr int BaseColumns = 4;
+
+} // namespace
+
+VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *menuView, QObject *parent)
+    : QFileSystemModel(parent)
+    , view(menuView)
+    , rootDir(rootDirectory)
+{
+    connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);
+    setRootPath(rootDir);
+}
+
+VelMenuModel::~VelMenuModel() = default;
+
+// The base class announces a change up to a column that this model does not have. Without
+// an index for it, nobody would hear of changed rows.
+QModelIndex VelMenuModel::index(int row, int column, const QModelIndex &parent) const
+{
+    return QFileSystemModel::index(row, column > 0 && column < BaseColumns ? 0 : column, parent);
+}
+
+int VelMenuModel::columnCount(const QModelIndex &parent) const
+{
+    Q_UNUSED(parent)
+    return 1;
+}
+
+QVariant VelMenuModel::data(const QModelIndex &index, int role) const
+{
+    if (index.isValid() && index.model() == this) {
+        if (role == Qt::DisplayRole)
+            return displayName(index);
+        if (role == Qt::UserRole)
+            return isHidden(index);
+        if (role == Qt::DecorationRole && !m_editedRows.isEmpty() && m_editedRows.contains(filePath(index)))
+            return iconProvider()->icon(QFileInfo(filePath(index)));
+    }
+    return QFileSystemModel::data(index, role);
+}
+
+bool VelMenuModel::setData(const QModelIndex &index, const QVariant &value, int role)
+{
+    return QFileSystemModel::setData(index, value, role);
+}
+
+Qt::ItemFlags VelMenuModel::flags(const QModelIndex &index) const
+{
+    return QFileSystemModel::flags(index) & ~Qt::ItemIsEditable;
+}
+
+QString VelMenuModel::menuDirectory() const
+{
+    return rootDir.isEmpty() ? QString() : QDir::cleanPath(QFileInfo(rootDir).absoluteFilePath());
+}
+
+void VelMenuModel::forgetItemInfo(const QString &path)
+{
+    hiddenItems.remove(path);
+    itemNames.remove(path);
+    refreshRow(path);
+}
+
+void VelMenuModel::setItemName(const QString &path, const QString &name)
+{
+    itemNames.insert(path, name);
+    refreshRow(path);
+}
+
+bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
+{
+    const QString directoryFile = path + DirectorySuffix;
+    const QString file = isFolder && QFileInfo::exists(directoryFile) ? directoryFile : path;
+    const bool isEntry = file.endsWith(EntrySuffix);
+    if (!isEntry && !file.endsWith(DirectorySuffix))
+        return false;
+
+    const VelUIDesktopEntry entry(file);
+    itemNames.insert(path, EntryName::of(entry));
+    VelUIDesktopEntry::DisplayableError reason = 0;
+    // Codes 1 and 3 hide; an entry that is left out of menus for another reason can be edited.
+    if (isEntry && !entry.isDisplayable(&reason) && (reason & ~2) == 1)
+        hiddenItems.insert(path, true);
+    return true;
+}
+
+QVariant VelMenuModel::displayName(const QModelIndex &index) const
+{
+    const QString path = filePath(index);
+    const QString known = itemNames.value(path);
+    if (!known.isEmpty())
+        return known;
+    if (!loadItemInfo(path, isDir(index)))
+        return QFileSystemModel::data(index, Qt::DisplayRole);
+    return itemNames.value(path);
+}
+
+bool VelMenuModel::isHidden(const QModelIndex &index) const
+{
+    const QString path = filePath(index);
+    if (!itemNames.contains(path) && !loadItemInfo(path, isDir(index)))
+        return false;
+    return hiddenItems.value(path, false);
+}
+
+// Announces that the row of \a path may show something else now. What belongs to the
+// ".directory" file is shown in the folder's row; a dot file has no row, and asking for its
+// index would make one.
+void VelMenuModel::refreshRow(const QString &path)
+{
+    const QString rowPath = path.endsWith(DirectorySuffix) ? QFileInfo(path).absolutePath() : path;
+    const QFileInfo info(rowPath);
+    if (info.fileName().startsWith(QLatin1Char('.')) || !info.exists()) {
+        m_editedRows.remove(rowPath);
+        return;
+    }
+    m_editedRows.insert(rowPath);
+    const QModelIndex row = index(rowPath);
+    if (row.isValid())
+        Q_EMIT dataChanged(row, row);
+}
+
+// For several rows the base class announces from the first to the last name by code points,
+// which are not the first and the last row of its own order.
+void VelMenuModel::completeDataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
+                                       const QVector<int> &roles)
+{
+    if (m_isCompleting || topLeft == bottomRight || !topLeft.isValid())
+        return;
+    const QModelIndex parent = topLeft.parent();
+    const int last = rowCount(parent) - 1;
+    if (topLeft.row() == 0 && bottomRight.row() == last)
+        return;
+    m_isCompleting = true;
+    Q_EMIT dataChanged(index(0, 0, parent), index(last, 0, parent), roles);
+    m_isCompleting = false;
+}

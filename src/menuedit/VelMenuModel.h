@@ -1,0 +1,77 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QFileSystemModel>
+#include <QMap>
+#include <QSet>
+#include <QString>
+#include <QStringList>
+
+class VelMenuView;
+
+/**
+ * The files and folders of a menu directory, under the names that the menu shows.
+ *
+ * Tells which entries are to be hidden (role Qt::UserRole) and carries out drops. A name is
+ * read from disk once and kept until forgetItemInfo() is called for it.
+ */
+class VelMenuModel : public QFileSystemModel
+{
+    Q_OBJECT
+
+public:
+    /// \a view is called back after drops; null is allowed. It is not owned.
+    VelMenuModel(const QString &rootDir, VelMenuView *view, QObject *parent);
+    ~VelMenuModel() override;
+
+    using QFileSystemModel::index;
+    QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
+    int columnCount(const QModelIndex &parent = QModelIndex()) const override;
+    QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
+    bool setData(const QModelIndex &index, const QVariant &value, int role = Qt::EditRole) override;
+    bool dropMimeData(const QMimeData *data, Qt::DropAction action, int row, int column,
+                      const QModelIndex &parent) override;
+    Qt::ItemFlags flags(const QModelIndex &index) const override;
+
+    /// The menu directory, clean and absolute; empty if none was given.
+    QString menuDirectory() const;
+
+    /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
+    void forgetItemInfo(const QString &path);
+    /// Shows \a path as \a name, without reading the file.
+    void setItemName(const QString &path, const QString &name);
+
+Q_SIGNALS:
+    /// Files were dropped and are there.
+    void changed();
+
+private:
+    struct Drop;
+
+    bool loadItemInfo(const QString &path, bool isFolder) const;
+    QVariant displayName(const QModelIndex &index) const;
+    bool isHidden(const QModelIndex &index) const;
+
+    void refreshRow(const QString &path);
+    void completeDataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
+                             const QVector<int> &roles);
+
+    bool dropIntoOwnFolder(const Drop &drop);
+    bool dropIntoOtherFolder(const Drop &drop);
+    bool mayOverwrite(const QString &target);
+    bool fixSortOrder(const Drop &drop);
+    bool carryOut(const Drop &drop);
+    bool link(const Drop &drop);
+    void finish(const Drop &drop, bool sortAnew);
+    void tellAtItem(const QString &path, const QString &text);
+
+    VelMenuView *view;
+    QString rootDir;
+    mutable QMap<QString, QString> itemNames;
+    mutable QMap<QString, bool> hiddenItems;
+    // Rows that were edited here: the base class keeps the icon it has, this model asks anew.
+    QSet<QString> m_editedRows;
+    bool m_isCompleting = false;
+};

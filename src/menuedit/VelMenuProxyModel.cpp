@@ -1,0 +1,182 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "VelMenuProxyModel.h"
+
+#include "VelMenuModel.h"
+
+#include <frame/DesktopEntryRecord.h>
+
+#include <QDateTime>
+#include <QFileInfo>
+
+#include <optional>
+
+/// What is the same for all children of a folder.
+struct VelMenuProxyModel::Folder
+{
+    QString path;
+    bool isRecents;
+    std::optional<SortOrder::Index> order;
+};
+
+/// One row, by the internal id that the source model gives it for as long as it lives.
+struct VelMenuProxyModel::Row
+{
+    Folder *folder;
+    QString fileName;
+    bool isInMenu;
+    bool isFolder;
+    qint64 modified;
+    std::optional<SortOrder::Mention> mention;
+    std::optional<QString> displayName;
+};
+
+VelMenuProxyModel::VelMenuProxyModel(QObject *parent)
+    : QSortFilterProxyModel(parent)
+{
+    setDynamicSortFilter(true);
+    connect(this, &QAbstractItemModel::layoutAboutToBeChanged, this, &VelMenuProxyModel::dropUnnamedRows);
+}
+
+VelMenuProxyModel::~VelMenuProxyModel() = default;
+
+void VelMenuProxyModel::setSourceModel(QAbstractItemModel *model)
+{
+    if (sourceModel())
+        sourceModel()->disconnect(this);
+    dropAll();
+    sortOrders.clear();
+    m_files = qobject_cast<VelMenuModel *>(model);
+    m_menuDirectory = m_files ? m_files->menuDirectory() : QString();
+    // Before the base class connects: its slots sort.
+    if (m_files)
+        watch(model);
+    QSortFilterProxyModel::setSourceModel(model);
+}
+
+void VelMenuProxyModel::watch(QAbstractItemModel *model)
+{
+    connect(model, &QAbstractItemModel::dataChanged, this, &VelMenuProxyModel::dropRows);
+    connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuProxyModel::dropAll);
+    connect(model, &QAbstractItemModel::rowsRemoved, this, &VelMenuProxyModel::dropAll);
+    connect(model, &QAbstractItemModel::modelAboutToBeReset, this, &VelMenuProxyModel::dropAll);
+    connect(model, &QAbstractItemModel::modelReset, this, &VelMenuProxyModel::dropAll);
+    connect(model, &QObject::destroyed, this, [this] {
+        dropAll();
+        m_files = nullptr;
+    });
+    connect(m_files, &QFileSystemModel::fileRenamed, this, &VelMenuProxyModel::dropAll);
+}
+
+void VelMenuProxyModel::invalidateSortOrder(const QString &folderPath)
+{
+    sortOrders.remove(folderPath);
+    dropAll();
+    invalidate();
+}
+
+bool VelMenuProxyModel::filterAcceptsRow(int sourceRow, const QModelIndex &sourceParent) const
+{
+    if (sourceModel()->index(sourceRow, 0, sourceParent).data(Qt::UserRole).toBool())
+        return false;
+    return QSortFilterProxyModel::filterAcceptsRow(sourceRow, sourceParent);
+}
+
+bool VelMenuProxyModel::lessThan(const QModelIndex &left, const QModelIndex &right) const
+{
+    if (!m_files)
+        return QSortFilterProxyModel::lessThan(left, right);
+    Row &leftRow = rowOf(left);
+    Row &rightRow = rowOf(right);
+    if (!leftRow.isInMenu)
+        return false;
+    if (leftRow.folder->isRecents)
+        return leftRow.modified < rightRow.modified;
+
+    Folder &folder = *leftRow.folder;
+    if (!folder.order)
+        folder.order.emplace(sortOrderOf(folder.path));
+    if (!folder.order->isEmpty()) {
+        const SortOrder::Places places = SortOrder::places(mentionOf(leftRow), mentionOf(rightRow));
+        if (places.left != places.right)
+            return places.right < places.left;
+    }
+    if (leftRow.isFolder != rightRow.isFolder)
+        return rightRow.isFolder;
+    return QString::localeAwareCompare(displayNameOf(leftRow, left), displayNameOf(rightRow, right)) >= 0;
+}
+
+VelMenuProxyModel::Row &VelMenuProxyModel::rowOf(const QModelIndex &index) const
+{
+    const auto known = m_rows.find(index.internalId());
+    if (known != m_rows.end())
+        return known->second;
+
+    Row row{};
+    row.folder = &folderOf(index);
+    row.fileName = index.data(QFileSystemModel::FileNameRole).toString();
+    const QString path = m_files->filePath(index);
+    row.isInMenu = path.startsWith(m_menuDirectory) || path.endsWith(QLatin1String("/autostart"));
+    row.isFolder = m_files->isDir(index);
+    if (row.folder->isRecents)
+        row.modified = m_files->lastModified(index).toMSecsSinceEpoch();
+    return m_rows.emplace(index.internalId(), std::move(row)).first->second;
+}
+
+VelMenuProxyModel::Folder &VelMenuProxyModel::folderOf(const QModelIndex &index) const
+{
+    const QModelIndex parent = index.parent();
+    const auto known = m_folders.find(parent.internalId());
+    if (known != m_folders.end())
+        return known->second;
+    Folder folder{m_files->filePath(parent),
+                  parent.data(QFileSystemModel::FileNameRole) == QLatin1String("recents"), std::nullopt};
+    return m_folders.emplace(parent.internalId(), std::move(folder)).first->second;
+}
+
+QStringList VelMenuProxyModel::sortOrderOf(const QString &folderPath) const
+{
+    const auto known = sortOrders.constFind(folderPath);
+    if (known != sortOrders.constEnd())
+        return *known;
+    QStringList list;
+    const QString file = folderPath + QLatin1String("/.directory");
+    if (QFileInfo::exists(file))
+        list = VelUIDesktopEntry(file).getSortOrder();
+    sortOrders.insert(folderPath, list);
+    return list;
+}
+
+const SortOrder::Mention &VelMenuProxyModel::mentionOf(Row &row) const
+{
+    if (!row.mention)
+        row.mention = row.folder->order->mention(row.fileName);
+    return *row.mention;
+}
+
+const QString &VelMenuProxyModel::displayNameOf(Row &row, const QModelIndex &index) const
+{
+    if (!row.displayName)
+        row.displayName = index.data(Qt::DisplayRole).toString();
+    return *row.displayName;
+}
+
+void VelMenuProxyModel::dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight)
+{
+    for (int row = topLeft.row(); row <= bottomRight.row(); ++row)
+        m_rows.erase(topLeft.sibling(row, 0).internalId());
+}
+
+// An empty name is read from disk whenever it is asked for; within one sort it must not change.
+void VelMenuProxyModel::dropUnnamedRows()
+{
+    for (auto it = m_rows.begin(); it != m_rows.end();)
+        it = it->second.displayName && it->second.displayName->isEmpty() ? m_rows.erase(it) : std::next(it);
+}
+
+void VelMenuProxyModel::dropAll()
+{
+    m_rows.clear();
+    m_folders.clear();
+}

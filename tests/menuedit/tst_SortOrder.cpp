@@ -1,0 +1,226 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "TestCase.h"
+
+#include <menuedit/SortOrder.h>
+
+#include <QRandomGenerator>
+
+#include <fnmatch.h>
+
+using SortOrder::AtEnd;
+
+class tst_SortOrder : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void placesTwoNames_data();
+    void placesTwoNames();
+    void agreesWithTheWalkOverRandomLists();
+    void answersForALongListOfPatterns();
+    void rewritesTheList_data();
+    void rewritesTheList();
+};
+
+namespace {
+
+bool matches(const QString &pattern, const QString &name)
+{
+    return fnmatch(pattern.toLocal8Bit().constData(), name.toLocal8Bit().constData(), 0) == 0;
+}
+
+// The positions found by one walk over the list, element by element.
+struct Walk
+{
+    int leftExact = -1;
+    int rightExact = -1;
+    int leftAny = -1;
+    int rightAny = -1;
+
+    // Whether the walk goes on.
+    bool step(int i, const QString &e, const QString &left, const QString &right)
+    {
+        if (e == left) {
+            if (rightExact != -1) {
+                leftExact = i;
+                return false;
+            }
+            if (e == right) {
+                leftExact = rightExact = rightAny = i;
+                return false;
+            }
+            leftExact = leftAny = i;
+        } else if (e == right) {
+            rightExact = rightAny = i;
+            return leftExact == -1;
+        } else if (leftAny == -1 && rightAny == -1 && e.contains(QLatin1Char('*'))) {
+            if (matches(e, left))
+                leftAny = i;
+            if (matches(e, right))
+                rightAny = i;
+        }
+        return true;
+    }
+
+    SortOrder::Places resolve() const
+    {
+        const int rightOfAny = rightAny != -1 ? rightAny : AtEnd;
+        if (leftExact != -1)
+            return {leftExact, rightExact != -1 ? rightExact : rightOfAny};
+        if (rightExact != -1)
+            return {leftAny != -1 ? leftAny : AtEnd, rightExact};
+        if (leftAny != -1)
+            return {leftAny, rightOfAny};
+        return {AtEnd, rightOfAny};
+    }
+};
+
+SortOrder::Places walked(const QStringList &list, const QString &left, const QString &right)
+{
+    Walk walk;
+    for (int i = 0; i < list.size(); ++i) {
+        if (!walk.step(i, list.at(i), left, right))
+            break;
+    }
+    return walk.resolve();
+}
+
+QString pick(const QStringList &from)
+{
+    return from.at(QRandomGenerator::global()->bounded(from.size()));
+}
+
+QStringList words(const char *text)
+{
+    return QString::fromUtf8(text).split(QLatin1Char(' '), Qt::SkipEmptyParts);
+}
+
+} // namespace
+
+void tst_SortOrder::placesTwoNames_data()
+{
+    QTest::addColumn<QStringList>("list");
+    QTest::addColumn<QString>("left");
+    QTest::addColumn<QString>("right");
+    QTest::addColumn<int>("leftPlace");
+    QTest::addColumn<int>("rightPlace");
+    const auto row = [](const char *title, const char *list, const char *left, const char *right,
+                        int leftPlace, int rightPlace) {
+        QTest::newRow(title) << words(list) << QString::fromUtf8(left) << QString::fromUtf8(right)
+                             << leftPlace << rightPlace;
+    };
+    row("empty list", "", "a", "b", AtEnd, AtEnd);
+    row("both named", "b a", "a", "b", 1, 0);
+    row("one named", "a", "a", "b", 0, AtEnd);
+    row("neither", "x y", "a", "b", AtEnd, AtEnd);
+    row("both by one pattern", "*", "a", "b", 0, 0);
+    row("named behind the pattern", "x * y", "y", "b", 2, 1);
+    row("named before the pattern", "x * y", "x", "b", 0, AtEnd);
+    row("own pattern each", "a* b*", "ax", "bx", 0, AtEnd);
+    row("own pattern each, turned", "a* b*", "bx", "ax", AtEnd, 0);
+    row("second pattern", "c* a*", "ax", "b", 1, AtEnd);
+    row("no pattern after a name", "a * b", "c", "a", AtEnd, 0);
+    row("pattern that is a name", "a* ab", "a*", "ab", 0, 1);
+    row("name twice", "a b a", "a", "c", 2, AtEnd);
+    row("name twice, other between", "a b a", "a", "b", 0, 1);
+    row("name twice, other behind", "a a b", "a", "b", 1, 2);
+    row("other twice", "a a b", "b", "a", 2, 1);
+    row("same name", "a b a", "a", "a", 0, 0);
+    row("question mark is no pattern", "? a?", "a", "ab", AtEnd, AtEnd);
+    row("question mark in a pattern", "?b*", "ab", "b", 0, AtEnd);
+    row("brackets in a pattern", "[ab]*", "b", "c", 0, AtEnd);
+    row("a star matches a dot", "*", ".a", "b", 0, 0);
+    row("case counts", "A a*", "a", "A", AtEnd, 0);
+    row("not ASCII", "\xc3\x84* z", "\xc3\x84pfel", "z", 0, 1);
+}
+
+void tst_SortOrder::placesTwoNames()
+{
+    QFETCH(QStringList, list);
+    QFETCH(QString, left);
+    QFETCH(QString, right);
+    QFETCH(int, leftPlace);
+    QFETCH(int, rightPlace);
+
+    const SortOrder::Places places = SortOrder::places(list, left, right);
+
+    QCOMPARE(places.left, leftPlace);
+    QCOMPARE(places.right, rightPlace);
+}
+
+void tst_SortOrder::agreesWithTheWalkOverRandomLists()
+{
+    const QStringList names = words("a b ab ba c a* *b b.desktop a.desktop \xc3\xa4 [a] a?");
+    const QStringList elements = names + words("* *.desktop a* *b ?* [ab]* *a* b*b x y \\** **");
+    constexpr int Lists = 300000;
+    for (int n = 0; n < Lists; ++n) {
+        QStringList list;
+        const int size = QRandomGenerator::global()->bounded(8);
+        for (int i = 0; i < size; ++i)
+            list.append(pick(elements));
+        const QString left = pick(names);
+        const QString right = pick(names);
+
+        const SortOrder::Places places = SortOrder::places(list, left, right);
+        const SortOrder::Places expected = walked(list, left, right);
+
+        if (places.left != expected.left || places.right != expected.right)
+            QFAIL(qPrintable(list.join(QLatin1Char(' ')) + QStringLiteral(" : ") + left + QLatin1Char(' ')
+                             + right));
+    }
+}
+
+void tst_SortOrder::answersForALongListOfPatterns()
+{
+    QStringList list;
+    for (int i = 0; i < 100000; ++i)
+        list.append(QStringLiteral("*a*a*a*a*%1*b").arg(i % 1000));
+    list.append(QStringLiteral("*"));
+
+    const SortOrder::Places places =
+        SortOrder::places(list, QString(200, QLatin1Char('a')), QStringLiteral("aaaa7b"));
+
+    QCOMPARE(places.left, AtEnd);
+    QCOMPARE(places.right, 7);
+}
+
+void tst_SortOrder::rewritesTheList_data()
+{
+    QTest::addColumn<QStringList>("children");
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<int>("place");
+    QTest::addColumn<QStringList>("expected");
+    const auto row = [](const char *title, const char *children, const char *name, int place,
+                        const char *expected) {
+        QTest::newRow(title) << words(children) << QString::fromUtf8(name) << place << words(expected);
+    };
+    row("new at the top", "a b c", "x", 0, "* x a b c");
+    row("new in the middle", "a b c", "x", 1, "* a x b c");
+    row("new at the end", "a b c", "x", 3, "* a b c x");
+    row("moved up", "a b c", "c", 0, "* c a b");
+    row("moved down", "a b c", "a", 2, "* b a c");
+    row("moved to the end", "a b c", "a", 3, "* b c a");
+    row("before itself", "a b c", "b", 1, "* a b c");
+    row("behind itself", "a b c", "b", 2, "* a b c");
+    row("no place for a new one", "a b", "x", -1, "* a b");
+    row("no place for a child", "a b", "a", -1, "* b");
+    row("place that is none", "a b", "x", 3, "* a b");
+    row("empty folder", "", "x", 0, "* x");
+    row("nothing at all", "", "x", -1, "*");
+}
+
+void tst_SortOrder::rewritesTheList()
+{
+    QFETCH(QStringList, children);
+    QFETCH(QString, name);
+    QFETCH(int, place);
+    QFETCH(QStringList, expected);
+
+    QCOMPARE(SortOrder::rewritten(children, name, place), expected);
+}
+
+VEL_TEST_GUILESS_MAIN(tst_SortOrder)
+
+#include "tst_SortOrder.moc"
