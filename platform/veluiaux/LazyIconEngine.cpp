@@ -1,0 +1,163 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "LazyIconEngine.h"
+
+#include "IconDrawing.h"
+#include "IconLookup.h"
+#include "IconMemory.h"
+#include "ThemeState.h"
+
+#include <QGuiApplication>
+#include <QPainter>
+#include <QPalette>
+
+namespace {
+
+// Stands in no name of a file and in no name of an icon.
+constexpr QChar separator(0x1f);
+
+} // namespace
+
+LazyIconEngine::LazyIconEngine(const QString &name, const QMap<Qt::Corner, QString> &emblems,
+                               const QIcon &plain)
+    : m_name(name)
+    , m_emblems(emblems)
+    , m_plain(plain)
+{
+}
+
+LazyIconEngine::~LazyIconEngine() = default;
+
+const QIcon &LazyIconEngine::base() const
+{
+    const quint64 generation = ThemeState::generation();
+    if (m_baseGeneration != generation) {
+        m_base = m_name.isEmpty() ? QIcon() : IconLookup::find(m_name);
+        if (m_base.isNull())
+            m_base = m_plain;
+        m_baseGeneration = generation;
+    }
+    return m_base;
+}
+
+const QString &LazyIconEngine::baseKey() const
+{
+    if (m_baseKey.isNull()) {
+        m_baseKey = (m_name.isEmpty() ? QString() : IconLookup::identity(m_name)) + separator
+            + QString::number(m_plain.cacheKey(), 16);
+    }
+    return m_baseKey;
+}
+
+QString LazyIconEngine::pictureKey(const QSize &pixels, qreal ratio, QIcon::Mode mode,
+                                   QIcon::State state) const
+{
+    // Disabled and selected pictures are tinted by the palette.
+    const qint64 numbers[] = {pixels.width(), pixels.height(), qRound64(ratio * 1000), mode * 2 + state,
+                              QGuiApplication::palette().cacheKey()};
+    QString key = baseKey();
+    for (const qint64 number : numbers) {
+        key += separator;
+        key += QString::number(number, 36);
+    }
+    return key;
+}
+
+QPixmap LazyIconEngine::picture(const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state) const
+{
+    if (pixels.isEmpty())
+        return QPixmap();
+    const IconMemory &memory = IconMemory::instance();
+    QString key = pictureKey(pixels, ratio, mode, state);
+    for (auto it = m_emblems.cbegin(); it != m_emblems.cend(); ++it)
+        key += separator + QString::number(it.key()) + it.value();
+
+    QPixmap picture;
+    if (memory.findPicture(key, &picture))
+        return picture;
+    picture = IconDrawing::picture(base(), pixels, ratio, mode, state);
+    if (picture.isNull())
+        return picture;
+    if (!m_emblems.isEmpty())
+        IconDrawing::layEmblems(picture, m_emblems, ratio, mode);
+    picture.setDevicePixelRatio(ratio);
+    memory.keepPicture(key, picture);
+    return picture;
+}
+
+QPixmap LazyIconEngine::pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state)
+{
+    return picture(size, 1, mode, state);
+}
+
+void LazyIconEngine::paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state)
+{
+    const qreal ratio = painter->device()->devicePixelRatioF();
+    const QPixmap picture = this->picture(rect.size() * ratio, ratio, mode, state);
+    if (picture.isNull())
+        return;
+    QRectF target(QPointF(), QSizeF(picture.size()) / ratio);
+    if (picture.size() == rect.size() * ratio)
+        target = rect; // the rounded size at an odd ratio must not blur the picture
+    else
+        target.moveTopLeft(
+            rect.topLeft()
+            + QPoint(int(rect.width() - target.width()) / 2, int(rect.height() - target.height()) / 2));
+    painter->drawPixmap(target, picture, picture.rect());
+}
+
+QSize LazyIconEngine::actualSize(const QSize &size, QIcon::Mode mode, QIcon::State state)
+{
+    IconMemory &memory = IconMemory::instance();
+    const QString key = pictureKey(size, 0, mode, state);
+    if (const QSize *known = memory.findSize(key))
+        return *known;
+    const QSize actual = base().actualSize(size, mode, state);
+    memory.keepSize(key, actual);
+    return actual;
+}
+
+bool LazyIconEngine::isEmpty() const
+{
+    if (!m_plain.isNull())
+        return false;
+    IconMemory &memory = IconMemory::instance();
+    if (const bool *known = memory.findEmptiness(baseKey()))
+        return *known;
+    const bool empty = base().isNull();
+    memory.keepEmptiness(baseKey(), empty);
+    return empty;
+}
+
+QList<QSize> LazyIconEngine::availableSizes(QIcon::Mode mode, QIcon::State state) const
+{
+    return base().availableSizes(mode, state);
+}
+
+QString LazyIconEngine::iconName() const
+{
+    return base().name();
+}
+
+QString LazyIconEngine::key() const
+{
+    return QStringLiteral("LazyIconEngine");
+}
+
+QIconEngine *LazyIconEngine::clone() const
+{
+    return new LazyIconEngine(*this); // the icon that asks owns it
+}
+
+void LazyIconEngine::virtual_hook(int id, void *data)
+{
+    if (id == QIconEngine::IsNullHook) {
+        *static_cast<bool *>(data) = isEmpty();
+    } else if (id == QIconEngine::ScaledPixmapHook) {
+        auto *argument = static_cast<QIconEngine::ScaledPixmapArgument *>(data);
+        argument->pixmap = picture(argument->size, argument->scale, argument->mode, argument->state);
+    } else {
+        QIconEngine::virtual_hook(id, data);
+    }
+}

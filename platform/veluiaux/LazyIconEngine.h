@@ -1,0 +1,55 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QIcon>
+#include <QIconEngine>
+#include <QMap>
+#include <QString>
+
+/**
+ * The engine of an icon that is looked up when it is needed.
+ *
+ * Holds only the parts of the icon. What they come to is kept in IconMemory for all engines
+ * made of the same parts, so that a picture that is known already is found without a look at
+ * the theme.
+ */
+class LazyIconEngine : public QIconEngine
+{
+public:
+    /// The icon \a name with \a emblems; \a plain where there is no such icon or no name.
+    LazyIconEngine(const QString &name, const QMap<Qt::Corner, QString> &emblems, const QIcon &plain);
+    ~LazyIconEngine() override;
+
+    void paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state) override;
+    QSize actualSize(const QSize &size, QIcon::Mode mode, QIcon::State state) override;
+    QPixmap pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state) override;
+    QString key() const override;
+    QIconEngine *clone() const override;
+    QList<QSize> availableSizes(QIcon::Mode mode, QIcon::State state) const override;
+    QString iconName() const override;
+    void virtual_hook(int id, void *data) override;
+
+    /// A picture that fits into \a pixels, drawn for and with the pixel ratio \a ratio.
+    QPixmap picture(const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state) const;
+
+protected:
+    LazyIconEngine(const LazyIconEngine &other) = default;
+
+private:
+    /// The icon without emblems, as the theme now has it.
+    const QIcon &base() const;
+    bool isEmpty() const;
+    /// Names the parts, without the emblems, for what is remembered.
+    const QString &baseKey() const;
+    QString pictureKey(const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state) const;
+
+    const QString m_name;
+    const QMap<Qt::Corner, QString> m_emblems;
+    const QIcon m_plain;
+
+    mutable QIcon m_base;
+    mutable quint64 m_baseGeneration = 0;
+    mutable QString m_baseKey;
+};

@@ -1,0 +1,65 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include <veluiaux/VelIconTheme.h>
+
+#include "ThemeState.h"
+
+#include <QFileInfo>
+#include <QMimeDatabase>
+#include <QString>
+#include <QUrl>
+
+namespace {
+
+/// The file that \a text names, as a path or as a URL; empty when it names none here.
+QString localFile(const QString &text, const QUrl &url)
+{
+    if (text.startsWith(QLatin1Char('/')))
+        return text;
+    if (url.scheme() != QLatin1String("file"))
+        return QString();
+    if (!url.host().isEmpty() && url.host() != QLatin1String("localhost"))
+        return QString();
+    return url.path(QUrl::FullyDecoded);
+}
+
+struct Kind
+{
+    std::string icon;
+    std::string mimeType;
+};
+
+Kind kindOf(const QString &text)
+{
+    const QUrl url(text);
+    const QFileInfo file(localFile(text, url));
+    if (!file.filePath().isEmpty() && file.exists()) {
+        const QMimeType type = QMimeDatabase().mimeTypeForFile(file);
+        return {type.iconName().toStdString(), type.name().toStdString()};
+    }
+    const QString scheme = text.startsWith(QLatin1Char('/')) ? QString() : url.scheme();
+    if (scheme == QLatin1String("http") || scheme == QLatin1String("https"))
+        return {"text-html", "text/html"};
+    if (scheme == QLatin1String("mailto"))
+        return {"mail-message-new", "x-scheme-handler/mailto"};
+    return {"unknown", "application/octet-stream"};
+}
+
+} // namespace
+
+VelIconTheme &VelIconTheme::current(ForceLoad force)
+{
+    static VelIconTheme theme;
+    if (force == DoForceLoad)
+        ThemeState::reload();
+    return theme;
+}
+
+std::string VelIconTheme::getURLIconName(const char *url, std::string *mimeType)
+{
+    Kind kind = kindOf(QString::fromLocal8Bit(url));
+    if (mimeType)
+        *mimeType = std::move(kind.mimeType);
+    return kind.icon;
+}

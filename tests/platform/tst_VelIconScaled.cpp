@@ -1,0 +1,95 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "IconThemeFolder.h"
+#include "TestCase.h"
+
+#include <veluiaux/VelIcon.h>
+
+#include <QImage>
+#include <QPainter>
+
+/// Icons in an application on a screen of two pixels for one, with AA_UseHighDpiPixmaps.
+class tst_VelIconScaled : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init();
+
+    void makesPixmapsForTheScreen();
+    void laysEmblemsInTheirLogicalSize();
+    void paintsOnADeviceOfAnotherRatio();
+    void tellsTheSizesThatQtTells();
+
+private:
+    QIcon icon() const
+    {
+        return VelIcon::fromTheme(QStringLiteral("by-size"),
+                                  qMakePair(Qt::TopLeftCorner, QStringLiteral("emblem")), QIcon());
+    }
+};
+
+void tst_VelIconScaled::init()
+{
+    TestCase::init();
+    const IconThemeFolder theme(folder(), QStringLiteral("sizes"), {8, 16, 32});
+    theme.write();
+    theme.add(QStringLiteral("by-size"), Qt::red, 16);
+    theme.add(QStringLiteral("by-size"), Qt::cyan, 32);
+    theme.add(QStringLiteral("emblem"), Qt::blue);
+    theme.use();
+    QCOMPARE(qApp->devicePixelRatio(), 2.0);
+}
+
+void tst_VelIconScaled::makesPixmapsForTheScreen()
+{
+    for (int round = 0; round < 2; ++round) {
+        const QPixmap pixmap = icon().pixmap(16);
+        QCOMPARE(pixmap.devicePixelRatio(), 2.0);
+        QCOMPARE(pixmap.size(), QSize(32, 32));
+        QCOMPARE(pixmap.toImage().pixelColor(20, 20), QColor(Qt::cyan));
+    }
+}
+
+void tst_VelIconScaled::laysEmblemsInTheirLogicalSize()
+{
+    const QImage image = icon().pixmap(16).toImage();
+    QCOMPARE(image.pixelColor(15, 15), QColor(Qt::blue));
+    QCOMPARE(image.pixelColor(16, 15), QColor(Qt::cyan));
+    QCOMPARE(image.pixelColor(15, 16), QColor(Qt::cyan));
+}
+
+void tst_VelIconScaled::paintsOnADeviceOfAnotherRatio()
+{
+    QImage image(16, 16, QImage::Format_ARGB32_Premultiplied);
+    image.fill(Qt::white);
+    QPainter painter(&image);
+    icon().paint(&painter, image.rect());
+    painter.end();
+    QCOMPARE(image.pixelColor(7, 7), QColor(Qt::blue));
+    QCOMPARE(image.pixelColor(8, 7), image.pixelColor(15, 15));
+    QVERIFY(image.pixelColor(15, 15) != QColor(Qt::white));
+}
+
+void tst_VelIconScaled::tellsTheSizesThatQtTells()
+{
+    const QIcon qt = QIcon::fromTheme(QStringLiteral("by-size"));
+    for (const int size : {8, 16, 22, 32, 64}) {
+        QCOMPARE(icon().actualSize(QSize(size, size)), qt.actualSize(QSize(size, size)));
+        QCOMPARE(icon().pixmap(size).size(), qt.pixmap(size).size());
+        QCOMPARE(icon().pixmap(size).devicePixelRatio(), qt.pixmap(size).devicePixelRatio());
+    }
+}
+
+int main(int argc, char **argv)
+{
+    VelTest::TestEnvironment environment;
+    qputenv("QT_SCALE_FACTOR", "2");
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    QApplication application(argc, argv);
+    tst_VelIconScaled test;
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_VelIconScaled.moc"
