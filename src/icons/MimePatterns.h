@@ -1,0 +1,60 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QByteArray>
+#include <QRegularExpression>
+#include <QSet>
+#include <QString>
+#include <QStringList>
+#include <QVector>
+
+/**
+ * The file name patterns of the MIME database, as far as needed to tell which names the
+ * database cannot tell apart.
+ *
+ * Nearly all patterns are a "*" and the end of a name. Two names that no other pattern may
+ * match, and that share the longest of these ends, match the same patterns; so the database
+ * takes them for the same type as long as it does not look at the contents.
+ */
+class MimePatterns
+{
+public:
+    /**
+     * Adds the patterns of a "mime.cache" file as update-mime-database writes it.
+     *
+     * @return false when the bytes cannot be understood; the patterns are unusable then
+     */
+    bool addCache(const QByteArray &cache);
+
+    /// To be called when all caches were added, before decidingEnd().
+    void finish();
+
+    /**
+     * The length of the end of \a name that decides which patterns match it.
+     *
+     * @return at least 1, less than the length of \a name; 0 when no pattern matches, or one
+     *         that is not of the plain kind may match
+     */
+    int decidingEnd(const QString &name) const;
+
+private:
+    struct Node
+    {
+        QChar character;
+        int firstChild = -1;
+        int nextSibling = -1;
+        bool isEnd = false; // a pattern begins here
+    };
+
+    void addPattern(const QString &pattern);
+    void addEnd(const QString &end);
+    int childOf(int node, QChar character) const;
+    bool mayMatchOtherPattern(const QString &name) const;
+
+    QVector<Node> m_nodes{Node()}; // the ends, read backwards, in lower case
+    QSet<QString> m_literals; // in lower case
+    QStringList m_otherPatterns;
+    QRegularExpression m_other;
+};

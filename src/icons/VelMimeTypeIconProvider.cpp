@@ -1,0 +1,146 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "VelMimeTypeIconProvider.h"
+
+#include "MimeTypeFinder.h"
+
+#include <frame/DesktopEntryRecord.h>
+
+#include <velcore/dirs.h>
+#include <veluiaux/VelIcon.h>
+#include <veluiaux/VelIconTheme.h>
+#include <veluiaux/VelTrash.h>
+
+#include <QFile>
+#include <QFileInfo>
+#include <QPainter>
+#include <QPixmap>
+
+namespace {
+
+QIcon builtInIcon(const QStringList &names)
+{
+    const QString directory = QString::fromStdString(GetVelDir(VelDir::Pictures));
+    QIcon icon;
+    for (const QString &name : names)
+        icon.addFile(directory + name);
+    return icon;
+}
+
+/// A rule across the middle, two pixels high.
+QPixmap separatorPicture(int size)
+{
+    QPixmap picture(size, size);
+    picture.fill(Qt::transparent);
+    QPainter painter(&picture);
+    painter.drawLine(0, size / 2 - 1, size, size / 2 - 1);
+    painter.drawLine(0, size / 2, size, size / 2);
+    return picture;
+}
+
+QIcon drawnSeparator()
+{
+    QIcon icon;
+    for (const int size : {16, 22, 32, 48, 64, 128})
+        icon.addPixmap(separatorPicture(size));
+    return icon;
+}
+
+QString themeName(QFileIconProvider::IconType type)
+{
+    switch (type) {
+    case QFileIconProvider::Computer:
+        return QStringLiteral("computer");
+    case QFileIconProvider::Desktop:
+        return QStringLiteral("user-desktop");
+    case QFileIconProvider::Trashcan:
+        return VelTrash::isEmpty() ? QStringLiteral("user-trash") : QStringLiteral("user-trash-full");
+    case QFileIconProvider::Network:
+        return QStringLiteral("network-wired");
+    case QFileIconProvider::Drive:
+        return QStringLiteral("drive-harddisk");
+    case QFileIconProvider::Folder:
+        return QStringLiteral("folder");
+    case QFileIconProvider::File:
+        break;
+    }
+    return QStringLiteral("unknown");
+}
+
+} // namespace
+
+VelMimeTypeIconProvider::VelMimeTypeIconProvider()
+    : folderIcon(builtInIcon({QStringLiteral("/folder16.xpm"), QStringLiteral("/folder32.xpm")}))
+    , fileIcon(builtInIcon({QStringLiteral("/icon16.xpm"), QStringLiteral("/icon32.xpm")}))
+    , separatorIcon(drawnSeparator())
+{
+}
+
+VelMimeTypeIconProvider::~VelMimeTypeIconProvider() = default;
+
+QIcon VelMimeTypeIconProvider::icon(IconType type) const
+{
+    // QIcon::fromTheme() with a fallback decides in the same way, but has the style draw the
+    // fallback even where the theme has the icon.
+    const QIcon icon = QIcon::fromTheme(themeName(type));
+    if (icon.isNull() || icon.availableSizes().isEmpty())
+        return QFileIconProvider::icon(type);
+    return icon;
+}
+
+QIcon VelMimeTypeIconProvider::icon(const QFileInfo &info) const
+{
+    if (!info.exists()) {
+        return VelIcon::fromTheme(QStringLiteral("unknown"),
+                                  qMakePair(Qt::TopRightCorner, QStringLiteral("emblem-unreadable")),
+                                  QIcon());
+    }
+    Emblems emblems;
+    if (info.isSymLink())
+        emblems.insert(Qt::BottomLeftCorner, QStringLiteral("emblem-symbolic-link"));
+    if (info.isDir())
+        return directoryIcon(info, emblems);
+    if (!info.isFile())
+        return VelIcon::withEmblems(fileIcon, emblems);
+    if (info.fileName().endsWith(QLatin1String(".desktop")))
+        return desktopEntryIcon(info, emblems);
+    return regularFileIcon(info, emblems);
+}
+
+QString VelMimeTypeIconProvider::type(const QFileInfo &info) const
+{
+    return MimeTypeFinder::instance().typeOf(info).name();
+}
+
+QIcon VelMimeTypeIconProvider::directoryIcon(const QFileInfo &info, const Emblems &emblems) const
+{
+    const QString path = info.absoluteFilePath() + QStringLiteral("/.directory");
+    const QString name = QFile::exists(path) ? VelUIDesktopEntry(path).getIcon() : QString();
+    return name.isEmpty() ? VelIcon::withEmblems(folderIcon, emblems)
+                          : VelIcon::fromTheme(name, emblems, folderIcon);
+}
+
+QIcon VelMimeTypeIconProvider::regularFileIcon(const QFileInfo &info, const Emblems &emblems) const
+{
+    const QMimeType type = MimeTypeFinder::instance().typeOf(info);
+    return type.isValid() ? VelIcon::fromTheme(type.iconName(), emblems, fileIcon)
+                          : VelIcon::withEmblems(fileIcon, emblems);
+}
+
+QIcon VelMimeTypeIconProvider::desktopEntryIcon(const QFileInfo &info, const Emblems &emblems) const
+{
+    const VelUIDesktopEntry entry(info.absoluteFilePath());
+    const QString name = entry.getIcon();
+    if (!name.isEmpty())
+        return VelIcon::fromTheme(name, emblems, fileIcon);
+    if (entry.getType() == QLatin1String("Link")) {
+        const QByteArray url = entry.getURL().toLocal8Bit();
+        const std::string urlIcon =
+            VelIconTheme::current(VelIconTheme::NoForceLoad).getURLIconName(url.constData(), nullptr);
+        return VelIcon::fromTheme(QString::fromStdString(urlIcon), emblems, QIcon());
+    }
+    if (entry.getExec() == QLatin1String("VELWM_SEPARATOR"))
+        return separatorIcon;
+    return VelIcon::withEmblems(fileIcon, emblems);
+}
