@@ -1,0 +1,114 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include <VelSettings.h>
+
+#include "EmptiedSettings.h"
+#include "ThemeRcFormat.h"
+
+#include <QFileInfo>
+#include <QSettings>
+#include <QTextCodec>
+
+#include <cstdio>
+
+#include <utime.h>
+
+namespace {
+
+// The number under which Qt knows the format, the same for the whole process.
+QSettings::Format themeRcFormat = QSettings::InvalidFormat;
+
+void registerFormat()
+{
+    if (themeRcFormat != QSettings::InvalidFormat)
+        return;
+    themeRcFormat = QSettings::registerFormat(QStringLiteral("themerc"), ThemeRcFormat::read,
+                                              EmptiedSettings::write, Qt::CaseSensitive);
+    if (themeRcFormat == QSettings::InvalidFormat)
+        std::fprintf(stderr, "VelSettings: custom format %d NOT registered\n", int(themeRcFormat));
+}
+
+std::unique_ptr<QSettings> openSettings(const QString &path)
+{
+    auto settings = std::make_unique<QSettings>(path, themeRcFormat);
+    settings->setIniCodec(QTextCodec::codecForLocale());
+    return settings;
+}
+
+} // namespace
+
+VelSettings::VelSettings(const QString &path)
+{
+    parsed = ParseConfigFile(path);
+}
+
+VelSettings::~VelSettings()
+{
+    close();
+}
+
+bool VelSettings::ParseConfigFile(const QString &path)
+{
+    const QFileInfo info(path);
+    if (!info.exists())
+        return false;
+    if (!info.isReadable()) {
+        qCritical("Permission Denied for '%s'!", path.toLocal8Bit().constData());
+        return false;
+    }
+    registerFormat();
+
+    close();
+    settings = openSettings(info.absoluteFilePath());
+    if (EmptiedSettings::isLeft(*settings) && EmptiedSettings::drop(*settings))
+        settings = openSettings(info.absoluteFilePath());
+    if (settings->status() != QSettings::NoError) {
+        qCritical("Cant register format!");
+        return false;
+    }
+    fileName = info.absoluteFilePath();
+    return true;
+}
+
+bool VelSettings::isParsed() const
+{
+    return parsed;
+}
+
+QVariant VelSettings::value(const QString &key, const QVariant &defaultValue) const
+{
+    return parsed && settings ? settings->value(key, defaultValue) : defaultValue;
+}
+
+void VelSettings::setValue(const QString &key, const QVariant &value)
+{
+    if (settings)
+        settings->setValue(key, value);
+}
+
+void VelSettings::remove(const QString &key)
+{
+    if (settings)
+        settings->remove(key);
+}
+
+void VelSettings::sync(bool touch)
+{
+    if (!settings || fileName.isEmpty())
+        return;
+    if (touch)
+        utime(fileName.toLocal8Bit().constData(), nullptr);
+    settings->sync();
+}
+
+// Writes what is pending and lets go of the file.
+void VelSettings::close()
+{
+    if (!settings)
+        return;
+    settings->sync();
+    if (EmptiedSettings::isLeft(*settings))
+        EmptiedSettings::drop(*settings);
+    settings.reset();
+}

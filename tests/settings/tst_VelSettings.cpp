@@ -1,0 +1,418 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "StderrCapture.h"
+#include "TestCase.h"
+
+#include <VelSettings.h>
+
+#include <QDateTime>
+#include <QDir>
+
+#include <type_traits>
+
+#include <sys/stat.h>
+#include <utime.h>
+
+static_assert(!std::is_copy_constructible<VelSettings>::value && !std::is_copy_assignable<VelSettings>::value,
+              "two objects would own one QSettings");
+static_assert(!std::has_virtual_destructor<VelSettings>::value, "a plain class");
+
+namespace {
+
+QString s(const char *utf8)
+{
+    return QString::fromUtf8(utf8);
+}
+
+// Gives the file a time in the past, so that a change is seen.
+void makeOld(const QString &path)
+{
+    const utimbuf times = {1000000000, 1000000000};
+    utime(QFile::encodeName(path).constData(), &times);
+}
+
+struct stat statusOf(const QString &path)
+{
+    struct stat status = {};
+    stat(QFile::encodeName(path).constData(), &status);
+    return status;
+}
+
+} // namespace
+
+class tst_VelSettings : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void doesNothingWithoutAFile();
+    void saysNothingAboutAMissingFile();
+    void opensAFileByARelativePath();
+    void readsTypedValues();
+    void givesTheDefaultForAMissingKey();
+    void writesChangesOnSync();
+    void writesChangesWhenItIsDestroyed();
+    void leavesAnUnchangedFileAlone();
+    void touchesAnUnchangedFileOnSync();
+    void touchesNothingWithoutBeingAsked();
+    void renamesTheSection();
+    void dropsTheHeaderWithTheSectionName();
+    void removesAKey();
+    void removesTheKeysBelowAKey();
+    void switchesToAnotherFile();
+    void keepsItsFileWhenTheOtherOneIsMissing();
+    void doesNotCallItselfParsedAfterALaterSuccess();
+    void setsAndWritesThoughItIsNotParsed();
+    void opensAnEmptyFile();
+    void opensADirectoryWithoutACrash();
+    void sharesChangesBetweenObjectsOnOneFile();
+    void opensAgainAfterTheLastKeyWasRemoved_data();
+    void opensAgainAfterTheLastKeyWasRemoved();
+    void opensAgainWhileAnObjectThatRemovedTheLastKeyLives();
+    void writesAKeyThatIsSetAfterTheLastOneWasRemoved();
+    void keepsEverySlashedKeyWhenAllWereRemoved();
+    void sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved();
+};
+
+void tst_VelSettings::doesNothingWithoutAFile()
+{
+    VelSettings settings(path(s("none")));
+    QVERIFY(!settings.isParsed());
+    settings.setValue(s("a"), 1);
+    QCOMPARE(settings.value(s("a"), 2), QVariant(2));
+    QCOMPARE(settings.value(s("a")), QVariant());
+    settings.remove(s("a"));
+    settings.sync();
+    settings.sync(true);
+    QVERIFY(!QFile::exists(path(s("none"))));
+}
+
+void tst_VelSettings::saysNothingAboutAMissingFile()
+{
+    StderrCapture capture;
+    VelSettings settings(path(s("none")));
+    QVERIFY(!settings.ParseConfigFile(path(s("none"))));
+    QCOMPARE(capture.take(), QByteArray());
+}
+
+void tst_VelSettings::opensAFileByARelativePath()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    const QString before = QDir::currentPath();
+    QVERIFY(QDir::setCurrent(folder()));
+    VelSettings settings(s("rc"));
+    QVERIFY(QDir::setCurrent(before));
+    QVERIFY(settings.isParsed());
+    settings.setValue(s("a"), 2);
+    settings.sync(true);
+    QCOMPARE(read(file), QByteArray("a=2\n"));
+}
+
+void tst_VelSettings::readsTypedValues()
+{
+    VelSettings settings(write(s("rc"), "[ Main ]\nflag=True\nsize=007\npath = one = two\nquoted=\"a b\"\n"));
+    QVERIFY(settings.isParsed());
+    QCOMPARE(settings.value(s("SectionName")), QVariant(s("Main")));
+    QCOMPARE(settings.value(s("flag")), QVariant(true));
+    QCOMPARE(int(settings.value(s("flag")).type()), int(QVariant::Bool));
+    QCOMPARE(settings.value(s("size")), QVariant(7));
+    QCOMPARE(int(settings.value(s("size")).type()), int(QVariant::Int));
+    QCOMPARE(settings.value(s("path")), QVariant(s("one = two")));
+    QCOMPARE(settings.value(s("quoted")), QVariant(s("a b")));
+    QCOMPARE(settings.value(s("Flag")), QVariant()); // keys are case-sensitive
+}
+
+void tst_VelSettings::givesTheDefaultForAMissingKey()
+{
+    VelSettings settings(write(s("rc"), "a=1\n"));
+    QCOMPARE(settings.value(s("b")), QVariant());
+    QCOMPARE(settings.value(s("b"), s("default")), QVariant(s("default")));
+}
+
+void tst_VelSettings::writesChangesOnSync()
+{
+    const QString file = write(s("rc"), "# comment\n[Main]\nz=1\nb=\"v\"\npath = one = two\n");
+    VelSettings settings(file);
+    settings.setValue(s("new"), s("x y"));
+    settings.setValue(s("z"), false);
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("[Main]\nb=v\nnew=\"x y\"\npath=\"one = two\"\nz=false\n"));
+}
+
+void tst_VelSettings::writesChangesWhenItIsDestroyed()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    {
+        VelSettings settings(file);
+        settings.setValue(s("a"), 2);
+    }
+    QCOMPARE(read(file), QByteArray("a=2\n"));
+}
+
+void tst_VelSettings::leavesAnUnchangedFileAlone()
+{
+    const QByteArray bytes("# comment\n\n[b]\nx=007\n");
+    const QString file = write(s("rc"), bytes);
+    makeOld(file);
+    const struct stat before = statusOf(file);
+    {
+        VelSettings settings(file);
+        QCOMPARE(settings.value(s("x")), QVariant(7));
+        settings.sync();
+    }
+    QCOMPARE(read(file), bytes);
+    QCOMPARE(statusOf(file).st_mtime, before.st_mtime);
+    QCOMPARE(statusOf(file).st_ino, before.st_ino);
+}
+
+void tst_VelSettings::touchesAnUnchangedFileOnSync()
+{
+    const QByteArray bytes("# comment\n\n[b]\nx=007\n");
+    const QString file = write(s("rc"), bytes);
+    makeOld(file);
+    const struct stat before = statusOf(file);
+    VelSettings settings(file);
+    settings.sync(true);
+    QCOMPARE(read(file), bytes);
+    QCOMPARE(statusOf(file).st_ino, before.st_ino);
+    QCOMPARE(statusOf(file).st_mode, before.st_mode);
+    QVERIFY(qAbs(statusOf(file).st_mtime - time(nullptr)) < 60);
+    QCOMPARE(settings.value(s("x")), QVariant(7));
+}
+
+void tst_VelSettings::touchesNothingWithoutBeingAsked()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    makeOld(file);
+    VelSettings settings(file);
+    settings.sync();
+    QCOMPARE(statusOf(file).st_mtime, time_t(1000000000));
+}
+
+void tst_VelSettings::renamesTheSection()
+{
+    const QString file = write(s("rc"), "[Old]\na=1\n");
+    VelSettings settings(file);
+    settings.setValue(s("SectionName"), s("New"));
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("[New]\na=1\n"));
+}
+
+void tst_VelSettings::dropsTheHeaderWithTheSectionName()
+{
+    const QString file = write(s("rc"), "[Old]\na=1\n");
+    VelSettings settings(file);
+    settings.remove(s("SectionName"));
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=1\n"));
+}
+
+void tst_VelSettings::removesAKey()
+{
+    const QString file = write(s("rc"), "[Main]\na=1\nb=2\n");
+    VelSettings settings(file);
+    settings.remove(s("a"));
+    QCOMPARE(settings.value(s("a")), QVariant());
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("[Main]\nb=2\n"));
+}
+
+void tst_VelSettings::removesTheKeysBelowAKey()
+{
+    const QString file = write(s("rc"), "x=1\nx/y=2\nxy=3\n");
+    VelSettings settings(file);
+    QCOMPARE(settings.value(s("x/y")), QVariant(2));
+    settings.remove(s("x"));
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("xy=3\n"));
+}
+
+void tst_VelSettings::switchesToAnotherFile()
+{
+    const QString one = write(s("one"), "a=1\n");
+    const QString two = write(s("two"), "a=2\n");
+    VelSettings settings(one);
+    settings.setValue(s("b"), 1);
+    QVERIFY(settings.ParseConfigFile(two));
+    QCOMPARE(read(one), QByteArray("a=1\nb=1\n")); // let go of, so written
+    QCOMPARE(settings.value(s("a")), QVariant(2));
+    settings.setValue(s("b"), 2);
+    settings.sync();
+    QCOMPARE(read(two), QByteArray("a=2\nb=2\n"));
+    QCOMPARE(read(one), QByteArray("a=1\nb=1\n"));
+}
+
+void tst_VelSettings::keepsItsFileWhenTheOtherOneIsMissing()
+{
+    const QString one = write(s("one"), "a=1\n");
+    VelSettings settings(one);
+    QVERIFY(!settings.ParseConfigFile(path(s("none"))));
+    QVERIFY(settings.isParsed());
+    QCOMPARE(settings.value(s("a")), QVariant(1));
+    settings.setValue(s("a"), 2);
+    settings.sync();
+    QCOMPARE(read(one), QByteArray("a=2\n"));
+}
+
+void tst_VelSettings::doesNotCallItselfParsedAfterALaterSuccess()
+{
+    VelSettings settings(path(s("none")));
+    const QString file = write(s("rc"), "a=1\n");
+    QVERIFY(settings.ParseConfigFile(file));
+    QVERIFY(!settings.isParsed());
+    QCOMPARE(settings.value(s("a"), s("default")), QVariant(s("default")));
+}
+
+void tst_VelSettings::setsAndWritesThoughItIsNotParsed()
+{
+    VelSettings settings(path(s("none")));
+    const QString file = write(s("rc"), "a=1\nb=2\n");
+    QVERIFY(settings.ParseConfigFile(file));
+    settings.setValue(s("a"), 3);
+    settings.remove(s("b"));
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=3\n"));
+}
+
+void tst_VelSettings::opensAnEmptyFile()
+{
+    const QString file = write(s("rc"), "");
+    VelSettings settings(file);
+    QVERIFY(settings.isParsed());
+    settings.setValue(s("a"), 1);
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=1\n"));
+}
+
+void tst_VelSettings::opensADirectoryWithoutACrash()
+{
+    expectWarning(s("Cant register format!"));
+    VelSettings settings(folder());
+    QVERIFY(!settings.isParsed());
+    QCOMPARE(settings.value(s("a"), 1), QVariant(1));
+    settings.sync(true);
+}
+
+void tst_VelSettings::sharesChangesBetweenObjectsOnOneFile()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    VelSettings one(file);
+    VelSettings other(file);
+    one.setValue(s("a"), 2);
+    QCOMPARE(other.value(s("a")), QVariant(2));
+}
+
+void tst_VelSettings::opensAgainAfterTheLastKeyWasRemoved_data()
+{
+    QTest::addColumn<QByteArray>("bytes");
+    QTest::addColumn<QString>("removed");
+    QTest::addColumn<bool>("syncs");
+    QTest::newRow("one key, written at the end") << QByteArray("# kept\nonly=1\n") << s("only") << false;
+    QTest::newRow("one key, synced") << QByteArray("# kept\nonly=1\n") << s("only") << true;
+    QTest::newRow("header alone") << QByteArray("[Main]\n") << s("SectionName") << true;
+    QTest::newRow("all keys") << QByteArray("[Main]\nonly=1\nb=2\n\n;c\n") << s("") << true;
+}
+
+void tst_VelSettings::opensAgainAfterTheLastKeyWasRemoved()
+{
+    QFETCH(QByteArray, bytes);
+    QFETCH(QString, removed);
+    QFETCH(bool, syncs);
+    const QString file = write(s("rc"), bytes);
+    StderrCapture capture;
+    {
+        VelSettings settings(file);
+        settings.remove(removed);
+        if (syncs) {
+            settings.sync();
+            QCOMPARE(read(file), bytes);
+        }
+        if (!removed.isEmpty())
+            QCOMPARE(settings.value(removed), QVariant());
+    }
+    const QByteArray refusal("VelSettings: file isn't open or settings are empty\n");
+    QVERIFY(capture.take().startsWith(refusal));
+    QCOMPARE(read(file), bytes);
+
+    const QByteArray lastOfAll = bytes.contains("[Main]") ? "[Main]\n" : "";
+    const bool hadKey = bytes.contains("only");
+    {
+        VelSettings settings(file);
+        QVERIFY(settings.isParsed());
+        if (hadKey)
+            QCOMPARE(settings.value(s("only")), QVariant(1));
+        settings.setValue(s("new"), 3);
+    }
+    const QByteArray written = read(file);
+    QVERIFY(written.startsWith(lastOfAll));
+    QCOMPARE(written.contains("only=1\n"), hadKey);
+    QCOMPARE(written.contains("b=2\n"), bytes.contains("b=2\n"));
+    QVERIFY(written.contains("new=3\n"));
+    QCOMPARE(QDir(folder()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
+             QStringList{s("rc")});
+}
+
+void tst_VelSettings::opensAgainWhileAnObjectThatRemovedTheLastKeyLives()
+{
+    const QByteArray bytes("# kept\nonly=1\n");
+    const QString file = write(s("rc"), bytes);
+    StderrCapture capture;
+    VelSettings first(file);
+    first.remove(s("only"));
+    VelSettings second(file);
+    capture.take();
+    QVERIFY(second.isParsed());
+    QCOMPARE(second.value(s("only")), QVariant(1));
+    QCOMPARE(read(file), bytes);
+    second.setValue(s("new"), 2);
+    second.sync();
+    QCOMPARE(read(file), QByteArray("new=2\nonly=1\n"));
+}
+
+void tst_VelSettings::writesAKeyThatIsSetAfterTheLastOneWasRemoved()
+{
+    const QString file = write(s("rc"), "old=1\n");
+    StderrCapture capture;
+    VelSettings settings(file);
+    settings.remove(s("old"));
+    settings.sync();
+    capture.take();
+    settings.setValue(s("new"), 2);
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("new=2\n"));
+}
+
+void tst_VelSettings::keepsEverySlashedKeyWhenAllWereRemoved()
+{
+    const QString file = write(s("rc"), "//dbl=1\n/lead=2\nonly=3\ntrail/=4\n");
+    StderrCapture capture;
+    {
+        VelSettings settings(file);
+        settings.remove(QString());
+    }
+    capture.take();
+    {
+        VelSettings settings(file);
+        settings.setValue(s("only"), 5);
+    }
+    QCOMPARE(read(file), QByteArray("//dbl=1\n/lead=2\nonly=5\ntrail/=4\n"));
+}
+
+void tst_VelSettings::sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved()
+{
+    const QString file = write(s("rc"), "only=1\n");
+    StderrCapture capture;
+    VelSettings settings(file);
+    settings.remove(s("only"));
+    settings.sync();
+    capture.take();
+    write(s("rc"), "from=elsewhere\nonly=1\n");
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("from=elsewhere\n"));
+    QCOMPARE(settings.value(s("from")), QVariant(s("elsewhere")));
+}
+
+VEL_TEST_GUILESS_MAIN(tst_VelSettings)
+
+#include "tst_VelSettings.moc"
