@@ -37,6 +37,7 @@ const QVector<Rule> &rules()
         {"src/desktopentry", text("include src/frame platform")},
         {"src/menuedit", text("include src/frame platform")},
         {"apps", text("include platform")},
+        {"designer", text("include")},
         {"examples", text("include platform")},
     };
     return all;

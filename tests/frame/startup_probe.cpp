@@ -4,7 +4,7 @@
 // startup_probe WHEN LIBRARY
 //
 // Loads a library at one of several moments and prints, on one line a moment, what a text of the
-// library reads and how many translators the application owns.
+// library reads and how many of its translators (or of those that failed to load) the application owns.
 
 #include <QCoreApplication>
 #include <QTimer>
@@ -20,12 +20,18 @@ namespace {
 
 void say(const char *moment)
 {
-    const QList<QTranslator *> translators = qApp->findChildren<QTranslator *>();
+    // Libraries under ours bring catalogues of their own.
+    int count = 0;
     bool onApplicationThread = true;
-    for (const QTranslator *translator : translators)
+    for (const QTranslator *translator : qApp->findChildren<QTranslator *>()) {
+        if (!translator->filePath().isEmpty()
+            && !translator->filePath().contains(QLatin1String("libveluiextra")))
+            continue;
+        ++count;
         onApplicationThread = onApplicationThread && translator->thread() == qApp->thread();
+    }
     std::printf("%s: %s, %d translators%s\n", moment,
-                qPrintable(QCoreApplication::translate("VelMenuView", "New entry")), int(translators.size()),
+                qPrintable(QCoreApplication::translate("VelMenuView", "New entry")), count,
                 onApplicationThread ? "" : " on another thread");
 }
 
