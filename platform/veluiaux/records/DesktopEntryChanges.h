@@ -1,0 +1,49 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <unordered_set>
+#include <vector>
+
+/**
+ * What a record did to its file and has not saved yet, by group, key and language.
+ *
+ * Kept apart from the text, so that it can be applied to whatever stands in the file when
+ * it is saved. In the order in which the keys were first set.
+ */
+class DesktopEntryChanges
+{
+public:
+    struct Change
+    {
+        std::string group;
+        std::string key;
+        std::string locale; ///< empty for the key without a language
+        std::optional<std::string> value; ///< as it is to stand in the file; none: the key goes
+    };
+
+    bool isEmpty() const { return m_changes.empty() && m_removedGroups.empty(); }
+    const std::vector<Change> &all() const { return m_changes; }
+
+    const Change *find(std::string_view group, std::string_view key, std::string_view locale) const;
+    void set(Change change);
+    /// Forgets what was done to the key: it is again as it stands in the file.
+    void drop(std::string_view group, std::string_view key, std::string_view locale);
+
+    /// The groups go, and with them the changes made in them.
+    void removeGroups(const std::unordered_set<std::string> &groups);
+    bool isRemoved(std::string_view group) const;
+
+private:
+    static std::string place(std::string_view group, std::string_view key, std::string_view locale);
+    void reindex();
+
+    std::vector<Change> m_changes;
+    std::unordered_map<std::string, std::size_t> m_index;
+    std::unordered_set<std::string> m_removedGroups;
+};

@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "DesktopEntryChanges.h"
+#include "EntryFile.h"
+
+#include <QByteArray>
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+/**
+ * One desktop entry: the text of its file and what has been changed since.
+ *
+ * Cheap to copy: the text is shared, only the changes are copied. Values are made from the
+ * text when they are asked for.
+ */
+class EntryDocument
+{
+public:
+    /// A key with the value it has now, as it stands (or is to stand) in the file.
+    struct Entry
+    {
+        std::string group;
+        std::string key;
+        std::string locale;
+        std::string value;
+    };
+
+    EntryDocument();
+
+    /// Binds the document to a file without reading it.
+    void setPath(const QByteArray &path);
+    /// Reads the file anew and drops all changes; false if it cannot be read.
+    bool load();
+    /// Writes the changes to the file; false if that failed, the file is as it was then.
+    bool save();
+    /// Whether a file with a main group was read, or something taken over from such a document.
+    bool isValid() const { return m_valid; }
+    /// Takes over the keys of \a other that this document does not have.
+    void inheritFrom(const EntryDocument &other);
+
+    /// Whether the key stands in the entry, if only with an empty value.
+    bool has(std::string_view group, std::string_view key) const;
+    QString text(std::string_view group, std::string_view key) const;
+    QString localText(std::string_view group, std::string_view key) const;
+    QStringList list(std::string_view group, std::string_view key) const;
+    QStringList localList(std::string_view group, std::string_view key) const;
+    bool flag(std::string_view group, std::string_view key) const;
+
+    void setText(std::string_view group, std::string_view key, const QString &value);
+    void setLocalText(std::string_view group, std::string_view key, const QString &value);
+    void setList(std::string_view group, std::string_view key, const QStringList &value);
+    void setLocalList(std::string_view group, std::string_view key, const QStringList &value);
+    void setFlag(std::string_view group, std::string_view key, bool value);
+
+    bool hasGroup(std::string_view group) const;
+    /// Removes a key in all languages.
+    void removeKey(std::string_view group, std::string_view key);
+    void removeGroups(const std::unordered_set<std::string> &groups);
+
+    /// All keys that count, in the order of the file, then of the setting.
+    std::vector<Entry> entries() const;
+
+private:
+    using Value = std::optional<std::string_view>;
+
+    int baseGroup(std::string_view group) const;
+    Value baseValue(std::string_view group, std::string_view key, std::string_view locale) const;
+    Value value(std::string_view group, std::string_view key, std::string_view locale) const;
+
+    template <typename T>
+    std::optional<T> read(std::string_view group, std::string_view key) const;
+    template <typename T>
+    std::optional<T> readLocal(std::string_view group, std::string_view key,
+                               std::string *locale = nullptr) const;
+    template <typename T>
+    void write(std::string_view group, std::string_view key, std::string_view locale, const T &value);
+    template <typename T>
+    void writeLocal(std::string_view group, std::string_view key, const T &value);
+
+    bool isFromPath() const { return m_read && m_textPath == m_path; }
+    bool replace(const QByteArray &target, std::string bytes);
+
+    QByteArray m_path;
+    std::shared_ptr<const DesktopEntryText> m_text; ///< never null
+    FileStamp m_stamp;
+    bool m_read = false; ///< m_text is that of a file
+    QByteArray m_textPath; ///< and of this one
+    bool m_settled = false; ///< m_stamp alone tells whether that file has changed since
+    bool m_valid = false;
+    DesktopEntryChanges m_changes;
+};

@@ -1,0 +1,105 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "EntryFile.h"
+
+#include "FileDescriptor.h"
+#include "SharedTexts.h"
+
+#include <ctime>
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+
+namespace {
+
+constexpr std::int64_t Second = 1000000000;
+constexpr std::int64_t SettlingTime = Second / 20;
+
+std::int64_t nanoseconds(const timespec &time)
+{
+    return std::int64_t(time.tv_sec) * Second + time.tv_nsec;
+}
+
+// Reads until the end, or until there is more than a desktop entry may have.
+bool readAll(int file, std::size_t expected, std::string *bytes)
+{
+    // One byte more than expected: the read that fills less has met the end.
+    bytes->resize(expected + 1);
+    std::size_t done = 0;
+    for (;;) {
+        const ssize_t count = ::read(file, bytes->data() + done, bytes->size() - done);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count < 0)
+            return false;
+        done += std::size_t(count);
+        if (done < bytes->size())
+            break;
+        if (done > std::size_t(EntryFile::LargestSize))
+            return false;
+        bytes->resize(done + 4096);
+    }
+    bytes->resize(done);
+    return true;
+}
+
+} // namespace
+
+FileStamp::FileStamp(const struct stat &status)
+    : device(status.st_dev)
+    , inode(status.st_ino)
+    , size(status.st_size)
+    , modified(nanoseconds(status.st_mtim))
+    , changed(nanoseconds(status.st_ctim))
+{
+}
+
+bool FileStamp::operator==(const FileStamp &other) const
+{
+    return device == other.device && inode == other.inode && size == other.size && modified == other.modified
+        && changed == other.changed;
+}
+
+bool FileStamp::isSettled() const
+{
+    timespec now;
+    ::clock_gettime(CLOCK_REALTIME, &now);
+    const std::int64_t latest = nanoseconds(now) - SettlingTime;
+    return modified <= latest && changed <= latest;
+}
+
+std::optional<EntryFile> EntryFile::readAnew(const QByteArray &path)
+{
+    if (path.isEmpty() || path.contains('\0'))
+        return std::nullopt;
+    // Without O_NONBLOCK a named pipe would wait for a writer.
+    const FileDescriptor file(::open(path.constData(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
+    struct stat status;
+    if (!file.isOpen() || ::fstat(file.get(), &status) != 0 || !S_ISREG(status.st_mode)
+        || status.st_size > LargestSize)
+        return std::nullopt;
+
+    EntryFile result;
+    result.stamp = FileStamp(status);
+    result.settled = result.stamp.isSettled();
+    std::string bytes;
+    if (!readAll(file.get(), std::size_t(status.st_size), &bytes) || std::int64_t(bytes.size()) > LargestSize)
+        return std::nullopt;
+    result.settled = result.settled && std::int64_t(bytes.size()) == result.stamp.size;
+    result.text = std::make_shared<DesktopEntryText>(std::move(bytes));
+    return result;
+}
+
+std::optional<EntryFile> EntryFile::read(const QByteArray &path)
+{
+    SharedTexts &shared = SharedTexts::instance();
+    if (auto known = shared.find(path))
+        return known;
+    auto file = readAnew(path);
+    if (file && file->settled)
+        shared.insert(path, *file);
+    return file;
+}

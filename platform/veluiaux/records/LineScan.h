@@ -1,0 +1,35 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+/// Answers about the lines of a text that no index keeps, because only writing asks for them.
+class LineScan
+{
+public:
+    /// \a text has to outlive this object.
+    explicit LineScan(const std::string &text);
+
+    /// The first byte behind a byte order mark.
+    std::size_t begin() const { return m_begin; }
+
+    /// The begin of the unbroken run of comment lines right above the line at \a line, else \a line.
+    std::size_t commentsAbove(std::size_t line) const;
+
+    /// The end of the last line before \a end that is not blank.
+    std::size_t contentEnd(std::size_t end) const;
+
+    /// The line end for a new line at \a at: that of the line above, else the first in the text.
+    std::string lineEndAt(std::size_t at) const;
+
+private:
+    enum class Kind { Blank, Comment, Other };
+    std::size_t lineAbove(std::size_t line) const;
+    Kind kind(std::size_t line, std::size_t end) const;
+
+    const std::string &m_text;
+    std::size_t m_begin;
+};

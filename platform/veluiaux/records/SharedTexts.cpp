@@ -1,0 +1,75 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "SharedTexts.h"
+
+#include <sys/stat.h>
+
+namespace {
+
+// What an item takes beside its text: path, list node, hash node.
+constexpr std::size_t ItemCost = 256;
+
+} // namespace
+
+SharedTexts &SharedTexts::instance()
+{
+    // Never destroyed: a record may outlive every static of this library.
+    static auto *const texts = new SharedTexts;
+    return *texts;
+}
+
+std::optional<EntryFile> SharedTexts::find(const QByteArray &path)
+{
+    std::optional<EntryFile> known;
+    {
+        const std::lock_guard<std::mutex> lock(m_mutex);
+        const auto found = m_index.constFind(path);
+        if (found == m_index.constEnd())
+            return std::nullopt;
+        m_items.splice(m_items.begin(), m_items, *found);
+        known = m_items.front().file;
+    }
+    struct stat status;
+    if (::stat(path.constData(), &status) == 0 && S_ISREG(status.st_mode)
+        && FileStamp(status) == known->stamp)
+        return known;
+    return std::nullopt;
+}
+
+void SharedTexts::insert(const QByteArray &path, const EntryFile &file)
+{
+    const std::size_t cost = ItemCost + std::size_t(path.size()) + file.text->cost();
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    const auto known = m_index.constFind(path);
+    if (known != m_index.constEnd())
+        forget(*known);
+    if (cost > Limit / 4)
+        return;
+    m_items.push_front({path, file, cost});
+    m_index.insert(path, m_items.begin());
+    m_cost += cost;
+    while (m_cost > Limit)
+        forget(std::prev(m_items.end()));
+}
+
+std::size_t SharedTexts::cost() const
+{
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    return m_cost;
+}
+
+void SharedTexts::clear()
+{
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    m_index.clear();
+    m_items.clear();
+    m_cost = 0;
+}
+
+void SharedTexts::forget(Items::iterator item)
+{
+    m_cost -= item->cost;
+    m_index.remove(item->path);
+    m_items.erase(item);
+}

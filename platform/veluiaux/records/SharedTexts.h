@@ -1,0 +1,54 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "EntryFile.h"
+
+#include <QByteArray>
+#include <QHash>
+
+#include <cstddef>
+#include <list>
+#include <mutex>
+#include <optional>
+
+/**
+ * The texts of the files read last, so that records of one unchanged file share one.
+ *
+ * A text is given out while the file has the stamp it was read with, and only files whose
+ * stamp was settled then are kept. Of the least recently used ones as many are forgotten as
+ * it takes to stay within the limit. May be used from any thread.
+ */
+class SharedTexts
+{
+public:
+    /// The memory that texts and their indexes may take, in bytes.
+    static constexpr std::size_t Limit = 8 * 1024 * 1024;
+
+    static SharedTexts &instance();
+
+    /// The text of \a path if it is known and the file still as it was.
+    std::optional<EntryFile> find(const QByteArray &path);
+    void insert(const QByteArray &path, const EntryFile &file);
+
+    /// The memory taken now, in bytes.
+    std::size_t cost() const;
+    void clear();
+
+private:
+    struct Item
+    {
+        QByteArray path;
+        EntryFile file;
+        std::size_t cost;
+    };
+    using Items = std::list<Item>; // the most recently used first
+
+    void forget(Items::iterator item);
+
+    mutable std::mutex m_mutex;
+    Items m_items;
+    QHash<QByteArray, Items::iterator> m_index;
+    std::size_t m_cost = 0;
+};
