@@ -3,7 +3,25 @@
 
 #include <velintegration/startmenu.h>
 
-bool CreateStartMenu(const char *, const char *)
+#include "applicationsmenu.h"
+#include "foldercopy.h"
+#include "folderreplacement.h"
+
+namespace fs = std::filesystem;
+
+bool CreateStartMenu(const char *menuDir, const char *templateDir)
 {
-    return false;
+    if (!menuDir || !*menuDir)
+        return false;
+    const bool hasTemplate = templateDir && *templateDir;
+    std::error_code error;
+    if (hasTemplate && !fs::is_directory(templateDir, error))
+        return false;
+
+    FolderReplacement replacement(menuDir);
+    if (!replacement.isOpen())
+        return false;
+    const bool built = hasTemplate ? copyFolderContents(templateDir, replacement.folder())
+                                   : buildApplicationsMenu(replacement.folder());
+    return built && replacement.commit();
 }

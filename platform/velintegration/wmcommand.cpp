@@ -8,6 +8,7 @@
 #include <cstring>
 
 #include <X11/Xatom.h>
+#include <X11/Xlib.h>
 
 namespace {
 

@@ -12,6 +12,7 @@
 #include <thread>
 
 #include <X11/Xatom.h>
+#include <X11/Xlib.h>
 
 struct CloseDisplay
 {

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include <X11/Xatom.h>
+#include <X11/Xlib.h>
 
 struct CloseDisplay
 {

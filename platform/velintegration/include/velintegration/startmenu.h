@@ -5,4 +5,21 @@
 
 #include <velintegration/velintegration_export.h>
 
+/**
+ * Builds a start menu anew. What was in it before is lost.
+ *
+ * The menu holds the applications that are installed: the entries in "applications" of
+ * XDG_DATA_HOME and XDG_DATA_DIRS, where an id in an earlier directory hides later ones;
+ * entries that are not displayable are left out. They are grouped by the first of their main
+ * categories into folders named after the category; what has none goes into "Other", the last
+ * one. Every folder has a ".directory" file with its name in several languages, an icon and
+ * the order of its children. The entries are copies that no longer depend on the originals.
+ *
+ * The new menu is built beside the old one and takes its place in the end: when anything
+ * fails, the old one is left as it was.
+ *
+ * @param menuDir the folder of the menu. Missing parents are made, a link is followed
+ * @param templateDir a folder that is copied instead of all that; may be null or empty
+ * @return whether the new menu stands
+ */
 VELINTEGRATION_EXPORT bool CreateStartMenu(const char *menuDir, const char *templateDir);

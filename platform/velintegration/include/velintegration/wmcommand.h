@@ -7,7 +7,8 @@
 
 #include <string>
 
-#include <X11/Xlib.h>
+// The one type of Xlib that is needed; its header would bring macros named None and Bool.
+typedef struct _XDisplay Display;
 
 /**
  * The names that the channel to the window manager goes by.

@@ -1,0 +1,20 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <filesystem>
+
+/// Copies a file, following links; the copy can be written by its owner.
+bool copyFile(const std::filesystem::path &from, const std::filesystem::path &to);
+
+/**
+ * Copies what is in a folder into another one. Links are followed, so that the copies stand
+ * alone; links that lead nowhere or back to a folder around them are left out, and so is
+ * what is neither file nor folder.
+ *
+ * @param from the folder to copy
+ * @param to an existing folder; is left out where it lies in \a from
+ * @return false when something could not be read or written
+ */
+bool copyFolderContents(const std::filesystem::path &from, const std::filesystem::path &to);

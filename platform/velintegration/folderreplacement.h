@@ -1,0 +1,49 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <filesystem>
+#include <vector>
+
+/**
+ * A new folder that is built beside another and then takes its place.
+ *
+ * Missing parents of the target are made; a target that is a link is followed. Unless
+ * commit() succeeds, the target is left as it was and all that was made here is removed.
+ */
+class FolderReplacement
+{
+public:
+    /// Exchanges two paths in one step; 0, or -1 and errno.
+    using Exchange = int (*)(const char *first, const char *second);
+
+    explicit FolderReplacement(const std::filesystem::path &target, Exchange exchange = exchangePaths);
+    ~FolderReplacement();
+    FolderReplacement(const FolderReplacement &) = delete;
+    FolderReplacement &operator=(const FolderReplacement &) = delete;
+
+    /// Whether there is a new folder to fill; without one nothing else may be called.
+    bool isOpen() const { return !m_folder.empty(); }
+
+    /// The new folder, empty at first; its name begins with a dot.
+    const std::filesystem::path &folder() const { return m_folder; }
+
+    /// Puts the new folder in the target's place and removes the old one.
+    bool commit();
+
+    /// The exchange of the file system; not every one knows it.
+    static int exchangePaths(const char *first, const char *second);
+
+private:
+    bool makeParents();
+    bool makeFolder();
+    bool replaceOld();
+    bool replaceInTwoSteps();
+    std::filesystem::path freeName(const char *purpose) const;
+
+    std::filesystem::path m_target;
+    std::filesystem::path m_folder;
+    std::vector<std::filesystem::path> m_madeParents;
+    Exchange m_exchange;
+};

@@ -1,0 +1,98 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "menucategories.h"
+
+#include "menunames.h"
+
+#include <algorithm>
+
+namespace {
+
+// An item of a list as a desktop entry holds it.
+QByteArray escaped(const QString &item)
+{
+    QByteArray result;
+    for (const char c : item.toUtf8()) {
+        switch (c) {
+        case '\\':
+            result += "\\\\";
+            break;
+        case ';':
+            result += "\\;";
+            break;
+        case '\n':
+            result += "\\n";
+            break;
+        case '\r':
+            result += "\\r";
+            break;
+        case '\t':
+            result += "\\t";
+            break;
+        case ' ':
+            result += result.isEmpty() ? "\\s" : " ";
+            break;
+        default:
+            result += c;
+        }
+    }
+    return result;
+}
+
+} // namespace
+
+const QVector<MenuCategory> &menuCategories()
+{
+    static const QVector<MenuCategory> categories = {
+        {"AudioVideo", "applications-multimedia", "Multimedia"},
+        {"Audio", "applications-multimedia", "Audio"},
+        {"Video", "applications-multimedia", "Video"},
+        {"Development", "applications-development", "Development"},
+        {"Education", "applications-education", "Education"},
+        {"Game", "applications-games", "Games"},
+        {"Graphics", "applications-graphics", "Graphics"},
+        {"Network", "applications-internet", "Internet"},
+        {"Office", "applications-office", "Office"},
+        {"Science", "applications-science", "Science"},
+        {"Settings", "preferences-desktop", "Settings"},
+        {"System", "applications-system", "System"},
+        {"Utility", "applications-utilities", "Utilities"},
+        {"Other", "applications-other", "Other"},
+    };
+    return categories;
+}
+
+const MenuCategory &menuRoot()
+{
+    static const MenuCategory root = {"", "start-here", "Start Menu"};
+    return root;
+}
+
+int menuCategoryOf(const QStringList &categories)
+{
+    const QVector<MenuCategory> &all = menuCategories();
+    // "Other" is our own folder: an entry that names such a category has no main one.
+    const auto end = all.constEnd() - 1;
+    for (const QString &category : categories) {
+        const auto found = std::find_if(all.constBegin(), end, [&category](const MenuCategory &known) {
+            return category == QLatin1String(known.folder);
+        });
+        if (found != end)
+            return static_cast<int>(found - all.constBegin());
+    }
+    return all.size() - 1;
+}
+
+QByteArray menuDirectoryEntry(const MenuCategory &category, const QStringList &sortOrder)
+{
+    QByteArray entry = "[Desktop Entry]\nType=Directory\nName=" + QByteArray(category.name) + '\n';
+    for (const MenuName &name : menuNames(category.name))
+        entry += "Name[" + QByteArray(name.language) + "]=" + name.text + '\n';
+    entry += "Icon=" + QByteArray(category.icon) + '\n';
+    if (!sortOrder.isEmpty())
+        entry += "SortOrder=";
+    for (const QString &item : sortOrder)
+        entry += escaped(item) + ';';
+    return sortOrder.isEmpty() ? entry : entry + '\n';
+}
