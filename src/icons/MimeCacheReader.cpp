@@ -59,7 +59,9 @@ void MimeCacheReader::visitList(quint32 offset, const Visitor &visit)
 {
     const quint32 count = number(offset);
     for (quint32 i = 0; i < count && m_valid; ++i) {
-        const QString pattern = text(number(offset + 4 + entrySize * i));
+        const quint32 entry = offset + 4 + entrySize * i;
+        const QString pattern = text(number(entry));
+        number(entry + 8); // has to be there
         if (m_valid)
             visit(pattern);
     }
@@ -70,12 +72,13 @@ void MimeCacheReader::visitTree(quint32 count, quint32 offset, const QString &en
     for (quint32 i = 0; i < count && m_valid; ++i) {
         const quint32 entry = offset + entrySize * i;
         const quint32 character = number(entry);
+        const quint32 last = number(entry + 8);
         if (--m_nodesLeft < 0 || character > 0xffff || end.size() > longestEnd) {
             m_valid = false;
         } else if (character == 0) {
             visit(QLatin1Char('*') + end);
         } else {
-            visitTree(number(entry + 4), number(entry + 8), QChar(ushort(character)) + end, visit);
+            visitTree(number(entry + 4), last, QChar(ushort(character)) + end, visit);
         }
     }
 }

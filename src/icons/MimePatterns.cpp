@@ -74,6 +74,8 @@ bool MimePatterns::mayMatchOtherPattern(const QString &name) const
 {
     if (m_otherPatterns.isEmpty())
         return false;
+    if (!m_other.isValid())
+        return true;
     const QRegularExpressionMatch match = m_other.match(name);
     return !match.isValid() || match.hasMatch(); // a name that is no valid UTF-16 cannot be told
 }

@@ -23,8 +23,11 @@ QIcon builtInIcon(const QStringList &names)
 {
     const QString directory = QString::fromStdString(GetVelDir(VelDir::Pictures));
     QIcon icon;
-    for (const QString &name : names)
-        icon.addFile(directory + name);
+    for (const QString &name : names) {
+        // A missing file would make an icon that is not null and has no picture.
+        if (QFile::exists(directory + name))
+            icon.addFile(directory + name);
+    }
     return icon;
 }
 
