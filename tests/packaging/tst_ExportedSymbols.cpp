@@ -1,0 +1,76 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "TestCase.h"
+
+#include <QProcess>
+
+// What the library exports is a promise to its hosts: the list is checked in, and a symbol that
+// comes or goes has to be entered there by hand (see the first lines of the list).
+class tst_ExportedSymbols : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+
+    void areThoseOfTheList();
+    void belongToDocumentedClassesOnly();
+
+private:
+    QStringList m_symbols;
+};
+
+void tst_ExportedSymbols::initTestCase()
+{
+    QProcess nm;
+    nm.start(QStringLiteral(VEL_NM),
+             {QStringLiteral("--dynamic"), QStringLiteral("--defined-only"), QStringLiteral("--demangle"),
+              QStringLiteral("--format=posix"), QStringLiteral(VEL_LIBRARY)});
+    QVERIFY(nm.waitForFinished());
+    for (const QByteArray &line : nm.readAllStandardOutput().split('\n')) {
+        // "name type value size"; a demangled name has blanks of its own.
+        static const QRegularExpression pattern(QStringLiteral("^(.*) ([A-Za-z]) [0-9a-f]+( [0-9a-f]+)?$"));
+        const QRegularExpressionMatch match = pattern.match(QString::fromUtf8(line));
+        // Weak symbols are inline functions and templates of other libraries.
+        if (match.hasMatch() && match.captured(2) != QLatin1String("W") && match.captured(2) != QLatin1String("w")
+            && match.captured(2) != QLatin1String("u") && !match.captured(1).startsWith(QLatin1String("__")))
+            m_symbols.append(match.captured(1));
+    }
+    m_symbols.sort();
+    m_symbols.removeDuplicates();
+    QVERIFY(!m_symbols.isEmpty());
+}
+
+void tst_ExportedSymbols::areThoseOfTheList()
+{
+    QStringList listed;
+    for (const QByteArray &line :
+         read(QStringLiteral(VEL_SOURCE_DIR "/tests/packaging/exported-symbols.txt")).split('\n')) {
+        if (!line.isEmpty() && !line.startsWith('#'))
+            listed.append(QString::fromUtf8(line));
+    }
+    QStringList added;
+    for (const QString &symbol : qAsConst(m_symbols)) {
+        if (!listed.contains(symbol))
+            added.append(QStringLiteral("+ ") + symbol);
+    }
+    for (const QString &symbol : qAsConst(listed)) {
+        if (!m_symbols.contains(symbol))
+            added.append(QStringLiteral("- ") + symbol);
+    }
+    QVERIFY2(added.isEmpty(), qPrintable(added.join(QLatin1Char('\n'))));
+}
+
+void tst_ExportedSymbols::belongToDocumentedClassesOnly()
+{
+    static const QRegularExpression owner(QStringLiteral(
+        "(?:^|\\s)(VelSettings|VelKeyServer|IShortcutObject|ShortcutsModel|EditShortcutsDialog|VelMenuView|VelMenuDialog"
+        "|VelMimeTypeIconProvider|VelDesktopEntryPropsWidget|VelDesktopEntryEditDialog|VelRadioGroupBox)(?:::|$)"));
+    for (const QString &symbol : qAsConst(m_symbols))
+        QVERIFY2(owner.match(symbol).hasMatch(), qPrintable(symbol));
+}
+
+VEL_TEST_GUILESS_MAIN(tst_ExportedSymbols)
+
+#include "tst_ExportedSymbols.moc"
