@@ -1,0 +1,38 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+#include <QVector>
+
+/// One item of a menu directory, as the menu shows it.
+struct MenuItem
+{
+    enum Kind {
+        Folder, ///< a directory; its children follow in the menu's order
+        Entry, ///< a desktop entry
+        Separator, ///< a desktop entry whose command draws a line
+        File ///< any other file
+    };
+
+    Kind kind = File;
+    QString name; ///< the name shown
+    QString path; ///< absolute
+    QString icon; ///< the name of the icon or its path; may be empty
+    QString exec; ///< the command of an entry, with its field codes
+    QVector<MenuItem> children; ///< of a folder
+};
+
+/// Reads a menu directory with everything below it, in the order in which the menu shows it.
+namespace MenuTree {
+
+/**
+ * Returns the folder \a path with its children.
+ *
+ * Dot files, entries that are not to be displayed, and links that lead back to a folder on the way
+ * are left out. A folder that cannot be read has no children.
+ */
+MenuItem read(const QString &path);
+
+} // namespace MenuTree

@@ -1,0 +1,53 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <velintegration/wmcommandreceiver.h>
+
+#include <QObject>
+#include <QString>
+
+/// The commands of a shell that the bridge runs; an empty one runs nothing.
+struct BridgeCommands
+{
+    QString startMenu;
+    QString toolBar;
+    QString shortcut;
+    QString other; ///< for every other line
+};
+
+/**
+ * Stands in for the window manager on a desktop whose own one knows nothing of the channel: owns the
+ * channel and runs a command for each kind of line.
+ */
+class Bridge : public QObject
+{
+    Q_OBJECT
+
+public:
+    explicit Bridge(const BridgeCommands &commands, QObject *parent = nullptr);
+
+    /**
+     * Takes the channel and starts to listen.
+     *
+     * @param replace whether to take it from the program that has it
+     * @return false without a display or when another program has the channel
+     */
+    bool start(bool replace);
+
+    /// Gives the channel up.
+    void stop();
+
+Q_SIGNALS:
+    /// Another program has taken the channel.
+    void lost();
+    /// The command for \a line could not be started.
+    void failed(const QString &line);
+
+private:
+    void obey(const std::string &line);
+
+    const BridgeCommands m_commands;
+    WmCommandReceiver m_receiver;
+};

@@ -1,0 +1,99 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+// Owns the window manager's command channel and runs a command for each kind of update.
+
+#include "Bridge.h"
+
+#include <QCommandLineParser>
+#include <QCoreApplication>
+#include <QSocketNotifier>
+
+#include <csignal>
+#include <cstdio>
+#include <unistd.h>
+
+namespace {
+
+enum ExitStatus { Done = 0, ChannelTaken = 1, CannotStart = 2 };
+
+int signalPipe[2] = {-1, -1};
+
+// Only what is safe inside a signal handler: wakes the event loop up.
+void handleSignal(int)
+{
+    const char byte = 0;
+    const ssize_t written = write(signalPipe[1], &byte, 1);
+    (void)written; // a full pipe wakes it up as well
+}
+
+void say(const QString &text)
+{
+    std::fprintf(stderr, "vel-wmbridge: %s\n", text.toLocal8Bit().constData());
+}
+
+QString tr(const char *text)
+{
+    return QCoreApplication::translate("vel-wmbridge", text);
+}
+
+void quitOnSignals()
+{
+    if (pipe(signalPipe) != 0)
+        return; // ended by the signal itself, then; the X server gives the channel up
+    auto *notifier = new QSocketNotifier(signalPipe[0], QSocketNotifier::Read, qApp);
+    QObject::connect(notifier, &QSocketNotifier::activated, qApp, &QCoreApplication::quit);
+    std::signal(SIGTERM, handleSignal);
+    std::signal(SIGINT, handleSignal);
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    QCoreApplication application(argc, argv);
+    QCoreApplication::setOrganizationName(QStringLiteral("vel"));
+    QCoreApplication::setApplicationName(QStringLiteral("vel-wmbridge"));
+    QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+
+    QCommandLineParser parser;
+    parser.setApplicationDescription(
+        tr("Owns the window manager's command channel on a desktop that has none, and runs a command of the "
+           "shell for "
+           "each kind of update. The variable VEL_COMMAND holds the line that came."));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    const QString command = QStringLiteral("COMMAND");
+    const QCommandLineOption startMenu(QStringLiteral("startmenu"),
+                                       tr("Run when the start menu has changed."), command);
+    const QCommandLineOption toolBar(QStringLiteral("toolbar"), tr("Run when the tool bar has changed."),
+                                     command);
+    const QCommandLineOption shortcut(QStringLiteral("shortcut"),
+                                      tr("Run when the desktop's entries have changed."), command);
+    const QCommandLineOption other(QStringLiteral("other"), tr("Run for every other line."), command);
+    const QCommandLineOption replace(QStringLiteral("replace"),
+                                     tr("Take the channel from the program that has it."));
+    parser.addOptions({startMenu, toolBar, shortcut, other, replace});
+    parser.process(application);
+    if (!parser.positionalArguments().isEmpty()) {
+        say(tr("unexpected argument: %1").arg(parser.positionalArguments().constFirst()));
+        return CannotStart;
+    }
+
+    Bridge bridge(
+        {parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)});
+    QObject::connect(&bridge, &Bridge::failed, &application,
+                     [](const QString &line) { say(tr("cannot run the command for %1").arg(line)); });
+    QObject::connect(&bridge, &Bridge::lost, &application, [] {
+        say(tr("another program has taken the channel"));
+        QCoreApplication::exit(ChannelTaken);
+    });
+    if (!bridge.start(parser.isSet(replace))) {
+        say(tr("cannot take the channel: there is no display, or another program has it"));
+        return ChannelTaken;
+    }
+    quitOnSignals();
+    const int status = QCoreApplication::exec();
+    bridge.stop();
+    return status;
+}

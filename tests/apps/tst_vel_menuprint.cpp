@@ -1,0 +1,265 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "TestCase.h"
+
+#include <MenuFormat.h>
+#include <MenuTree.h>
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QProcess>
+#include <QXmlStreamReader>
+
+#include <sys/stat.h>
+#include <utime.h>
+
+namespace {
+
+struct Result
+{
+    int status;
+    QByteArray out;
+    QByteArray err;
+};
+
+Result print(const QStringList &arguments)
+{
+    QProcess process;
+    process.start(QStringLiteral(VEL_PROGRAM), arguments);
+    if (!process.waitForFinished())
+        QTest::qFail("the program hangs", __FILE__, __LINE__);
+    return {process.exitCode(), process.readAllStandardOutput(), process.readAllStandardError()};
+}
+
+QStringList names(const QVector<MenuItem> &items)
+{
+    QStringList result;
+    for (const MenuItem &item : items)
+        result.append(item.name);
+    return result;
+}
+
+QByteArray entry(const QByteArray &name, const QByteArray &more = QByteArray())
+{
+    return "[Desktop Entry]\nType=Application\nName=" + name + "\nExec=true\n" + more;
+}
+
+} // namespace
+
+class tst_vel_menuprint : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void refusesWhatItCannotPrint_data();
+    void refusesWhatItCannotPrint();
+    void printsFoldersFirstThenNames();
+    void followsTheSortOrder();
+    void putsTheNewestFirstInRecents();
+    void leavesOutWhatIsNotShown();
+    void doesNotFollowALinkIntoItself();
+    void namesFoldersAsTheirDirectoryFileSays();
+    void printsTheStartMenuWithoutADirectory();
+    void printsText();
+    void printsJson();
+    void printsAnOpenboxPipeMenu();
+    void quotesPathsForTheShell();
+};
+
+void tst_vel_menuprint::refusesWhatItCannotPrint_data()
+{
+    QTest::addColumn<QStringList>("arguments");
+    QTest::addColumn<QByteArray>("message");
+
+    QTest::newRow("no such directory") << QStringList{QStringLiteral("/nowhere/at/all")}
+                                       << QByteArray("vel-menuprint: no such directory: /nowhere/at/all\n");
+    QTest::newRow("a file") << QStringList{QStringLiteral("/etc/passwd")}
+                            << QByteArray("vel-menuprint: no such directory: /etc/passwd\n");
+    QTest::newRow("unknown format") << QStringList{QStringLiteral("--format"), QStringLiteral("yaml"),
+                                                   QStringLiteral("/")}
+                                    << QByteArray("vel-menuprint: unknown format: yaml\n");
+    QTest::newRow("two directories") << QStringList{QStringLiteral("/etc"), QStringLiteral("/usr")}
+                                     << QByteArray("vel-menuprint: more than one directory\n");
+}
+
+void tst_vel_menuprint::refusesWhatItCannotPrint()
+{
+    QFETCH(QStringList, arguments);
+    QFETCH(QByteArray, message);
+
+    const Result result = print(arguments);
+    QCOMPARE(result.status, 2);
+    QCOMPARE(result.out, QByteArray());
+    QCOMPARE(result.err, message);
+}
+
+void tst_vel_menuprint::printsFoldersFirstThenNames()
+{
+    write(QStringLiteral("menu/a.desktop"), entry("Zebra"));
+    write(QStringLiteral("menu/z.desktop"), entry("Apple"));
+    QVERIFY(QDir().mkpath(path(QStringLiteral("menu/tools"))));
+
+    QCOMPARE(names(MenuTree::read(path(QStringLiteral("menu"))).children),
+             QStringList({QStringLiteral("tools"), QStringLiteral("Apple"), QStringLiteral("Zebra")}));
+}
+
+void tst_vel_menuprint::followsTheSortOrder()
+{
+    write(QStringLiteral("menu/.directory"),
+          "[Desktop Entry]\nType=Directory\nName=M\nSortOrder=c.desktop;x*;a.desktop;\n");
+    write(QStringLiteral("menu/a.desktop"), entry("A"));
+    write(QStringLiteral("menu/b.desktop"), entry("B"));
+    write(QStringLiteral("menu/c.desktop"), entry("C"));
+    write(QStringLiteral("menu/x1.desktop"), entry("X"));
+
+    QCOMPARE(
+        names(MenuTree::read(path(QStringLiteral("menu"))).children),
+        QStringList({QStringLiteral("C"), QStringLiteral("X"), QStringLiteral("A"), QStringLiteral("B")}));
+}
+
+void tst_vel_menuprint::putsTheNewestFirstInRecents()
+{
+    const utimbuf old{1000, 1000};
+    const utimbuf recent{2000, 2000};
+    utime(QFile::encodeName(write(QStringLiteral("recents/a.desktop"), entry("Old"))), &old);
+    utime(QFile::encodeName(write(QStringLiteral("recents/b.desktop"), entry("New"))), &recent);
+
+    QCOMPARE(names(MenuTree::read(path(QStringLiteral("recents"))).children),
+             QStringList({QStringLiteral("New"), QStringLiteral("Old")}));
+}
+
+void tst_vel_menuprint::leavesOutWhatIsNotShown()
+{
+    write(QStringLiteral("menu/hidden.desktop"), entry("Hidden", "Hidden=true\n"));
+    write(QStringLiteral("menu/elsewhere.desktop"), entry("Elsewhere", "OnlyShowIn=OTHER;\n"));
+    write(QStringLiteral("menu/nodisplay.desktop"), entry("No display", "NoDisplay=true\n"));
+    write(QStringLiteral("menu/.dot.desktop"), entry("Dot"));
+    QVERIFY(QFile::link(path(QStringLiteral("gone")), path(QStringLiteral("menu/dangling.desktop"))));
+
+    QCOMPARE(names(MenuTree::read(path(QStringLiteral("menu"))).children),
+             QStringList{QStringLiteral("No display")});
+}
+
+void tst_vel_menuprint::doesNotFollowALinkIntoItself()
+{
+    write(QStringLiteral("menu/folder/a.desktop"), entry("A"));
+    QVERIFY(QFile::link(path(QStringLiteral("menu")), path(QStringLiteral("menu/folder/again"))));
+
+    const MenuItem menu = MenuTree::read(path(QStringLiteral("menu")));
+    QCOMPARE(names(menu.children), QStringList{QStringLiteral("folder")});
+    QCOMPARE(names(menu.children.constFirst().children), QStringList{QStringLiteral("A")});
+}
+
+void tst_vel_menuprint::namesFoldersAsTheirDirectoryFileSays()
+{
+    write(QStringLiteral("menu/office/.directory"),
+          "[Desktop Entry]\nType=Directory\nName=Office work\nIcon=folder-office\n");
+
+    const MenuItem office = MenuTree::read(path(QStringLiteral("menu"))).children.value(0);
+    QCOMPARE(office.name, QStringLiteral("Office work"));
+    QCOMPARE(office.icon, QStringLiteral("folder-office"));
+    QCOMPARE(office.kind, MenuItem::Folder);
+}
+
+void tst_vel_menuprint::printsTheStartMenuWithoutADirectory()
+{
+    const QString menu = qEnvironmentVariable("XDG_CONFIG_HOME") + QStringLiteral("/vel/startmenu");
+    QVERIFY(QDir().mkpath(menu));
+    QFile file(menu + QStringLiteral("/a.desktop"));
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    file.write(entry("Start"));
+    file.close();
+
+    const Result result = print({});
+    QCOMPARE(result.status, 0);
+    QCOMPARE(result.out, QByteArray("startmenu/\n    Start\n"));
+}
+
+void tst_vel_menuprint::printsText()
+{
+    write(QStringLiteral("menu/folder/a.desktop"), entry("A"));
+    write(QStringLiteral("menu/line.desktop"),
+          "[Desktop Entry]\nType=Application\nName=Line\nExec=VELWM_SEPARATOR\n");
+
+    const Result result =
+        print({QStringLiteral("--format"), QStringLiteral("text"), path(QStringLiteral("menu"))});
+    QCOMPARE(result.status, 0);
+    QCOMPARE(result.out, QByteArray("menu/\n    folder/\n        A\n    --\n"));
+}
+
+void tst_vel_menuprint::printsJson()
+{
+    const QString file = write(QStringLiteral("menu/a.desktop"), entry("Ä \"B\"", "Icon=x\n"));
+    write(QStringLiteral("menu/notes.txt"), "text");
+
+    const Result result =
+        print({QStringLiteral("--format"), QStringLiteral("json"), path(QStringLiteral("menu"))});
+    QCOMPARE(result.status, 0);
+    const QJsonObject menu = QJsonDocument::fromJson(result.out).object();
+    QCOMPARE(menu.value(QLatin1String("kind")).toString(), QStringLiteral("folder"));
+    const QJsonArray children = menu.value(QLatin1String("children")).toArray();
+    QCOMPARE(children.size(), 2);
+    const QJsonObject expected{{QStringLiteral("kind"), QStringLiteral("entry")},
+                               {QStringLiteral("name"), QStringLiteral("Ä \"B\"")},
+                               {QStringLiteral("path"), file},
+                               {QStringLiteral("icon"), QStringLiteral("x")},
+                               {QStringLiteral("exec"), QStringLiteral("true")}};
+    QVERIFY(children.contains(expected));
+    QVERIFY(!children.at(1).toObject().contains(QLatin1String("exec"))
+            || !children.at(0).toObject().contains(QLatin1String("exec")));
+}
+
+void tst_vel_menuprint::printsAnOpenboxPipeMenu()
+{
+    write(QStringLiteral("menu/folder/a.desktop"), entry("A & <B>_c"));
+    write(QStringLiteral("menu/line.desktop"),
+          "[Desktop Entry]\nType=Application\nName=Line\nExec=VELWM_SEPARATOR\n");
+
+    const Result result =
+        print({QStringLiteral("--format"), QStringLiteral("openbox"), path(QStringLiteral("menu"))});
+    QCOMPARE(result.status, 0);
+    QXmlStreamReader xml(result.out);
+    QStringList seen;
+    while (!xml.atEnd()) {
+        if (xml.readNext() == QXmlStreamReader::StartElement)
+            seen.append(xml.name().toString() + QLatin1Char(' ')
+                        + xml.attributes().value(QLatin1String("label")).toString());
+    }
+    QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
+    QCOMPARE(seen,
+             QStringList({QStringLiteral("openbox_pipe_menu "), QStringLiteral("menu folder"),
+                          QStringLiteral("item A & <B>__c"), QStringLiteral("action "),
+                          QStringLiteral("command "), QStringLiteral("separator ")}));
+    QVERIFY(result.out.contains("<command>vel-open --exec '"
+                                + QFile::encodeName(path(QStringLiteral("menu/folder/a.desktop")))
+                                + "'</command>"));
+}
+
+void tst_vel_menuprint::quotesPathsForTheShell()
+{
+    write(QStringLiteral("menu/it's $HOME.desktop"), entry("A"));
+
+    const QByteArray menu = MenuFormat::openbox(MenuTree::read(path(QStringLiteral("menu"))));
+    QXmlStreamReader xml(menu);
+    QString command;
+    while (!xml.atEnd()) {
+        if (xml.readNext() == QXmlStreamReader::StartElement && xml.name() == QLatin1String("command"))
+            command = xml.readElementText();
+    }
+    QProcess shell;
+    shell.start(QStringLiteral("sh"),
+                {QStringLiteral("-c"),
+                 QString(command).replace(QLatin1String("vel-open --exec"), QLatin1String("printf %s"))});
+    QVERIFY(shell.waitForFinished());
+    QCOMPARE(QFile::decodeName(shell.readAllStandardOutput()),
+             path(QStringLiteral("menu/it's $HOME.desktop")));
+}
+
+VEL_TEST_GUILESS_MAIN(tst_vel_menuprint)
+
+#include "tst_vel_menuprint.moc"
