@@ -1,0 +1,67 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "BusActivation.h"
+
+#include <QDBusConnection>
+#include <QDBusMessage>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QFileInfo>
+#include <QRegularExpression>
+#include <QVariantMap>
+
+namespace {
+
+const int answerTime = 1200; // milliseconds
+
+// Without an address the bus library would start a bus of its own.
+bool hasSessionBus()
+{
+    return !qEnvironmentVariableIsEmpty("DBUS_SESSION_BUS_ADDRESS")
+        || (!qEnvironmentVariableIsEmpty("XDG_RUNTIME_DIR")
+            && QFile::exists(QFile::decodeName(qgetenv("XDG_RUNTIME_DIR")) + QLatin1String("/bus")));
+}
+
+bool isBusName(const QString &name)
+{
+    static const QRegularExpression pattern(
+        QStringLiteral("^[A-Za-z_-][A-Za-z0-9_-]*(\\.[A-Za-z_-][A-Za-z0-9_-]*)+$"));
+    return name.size() <= 255 && pattern.match(name).hasMatch();
+}
+
+QString objectPath(QString name)
+{
+    name.replace(QLatin1Char('.'), QLatin1Char('/')).replace(QLatin1Char('-'), QLatin1Char('_'));
+    return QLatin1Char('/') + name;
+}
+
+QVariantMap platformData()
+{
+    QVariantMap data;
+    const QString startupId = QString::fromLocal8Bit(qgetenv("DESKTOP_STARTUP_ID"));
+    if (!startupId.isEmpty())
+        data.insert(QStringLiteral("desktop-startup-id"), startupId);
+    return data;
+}
+
+} // namespace
+
+bool activateOnBus(const QString &path)
+{
+    const QString name = QFileInfo(path).completeBaseName();
+    if (!hasSessionBus() || !isBusName(name))
+        return false;
+    const QDBusConnection bus = QDBusConnection::sessionBus();
+    if (!bus.isConnected())
+        return false;
+
+    QDBusMessage call = QDBusMessage::createMethodCall(
+        name, objectPath(name), QStringLiteral("org.freedesktop.Application"), QStringLiteral("Activate"));
+    call.setArguments({platformData()});
+    QElapsedTimer timer;
+    timer.start();
+    const QDBusMessage answer = bus.call(call, QDBus::Block, answerTime);
+    // Who has not answered in time has been found and takes its time to start.
+    return answer.type() == QDBusMessage::ReplyMessage || timer.elapsed() >= answerTime;
+}

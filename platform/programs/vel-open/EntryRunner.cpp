@@ -1,0 +1,117 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "EntryRunner.h"
+
+#include "BusActivation.h"
+#include "CommandWords.h"
+#include "ProgramStart.h"
+#include "Terminal.h"
+
+#include <velintegration/wmcommand.h>
+#include <veluiaux/VelUIDesktopEntry.h>
+
+#include <QFile>
+#include <QFileInfo>
+
+#include <memory>
+
+#include <X11/Xlib.h>
+
+namespace {
+
+struct CloseDisplay
+{
+    void operator()(Display *display) const { XCloseDisplay(display); }
+};
+
+// The record has no say in how an application is started, so this key is read here.
+bool isBusActivatable(const QString &path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly))
+        return false;
+    bool inEntry = false;
+    bool result = false;
+    while (!file.atEnd()) {
+        const QByteArray line = file.readLine().trimmed();
+        if (line.startsWith('['))
+            inEntry = line == "[Desktop Entry]";
+        const int equals = line.indexOf('=');
+        if (inEntry && line.left(equals).trimmed() == "DBusActivatable")
+            result = line.mid(equals + 1).trimmed() == "true";
+    }
+    return result;
+}
+
+QString sendToWindowManager(const QString &exec)
+{
+    const std::unique_ptr<Display, CloseDisplay> display(XOpenDisplay(nullptr));
+    if (!display)
+        return QStringLiteral("cannot open the display");
+    if (!SendCommandToWM(display.get(), (exec.toLocal8Bit() + '\n').constData()))
+        return QStringLiteral("no window manager takes commands here");
+    return {};
+}
+
+QString filledIn(const VelUIDesktopEntry &entry, const QString &path)
+{
+    const QString localName = entry.getLocalName();
+    return VelUIDesktopEntry::ExecFormatString(entry.getExec())
+        .appName(localName.isEmpty() ? entry.getName() : localName)
+        .icon(entry.getIcon())
+        .desktopFilePath(path);
+}
+
+QString runCommand(const VelUIDesktopEntry &entry, const QString &path)
+{
+    QStringList words = commandWords(filledIn(entry, path)).value_or(QStringList());
+    if (words.isEmpty())
+        return QStringLiteral("cannot understand the command \"%1\"").arg(entry.getExec());
+    if (entry.getTerminal()) {
+        // A terminal would open all the same and say it there, for a moment.
+        const QString problem = whyNotExecutable(words.first(), entry.getPath());
+        if (!problem.isEmpty())
+            return problem;
+        const QStringList terminal = terminalWords();
+        if (terminal.isEmpty())
+            return QStringLiteral("there is no terminal");
+        words = terminal + words;
+    }
+    return startProgram(words, entry.getPath());
+}
+
+QString runApplication(const VelUIDesktopEntry &entry, const QString &path)
+{
+    if (isBusActivatable(path) && activateOnBus(path))
+        return {};
+    const QString exec = entry.getExec();
+    if (exec.isEmpty())
+        return QStringLiteral("there is no command in it");
+    return exec.startsWith(QLatin1String("VELWM_")) ? sendToWindowManager(exec) : runCommand(entry, path);
+}
+
+} // namespace
+
+QString runEntry(const QString &path)
+{
+    const QFileInfo file(path);
+    if (!file.exists())
+        return QStringLiteral("no such file or folder");
+    const QString absolutePath = file.absoluteFilePath();
+    if (file.isDir() || !path.endsWith(QLatin1String(".desktop")))
+        return openWithDesktop(absolutePath);
+
+    VelUIDesktopEntry entry(absolutePath);
+    if (!entry.load())
+        return QStringLiteral("is no desktop entry");
+    const QString type = entry.getType();
+    if (type == QLatin1String("Application"))
+        return runApplication(entry, absolutePath);
+    if (type == QLatin1String("Link"))
+        return entry.getURL().isEmpty() ? QStringLiteral("there is no URL in it")
+                                        : openWithDesktop(entry.getURL());
+    if (type == QLatin1String("Directory"))
+        return openWithDesktop(file.absolutePath());
+    return QStringLiteral("is neither an application nor a link nor a folder");
+}

@@ -1,0 +1,134 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+// vel-open --exec PATH: runs a desktop entry.
+//
+// A child in a session of its own does the work and tells the outcome through a pipe. The
+// parent waits for that, but for no longer than a caller may be kept waiting: what takes its
+// time then goes on without it.
+
+#include "EntryRunner.h"
+
+#include <QCoreApplication>
+#include <QFile>
+
+#include <cerrno>
+#include <chrono>
+#include <cstdio>
+#include <cstring>
+#include <optional>
+#include <string>
+
+#include <fcntl.h>
+#include <linux/close_range.h>
+#include <poll.h>
+#include <sys/syscall.h>
+#include <unistd.h>
+
+namespace {
+
+const char usage[] = "usage: vel-open --exec PATH\n"
+                     "Runs a desktop entry, or opens a file or folder.\n";
+const std::chrono::milliseconds longestWait(1700);
+const char success = '+';
+
+int fail(const std::string &path, std::string reason)
+{
+    std::string line = "vel-open: " + path + ": " + reason;
+    for (char &c : line) {
+        if (c == '\n' || c == '\r')
+            c = '?';
+    }
+    std::fprintf(stderr, "%s\n", line.c_str());
+    return 1;
+}
+
+// The program that is started inherits no file of the caller's.
+void closeFilesOnExec()
+{
+    if (syscall(SYS_close_range, 3u, ~0u, CLOSE_RANGE_CLOEXEC) == 0)
+        return;
+    const long count = sysconf(_SC_OPEN_MAX);
+    for (int descriptor = 3; descriptor < count; ++descriptor)
+        fcntl(descriptor, F_SETFD, FD_CLOEXEC);
+}
+
+void leaveTheCaller()
+{
+    setsid();
+    const int null = open("/dev/null", O_RDWR);
+    for (int stream = 0; stream < 3; ++stream)
+        dup2(null, stream);
+    if (null > 2)
+        close(null);
+}
+
+// Does the work and writes the outcome; does not return. Programs that it runs live on.
+[[noreturn]] void work(int outcome, int argc, char **argv, const char *path)
+{
+    leaveTheCaller();
+    const QCoreApplication application(argc, argv);
+    const QString reason = runEntry(QFile::decodeName(path));
+    const std::string text = reason.isEmpty() ? std::string(1, success) : reason.toLocal8Bit().toStdString();
+    const ssize_t written = write(outcome, text.data(), text.size());
+    _exit(written < 0 ? 1 : 0);
+}
+
+// What the child wrote; nothing when it takes longer than a caller may wait.
+std::optional<std::string> waitForOutcome(int outcome)
+{
+    const auto deadline = std::chrono::steady_clock::now() + longestWait;
+    std::string text;
+    for (;;) {
+        const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(
+            deadline - std::chrono::steady_clock::now());
+        if (left.count() <= 0)
+            return {};
+        pollfd descriptor = {outcome, POLLIN, 0};
+        if (poll(&descriptor, 1, static_cast<int>(left.count())) <= 0)
+            continue;
+        char buffer[4096];
+        const ssize_t count = read(outcome, buffer, sizeof buffer);
+        if (count == 0)
+            return text;
+        if (count > 0)
+            text.append(buffer, static_cast<std::size_t>(count));
+    }
+}
+
+int run(int argc, char **argv, const char *path)
+{
+    closeFilesOnExec();
+    int ends[2];
+    if (pipe2(ends, O_CLOEXEC) != 0)
+        return fail(path, std::strerror(errno));
+    const pid_t child = fork();
+    if (child < 0)
+        return fail(path, std::strerror(errno));
+    if (child == 0)
+        work(ends[1], argc, argv, path);
+    close(ends[1]);
+    const std::optional<std::string> outcome = waitForOutcome(ends[0]);
+    if (!outcome || *outcome == std::string(1, success))
+        return 0;
+    return fail(path, outcome->empty() ? std::string("the start ended unexpectedly") : *outcome);
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    if (argc == 2 && std::strcmp(argv[1], "--help") == 0) {
+        std::fputs(usage, stdout);
+        return 0;
+    }
+    if (argc == 2 && std::strcmp(argv[1], "--version") == 0) {
+        std::puts("vel-open " VEL_VERSION);
+        return 0;
+    }
+    if (argc != 3 || std::strcmp(argv[1], "--exec") != 0 || !*argv[2]) {
+        std::fputs("vel-open: no entry given; usage: vel-open --exec PATH\n", stderr);
+        return 2;
+    }
+    return run(argc, argv, argv[2]);
+}
