@@ -127,20 +127,20 @@ public:
     /**
      * Tells in which format clipboard or drag data holds files.
      *
-     * @param data the data; null is allowed
+     * @param mimeData the data; null is allowed
      * @return "text/uri-move-list" when that is there, else "text/uri-list" when that is
      *         there, else an empty text
      */
-    QString dndFormat(const QMimeData *data) const;
+    QString dndFormat(const QMimeData *mimeData) const;
 
     /**
      * Decodes a list of files of clipboard or drag data.
      *
-     * @param data the data; null gives an empty list
+     * @param mimeData the data; null gives an empty list
      * @param format the format to read, as dndFormat() tells it
      * @return one URL for each line; percent-escaped and plain local text are both understood
      */
-    QList<QUrl> dndUrls(const QMimeData *data, const QString &format) const;
+    QList<QUrl> dndUrls(const QMimeData *mimeData, const QString &format) const;
 
     /**
      * Creates a folder or an entry beside or in the selected item and opens the editor on it.

@@ -1,0 +1,17 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ActionState.h"
+
+ActionState ActionState::of(const Selection &selection)
+{
+    ActionState state;
+    if (!selection.any)
+        return state;
+    state.create = selection.writable;
+    state.edit = selection.writable;
+    state.paste = selection.writable && selection.filesOnClipboard;
+    state.up = selection.writable && selection.row != 0;
+    state.down = selection.writable && selection.row != selection.count - 1;
+    return state;
+}

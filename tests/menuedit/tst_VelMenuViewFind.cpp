@@ -1,0 +1,476 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuTestCase.h"
+
+#include "ModalDriver.h"
+#include "VelMenuView.h"
+#include <menuedit/TreeLoader.h>
+
+#include <QFileSystemModel>
+#include <QInputDialog>
+#include <QLineEdit>
+#include <QPointer>
+#include <QSortFilterProxyModel>
+#include <QTimer>
+
+/// Searching the tree.
+class tst_VelMenuViewFind : public MenuTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void doesNothingWithoutAText();
+    void doesNothingAfterACancelledQuestion();
+    void offersTheLastTextAgain();
+    void findsAnywhereInShownNamesWithoutRegardToCase_data();
+    void findsAnywhereInShownNamesWithoutRegardToCase();
+    void findsInFoldersThatWereNeverOpened();
+    void findsBeforeTheFirstFolderWasRead();
+    void findsInTheOrderShown();
+    void goesOnAndWrapsWithoutAMessage();
+    void searchesAnewWhenTheMatchesWereDropped();
+    void bringsTheMatchIntoSight();
+    void tellsWhenNothingMatches();
+    void findsNeitherTheMenuNorItsNeighbours();
+    void goesOnWhenMatchesVanished();
+    void searchesAnewWhenAllMatchesVanished();
+    void followsMatchesThatMove();
+    void doesNotFollowLinksInCircles();
+    void passesOverFoldersThatCannotBeRead();
+    void stopsAtItsLimits();
+    void findsWhatIsThereWhenAFolderVanishesMeanwhile();
+    void refusesToSearchWhileItSearches();
+    void goesAwayWhileItSearches_data();
+    void goesAwayWhileItSearches();
+    void changesItsDirectoryWhileItSearches();
+    void goesAwayWhileItAsks();
+    void goesAwayWhileItTellsThatNothingMatched();
+
+private:
+    void find(VelMenuView &view, const QString &text);
+};
+
+void tst_VelMenuViewFind::find(VelMenuView &view, const QString &text)
+{
+    ModalDriver modal;
+    modal.handle([&text](QWidget *window) {
+        window->findChild<QLineEdit *>()->setText(text);
+        qobject_cast<QDialog *>(window)->accept();
+    });
+    view.slotFind();
+    QVERIFY(modal.finished());
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void tst_VelMenuViewFind::doesNothingWithoutAText()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    select(view, a);
+    const ModalDriver modal;
+    view.slotFindNext();
+    QVERIFY(!view.findAndSelect(false));
+    QVERIFY(!view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), a);
+    QVERIFY(modal.finished());
+}
+
+void tst_VelMenuViewFind::doesNothingAfterACancelledQuestion()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    find(view, QStringLiteral("a"));
+    QCOMPARE(view.selectedPath(), a);
+    view.selectionModel()->clearSelection();
+    ModalDriver modal;
+    modal.handle([](QWidget *window) { qobject_cast<QDialog *>(window)->reject(); });
+    view.slotFind();
+    QVERIFY(modal.finished());
+    QVERIFY(!view.selectedItem().isValid());
+    // The text is gone, too.
+    view.slotFindNext();
+    QVERIFY(!view.selectedItem().isValid());
+}
+
+void tst_VelMenuViewFind::offersTheLastTextAgain()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("a"));
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        auto *dialog = qobject_cast<QInputDialog *>(window);
+        QVERIFY(dialog);
+        QCOMPARE(dialog->windowTitle(), QStringLiteral("Find"));
+        QCOMPARE(dialog->labelText(), QStringLiteral("Find string:"));
+        QCOMPARE(dialog->textEchoMode(), QLineEdit::Normal);
+        QCOMPARE(dialog->textValue(), QStringLiteral("a"));
+        dialog->reject();
+    });
+    view.slotFind();
+    QVERIFY(modal.finished());
+}
+
+void tst_VelMenuViewFind::findsAnywhereInShownNamesWithoutRegardToCase_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<QString>("file");
+    QTest::newRow("begin") << QStringLiteral("Text") << QStringLiteral("a.desktop");
+    QTest::newRow("middle, other case") << QStringLiteral("EXT ED") << QStringLiteral("a.desktop");
+    QTest::newRow("end") << QStringLiteral("player") << QStringLiteral("b.desktop");
+    QTest::newRow("not the file name") << QStringLiteral("b.desk") << QString();
+    QTest::newRow("no pattern") << QStringLiteral("T*r") << QString();
+    QTest::newRow("file without a record") << QStringLiteral("notes.TXT") << QStringLiteral("notes.txt");
+}
+
+void tst_VelMenuViewFind::findsAnywhereInShownNamesWithoutRegardToCase()
+{
+    QFETCH(QString, text);
+    QFETCH(QString, file);
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("Text Editor"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("Music Player"));
+    write(QStringLiteral("menu/notes.txt"), "");
+    VelMenuView view(menu(), -1, true);
+    ModalDriver modal;
+    modal.handle([&text](QWidget *window) {
+        window->findChild<QLineEdit *>()->setText(text);
+        qobject_cast<QDialog *>(window)->accept();
+    });
+    if (file.isEmpty())
+        modal.handle([](QWidget *window) { window->close(); });
+    view.slotFind();
+    QVERIFY(modal.finished());
+    QCOMPARE(QFileInfo(view.selectedPath()).fileName(), file);
+}
+
+void tst_VelMenuViewFind::findsInFoldersThatWereNeverOpened()
+{
+    const QString deep = writeEntry(QStringLiteral("one/two/three/x.desktop"), QStringLiteral("Needle"));
+    writeEntry(QStringLiteral("other/y.desktop"), QStringLiteral("Hay"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 2));
+    find(view, QStringLiteral("needle"));
+    QCOMPARE(view.selectedPath(), deep);
+}
+
+void tst_VelMenuViewFind::findsBeforeTheFirstFolderWasRead()
+{
+    const QString deep = writeEntry(QStringLiteral("one/x.desktop"), QStringLiteral("Needle"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("needle"));
+    QCOMPARE(view.selectedPath(), deep);
+}
+
+void tst_VelMenuViewFind::findsInTheOrderShown()
+{
+    writeFolder(QString(), QStringLiteral("Menu"), "z.desktop;sub;a.desktop;");
+    const QString first = writeEntry(QStringLiteral("z.desktop"), QStringLiteral("hit z"));
+    const QString second = writeFolder(QStringLiteral("sub"), QStringLiteral("hit sub"));
+    const QString third = writeEntry(QStringLiteral("sub/m.desktop"), QStringLiteral("hit m"));
+    const QString fourth = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("miss"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    for (const QString &path : {first, second, third, fourth}) {
+        QCOMPARE(view.selectedPath(), path);
+        QCOMPARE(view.selectionModel()->selectedIndexes().size(), 1);
+        QVERIFY(view.findAndSelect(true));
+    }
+}
+
+void tst_VelMenuViewFind::goesOnAndWrapsWithoutAMessage()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QCOMPARE(view.selectedPath(), a);
+    const ModalDriver modal;
+    view.slotFindNext();
+    QCOMPARE(view.selectedPath(), b);
+    view.slotFindNext();
+    QCOMPARE(view.selectedPath(), a);
+    QVERIFY(modal.finished());
+}
+
+void tst_VelMenuViewFind::searchesAnewWhenTheMatchesWereDropped()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), b);
+    view.clearFindResults();
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), a);
+    // A search that does not ask for the next match begins again as well.
+    QVERIFY(view.findAndSelect(true));
+    QVERIFY(view.findAndSelect(false));
+    QCOMPARE(view.selectedPath(), a);
+}
+
+void tst_VelMenuViewFind::bringsTheMatchIntoSight()
+{
+    for (int i = 0; i < 100; ++i)
+        writeEntry(QStringLiteral("sub/e%1.desktop").arg(i), QStringLiteral("E%1").arg(i));
+    const QString needle = writeEntry(QStringLiteral("sub/n.desktop"), QStringLiteral("Needle"));
+    VelMenuView view(menu(), -1, true);
+    view.resize(200, 120);
+    view.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    find(view, QStringLiteral("needle"));
+    QCOMPARE(view.selectedPath(), needle);
+    QVERIFY(view.isExpanded(shown(view, menu() + QLatin1String("/sub"))));
+    QTRY_VERIFY(view.viewport()->rect().contains(view.visualRect(shown(view, needle))));
+}
+
+void tst_VelMenuViewFind::tellsWhenNothingMatches()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    select(view, a);
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        window->findChild<QLineEdit *>()->setText(QStringLiteral("%1 q"));
+        qobject_cast<QDialog *>(window)->accept();
+    });
+    modal.answer({QMessageBox::Information, QStringLiteral("Find"), QStringLiteral("'%1 q' not found ."),
+                  QMessageBox::Close},
+                 QMessageBox::Close);
+    view.slotFind();
+    QVERIFY(modal.finished());
+    QCOMPARE(view.selectedPath(), a);
+
+    modal.answer({QMessageBox::Information, QStringLiteral("Find"), QStringLiteral("'%1 q' not found ."),
+                  QMessageBox::Close},
+                 QMessageBox::Close);
+    QVERIFY(!view.findAndSelect(true));
+    QVERIFY(modal.finished());
+}
+
+void tst_VelMenuViewFind::findsNeitherTheMenuNorItsNeighbours()
+{
+    write(QStringLiteral("needlemenu/.directory"), "[Desktop Entry]\nType=Directory\nName=Needle root\n");
+    const QString inside =
+        write(QStringLiteral("needlemenu/x.desktop"), entryText(QStringLiteral("Needle inside")));
+    write(QStringLiteral("needleneighbour.desktop"), entryText(QStringLiteral("Needle outside")));
+    VelMenuView view(path(QStringLiteral("needlemenu")), -1, true);
+    // The neighbours are known to the model.
+    files(view)->fetchMore(files(view)->index(folder()));
+    QTRY_VERIFY(files(view)->rowCount(files(view)->index(folder())) > 1);
+    find(view, QStringLiteral("needle"));
+    for (int i = 0; i < 3; ++i) {
+        QCOMPARE(view.selectedPath(), inside);
+        QVERIFY(view.findAndSelect(true));
+    }
+}
+
+void tst_VelMenuViewFind::goesOnWhenMatchesVanished()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    const QString c = writeEntry(QStringLiteral("c.desktop"), QStringLiteral("hit c"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QCOMPARE(view.selectedPath(), a);
+    QVERIFY(QFile::remove(b));
+    QTRY_COMPARE(names(view, menu()).size(), 2);
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), c);
+    QVERIFY(QFile::remove(c));
+    QTRY_COMPARE(names(view, menu()).size(), 1);
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), a);
+}
+
+void tst_VelMenuViewFind::searchesAnewWhenAllMatchesVanished()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QVERIFY(QFile::remove(a));
+    QTRY_COMPARE(names(view, menu()).size(), 0);
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    QTRY_COMPARE(names(view, menu()).size(), 1);
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), b);
+}
+
+void tst_VelMenuViewFind::followsMatchesThatMove()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QCOMPARE(view.selectedPath(), a);
+    writeFolder(QString(), QStringLiteral("Menu"), "b.desktop;a.desktop;");
+    view.invalidateSortOrder(files(view)->index(menu()));
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), b);
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), a);
+}
+
+void tst_VelMenuViewFind::doesNotFollowLinksInCircles()
+{
+    const QString needle = writeEntry(QStringLiteral("a/x.desktop"), QStringLiteral("Needle"));
+    QDir().mkpath(menu() + QLatin1String("/b"));
+    QVERIFY(QFile::link(QStringLiteral("."), menu() + QLatin1String("/a/self")));
+    QVERIFY(QFile::link(QStringLiteral("../.."), menu() + QLatin1String("/a/above")));
+    QVERIFY(QFile::link(QStringLiteral("/"), menu() + QLatin1String("/a/disk")));
+    QVERIFY(QFile::link(QStringLiteral("../b"), menu() + QLatin1String("/a/tob")));
+    QVERIFY(QFile::link(QStringLiteral("../a"), menu() + QLatin1String("/b/toa")));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("needle"));
+    QCOMPARE(view.selectedPath(), needle);
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), menu() + QLatin1String("/b/toa/x.desktop"));
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), needle);
+}
+
+void tst_VelMenuViewFind::passesOverFoldersThatCannotBeRead()
+{
+    const QString needle = writeEntry(QStringLiteral("b/x.desktop"), QStringLiteral("Needle"));
+    writeEntry(QStringLiteral("a/y.desktop"), QStringLiteral("Needle, too"));
+    const QString closed = menu() + QLatin1String("/a");
+    QVERIFY(QFile::setPermissions(closed, QFile::Permissions()));
+    VelMenuView view(menu(), -1, true);
+    const bool isRoot = QFileInfo(closed).isReadable();
+    find(view, QStringLiteral("needle"));
+    QVERIFY(QFile::setPermissions(closed, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+    QCOMPARE(view.selectedPath(), isRoot ? closed + QLatin1String("/y.desktop") : needle);
+}
+
+void tst_VelMenuViewFind::stopsAtItsLimits()
+{
+    for (int i = 0; i < 20; ++i)
+        writeEntry(QStringLiteral("f%1/x.desktop").arg(i), QStringLiteral("X"));
+    QString chain = menu();
+    for (int i = 0; i < 200; ++i)
+        chain += QLatin1String("/d");
+    QVERIFY(QDir().mkpath(chain));
+    QFileSystemModel model;
+    TreeLoader loader(&model);
+    const QModelIndex root = model.setRootPath(menu());
+    loader.setLimits(5, 10000);
+    QVERIFY(!loader.load(root));
+    loader.setLimits(1000, 1);
+    QVERIFY(!loader.load(root));
+    loader.setLimits(1000, 10000);
+    QVERIFY(loader.load(root));
+    for (int i = 0; i < 20; ++i)
+        QCOMPARE(model.rowCount(model.index(QStringLiteral("%1/f%2").arg(menu()).arg(i))), 1);
+    // Nothing has to be read again.
+    loader.setLimits(1000, 1);
+    QVERIFY(loader.load(root));
+    QVERIFY(!loader.load(QModelIndex()));
+}
+
+void tst_VelMenuViewFind::findsWhatIsThereWhenAFolderVanishesMeanwhile()
+{
+    for (int i = 0; i < 30; ++i)
+        writeEntry(QStringLiteral("gone%1/deep/x.desktop").arg(i), QStringLiteral("X"));
+    const QString needle = writeEntry(QStringLiteral("stays/x.desktop"), QStringLiteral("Needle"));
+    VelMenuView view(menu(), -1, true);
+    QTimer::singleShot(0, this, [this] {
+        for (int i = 0; i < 30; ++i)
+            QDir(menu() + QStringLiteral("/gone%1").arg(i)).removeRecursively();
+    });
+    find(view, QStringLiteral("needle"));
+    QCOMPARE(view.selectedPath(), needle);
+}
+
+void tst_VelMenuViewFind::refusesToSearchWhileItSearches()
+{
+    for (int i = 0; i < 30; ++i)
+        writeEntry(QStringLiteral("f%1/x.desktop").arg(i), QStringLiteral("X%1").arg(i));
+    QFileSystemModel model;
+    TreeLoader loader(&model);
+    const QModelIndex root = model.setRootPath(menu());
+    bool inner = true;
+    QTimer::singleShot(0, this, [&] { inner = loader.load(root); });
+    QVERIFY(loader.load(root));
+    QVERIFY(!inner);
+}
+
+void tst_VelMenuViewFind::goesAwayWhileItSearches_data()
+{
+    QTest::addColumn<int>("event");
+    for (int i = 0; i < 8; ++i)
+        QTest::newRow(qPrintable(QString::number(i))) << i;
+}
+
+void tst_VelMenuViewFind::goesAwayWhileItSearches()
+{
+    QFETCH(int, event);
+    for (int i = 0; i < 50; ++i)
+        writeEntry(QStringLiteral("f%1/g/x.desktop").arg(i), QStringLiteral("X"));
+    auto *view = new VelMenuView(menu(), -1, true);
+    int loaded = 0;
+    // Once as soon as events are looked at, else after so many folders.
+    if (event == 0)
+        QTimer::singleShot(0, view, [view] { delete view; });
+    connect(files(*view), &QFileSystemModel::directoryLoaded, view, [&] {
+        if (++loaded == event)
+            QTimer::singleShot(0, view, [view] { delete view; });
+    });
+    QPointer<VelMenuView> guard(view);
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        window->findChild<QLineEdit *>()->setText(QStringLiteral("x"));
+        qobject_cast<QDialog *>(window)->accept();
+    });
+    view->slotFind();
+    QTRY_VERIFY(!guard);
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void tst_VelMenuViewFind::changesItsDirectoryWhileItSearches()
+{
+    for (int i = 0; i < 50; ++i)
+        writeEntry(QStringLiteral("f%1/x.desktop").arg(i), QStringLiteral("X"));
+    const QString other =
+        QFileInfo(write(QStringLiteral("other/x.desktop"), entryText(QStringLiteral("X")))).path();
+    VelMenuView view(menu(), -1, true);
+    ModalDriver modal;
+    modal.handle([&](QWidget *window) {
+        window->findChild<QLineEdit *>()->setText(QStringLiteral("x"));
+        qobject_cast<QDialog *>(window)->accept();
+        QTimer::singleShot(0, &view, [&] { view.init(other, -1, true, nullptr); });
+    });
+    view.slotFind();
+    QTRY_COMPARE(view.menuDir(), other);
+    QVERIFY(modal.finished());
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void tst_VelMenuViewFind::goesAwayWhileItAsks()
+{
+    auto *view = new VelMenuView(menu(), -1, true);
+    ModalDriver modal;
+    modal.handle([view](QWidget *) { delete view; });
+    view->slotFind();
+    QVERIFY(modal.finished());
+}
+
+void tst_VelMenuViewFind::goesAwayWhileItTellsThatNothingMatched()
+{
+    auto *view = new VelMenuView(menu(), -1, true);
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        window->findChild<QLineEdit *>()->setText(QStringLiteral("x"));
+        qobject_cast<QDialog *>(window)->accept();
+    });
+    modal.handle([view](QWidget *) { delete view; });
+    view->slotFind();
+    QVERIFY(modal.finished());
+}
+
+VEL_TEST_MAIN(tst_VelMenuViewFind)
+#include "tst_VelMenuViewFind.moc"
