@@ -3,48 +3,249 @@
 
 #include "VelMenuDialog.h"
 
+#include "MessageBox.h"
+#include "VelMenuView.h"
+#include "WmCommand.h"
+
+#include <frame/DesktopEntryRecord.h>
+
+#include <velcore/dirs.h>
+#include <velintegration/help.h>
+
+#include <QAbstractProxyModel>
+#include <QAction>
+#include <QDialogButtonBox>
+#include <QFile>
+#include <QFileSystemModel>
+#include <QIcon>
+#include <QPushButton>
+#include <QSettings>
+#include <QToolBar>
+#include <QVBoxLayout>
+
+#include <string>
+
+namespace {
+
+const char *const WidthKey = "VelMenuDialog/Width";
+const char *const HeightKey = "VelMenuDialog/Height";
+
+QString startMenuDir()
+{
+    return QString::fromStdString(GetVelDir(VelDir::StartMenu));
+}
+
+} // namespace
+
 class VelMenuDialogPrivate
 {
+public:
+    explicit VelMenuDialogPrivate(VelMenuDialog *dialog)
+        : q(dialog)
+    {
+    }
+
+    VelMenuView *view = nullptr;
+    QDialogButtonBox *buttonBox = nullptr;
+    bool anyItemSelectable = false;
+    int menuKind = WmCommand::NoKind;
+    QToolBar *toolBar = nullptr;
+
+    VelMenuDialog *q;
+
+    void buildToolBar();
+    void addAction(const char *name);
+    void connectButtons();
+    QString title(const QString &dir) const;
+    void restoreSize();
+    QPushButton *button(QDialogButtonBox::StandardButton which) const { return buttonBox->button(which); }
+    QString pathOf(const QModelIndex &shown) const;
 };
 
-VelMenuDialog::VelMenuDialog(const QString &, int, bool, bool, QWidget *parent, Qt::WindowFlags f)
-    : QDialog(parent, f)
-    , d(new VelMenuDialogPrivate)
+void VelMenuDialogPrivate::addAction(const char *name)
 {
+    const QLatin1String wanted(name);
+    const QList<QAction *> actions = view->actions();
+    for (QAction *action : actions) {
+        if (action->objectName() == wanted)
+            toolBar->addAction(action);
+    }
+}
+
+void VelMenuDialogPrivate::buildToolBar()
+{
+    toolBar = new QToolBar(VelMenuDialog::tr("Edit"), q);
+    toolBar->setObjectName(QStringLiteral("toolBar"));
+    for (const char *name : {"fileNewAction", "dirNewAction", "editAction", "deleteAction"})
+        addAction(name);
+    toolBar->addSeparator();
+    for (const char *name : {"cutAction", "copyAction", "pasteAction"})
+        addAction(name);
+    toolBar->addSeparator();
+    for (const char *name : {"upAction", "downAction"})
+        addAction(name);
+    if (view->menuDir() == startMenuDir()) {
+        toolBar->addSeparator();
+        addAction("recreateAction");
+    }
+}
+
+void VelMenuDialogPrivate::connectButtons()
+{
+    if (QPushButton *ok = button(QDialogButtonBox::Ok)) {
+        ok->setEnabled(false);
+        QObject::connect(ok, &QPushButton::clicked, q, &VelMenuDialog::accept);
+    }
+    if (QPushButton *cancel = button(QDialogButtonBox::Cancel))
+        QObject::connect(cancel, &QPushButton::clicked, q, &VelMenuDialog::reject);
+    if (QPushButton *close = button(QDialogButtonBox::Close))
+        QObject::connect(close, &QPushButton::clicked, q, &VelMenuDialog::accept);
+    if (QPushButton *apply = button(QDialogButtonBox::Apply)) {
+        apply->setEnabled(false);
+        apply->setToolTip(VelMenuDialog::tr("Send command to vel-wm to update\n edited menu, toolbar, etc."));
+        QObject::connect(apply, &QPushButton::clicked, q, &VelMenuDialog::applySlot);
+        QObject::connect(view, &VelMenuView::changed, q, &VelMenuDialog::changed);
+    }
+}
+
+QString VelMenuDialogPrivate::title(const QString &dir) const
+{
+    QString text;
+    const QString recordFile = dir + QLatin1String("/.directory");
+    if (QFile::exists(recordFile))
+        text += QLatin1String(" \"") + VelUIDesktopEntry(recordFile).getLocalName() + QLatin1Char('"');
+    return text + QLatin1Char(' ') + dir;
+}
+
+void VelMenuDialogPrivate::restoreSize()
+{
+    const QSettings settings;
+    const int height = settings.value(QLatin1String(HeightKey), 480).toInt();
+    const int width = settings.value(QLatin1String(WidthKey), 400).toInt();
+    q->resize(width, height);
+}
+
+QString VelMenuDialogPrivate::pathOf(const QModelIndex &shown) const
+{
+    const auto *proxy = qobject_cast<const QAbstractProxyModel *>(shown.model());
+    const auto *files = proxy ? qobject_cast<const QFileSystemModel *>(proxy->sourceModel()) : nullptr;
+    return files ? files->filePath(proxy->mapToSource(shown)) : QString();
+}
+
+VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bool closeOnly, QWidget *parent,
+                             Qt::WindowFlags f)
+    : QDialog(parent, f)
+    , d(new VelMenuDialogPrivate(this))
+{
+    const QString shownDir = dir.isEmpty() ? startMenuDir() : dir;
+    d->menuKind = WmCommand::kindOf(shownDir);
+
+    auto *layout = new QVBoxLayout(this);
+    d->view = new VelMenuView(shownDir, iconSize, editable, this);
+    d->view->setObjectName(QStringLiteral("view"));
+    if (editable) {
+        d->buildToolBar();
+        layout->addWidget(d->toolBar);
+    }
+    layout->addWidget(d->view);
+    d->buttonBox = new QDialogButtonBox(closeOnly ? QDialogButtonBox::Close
+                                                  : QDialogButtonBox::Ok | QDialogButtonBox::Cancel,
+                                        Qt::Horizontal, this);
+    d->buttonBox->setObjectName(QStringLiteral("buttonBox"));
+    layout->addWidget(d->buttonBox);
+    connect(d->view->selectionModel(), &QItemSelectionModel::selectionChanged, this,
+            &VelMenuDialog::selChanged);
+    d->connectButtons();
+    setWindowTitle(d->title(shownDir));
+    setWindowIcon(QIcon::fromTheme(QStringLiteral("velmenuedit")));
+    d->restoreSize();
 }
 
 VelMenuDialog::VelMenuDialog(QWidget *parent)
-    : VelMenuDialog(QString(), -1, false, false, parent)
+    : VelMenuDialog(QString(), -1, false, false, parent, Qt::WindowFlags())
 {
 }
 
-VelMenuDialog::~VelMenuDialog() = default;
+VelMenuDialog::~VelMenuDialog()
+{
+    {
+        QSettings settings;
+        settings.setValue(QLatin1String(WidthKey), width());
+        settings.setValue(QLatin1String(HeightKey), height());
+    }
+    updateWM();
+}
 
 QString VelMenuDialog::menuDir() const
 {
-    return {};
+    return d->view->menuDir();
 }
 
 QString VelMenuDialog::selectedItemPath() const
 {
-    return {};
+    if (!d->view || !d->view->selectionModel() || !d->view->model())
+        return {};
+    const QModelIndexList selected = d->view->selectionModel()->selectedIndexes();
+    return selected.isEmpty() ? QString() : d->pathOf(selected.constFirst());
 }
 
-QString VelMenuDialog::selectedItemExec(const QString &, const QString &, const QStringList *,
-                                        const QStringList *) const
+QString VelMenuDialog::selectedItemExec(const QString &filePath, const QString &url,
+                                        const QStringList *filePathList, const QStringList *urlList) const
 {
-    return {};
+    const QString path = selectedItemPath();
+    if (path.isEmpty())
+        return {};
+    const VelUIDesktopEntry entry(path);
+    const QString exec = entry.getExec();
+    if (exec.startsWith(QLatin1String("VELWM_")))
+        return QLatin1String("vel-wmfunc ") + exec + QLatin1Char('\n');
+    const QString localName = entry.getLocalName();
+    return VelUIDesktopEntry::ExecFormatString(exec)
+        .filePath(filePath)
+        .url(url)
+        .appName(localName.isEmpty() ? entry.getName() : localName)
+        .icon(entry.getIcon())
+        .desktopFilePath(path)
+        .filePathList(filePathList ? *filePathList : QStringList())
+        .urlList(urlList ? *urlList : QStringList());
 }
 
 bool VelMenuDialog::updateWM()
 {
+    const QByteArray command = WmCommand::forKind(d->menuKind);
+    if (command.isEmpty())
+        return false;
+    if (WmCommand::send(command))
+        return true;
+    MessageBox::show(this, QMessageBox::Warning, tr("Warning"), tr("Can't send command to vel-wm"));
     return false;
 }
 
-void VelMenuDialog::selChanged(QItemSelection, QItemSelection) { }
+void VelMenuDialog::selChanged(QItemSelection selected, QItemSelection)
+{
+    QPushButton *ok = d->button(QDialogButtonBox::Ok);
+    if (!ok)
+        return;
+    const QModelIndexList indexes = selected.indexes();
+    ok->setEnabled(
+        !indexes.isEmpty()
+        && (d->anyItemSelectable || d->pathOf(indexes.constFirst()).endsWith(QLatin1String(".desktop"))));
+}
 
-void VelMenuDialog::changed() { }
+void VelMenuDialog::changed()
+{
+    if (QPushButton *apply = d->button(QDialogButtonBox::Apply))
+        apply->setEnabled(true);
+}
 
-void VelMenuDialog::applySlot() { }
+void VelMenuDialog::applySlot()
+{
+    updateWM();
+    if (QPushButton *apply = d->button(QDialogButtonBox::Apply))
+        apply->setEnabled(false);
+}
 
-void VelMenuDialog::helpSlot() { }
+void VelMenuDialog::helpSlot()
+{
+    velHelpShow(std::string());
+}
