@@ -1,0 +1,88 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "Options.h"
+
+#include <velcore/dirs.h>
+
+#include <QCommandLineParser>
+#include <QCoreApplication>
+#include <QDir>
+
+namespace {
+
+QString tr(const char *text)
+{
+    return QCoreApplication::translate("vel-menuedit", text);
+}
+
+QString standardDir(VelDir kind)
+{
+    return QString::fromStdString(GetVelDir(kind));
+}
+
+} // namespace
+
+Options Options::parse(const QStringList &arguments)
+{
+    QCommandLineParser parser;
+    parser.setApplicationDescription(tr("Edits the start menu, or picks an entry of it."));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    parser.addOptions({
+        {QStringLiteral("dir"), tr("Show the menu directory <dir> instead of the start menu."),
+         QStringLiteral("dir")},
+        {QStringLiteral("desktop"), tr("Show the desktop folder.")},
+        {QStringLiteral("toolbar"), tr("Show the tool bar.")},
+        {QStringLiteral("read-only"), tr("Look only, change nothing.")},
+        {QStringLiteral("icon-size"), tr("Show icons of <pixels> pixels."), QStringLiteral("pixels")},
+        {QStringLiteral("pick"), tr("Pick an entry and print its path and its command line.")},
+    });
+
+    Options options;
+    if (!parser.parse(arguments)) {
+        options.error = parser.errorText();
+        return options;
+    }
+    if (parser.isSet(QStringLiteral("help")) || parser.isSet(QStringLiteral("help-all")))
+        parser.showHelp();
+    if (parser.isSet(QStringLiteral("version")))
+        parser.showVersion();
+    if (!parser.positionalArguments().isEmpty())
+        options.error = tr("unexpected argument: %1").arg(parser.positionalArguments().constFirst());
+    options.pick = parser.isSet(QStringLiteral("pick"));
+    options.editable = !options.pick && !parser.isSet(QStringLiteral("read-only"));
+    options.chooseDir(parser);
+    if (parser.isSet(QStringLiteral("icon-size")))
+        options.chooseIconSize(parser.value(QStringLiteral("icon-size")));
+    return options;
+}
+
+void Options::chooseDir(const QCommandLineParser &parser)
+{
+    const bool isDir = parser.isSet(QStringLiteral("dir"));
+    const bool isDesktop = parser.isSet(QStringLiteral("desktop"));
+    const bool isToolBar = parser.isSet(QStringLiteral("toolbar"));
+    if (int(isDir) + int(isDesktop) + int(isToolBar) > 1)
+        error = tr("only one of --dir, --desktop and --toolbar can be given");
+    const QString startMenu = standardDir(VelDir::StartMenu);
+    dir = startMenu;
+    if (isDir) {
+        const QString given = parser.value(QStringLiteral("dir"));
+        // Without a trailing "/", so that a standard directory is recognised.
+        dir = given.isEmpty() ? given : QDir::cleanPath(QDir().absoluteFilePath(given));
+    } else if (isDesktop) {
+        dir = standardDir(VelDir::Desktop);
+    } else if (isToolBar) {
+        dir = standardDir(VelDir::ToolBar);
+    }
+    isStartMenu = dir == startMenu;
+}
+
+void Options::chooseIconSize(const QString &text)
+{
+    bool isNumber = false;
+    iconSize = text.toInt(&isNumber);
+    if (!isNumber || iconSize < 1 || iconSize > 512)
+        error = tr("--icon-size needs a number of pixels from 1 to 512, not \"%1\"").arg(text);
+}

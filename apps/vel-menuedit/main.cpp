@@ -1,0 +1,129 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "Options.h"
+
+#include <VelMenuDialog.h>
+
+#include <velintegration/startmenu.h>
+
+#include <QApplication>
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QIcon>
+#include <QShortcut>
+#include <QStandardPaths>
+
+#include <algorithm>
+#include <cstdio>
+
+namespace {
+
+enum ExitStatus { Done = 0, NothingPicked = 1, CannotStart = 2 };
+
+void describeApplication()
+{
+    QCoreApplication::setOrganizationName(QStringLiteral("vel"));
+    QCoreApplication::setApplicationName(QStringLiteral("vel-menuedit"));
+    QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+    QGuiApplication::setDesktopFileName(QStringLiteral("vel-menuedit"));
+}
+
+int fail(const QString &text)
+{
+    std::fprintf(stderr, "vel-menuedit: %s\n", text.toLocal8Bit().constData());
+    return CannotStart;
+}
+
+QString tr(const char *text)
+{
+    return QCoreApplication::translate("vel-menuedit", text);
+}
+
+// Whether the directory can be shown; the reason if not.
+QString obstacle(const Options &options)
+{
+    if (options.isStartMenu && !QFileInfo::exists(options.dir)
+        && !CreateStartMenu(QFile::encodeName(options.dir).constData(), nullptr))
+        return tr("cannot create the start menu %1").arg(options.dir);
+    const QFileInfo info(options.dir);
+    if (!info.exists())
+        return tr("no such directory: %1").arg(options.dir);
+    if (!info.isDir())
+        return tr("not a directory: %1").arg(options.dir);
+    if (!info.isReadable() || !info.isExecutable())
+        return tr("cannot read the directory %1").arg(options.dir);
+    return {};
+}
+
+// Programs that were built or installed beside this one are found without being in PATH.
+void findNeighbours()
+{
+    const QString program = QStringLiteral("vel-open");
+    const QString ownDir = QCoreApplication::applicationDirPath();
+    if (QStandardPaths::findExecutable(program).isEmpty()
+        && !QStandardPaths::findExecutable(program, {ownDir}).isEmpty())
+        qputenv("PATH", qgetenv("PATH") + ':' + QFile::encodeName(ownDir));
+}
+
+void print(const QString &line)
+{
+    const QByteArray bytes = QFile::encodeName(line);
+    std::fwrite(bytes.constData(), 1, size_t(bytes.size()), stdout);
+    if (!bytes.endsWith('\n'))
+        std::fputc('\n', stdout);
+}
+
+int run(const Options &options)
+{
+    VelMenuDialog dialog(options.dir, options.iconSize, options.editable, !options.pick, nullptr, Qt::Window);
+    QObject::connect(new QShortcut(QKeySequence(Qt::Key_F1), &dialog), &QShortcut::activated, &dialog,
+                     &VelMenuDialog::helpSlot);
+    const bool accepted = dialog.exec() == QDialog::Accepted;
+    if (!options.pick)
+        return Done;
+    if (!accepted || dialog.selectedItemPath().isEmpty())
+        return NothingPicked;
+    print(dialog.selectedItemPath());
+    print(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr));
+    std::fflush(stdout);
+    return Done;
+}
+
+// Help and version are to be had without a display.
+bool wantsNoWindow(int argc, char **argv)
+{
+    return std::any_of(argv + 1, argv + argc, [](const char *argument) {
+        const QByteArray text(argument);
+        return text == "--help" || text == "--help-all" || text == "-h" || text == "--version"
+            || text == "-v";
+    });
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    describeApplication();
+    if (wantsNoWindow(argc, argv)) {
+        QCoreApplication application(argc, argv);
+        const Options options = Options::parse(QCoreApplication::arguments());
+        if (!options.error.isEmpty())
+            return fail(options.error);
+        // What looked like it was the value of another option.
+    }
+
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    QApplication application(argc, argv);
+    // The message box that may follow the dialog would end before it is seen.
+    QGuiApplication::setQuitOnLastWindowClosed(false);
+    const Options options = Options::parse(QCoreApplication::arguments());
+    if (!options.error.isEmpty())
+        return fail(options.error);
+    const QString why = obstacle(options);
+    if (!why.isEmpty())
+        return fail(why);
+    findNeighbours();
+    return run(options);
+}
