@@ -1,0 +1,97 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "veluiextra_export.h"
+
+#include <QDialog>
+#include <QKeySequence>
+#include <QScopedPointer>
+
+class EditShortcutsDialogPrivate;
+class QAbstractButton;
+class ShortcutsModel;
+
+/**
+ * A dialog in which the user gives the shortcuts of an application other keys.
+ *
+ * It shows the groups and shortcuts of a ShortcutsModel. For the current one the user keeps
+ * the default key or records another one by pressing it, up to four chords long. A recorded
+ * key is refused, with a message that names the holder, when a global shortcut of the desktop
+ * has it (see VelKeyServer::checkForGlobalShortcut()) or another shortcut of the model.
+ *
+ * These checks see equal sequences, not prefixes: "Ctrl+K" is accepted beside
+ * "Ctrl+K, Ctrl+C". Qt then waits for the second chord before it triggers the first.
+ *
+ * The edits are pending in the model until the user confirms with Ok, which puts them into
+ * force. Cancel, Escape and closing the window without applying throw them away. The dialog
+ * saves nothing: call ShortcutsModel::saveKeys() after it was accepted.
+ *
+ * While something is changed the buttons Ok and Reset are enabled.
+ */
+class VELUIEXTRA_EXPORT EditShortcutsDialog : public QDialog
+{
+    Q_OBJECT
+
+public:
+    /**
+     * Makes the dialog for a model.
+     *
+     * @param model the model with everything registered; not owned; a dialog that outlives it
+     *              shows nothing and changes nothing
+     * @param parent the window that the dialog belongs to
+     */
+    explicit EditShortcutsDialog(ShortcutsModel *model, QWidget *parent = nullptr);
+    ~EditShortcutsDialog() override;
+
+    /**
+     * States whether there is something to apply or to reset.
+     *
+     * @param changed whether the buttons Ok and Reset are enabled
+     */
+    void setChanged(bool changed);
+
+public Q_SLOTS:
+    /**
+     * Shows the keys of the shortcut that is current now or whose key changed.
+     *
+     * @param defKS its default key
+     * @param currentKS its pending key; the shortcut keeps its default when the two are equal
+     */
+    void checkCurrentShortcut(QKeySequence defKS, QKeySequence currentKS);
+    /**
+     * Takes a key that was entered for the current shortcut, or refuses it with a message.
+     *
+     * @param key the whole sequence. An empty one conflicts with nothing; one that the key
+     *            editor announces when a recording begins or is given up changes nothing
+     */
+    void checkEnteredKeySequence(QKeySequence key);
+    /// No shortcut is current: disables the choice of a key.
+    void disableShortcutEdit();
+    /**
+     * Does what the buttons RestoreDefaults and Reset stand for; ignores any other button.
+     *
+     * @param button a button of the dialog's button box
+     */
+    void processButtonBox(QAbstractButton *button);
+    /// Gives the current shortcut its default key, if "defaultKeyRB" is checked.
+    void setDefaultShortcut();
+    /// Puts the edits into force and accepts the dialog.
+    void slotAccept();
+    /// Throws the edits away and rejects the dialog.
+    void slotReject();
+    /// Hides the dialog with the result Rejected; throws away what is changed.
+    void reject() override;
+
+protected:
+    /// Asks what to do with edits; the dialog stays open when the answer is Cancel.
+    void closeEvent(QCloseEvent *event) override;
+    /// Makes Escape the same as Cancel.
+    void keyPressEvent(QKeyEvent *event) override;
+    /// Watches the recording of a key.
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    const QScopedPointer<EditShortcutsDialogPrivate> d;
+};

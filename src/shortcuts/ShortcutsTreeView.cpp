@@ -1,0 +1,124 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ShortcutsTreeView.h"
+
+#include "RowsChangedEvent.h"
+#include "ShortcutsModel.h"
+
+#include <QTimer>
+
+ShortcutsTreeView::ShortcutsTreeView(QWidget *parent)
+    : QTreeView(parent)
+{
+}
+
+ShortcutsTreeView::~ShortcutsTreeView() = default;
+
+void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
+{
+    if (model()) {
+        model()->removeEventFilter(this);
+        disconnect(model(), &QObject::destroyed, this, nullptr);
+    }
+    m_hidden.clear();
+    QTreeView::setModel(newModel);
+    if (const ShortcutsModel *shortcuts = shortcutsModel()) {
+        newModel->installEventFilter(this);
+        connect(newModel, &QObject::destroyed, this, [this] { setModel(nullptr); });
+        hideEmptyRows(*shortcuts);
+    }
+}
+
+bool ShortcutsTreeView::isShortcutCurrent() const
+{
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    return shortcuts && shortcuts->isShortcutItem(currentIndex());
+}
+
+QKeySequence ShortcutsTreeView::currentKeySequence() const
+{
+    return isShortcutCurrent() ? shortcutsModel()->keySequence(currentIndex()) : QKeySequence();
+}
+
+void ShortcutsTreeView::setKeySequence(QKeySequence key)
+{
+    if (ShortcutsModel *shortcuts = shortcutsModel())
+        shortcuts->setKeySequence(currentIndex(), key);
+}
+
+void ShortcutsTreeView::currentChanged(const QModelIndex &current, const QModelIndex &previous)
+{
+    QTreeView::currentChanged(current, previous);
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    if (!shortcuts || current == previous)
+        return;
+    if (shortcuts->isShortcutItem(current))
+        Q_EMIT currentShortcutChanged(shortcuts->defaultKeySequence(current),
+                                      shortcuts->keySequence(current));
+    else
+        Q_EMIT currentItemIsNotShortcut();
+}
+
+void ShortcutsTreeView::dataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
+                                    const QVector<int> &roles)
+{
+    QTreeView::dataChanged(topLeft, bottomRight, roles);
+    if (!isShortcutCurrent())
+        return;
+    // The key stands in column 1, whichever column is current.
+    const QModelIndex current = currentIndex().siblingAtColumn(1);
+    if (current < topLeft || bottomRight < current)
+        return;
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    Q_EMIT currentShortcutChanged(shortcuts->defaultKeySequence(current), shortcuts->keySequence(current));
+}
+
+bool ShortcutsTreeView::eventFilter(QObject *watched, QEvent *event)
+{
+    if (watched == model() && event->type() == RowsChangedEvent::eventType())
+        refreshRowsLater();
+    return QTreeView::eventFilter(watched, event);
+}
+
+ShortcutsModel *ShortcutsTreeView::shortcutsModel() const
+{
+    return qobject_cast<ShortcutsModel *>(model());
+}
+
+// Once for all that comes and goes together, for instance with the window of many actions.
+void ShortcutsTreeView::refreshRowsLater()
+{
+    if (m_isRefreshPending)
+        return;
+    m_isRefreshPending = true;
+    QTimer::singleShot(0, this, &ShortcutsTreeView::refreshRows);
+}
+
+void ShortcutsTreeView::refreshRows()
+{
+    m_isRefreshPending = false;
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    if (!shortcuts)
+        return;
+    const auto hidden = m_hidden;
+    m_hidden.clear();
+    for (const QPersistentModelIndex &index : hidden) {
+        if (index.isValid())
+            setRowHidden(index.row(), index.parent(), false);
+    }
+    hideEmptyRows(*shortcuts);
+    scheduleDelayedItemsLayout();
+    if (currentIndex().isValid() && isRowHidden(currentIndex().row(), currentIndex().parent()))
+        selectionModel()->clear();
+}
+
+void ShortcutsTreeView::hideEmptyRows(const ShortcutsModel &shortcuts)
+{
+    const auto rows = shortcuts.emptyRows();
+    for (const auto &[group, row] : rows) {
+        const QModelIndex parent = shortcuts.index(group, 0);
+        setRowHidden(row, parent, true);
+        m_hidden.append(shortcuts.index(row, 0, parent));
+    }
+}

@@ -1,0 +1,58 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QKeySequence>
+#include <QPersistentModelIndex>
+#include <QTreeView>
+#include <QVector>
+
+class ShortcutsModel;
+
+/**
+ * The groups and shortcuts of a ShortcutsModel; tells which one is current and with which keys.
+ *
+ * Rows whose shortcut is gone are hidden. With a model of another kind it is a plain tree.
+ */
+class ShortcutsTreeView : public QTreeView
+{
+    Q_OBJECT
+
+public:
+    explicit ShortcutsTreeView(QWidget *parent = nullptr);
+    ~ShortcutsTreeView() override;
+
+    /// Shows \a model, which is not owned.
+    void setModel(QAbstractItemModel *model) override;
+
+    /// Whether the current item is a shortcut.
+    bool isShortcutCurrent() const;
+    /// The pending key of the current item; empty when that is no shortcut.
+    QKeySequence currentKeySequence() const;
+
+public Q_SLOTS:
+    /// Sets the pending key of the current item.
+    void setKeySequence(QKeySequence key);
+
+Q_SIGNALS:
+    /// A shortcut became current, or the current one's key changed.
+    void currentShortcutChanged(QKeySequence defaultKS, QKeySequence currentKS);
+    /// A group, or nothing, became current.
+    void currentItemIsNotShortcut();
+
+protected:
+    void currentChanged(const QModelIndex &current, const QModelIndex &previous) override;
+    void dataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
+                     const QVector<int> &roles = QVector<int>()) override;
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    ShortcutsModel *shortcutsModel() const;
+    void refreshRowsLater();
+    void refreshRows();
+    void hideEmptyRows(const ShortcutsModel &shortcuts);
+
+    QVector<QPersistentModelIndex> m_hidden;
+    bool m_isRefreshPending = false;
+};
