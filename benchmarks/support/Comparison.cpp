@@ -27,7 +27,12 @@ Comparison::Comparison(std::string title)
 
 void Comparison::add(const std::string &name, Work work, double limit)
 {
-    m_candidates.push_back({name, std::move(work), limit, {}});
+    m_candidates.push_back({name, std::move(work), {}, limit, {}});
+}
+
+void Comparison::addTimed(const std::string &name, TimedWork work, double limit)
+{
+    m_candidates.push_back({name, {}, std::move(work), limit, {}});
 }
 
 void Comparison::setPreparation(Work preparation)
@@ -45,6 +50,12 @@ double Comparison::measure(const Candidate &candidate) const
     using Clock = std::chrono::steady_clock;
     if (m_preparation)
         m_preparation();
+    if (candidate.timedWork) {
+        double time = 0;
+        for (int i = 0; i < m_repetitions; ++i)
+            time += candidate.timedWork();
+        return time / m_repetitions;
+    }
     const Clock::time_point start = Clock::now();
     for (int i = 0; i < m_repetitions; ++i)
         candidate.work();
@@ -92,8 +103,8 @@ bool Comparison::report() const
             std::snprintf(aim, sizeof aim, "%.2f%s", peer->limit, within ? "" : " (missed)");
         std::printf("  %-40s %12.1f us   ratio %6.3f   aim %s\n", peer->name.c_str(), peerTime, ratio, aim);
         if (table) {
-            std::fprintf(table, "| %s | %s | %.1f | %.1f | %.3f | %s |\n", m_title.c_str(), peer->name.c_str(), ourTime,
-                         peerTime, ratio, aim);
+            std::fprintf(table, "| %s | %s | %.1f | %.1f | %.3f | %s |\n", m_title.c_str(),
+                         peer->name.c_str(), ourTime, peerTime, ratio, aim);
         }
     }
     if (table)

@@ -29,12 +29,17 @@ class Comparison
 {
 public:
     using Work = std::function<void()>;
+    /// Work that takes its own time and returns it in microseconds.
+    using TimedWork = std::function<double()>;
 
     explicit Comparison(std::string title);
 
     /// Adds a way of doing the work; the first one added is ours. \a limit is what we aim at:
     /// the largest ratio of ours to this one, 0 for none.
     void add(const std::string &name, Work work, double limit = 0);
+
+    /// The same for work in which not all time counts, such as waiting for things to settle.
+    void addTimed(const std::string &name, TimedWork work, double limit = 0);
 
     /// Runs before every single measurement, outside of the time taken.
     void setPreparation(Work preparation);
@@ -46,9 +51,11 @@ public:
     bool run(int rounds = 15);
 
 private:
-    struct Candidate {
+    struct Candidate
+    {
         std::string name;
         Work work;
+        TimedWork timedWork; // instead of work
         double limit;
         std::vector<double> times; // microseconds for one repetition
     };

@@ -4,11 +4,12 @@
 #include "VelMenuModel.h"
 
 #include "EntryName.h"
+#include "VelMimeTypeIconProvider.h"
 
 #include <frame/DesktopEntryRecord.h>
 
+#include <QCoreApplication>
 #include <QDir>
-#include <QFileIconProvider>
 #include <QFileInfo>
 
 namespace {
@@ -21,16 +22,35 @@ constexpr int BaseColumns = 4;
 
 } // namespace
 
+/// Keeps the icon provider, which the model uses but never deletes.
+class VelMenuModel::IconProviderKeeper : public QObject
+{
+public:
+    using QObject::QObject;
+
+    VelMimeTypeIconProvider *provider() { return &m_provider; }
+
+private:
+    VelMimeTypeIconProvider m_provider;
+};
+
 VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *menuView, QObject *parent)
     : QFileSystemModel(parent)
     , view(menuView)
     , rootDir(rootDirectory)
+    , m_keeper(new IconProviderKeeper(QCoreApplication::instance()))
 {
+    setIconProvider(m_keeper->provider());
     connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);
     setRootPath(rootDir);
 }
 
-VelMenuModel::~VelMenuModel() = default;
+// The base class uses the provider to its own end.
+VelMenuModel::~VelMenuModel()
+{
+    if (m_keeper)
+        m_keeper->deleteLater();
+}
 
 // The base class announces a change up to a column that this model does not have. Without
 // an index for it, nobody would hear of changed rows.

@@ -5,6 +5,7 @@
 
 #include <QFileSystemModel>
 #include <QMap>
+#include <QPointer>
 #include <QSet>
 #include <QString>
 #include <QStringList>
@@ -48,6 +49,7 @@ Q_SIGNALS:
     void changed();
 
 private:
+    class IconProviderKeeper;
     struct Drop;
 
     bool loadItemInfo(const QString &path, bool isFolder) const;
@@ -74,4 +76,5 @@ private:
     // Rows that were edited here: the base class keeps the icon it has, this model asks anew.
     QSet<QString> m_editedRows;
     bool m_isCompleting = false;
+    QPointer<IconProviderKeeper> m_keeper;
 };

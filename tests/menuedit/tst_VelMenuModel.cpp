@@ -225,7 +225,7 @@ void tst_VelMenuModel::marksHiddenEntries()
     m_model = modelOf(folder(), 1);
 
     QCOMPARE(indexOf(row).data(Qt::UserRole), QVariant(hidden));
-    QVERIFY(!indexOf(row).data().isNull());
+    QVERIFY(indexOf(row).data().isValid());
     QCOMPARE(indexOf(row).data(Qt::UserRole), QVariant(hidden));
 }
 
