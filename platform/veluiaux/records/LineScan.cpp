@@ -49,7 +49,9 @@ std::size_t LineScan::contentEnd(std::size_t end) const
 
 std::string LineScan::lineEndAt(std::size_t at) const
 {
-    std::size_t feed = at > m_begin && m_text[at - 1] == '\n' ? at - 1 : m_text.find('\n');
+    std::size_t feed = at > 0 ? m_text.rfind('\n', at - 1) : std::string::npos;
+    if (feed == std::string::npos)
+        feed = m_text.find('\n');
     if (feed == std::string::npos)
         return "\n";
     return feed > 0 && m_text[feed - 1] == '\r' ? "\r\n" : "\n";

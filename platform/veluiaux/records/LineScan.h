@@ -22,7 +22,7 @@ public:
     /// The end of the last line before \a end that is not blank.
     std::size_t contentEnd(std::size_t end) const;
 
-    /// The line end for a new line at \a at: that of the line above, else the first in the text.
+    /// The line end for a new line at \a at: the nearest one above, else the first in the text.
     std::string lineEndAt(std::size_t at) const;
 
 private:
