@@ -120,7 +120,7 @@ void TestCase::init()
 void TestCase::cleanup()
 {
     closeModalWindows();
-    if (qApp)
+    if (QCoreApplication::instance())
         QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 
     MessageLog &log = messageLog();
