@@ -65,6 +65,7 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
 
     d->proxy = new VelMenuProxyModel(this);
     d->buildModel();
+    d->watchRows();
     setModel(d->proxy);
     d->showRoot();
     setSortingEnabled(true);

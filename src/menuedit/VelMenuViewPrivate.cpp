@@ -8,7 +8,9 @@
 #include "VelMenuProxyModel.h"
 #include "VelMenuView.h"
 
+#include <QFileInfo>
 #include <QItemSelectionModel>
+#include <QTimer>
 
 VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view)
     : q(view)
@@ -31,6 +33,7 @@ void VelMenuViewPrivate::clear()
     findResults.clear();
     findPos = -1;
     findText.clear();
+    awaited.clear();
     QItemSelectionModel *selection = q->selectionModel();
     q->setModel(nullptr);
     delete selection;
@@ -56,6 +59,47 @@ void VelMenuViewPrivate::showRoot()
 {
     hideTopLevel();
     q->setRootIndex(proxy->mapFromSource(model->index(menuDir)));
+}
+
+void VelMenuViewPrivate::watchRows()
+{
+    QObject::connect(
+        proxy, &QAbstractItemModel::rowsAboutToBeRemoved, q,
+        [this](const QModelIndex &parent, int first, int last) { leaveRows(parent, first, last); });
+    QObject::connect(proxy, &QAbstractItemModel::rowsInserted, q, [this](const QModelIndex &parent) {
+        if (!parent.isValid())
+            hideTopLevel();
+        // Not from here: looking for the item may bring in further rows.
+        if (!awaited.isEmpty())
+            QTimer::singleShot(0, q, [this] { selectAwaited(); });
+    });
+}
+
+void VelMenuViewPrivate::leaveRows(const QModelIndex &parent, int first, int last)
+{
+    const QModelIndex current = q->currentIndex();
+    if (!current.isValid() || current.parent() != parent || current.row() < first || current.row() > last)
+        return;
+    // A listing that is older than the item takes its row away for a moment.
+    const QString path = q->selectedPath();
+    if (!path.isEmpty() && QFileInfo::exists(path))
+        awaited = path;
+    QModelIndex neighbour = proxy->index(last + 1, 0, parent);
+    if (!neighbour.isValid() && first > 0)
+        neighbour = proxy->index(first - 1, 0, parent);
+    q->selectionModel()->setCurrentIndex(neighbour, QItemSelectionModel::NoUpdate);
+}
+
+void VelMenuViewPrivate::selectAwaited()
+{
+    if (awaited.isEmpty())
+        return;
+    const QModelIndex index = QFileInfo::exists(awaited) ? proxyIndex(awaited) : QModelIndex();
+    if (index.isValid() && !q->selectionModel()->hasSelection()) {
+        selectOnly(index);
+        q->scrollTo(index);
+    }
+    awaited.clear();
 }
 
 void VelMenuViewPrivate::hideTopLevel()

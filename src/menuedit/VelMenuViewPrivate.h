@@ -52,6 +52,8 @@ public:
     VelMenuView *q = nullptr;
     QString menuDir;
     std::unique_ptr<TreeLoader> loader;
+    /// The selected item whose row went although the file is there: its row comes back.
+    QString awaited;
 
     /// Takes models, menu and connections of an earlier init() away.
     void clear();
@@ -59,6 +61,12 @@ public:
     void buildModel();
     /// Shows the children of the menu directory; none when it does not exist.
     void showRoot();
+    /// Keeps track of rows that come and go; runs before the base class sees them.
+    void watchRows();
+    /// Keeps the base class from selecting a neighbour of the row that goes.
+    void leaveRows(const QModelIndex &parent, int first, int last);
+    /// Selects the awaited item again once its row is back.
+    void selectAwaited();
     /// Hides the root of the file system, which an invalid root index would show.
     void hideTopLevel();
 

@@ -42,6 +42,8 @@ private Q_SLOTS:
     void showsAndSelectsAnItemInAFolderNeverOpened();
     void scrollsToAnItemThatArrivesLater();
     void selectsNothingThatIsNoItemOfTheMenu();
+    void selectsAgainWhatAnOlderListingTookAway();
+    void selectsNoNeighbourOfARowThatGoes();
     void goesAwayBeforeItScrolls();
     void sortsAnewWhenToldThatAnOrderChanged();
     void passesOnThatFilesWereDropped();
@@ -308,6 +310,44 @@ void tst_VelMenuView::selectsNothingThatIsNoItemOfTheMenu()
         view.showAndSelect(path);
         QVERIFY2(!view.selectedItem().isValid(), qPrintable(path));
     }
+}
+
+void tst_VelMenuView::selectsAgainWhatAnOlderListingTookAway()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    QVERIFY(open(view, menu(), 2));
+    view.showAndSelect(b);
+    // What the model does with a listing made before the item.
+    QVERIFY(QMetaObject::invokeMethod(files(view), "_q_directoryChanged", Q_ARG(QString, menu()),
+                                      Q_ARG(QStringList, QStringList{QStringLiteral("a.desktop")})));
+    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("A")});
+    QVERIFY(!view.selectedItem().isValid());
+    writeEntry(QStringLiteral("c.desktop"), QStringLiteral("C"));
+    QTRY_COMPARE(view.selectedPath(), b);
+}
+
+void tst_VelMenuView::selectsNoNeighbourOfARowThatGoes()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    const QString c = writeEntry(QStringLiteral("c.desktop"), QStringLiteral("C"));
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    QVERIFY(open(view, menu(), 3));
+    QTRY_COMPARE(names(view, menu()).constFirst(), QStringLiteral("A"));
+    select(view, b);
+    QVERIFY(QFile::remove(b));
+    QTRY_COMPARE(names(view, menu()).size(), 2);
+    QVERIFY(!view.selectedItem().isValid());
+    QCOMPARE(view.currentIndex(), shown(view, c));
+    // It is no longer waited for.
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    QTRY_COMPARE(names(view, menu()).size(), 3);
+    QTest::qWait(0);
+    QVERIFY(!view.selectedItem().isValid());
 }
 
 void tst_VelMenuView::goesAwayBeforeItScrolls()
