@@ -72,6 +72,13 @@ private Q_SLOTS:
         QTRY_COMPARE(opened(), QFile::encodeName(page) + '|');
     }
 
+    void bringsAPageAboutTheMenuEditor()
+    {
+        qputenv("VEL_DATA_DIR", VEL_SOURCE_DIR "/data");
+        QVERIFY(velHelpShow(std::string()));
+        QTRY_COMPARE(opened(), QByteArray(VEL_SOURCE_DIR "/data/doc/index.html|"));
+    }
+
     void opensThePageOfThatName()
     {
         write(QStringLiteral("data/doc/index.html"), "<p>");

@@ -83,6 +83,7 @@ private Q_SLOTS:
     void aTemplateIsCopiedWithoutLinks();
     void aTemplateMayHoldTheMenu();
     void aMissingTemplateLeavesTheOldMenuWhole();
+    void theSampleMenuShowsAllItsEntries();
 };
 
 void StartMenuTest::init()
@@ -619,6 +620,23 @@ void StartMenuTest::aMissingTemplateLeavesTheOldMenuWhole()
     const QByteArray from = QFile::encodeName(path(QStringLiteral("missing")));
     QVERIFY(!CreateStartMenu(QFile::encodeName(menu()).constData(), from.constData()));
     QCOMPARE(tree(path(QStringLiteral("config"))), before);
+}
+
+void StartMenuTest::theSampleMenuShowsAllItsEntries()
+{
+    const QString sample = QStringLiteral(VEL_SOURCE_DIR "/data/sample");
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(sample));
+    QVERIFY(create());
+    QStringList shown;
+    const QMap<QString, QByteArray> files = tree(menu());
+    for (auto it = files.begin(); it != files.end(); ++it) {
+        if (it.key().endsWith(QLatin1String(".desktop")))
+            shown.append(QFileInfo(it.key()).fileName());
+    }
+    shown.sort();
+    QCOMPARE(shown, names(sample + QStringLiteral("/applications")));
+    QVERIFY(shown.size() >= 10);
+    QVERIFY(!sortOrder(menu()).contains(QStringLiteral("Other")));
 }
 
 VEL_TEST_GUILESS_MAIN(StartMenuTest)

@@ -13,7 +13,7 @@
 
 namespace {
 
-const int answerTime = 1200; // milliseconds
+const int answerTime = 1100; // milliseconds
 
 // Without an address the bus library would start a bus of its own.
 bool hasSessionBus()

@@ -10,7 +10,7 @@
 
 namespace {
 
-const int openingTime = 1300; // milliseconds; a browser that stays in front takes longer
+const int openingTime = 1100; // milliseconds; a browser that stays in front takes longer
 
 void takeOffStreams(QProcess *process)
 {

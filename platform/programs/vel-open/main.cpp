@@ -29,7 +29,7 @@ namespace {
 
 const char usage[] = "usage: vel-open --exec PATH\n"
                      "Runs a desktop entry, or opens a file or folder.\n";
-const std::chrono::milliseconds longestWait(1700);
+const std::chrono::milliseconds longestWait(1600);
 const char success = '+';
 
 int fail(const std::string &path, std::string reason)
