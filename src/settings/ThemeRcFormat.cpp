@@ -4,9 +4,12 @@
 #include "ThemeRcFormat.h"
 
 #include <QFileDevice>
+#include <QTextCodec>
 
+#include <algorithm>
 #include <cstdio>
 #include <cstring>
+#include <limits>
 
 namespace {
 
@@ -16,56 +19,99 @@ const QString &sectionKey()
     return key;
 }
 
-bool isDigit(QChar character)
+// Lines come as QStringView or, where they are ASCII, as QLatin1String: nearly all are, and
+// decoding them takes as long as all else. What follows serves both.
+
+QString toString(QStringView text)
 {
-    return character >= QLatin1Char('0') && character <= QLatin1Char('9');
+    return text.toString();
 }
 
-bool isNumber(const QString &value)
+QString toString(QLatin1String text)
 {
-    for (const QChar character : value) {
-        if (!isDigit(character))
-            return false;
+    return text;
+}
+
+int indexOf(QStringView text, char character)
+{
+    return int(text.indexOf(QLatin1Char(character)));
+}
+
+int indexOf(QLatin1String text, char character)
+{
+    const void *const found = std::memchr(text.data(), character, size_t(text.size()));
+    return found ? int(static_cast<const char *>(found) - text.data()) : -1;
+}
+
+int digitValue(QChar character)
+{
+    const int value = character.unicode() - '0';
+    return value <= 9 ? value : -1;
+}
+
+int digitValue(char character)
+{
+    return digitValue(QChar::fromLatin1(character));
+}
+
+template <typename Text>
+bool isNumber(Text text)
+{
+    return !text.isEmpty()
+        && std::all_of(text.begin(), text.end(), [](auto character) { return digitValue(character) >= 0; });
+}
+
+// The number that the digits make; 0 beyond the range.
+template <typename Text>
+int number(Text digits)
+{
+    qint64 result = 0;
+    for (const auto digit : digits) {
+        result = 10 * result + digitValue(digit);
+        if (result > std::numeric_limits<int>::max())
+            return 0;
     }
-    return !value.isEmpty();
+    return int(result);
 }
 
 // A single quote character is a value like any other, in both directions.
-bool isQuoted(const QString &value)
+template <typename Text>
+bool isQuoted(Text text)
 {
-    return value.size() >= 2 && value.startsWith(QLatin1Char('"')) && value.endsWith(QLatin1Char('"'));
+    return text.size() >= 2 && text.startsWith(QLatin1Char('"')) && text.endsWith(QLatin1Char('"'));
 }
 
-QVariant typedValue(const QString &value)
+template <typename Text>
+QVariant typedValue(Text text)
 {
-    if (value == QLatin1String("true") || value == QLatin1String("True"))
+    if (text == QLatin1String("true") || text == QLatin1String("True"))
         return true;
-    if (value == QLatin1String("false") || value == QLatin1String("False"))
+    if (text == QLatin1String("false") || text == QLatin1String("False"))
         return false;
-    if (isNumber(value))
-        return value.toInt(); // 0 beyond the range
-    return isQuoted(value) ? value.mid(1, value.size() - 2) : value;
+    if (isNumber(text))
+        return number(text);
+    return toString(isQuoted(text) ? text.mid(1, text.size() - 2) : text);
 }
 
-void readEntry(const QString &line, int separator, QSettings::SettingsMap &map)
+template <typename Text>
+void readEntry(Text key, Text value, QSettings::SettingsMap &map)
 {
-    const QString key = line.leftRef(separator).trimmed().toString();
-    const QString value = line.midRef(separator + 1).trimmed().toString();
     if (key.isEmpty() || value.isEmpty())
         return;
     // Written files are sorted: the place is at the end, and looked for only when it is not.
-    map.insert(map.constEnd(), key, typedValue(value));
+    map.insert(map.constEnd(), toString(key), typedValue(value));
 }
 
-void readLine(const QString &line, QSettings::SettingsMap &map)
+template <typename Text>
+void readLine(Text line, QSettings::SettingsMap &map)
 {
     if (line.startsWith(QLatin1Char('#')) || line.startsWith(QLatin1Char(';')))
         return;
-    const int separator = line.indexOf(QLatin1Char('='));
+    const int separator = indexOf(line, '=');
     if (separator >= 0) {
-        readEntry(line, separator, map);
+        readEntry(line.left(separator).trimmed(), line.mid(separator + 1).trimmed(), map);
     } else if (line.startsWith(QLatin1Char('[')) && line.endsWith(QLatin1Char(']'))) {
-        QString name = line;
+        QString name = toString(line);
         name.remove(QLatin1Char('[')).remove(QLatin1Char(']'));
         map.insert(sectionKey(), name.trimmed());
     }
@@ -77,14 +123,38 @@ bool isSpace(char byte)
     return byte == ' ' || (byte >= '\t' && byte <= '\r');
 }
 
-// The text of one line; it ends at the first NUL byte.
-QString lineText(const char *begin, const char *end)
+bool isAscii(const char *bytes, int size)
+{
+    quint64 all = 0;
+    for (; size >= int(sizeof all); size -= int(sizeof all), bytes += sizeof all) {
+        quint64 some;
+        std::memcpy(&some, bytes, sizeof some);
+        all |= some;
+    }
+    for (; size > 0; --size, ++bytes)
+        all |= uchar(*bytes);
+    return !(all & Q_UINT64_C(0x8080808080808080));
+}
+
+// Whether ASCII bytes stand for themselves in the encoding of the locale, whatever comes before.
+bool keepsAscii()
+{
+    constexpr int utf8 = 106; // IANA's number
+    return QTextCodec::codecForLocale()->mibEnum() == utf8;
+}
+
+// Reads one line, without its end. Its text ends at the first NUL byte.
+void readBytes(const char *begin, const char *end, bool asciiAsIs, QSettings::SettingsMap &map)
 {
     while (begin != end && isSpace(*begin))
         ++begin;
     while (begin != end && isSpace(end[-1]))
         --end;
-    return QString::fromLocal8Bit(begin, int(strnlen(begin, size_t(end - begin))));
+    const int size = int(strnlen(begin, size_t(end - begin)));
+    if (asciiAsIs && isAscii(begin, size))
+        readLine(QLatin1String(begin, size), map);
+    else
+        readLine(QStringView(QString::fromLocal8Bit(begin, size)), map);
 }
 
 QByteArray sectionLine(const QVariant &name)
@@ -96,7 +166,7 @@ QByteArray entryLine(const QString &key, const QVariant &value)
 {
     QString text = value.toString();
     const bool hasBlank = text.contains(QLatin1Char(' ')) || text.contains(QLatin1Char('\t'));
-    if (hasBlank && !isQuoted(text))
+    if (hasBlank && !isQuoted(QStringView(text)))
         text = QLatin1Char('"') + text + QLatin1Char('"');
     return QString(key + QLatin1Char('=') + text + QLatin1Char('\n')).toLocal8Bit();
 }
@@ -118,12 +188,13 @@ bool read(QIODevice &device, QSettings::SettingsMap &map)
     if (!device.atEnd())
         return false;
 
+    const bool asciiAsIs = keepsAscii();
     const char *line = bytes.constData();
     const char *const end = line + bytes.size();
     while (line != end) {
         const void *const feed = std::memchr(line, '\n', size_t(end - line));
         const char *const lineEnd = feed ? static_cast<const char *>(feed) : end;
-        readLine(lineText(line, lineEnd), map);
+        readBytes(line, lineEnd, asciiAsIs, map);
         line = feed ? lineEnd + 1 : end;
     }
     return true;
