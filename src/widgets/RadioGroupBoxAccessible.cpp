@@ -35,13 +35,17 @@ RadioGroupBoxAccessible::RadioGroupBoxAccessible(VelRadioGroupBox *box)
 {
 }
 
-void RadioGroupBoxAccessible::install()
+void RadioGroupBoxAccessible::install(VelRadioGroupBox *box)
 {
     static const bool installed = [] {
         QAccessible::installFactory(create);
         return true;
     }();
     Q_UNUSED(installed)
+    // Setting the title in the constructor of the base class made and kept one for a QGroupBox.
+    QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(box);
+    if (interface && interface->role() != QAccessible::RadioButton)
+        QAccessible::deleteAccessibleInterface(QAccessible::uniqueId(interface));
 }
 
 QString RadioGroupBoxAccessible::text(QAccessible::Text kind) const

@@ -14,8 +14,13 @@ public:
     /// \a box outlives the interface: Qt deletes the interface with the widget.
     explicit RadioGroupBoxAccessible(VelRadioGroupBox *box);
 
-    /// Makes Qt create this interface for every VelRadioGroupBox; further calls do nothing.
-    static void install();
+    /**
+     * Makes sure that \a box, which is being constructed, is presented by this class.
+     *
+     * The first call installs the factory. An interface that Qt has made already, while it
+     * constructed the base class, is replaced.
+     */
+    static void install(VelRadioGroupBox *box);
 
     QString text(QAccessible::Text kind) const override;
     QAccessible::State state() const override;

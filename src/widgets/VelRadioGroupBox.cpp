@@ -138,7 +138,7 @@ VelRadioGroupBox::~VelRadioGroupBox() = default;
 
 void VelRadioGroupBox::init()
 {
-    RadioGroupBoxAccessible::install();
+    RadioGroupBoxAccessible::install(this);
     d->pressed = false;
     setCheckable(true);
     setChecked(false);
