@@ -5,10 +5,12 @@
 
 // Each stands in the source file of its name.
 GalleryPage radioGroupBoxPage();
+GalleryPage settingsPage();
 
 QVector<GalleryPage> galleryPages()
 {
     return {
         radioGroupBoxPage(),
+        settingsPage(),
     };
 }

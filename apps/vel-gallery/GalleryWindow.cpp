@@ -9,6 +9,7 @@
 #include <QListWidget>
 #include <QPlainTextEdit>
 #include <QScrollArea>
+#include <QScrollBar>
 #include <QSplitter>
 #include <QStackedWidget>
 #include <QVBoxLayout>
@@ -34,6 +35,7 @@ QScrollArea *scrolled(QWidget *page, QWidget *parent)
     area->setFrameShape(QFrame::NoFrame);
     area->setWidgetResizable(true);
     area->setWidget(page);
+    area->setMinimumWidth(page->minimumSizeHint().width() + area->verticalScrollBar()->sizeHint().width());
     return area;
 }
 
@@ -132,7 +134,7 @@ QWidget *GalleryWindow::buildSide(QWidget *parent)
     split->addWidget(m_code);
     split->setStretchFactor(0, 1);
     split->setStretchFactor(1, 1);
-    split->setSizes({1, 1}); // in equal parts
+    split->setSizes({450, 450}); // in equal parts
 
     auto *layout = new QVBoxLayout(side);
     layout->setContentsMargins(0, 0, 0, 0);

@@ -1,0 +1,257 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "GalleryPages.h"
+#include "GalleryWindow.h"
+#include "TestCase.h"
+
+#include <VelRadioGroupBox.h>
+
+#include <QCheckBox>
+#include <QDialogButtonBox>
+#include <QDir>
+#include <QImage>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPlainTextEdit>
+#include <QProcess>
+#include <QPushButton>
+#include <QSet>
+#include <QSpinBox>
+
+#include <memory>
+
+namespace {
+
+QString s(const char *utf8)
+{
+    return QString::fromUtf8(utf8);
+}
+
+std::unique_ptr<GalleryWindow> openPage(const QString &name, const QString &settingsFile = QString())
+{
+    GalleryContext context;
+    context.settingsFile = settingsFile;
+    auto window = std::make_unique<GalleryWindow>(galleryPages(), context);
+    if (!window->showPage(name))
+        QTest::qFail("no such page", __FILE__, __LINE__);
+    window->show();
+    return window;
+}
+
+template <typename Widget>
+Widget *child(const GalleryWindow &window, const char *name)
+{
+    auto *found = window.findChild<Widget *>(QLatin1String(name));
+    if (!found)
+        qFatal("no %s", name);
+    return found;
+}
+
+void click(const GalleryWindow &window, QDialogButtonBox::StandardButton button)
+{
+    QTest::mouseClick(child<QDialogButtonBox>(window, "buttonBox")->button(button), Qt::LeftButton);
+}
+
+} // namespace
+
+class tst_vel_gallery : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void namesItsPagesOnceAndPlainly();
+    void showsEveryPageBesideItsCode();
+    void doesNotShowAPageThatDoesNotExist();
+    void listsHeadingsThatCannotBeChosen();
+    void choosesARadioGroupBoxByTheKeyboard();
+    void editsTheSettingsFileOnApply();
+    void addsNoKeyUnasked();
+    void takesBackEditsOnReset();
+    void saysThatNoSettingsFileWasNamed();
+    void saysThatTheSettingsFileCannotBeOpened();
+    void writesPicturesInEveryCombination();
+    void failsForAPageThatDoesNotExist();
+    void failsWhenPicturesCannotBeWritten();
+};
+
+void tst_vel_gallery::namesItsPagesOnceAndPlainly()
+{
+    QSet<QString> names;
+    const QRegularExpression plain(s("^[a-z]+(-[a-z]+)*$"));
+    for (const GalleryPage &page : galleryPages()) {
+        QVERIFY2(plain.match(page.name).hasMatch(), qPrintable(page.name));
+        QVERIFY2(!names.contains(page.name), qPrintable(page.name));
+        names.insert(page.name);
+        QVERIFY(!page.title.isEmpty() && !page.category.isEmpty() && !page.snippet.isEmpty());
+    }
+    QVERIFY(names.contains(s("radio-group-box")));
+    QVERIFY(names.contains(s("settings")));
+}
+
+void tst_vel_gallery::showsEveryPageBesideItsCode()
+{
+    const auto pages = galleryPages();
+    GalleryWindow window(pages, {});
+    for (const GalleryPage &page : pages) {
+        QVERIFY(window.showPage(page.name));
+        QVERIFY(window.currentPage());
+        QCOMPARE(child<QPlainTextEdit>(window, "codeView")->toPlainText(), page.snippet);
+        QWidget *made = window.currentPage();
+        QVERIFY(window.showPage(pages.constFirst().name));
+        QVERIFY(window.showPage(page.name));
+        QCOMPARE(window.currentPage(), made); // made once
+    }
+}
+
+void tst_vel_gallery::doesNotShowAPageThatDoesNotExist()
+{
+    GalleryWindow window(galleryPages(), {});
+    const QWidget *before = window.currentPage();
+    QVERIFY(before);
+    QVERIFY(!window.showPage(s("no-such-page")));
+    QCOMPARE(window.currentPage(), before);
+}
+
+void tst_vel_gallery::listsHeadingsThatCannotBeChosen()
+{
+    GalleryWindow window(galleryPages(), {});
+    const auto *list = child<QListWidget>(window, "pageList");
+    QSet<QString> categories;
+    for (const GalleryPage &page : galleryPages())
+        categories.insert(page.category);
+    int headings = 0;
+    for (int row = 0; row < list->count(); ++row) {
+        if (!(list->item(row)->flags() & Qt::ItemIsSelectable)) {
+            ++headings;
+            QVERIFY(categories.contains(list->item(row)->text()));
+        }
+    }
+    QCOMPARE(headings, categories.size());
+}
+
+void tst_vel_gallery::choosesARadioGroupBoxByTheKeyboard()
+{
+    const auto window = openPage(s("radio-group-box"));
+    window->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(window.get()));
+    const auto *manual = child<VelRadioGroupBox>(*window, "manualBox");
+    auto *none = child<VelRadioGroupBox>(*window, "noneBox");
+    QVERIFY(manual->isChecked());
+    // From the list by Tab through what is enabled.
+    child<QListWidget>(*window, "pageList")->setFocus();
+    for (int i = 0; i < 20 && window->focusWidget() != none; ++i)
+        QTest::keyClick(window->focusWidget(), Qt::Key_Tab);
+    QCOMPARE(window->focusWidget(), none);
+    QTest::keyClick(none, Qt::Key_Space);
+    QVERIFY(none->isChecked() && !manual->isChecked());
+}
+
+void tst_vel_gallery::editsTheSettingsFileOnApply()
+{
+    const QByteArray before("[Theme]\nflat=false\nfont=Sans\nother=kept\nsize=10\n");
+    const QString file = write(s("rc"), before);
+    const auto window = openPage(s("settings"), file);
+    QCOMPARE(child<QLineEdit>(*window, "sectionEdit")->text(), s("Theme"));
+    QCOMPARE(child<QLineEdit>(*window, "fontEdit")->text(), s("Sans"));
+    QCOMPARE(child<QSpinBox>(*window, "sizeSpinBox")->value(), 10);
+    QVERIFY(!child<QCheckBox>(*window, "flatCheckBox")->isChecked());
+
+    child<QLineEdit>(*window, "sectionEdit")->setText(s("Other theme"));
+    child<QLineEdit>(*window, "fontEdit")->setText(s("Sans Serif"));
+    child<QSpinBox>(*window, "sizeSpinBox")->setValue(12);
+    child<QCheckBox>(*window, "flatCheckBox")->setChecked(true);
+    QCOMPARE(read(file), before);
+    click(*window, QDialogButtonBox::Apply);
+    const QByteArray after("[Other theme]\nflat=true\nfont=\"Sans Serif\"\nother=kept\nsize=12\n");
+    QCOMPARE(read(file), after);
+    QCOMPARE(child<QPlainTextEdit>(*window, "fileView")->toPlainText().toUtf8(), after);
+}
+
+void tst_vel_gallery::addsNoKeyUnasked()
+{
+    const QByteArray bytes("# comment\n[Theme]\nother=1\n");
+    const QString file = write(s("rc"), bytes);
+    const auto window = openPage(s("settings"), file);
+    click(*window, QDialogButtonBox::Apply);
+    QCOMPARE(read(file), bytes);
+}
+
+void tst_vel_gallery::takesBackEditsOnReset()
+{
+    const QByteArray bytes("[Theme]\nsize=10\n");
+    const QString file = write(s("rc"), bytes);
+    const auto window = openPage(s("settings"), file);
+    child<QSpinBox>(*window, "sizeSpinBox")->setValue(12);
+    click(*window, QDialogButtonBox::Reset);
+    QCOMPARE(child<QSpinBox>(*window, "sizeSpinBox")->value(), 10);
+    QCOMPARE(read(file), bytes);
+}
+
+void tst_vel_gallery::saysThatNoSettingsFileWasNamed()
+{
+    const auto window = openPage(s("settings"));
+    QCOMPARE(child<QLabel>(*window, "stateLabel")->text(),
+             s("Name a settings file on the command line to edit it here."));
+    QVERIFY(!child<QDialogButtonBox>(*window, "buttonBox")->isEnabled());
+    QVERIFY(!child<QLineEdit>(*window, "fontEdit")->isEnabled());
+}
+
+void tst_vel_gallery::saysThatTheSettingsFileCannotBeOpened()
+{
+    const auto window = openPage(s("settings"), path(s("none")));
+    QCOMPARE(child<QLabel>(*window, "stateLabel")->text(), path(s("none")) + s(" cannot be opened."));
+    QVERIFY(!child<QDialogButtonBox>(*window, "buttonBox")->isEnabled());
+}
+
+void tst_vel_gallery::writesPicturesInEveryCombination()
+{
+    QProcess gallery;
+    const QString pictures = path(s("new/pictures"));
+    gallery.start(s(VEL_GALLERY), {s("--page"), s("radio-group-box"), s("--screenshots"), pictures});
+    QVERIFY(gallery.waitForFinished());
+    QCOMPARE(gallery.exitCode(), 0);
+    QStringList expected;
+    for (const char *palette : {"dark", "light"}) {
+        for (const char *direction : {"ltr", "rtl"}) {
+            for (const char *scale : {"1", "2"})
+                expected.append(s("radio-group-box-%1-%2-%3.png").arg(s(palette), s(direction), s(scale)));
+        }
+    }
+    QCOMPARE(QDir(pictures).entryList(QDir::Files, QDir::Name), expected);
+
+    const QDir folder(pictures);
+    const QImage light(folder.filePath(s("radio-group-box-light-ltr-1.png")));
+    const QImage dark(folder.filePath(s("radio-group-box-dark-ltr-1.png")));
+    const QImage mirrored(folder.filePath(s("radio-group-box-light-rtl-1.png")));
+    const QImage large(folder.filePath(s("radio-group-box-light-ltr-2.png")));
+    QVERIFY(light.pixelColor(2, 2).lightness() > 150);
+    QVERIFY(dark.pixelColor(2, 2).lightness() < 100);
+    QVERIFY(mirrored != light);
+    QCOMPARE(large.size(), 2 * light.size());
+}
+
+void tst_vel_gallery::failsForAPageThatDoesNotExist()
+{
+    QProcess gallery;
+    gallery.start(s(VEL_GALLERY), {s("--page"), s("no-such-page")});
+    QVERIFY(gallery.waitForFinished());
+    QCOMPARE(gallery.exitCode(), 1);
+    QCOMPARE(gallery.readAllStandardError(), QByteArray("vel-gallery: there is no page no-such-page\n"));
+}
+
+void tst_vel_gallery::failsWhenPicturesCannotBeWritten()
+{
+    const QString file = write(s("file"), "");
+    QProcess gallery;
+    gallery.start(s(VEL_GALLERY), {s("--screenshots"), file});
+    QVERIFY(gallery.waitForFinished());
+    QCOMPARE(gallery.exitCode(), 1);
+    QVERIFY(gallery.readAllStandardError().startsWith("vel-gallery: cannot make the folder "));
+    QCOMPARE(read(file), QByteArray());
+}
+
+VEL_TEST_MAIN(tst_vel_gallery)
+
+#include "tst_vel_gallery.moc"
