@@ -8,6 +8,7 @@
 
 #include <QGuiApplication>
 #include <QPainter>
+#include <QtMath>
 
 namespace {
 
@@ -28,21 +29,16 @@ QPoint placeInCorner(const QSize &size, const QRect &square, Qt::Corner corner)
 
 } // namespace
 
-QPixmap IconDrawing::picture(const QIcon &icon, const QSize &pixels, qreal ratio, QIcon::Mode mode,
+QPixmap IconDrawing::picture(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode,
                              QIcon::State state)
 {
-    if (qFuzzyCompare(ratio, ratioOfQt())) {
-        // Qt takes the theme's own pictures for this ratio, where there are some.
-        QPixmap picture = icon.pixmap(pixels / ratio, mode, state);
-        picture.setDevicePixelRatio(1);
-        return picture;
-    }
-    QPixmap picture(icon.actualSize(pixels, mode, state).boundedTo(pixels));
-    if (picture.isNull())
-        return picture;
-    picture.fill(Qt::transparent);
-    QPainter painter(&picture);
-    icon.paint(&painter, picture.rect(), Qt::AlignCenter, mode, state);
+    // Asked for a logical size, QIcon multiplies it by its own ratio.
+    const qreal ratio = ratioOfQt();
+    const QSize size(qFloor(pixels.width() / ratio), qFloor(pixels.height() / ratio));
+    QPixmap picture = icon.pixmap(size, mode, state);
+    picture.setDevicePixelRatio(1);
+    if (fit == Fit::Exactly && !picture.isNull() && picture.size() != pixels)
+        picture = picture.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
     return picture;
 }
 
@@ -53,7 +49,7 @@ void IconDrawing::layEmblems(QPixmap &picture, const QMap<Qt::Corner, QString> &
     for (auto it = emblems.cbegin(); it != emblems.cend(); ++it) {
         const QRect square = EmblemLayout::square(picture.size(), ratio, it.key());
         const LazyIconEngine engine(it.value(), {}, QIcon());
-        QPixmap emblem = engine.picture(square.size(), ratio, mode, QIcon::Off);
+        QPixmap emblem = engine.picture(square.size(), ratio, Fit::AtMost, mode, QIcon::Off);
         emblem.setDevicePixelRatio(1);
         painter.drawPixmap(placeInCorner(emblem.size(), square, it.key()), emblem);
     }

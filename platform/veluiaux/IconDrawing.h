@@ -11,17 +11,20 @@
 /// Makes the pictures of icons; remembers nothing.
 namespace IconDrawing {
 
-/**
- * The picture of \a icon that fits into \a pixels, at most as large.
- *
- * @param pixels size in the pixels of the device
- * @param ratio pixels of the device for one logical pixel, which may be another one than the
- *              application's
- * @return a picture with a pixel ratio of 1; null when the icon has none
- */
-QPixmap picture(const QIcon &icon, const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state);
+/// How a picture fills the pixels that it is made for.
+enum class Fit {
+    AtMost, ///< smaller where the icon has no picture as large
+    Exactly ///< scaled where the icon has no picture of that size
+};
 
-/// Lays \a emblems, names of theme icons, into the corners of \a picture.
+/**
+ * The picture of \a icon for \a pixels of the device, with a pixel ratio of 1; null when the
+ * icon has none.
+ */
+QPixmap picture(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode, QIcon::State state);
+
+/// Lays \a emblems, names of theme icons, into the corners of \a picture, which has \a ratio
+/// pixels for one logical pixel.
 void layEmblems(QPixmap &picture, const QMap<Qt::Corner, QString> &emblems, qreal ratio, QIcon::Mode mode);
 
 } // namespace IconDrawing

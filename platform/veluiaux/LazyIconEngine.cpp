@@ -3,7 +3,6 @@
 
 #include "LazyIconEngine.h"
 
-#include "IconDrawing.h"
 #include "IconLookup.h"
 #include "IconMemory.h"
 #include "ThemeState.h"
@@ -50,11 +49,10 @@ const QString &LazyIconEngine::baseKey() const
     return m_baseKey;
 }
 
-QString LazyIconEngine::pictureKey(const QSize &pixels, qreal ratio, QIcon::Mode mode,
-                                   QIcon::State state) const
+QString LazyIconEngine::sizedKey(const QSize &size, QIcon::Mode mode, QIcon::State state) const
 {
     // Disabled and selected pictures are tinted by the palette.
-    const qint64 numbers[] = {pixels.width(), pixels.height(), qRound64(ratio * 1000), mode * 2 + state,
+    const qint64 numbers[] = {size.width(), size.height(), mode * 2 + state,
                               QGuiApplication::palette().cacheKey()};
     QString key = baseKey();
     for (const qint64 number : numbers) {
@@ -64,19 +62,21 @@ QString LazyIconEngine::pictureKey(const QSize &pixels, qreal ratio, QIcon::Mode
     return key;
 }
 
-QPixmap LazyIconEngine::picture(const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state) const
+QPixmap LazyIconEngine::picture(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
+                                QIcon::State state) const
 {
     if (pixels.isEmpty())
         return QPixmap();
     const IconMemory &memory = IconMemory::instance();
-    QString key = pictureKey(pixels, ratio, mode, state);
+    QString key = sizedKey(pixels, mode, state) + separator + QString::number(qRound64(ratio * 1000))
+        + separator + QString::number(int(fit));
     for (auto it = m_emblems.cbegin(); it != m_emblems.cend(); ++it)
         key += separator + QString::number(it.key()) + it.value();
 
     QPixmap picture;
     if (memory.findPicture(key, &picture))
         return picture;
-    picture = IconDrawing::picture(base(), pixels, ratio, mode, state);
+    picture = IconDrawing::picture(base(), pixels, fit, mode, state);
     if (picture.isNull())
         return picture;
     if (!m_emblems.isEmpty())
@@ -88,29 +88,25 @@ QPixmap LazyIconEngine::picture(const QSize &pixels, qreal ratio, QIcon::Mode mo
 
 QPixmap LazyIconEngine::pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state)
 {
-    return picture(size, 1, mode, state);
+    return picture(size, 1, IconDrawing::Fit::AtMost, mode, state);
 }
 
 void LazyIconEngine::paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state)
 {
+    // A small picture stays small, but is as large on a device of more pixels.
+    const QSize size = actualSize(rect.size(), mode, state).boundedTo(rect.size());
     const qreal ratio = painter->device()->devicePixelRatioF();
-    const QPixmap picture = this->picture(rect.size() * ratio, ratio, mode, state);
-    if (picture.isNull())
-        return;
-    QRectF target(QPointF(), QSizeF(picture.size()) / ratio);
-    if (picture.size() == rect.size() * ratio)
-        target = rect; // the rounded size at an odd ratio must not blur the picture
-    else
-        target.moveTopLeft(
-            rect.topLeft()
-            + QPoint(int(rect.width() - target.width()) / 2, int(rect.height() - target.height()) / 2));
-    painter->drawPixmap(target, picture, picture.rect());
+    const QPixmap picture = this->picture(size * ratio, ratio, IconDrawing::Fit::Exactly, mode, state);
+    const QSize margin = (rect.size() - size) / 2;
+    const QRect target(rect.topLeft() + QPoint(margin.width(), margin.height()), size);
+    if (!picture.isNull())
+        painter->drawPixmap(target, picture);
 }
 
 QSize LazyIconEngine::actualSize(const QSize &size, QIcon::Mode mode, QIcon::State state)
 {
     IconMemory &memory = IconMemory::instance();
-    const QString key = pictureKey(size, 0, mode, state);
+    const QString key = sizedKey(size, mode, state);
     if (const QSize *known = memory.findSize(key))
         return *known;
     const QSize actual = base().actualSize(size, mode, state);
@@ -156,7 +152,8 @@ void LazyIconEngine::virtual_hook(int id, void *data)
         *static_cast<bool *>(data) = isEmpty();
     } else if (id == QIconEngine::ScaledPixmapHook) {
         auto *argument = static_cast<QIconEngine::ScaledPixmapArgument *>(data);
-        argument->pixmap = picture(argument->size, argument->scale, argument->mode, argument->state);
+        argument->pixmap = picture(argument->size, argument->scale, IconDrawing::Fit::AtMost, argument->mode,
+                                   argument->state);
     } else {
         QIconEngine::virtual_hook(id, data);
     }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "IconDrawing.h"
+
 #include <QIcon>
 #include <QIconEngine>
 #include <QMap>
@@ -31,8 +33,9 @@ public:
     QString iconName() const override;
     void virtual_hook(int id, void *data) override;
 
-    /// A picture that fits into \a pixels, drawn for and with the pixel ratio \a ratio.
-    QPixmap picture(const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state) const;
+    /// A picture for \a pixels, drawn for and with the pixel ratio \a ratio.
+    QPixmap picture(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
+                    QIcon::State state) const;
 
 protected:
     LazyIconEngine(const LazyIconEngine &other) = default;
@@ -43,7 +46,8 @@ private:
     bool isEmpty() const;
     /// Names the parts, without the emblems, for what is remembered.
     const QString &baseKey() const;
-    QString pictureKey(const QSize &pixels, qreal ratio, QIcon::Mode mode, QIcon::State state) const;
+    /// Names the parts with all that a picture or a size of them depends on but the emblems.
+    QString sizedKey(const QSize &size, QIcon::Mode mode, QIcon::State state) const;
 
     const QString m_name;
     const QMap<Qt::Corner, QString> m_emblems;

@@ -53,6 +53,7 @@ private Q_SLOTS:
     void centresASmallerPicture();
     void drawsForThePixelRatioOfTheDevice_data();
     void drawsForThePixelRatioOfTheDevice();
+    void scalesUpForADeviceOfMorePixels();
     void paintsAsQtDoes_data();
     void paintsAsQtDoes();
 
@@ -61,6 +62,8 @@ private:
     static QImage painted(const QIcon &icon, int size, qreal ratio = 1,
                           Qt::LayoutDirection direction = Qt::LeftToRight);
     static QIcon plainIcon(const QColor &color);
+    /// The size of what is not white.
+    static QSize extent(const QImage &image);
 
     std::unique_ptr<IconThemeFolder> m_theme;
 };
@@ -85,6 +88,18 @@ QImage tst_VelIcon::painted(const QIcon &icon, int size, qreal ratio, Qt::Layout
     painter.setLayoutDirection(direction);
     icon.paint(&painter, QRect(0, 0, size, size));
     return image;
+}
+
+QSize tst_VelIcon::extent(const QImage &image)
+{
+    QRect painted;
+    for (int y = 0; y < image.height(); ++y) {
+        for (int x = 0; x < image.width(); ++x) {
+            if (image.pixelColor(x, y) != QColor(Qt::white))
+                painted |= QRect(x, y, 1, 1);
+        }
+    }
+    return painted.size();
 }
 
 QIcon tst_VelIcon::plainIcon(const QColor &color)
@@ -501,6 +516,25 @@ void tst_VelIcon::drawsForThePixelRatioOfTheDevice()
     QCOMPARE(image, expected);
 }
 
+void tst_VelIcon::scalesUpForADeviceOfMorePixels()
+{
+    // The theme has nothing larger than 32 pixels.
+    const QImage large = painted(themeIcon(QStringLiteral("red")), 32, 2);
+    QCOMPARE(large.pixelColor(0, 0), QColor(Qt::red));
+    QCOMPARE(large.pixelColor(63, 63), QColor(Qt::red));
+
+    QPixmap small(8, 8);
+    small.fill(Qt::yellow);
+    const Emblems emblems{{Qt::TopLeftCorner, QStringLiteral("emblem-blue")}};
+    const QImage image = painted(VelIcon::withEmblems(QIcon(small), emblems), 16, 2);
+    QCOMPARE(image.pixelColor(7, 7), QColor(Qt::white));
+    QCOMPARE(image.pixelColor(8, 8), QColor(Qt::blue));
+    QCOMPARE(image.pixelColor(15, 15), QColor(Qt::blue));
+    QCOMPARE(image.pixelColor(16, 16), QColor(Qt::yellow));
+    QCOMPARE(image.pixelColor(23, 23), QColor(Qt::yellow));
+    QCOMPARE(image.pixelColor(24, 24), QColor(Qt::white));
+}
+
 void tst_VelIcon::paintsAsQtDoes_data()
 {
     QTest::addColumn<QString>("name");
@@ -524,6 +558,10 @@ void tst_VelIcon::paintsAsQtDoes()
             QCOMPARE(icon.pixmap(size, mode).toImage(), qt.pixmap(size, mode).toImage());
             QCOMPARE(painted(icon, size), painted(qt, size));
         }
+        // Breeze says of some pictures for this ratio that they are smaller than they are.
+        const QSizeF twice = extent(painted(icon, size, 2));
+        QVERIFY(twice.width() / extent(painted(icon, size)).width() > 1.4);
+        QVERIFY(twice.height() / extent(painted(icon, size)).height() > 1.4);
     }
 }
 
