@@ -44,7 +44,7 @@ std::string absoluteVariable(const char *name)
 
 std::string homeDirectory()
 {
-    const std::string home = absoluteVariable("HOME");
+    std::string home = absoluteVariable("HOME");
     if (!home.empty())
         return home;
     const std::string registered = homeOfTheUserDataBase();
@@ -53,7 +53,7 @@ std::string homeDirectory()
 
 std::string xdgConfigHome()
 {
-    const std::string configHome = absoluteVariable("XDG_CONFIG_HOME");
+    std::string configHome = absoluteVariable("XDG_CONFIG_HOME");
     if (!configHome.empty())
         return configHome;
     const std::string home = homeDirectory();

@@ -28,7 +28,7 @@ struct Locale
 std::string messageLocale()
 {
     for (const char *name : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
-        const std::string value = variable(name);
+        std::string value = variable(name);
         if (!value.empty())
             return value;
     }
@@ -72,7 +72,7 @@ std::string velLanguageCode()
     const Locale locale = parsed(messageLocale());
     if (!isLanguage(locale.language) || locale.language == "POSIX")
         return defaultLanguage;
-    const std::string withModifier = locale.language + "@" + locale.modifier;
+    std::string withModifier = locale.language + "@" + locale.modifier;
     if (contains(byModifier, withModifier))
         return withModifier;
     const std::string withCountry = locale.language + "_" + locale.country;

@@ -113,6 +113,7 @@ void VelOpenTest::init()
 
 void VelOpenTest::cleanup()
 {
+    QDBusConnection::disconnectFromBus(QStringLiteral("test"));
     if (m_bus) {
         m_bus->terminate();
         m_bus->waitForFinished();
@@ -449,7 +450,6 @@ void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool 
         QVERIFY2(m_time < 2000, qPrintable(QString::number(m_time)));
         QCOMPARE(application.activations(), activations);
     }
-    QDBusConnection::disconnectFromBus(QStringLiteral("test"));
     if (execRuns)
         QTRY_COMPARE(told(), QByteArray("ran\n"));
 }
@@ -509,7 +509,6 @@ void VelOpenTest::asksNoBusForOtherEntries()
                  0);
         QCOMPARE(application.activations(), 0);
     }
-    QDBusConnection::disconnectFromBus(QStringLiteral("test"));
     QTRY_COMPARE(told(), QByteArray("ran\n"));
 }
 

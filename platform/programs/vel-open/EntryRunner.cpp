@@ -70,7 +70,7 @@ QString runCommand(const VelUIDesktopEntry &entry, const QString &path)
         return QStringLiteral("cannot understand the command \"%1\"").arg(entry.getExec());
     if (entry.getTerminal()) {
         // A terminal would open all the same and say it there, for a moment.
-        const QString problem = whyNotExecutable(words.first(), entry.getPath());
+        QString problem = whyNotExecutable(words.first(), entry.getPath());
         if (!problem.isEmpty())
             return problem;
         const QStringList terminal = terminalWords();

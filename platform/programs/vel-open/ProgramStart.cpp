@@ -25,7 +25,7 @@ QString startProgram(const QStringList &words, const QString &folder)
 {
     if (!folder.isEmpty() && !QFileInfo(folder).isDir())
         return QStringLiteral("the folder %1 does not exist").arg(folder);
-    const QString problem = whyNotExecutable(words.first(), folder);
+    QString problem = whyNotExecutable(words.first(), folder);
     if (!problem.isEmpty())
         return problem;
 

@@ -32,7 +32,7 @@ const char usage[] = "usage: vel-open --exec PATH\n"
 const std::chrono::milliseconds longestWait(1600);
 const char success = '+';
 
-int fail(const std::string &path, std::string reason)
+int fail(const std::string &path, const std::string &reason)
 {
     std::string line = "vel-open: " + path + ": " + reason;
     for (char &c : line) {

@@ -8,7 +8,7 @@
 #include <string>
 
 // The one type of Xlib that is needed; its header would bring macros named None and Bool.
-typedef struct _XDisplay Display;
+typedef struct _XDisplay Display; // NOLINT(bugprone-reserved-identifier)
 
 /**
  * The names that the channel to the window manager goes by.
