@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include <VelDesktopEntryEditDialog.h>
+#include <VelDesktopEntryPropsWidget.h>
+
+#include <QApplication>
+#include <QCommandLineParser>
+#include <QDialogButtonBox>
+#include <QFileInfo>
+#include <QPushButton>
+
+#include <cstdio>
+
+namespace {
+
+enum ExitStatus { Saved = 0, Cancelled = 1, NotOpened = 2 };
+
+struct Options
+{
+    QString file;
+    QString pattern;
+    bool create = false;
+    bool readOnly = false;
+    QString error; ///< what is wrong with the command line; empty when nothing is
+};
+
+QString text(const char *source)
+{
+    return QCoreApplication::translate("main", source);
+}
+
+QString absolute(const QString &path)
+{
+    return path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
+}
+
+Options parse(const QStringList &arguments)
+{
+    QCommandLineParser parser;
+    parser.setApplicationDescription(text(QT_TRANSLATE_NOOP("main", "Edits a desktop entry.")));
+    const QCommandLineOption help = parser.addHelpOption();
+    const QCommandLineOption version = parser.addVersionOption();
+    const QCommandLineOption create(
+        QStringLiteral("create"),
+        text(QT_TRANSLATE_NOOP("main", "Make a new entry when there is no such file.")));
+    const QCommandLineOption pattern(
+        QStringLiteral("template"),
+        text(QT_TRANSLATE_NOOP("main", "Begin with the values of the entry <file>.")),
+        QStringLiteral("file"));
+    const QCommandLineOption readOnly(QStringLiteral("read-only"),
+                                      text(QT_TRANSLATE_NOOP("main", "Show the entry only.")));
+    parser.addOptions({create, pattern, readOnly});
+    parser.addPositionalArgument(QStringLiteral("file"),
+                                 text(QT_TRANSLATE_NOOP("main", "The entry to edit.")));
+
+    Options options;
+    if (!parser.parse(arguments))
+        options.error = parser.errorText();
+    else if (parser.isSet(help))
+        parser.showHelp(0);
+    else if (parser.isSet(version))
+        parser.showVersion();
+    else if (parser.positionalArguments().size() != 1 || parser.positionalArguments().constFirst().isEmpty())
+        options.error = text(QT_TRANSLATE_NOOP("main", "one file has to be named"));
+    else
+        options.file = absolute(parser.positionalArguments().constFirst());
+    options.pattern = absolute(parser.value(pattern));
+    options.create = parser.isSet(create);
+    options.readOnly = parser.isSet(readOnly);
+    return options;
+}
+
+int fail(const QString &reason)
+{
+    std::fprintf(stderr, "vel-entryedit: %s\n", qPrintable(reason));
+    return NotOpened;
+}
+
+// Looking only: nothing in the form can be changed, and nothing can be saved.
+void makeReadOnly(VelDesktopEntryEditDialog *dialog)
+{
+    if (auto *form = dialog->findChild<VelDesktopEntryPropsWidget *>())
+        form->setReadOnly(true);
+    if (auto *box = dialog->findChild<QDialogButtonBox *>())
+        box->button(QDialogButtonBox::Ok)->setEnabled(false);
+    if (auto *copyButton = dialog->findChild<QPushButton *>(QStringLiteral("copyButton")))
+        copyButton->setEnabled(false);
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    QApplication application(argc, argv);
+    QApplication::setOrganizationName(QStringLiteral("vel"));
+    QApplication::setApplicationName(QStringLiteral("vel-entryedit"));
+    QApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+    QApplication::setDesktopFileName(QStringLiteral("vel-entryedit"));
+    QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
+
+    const Options options = parse(QApplication::arguments());
+    if (!options.error.isEmpty())
+        return fail(options.error);
+
+    VelDesktopEntryEditDialog dialog;
+    if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
+        return fail(text(QT_TRANSLATE_NOOP("main", "cannot open %1")).arg(options.file));
+    if (options.readOnly)
+        makeReadOnly(&dialog);
+    return dialog.exec() == QDialog::Accepted ? Saved : Cancelled;
+}
