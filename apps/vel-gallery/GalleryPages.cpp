@@ -3,7 +3,9 @@
 
 #include "GalleryPages.h"
 
-// Each stands in the source file of its name.
+// Each stands in the source file of its name; those of desktop entries share one.
+GalleryPage desktopEntryFieldsPage();
+GalleryPage desktopEntryFormPage();
 GalleryPage radioGroupBoxPage();
 GalleryPage settingsPage();
 
@@ -12,5 +14,7 @@ QVector<GalleryPage> galleryPages()
     return {
         radioGroupBoxPage(),
         settingsPage(),
+        desktopEntryFormPage(),
+        desktopEntryFieldsPage(),
     };
 }

@@ -606,7 +606,8 @@ void tst_VelDesktopEntryPropsWidget::ignoresTheWheelOverTheTypeWithoutFocus()
     QApplication::sendEvent(typeBox(form), &event);
     QVERIFY(modal.finished());
     QCOMPARE(typeBox(form)->currentData().toString(), application);
-    QVERIFY(form.findChild<QScrollArea *>()->verticalScrollBar()->value() > 0);
+    // What the box ignores goes on to the form, which scrolls.
+    QVERIFY(!event.isAccepted());
 }
 
 void tst_VelDesktopEntryPropsWidget::enablesTheListOfTheChosenButton()

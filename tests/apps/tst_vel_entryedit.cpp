@@ -1,0 +1,227 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "TestCase.h"
+
+#include <QDir>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QProcess>
+
+// Drives the program from outside, as a user does: keys and clicks go through the X server,
+// and what it did is read from the file and from its exit status.
+class tst_vel_entryedit : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void refusesACommandLineThatNamesNoFile_data();
+    void refusesACommandLineThatNamesNoFile();
+    void saysThatItCannotOpenAMissingFile();
+    void endsWithOneWhenCancelled();
+    void leavesTheFileWhenNothingWasChanged();
+    void createsAnEntryThatRuns();
+    void takesATemplate();
+    void changesNothingReadOnly();
+    void isDescribedByAnEntryOfItsOwn();
+
+private:
+    void start(QProcess &program, const QStringList &arguments);
+    QString waitForWindow(const QString &title);
+    void pressKeys(const QString &window, const QStringList &keys);
+    void typeText(const QString &window, const QString &text);
+    void waitUntilGone(const QString &title);
+    QString findWindow(const QString &title);
+    static QByteArray xdotool(const QStringList &arguments);
+};
+
+QByteArray tst_vel_entryedit::xdotool(const QStringList &arguments)
+{
+    QProcess process;
+    process.start(QStringLiteral("xdotool"), arguments);
+    process.waitForFinished();
+    return process.readAllStandardOutput().trimmed();
+}
+
+void tst_vel_entryedit::start(QProcess &program, const QStringList &arguments)
+{
+    program.start(QStringLiteral(VEL_PROGRAM), arguments);
+    QVERIFY2(program.waitForStarted(), qPrintable(program.errorString()));
+}
+
+QString tst_vel_entryedit::findWindow(const QString &title)
+{
+    const QByteArray found =
+        xdotool({QStringLiteral("search"), QStringLiteral("--onlyvisible"), QStringLiteral("--name"), title});
+    return QString::fromLatin1(found.split('\n').constLast());
+}
+
+QString tst_vel_entryedit::waitForWindow(const QString &title)
+{
+    const auto isActive = [this, &title] {
+        const QString window = findWindow(title);
+        return !window.isEmpty() && xdotool({QStringLiteral("getactivewindow")}) == window.toLatin1();
+    };
+    if (!QTest::qWaitFor(isActive, 20000))
+        QTest::qFail(qPrintable(QStringLiteral("no active window ") + title), __FILE__, __LINE__);
+    return findWindow(title);
+}
+
+void tst_vel_entryedit::waitUntilGone(const QString &title)
+{
+    QVERIFY(QTest::qWaitFor([this, &title] { return findWindow(title).isEmpty(); }, 20000));
+}
+
+void tst_vel_entryedit::pressKeys(const QString &window, const QStringList &keys)
+{
+    Q_UNUSED(window)
+    xdotool(QStringList{QStringLiteral("key"), QStringLiteral("--delay"), QStringLiteral("20")} + keys);
+}
+
+void tst_vel_entryedit::typeText(const QString &window, const QString &text)
+{
+    Q_UNUSED(window)
+    xdotool({QStringLiteral("type"), QStringLiteral("--delay"), QStringLiteral("20"), text});
+}
+
+void tst_vel_entryedit::refusesACommandLineThatNamesNoFile_data()
+{
+    QTest::addColumn<QStringList>("arguments");
+    QTest::newRow("nothing") << QStringList();
+    QTest::newRow("two files") << QStringList{QStringLiteral("a"), QStringLiteral("b")};
+    QTest::newRow("unknown option") << QStringList{QStringLiteral("--nonsense"), QStringLiteral("a")};
+}
+
+void tst_vel_entryedit::refusesACommandLineThatNamesNoFile()
+{
+    QFETCH(QStringList, arguments);
+    QProcess program;
+    start(program, arguments);
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 2);
+    const QByteArray error = program.readAllStandardError();
+    QVERIFY2(error.startsWith("vel-entryedit: "), error.constData());
+    QCOMPARE(error.count('\n'), 1);
+}
+
+void tst_vel_entryedit::saysThatItCannotOpenAMissingFile()
+{
+    const QString missing = path(QStringLiteral("missing.desktop"));
+    QProcess program;
+    start(program, {missing});
+    pressKeys(waitForWindow(QStringLiteral("Warning")), {QStringLiteral("Return")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 2);
+    QCOMPARE(program.readAllStandardError(), "vel-entryedit: cannot open " + missing.toLocal8Bit() + '\n');
+}
+
+void tst_vel_entryedit::endsWithOneWhenCancelled()
+{
+    const QByteArray bytes = "[Desktop Entry]\nType=Application\nName=a\nExec=true\n";
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    QProcess program;
+    start(program, {file});
+    const QString window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys(window, {QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Escape")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 1);
+    QCOMPARE(read(file), bytes);
+    QCOMPARE(program.readAllStandardError(), QByteArray());
+}
+
+void tst_vel_entryedit::leavesTheFileWhenNothingWasChanged()
+{
+    const QByteArray bytes =
+        "#!/usr/bin/env x\n[Desktop Entry]\nName=a\nType=Application\nExec=true\nX-Key=1\n";
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    QProcess program;
+    program.setWorkingDirectory(folder());
+    start(program, {QStringLiteral("a.desktop")});
+    pressKeys(waitForWindow(QStringLiteral("Desktop Entry Editor")), {QStringLiteral("Return")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 0);
+    QCOMPARE(read(file), bytes);
+}
+
+void tst_vel_entryedit::createsAnEntryThatRuns()
+{
+    const QString file = path(QStringLiteral("new.desktop"));
+    const QString witness = path(QStringLiteral("witness"));
+    const QString script =
+        write(QStringLiteral("run"), "#!/bin/sh\necho \"$1\" > '" + witness.toUtf8() + "'\n");
+    QVERIFY(QFile::setPermissions(script, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+
+    QProcess program;
+    start(program, {QStringLiteral("--create"), file});
+    QString window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    // The type has the keys at first, the name comes next.
+    pressKeys(window, {QStringLiteral("Tab")});
+    typeText(window, QStringLiteral("My program"));
+    pressKeys(window, {QStringLiteral("Return")});
+
+    pressKeys(waitForWindow(QStringLiteral("^Warning$")), {QStringLiteral("Return")});
+    waitUntilGone(QStringLiteral("^Warning$"));
+    QVERIFY(!QFile::exists(file));
+    QCOMPARE(program.state(), QProcess::Running);
+
+    // From the name over its localised one and two icons with their buttons to the command.
+    window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys(window, QStringList(QVector<QString>(6, QStringLiteral("Tab")).toList()));
+    typeText(window, script + QStringLiteral(" started"));
+    pressKeys(window, {QStringLiteral("Return")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 0);
+    QCOMPARE(read(file),
+             "[Desktop Entry]\nType=Application\nName=My program\nExec=" + script.toUtf8() + " started\n");
+
+    QProcess open;
+    open.start(QStringLiteral(VEL_OPEN), {QStringLiteral("--exec"), file});
+    QVERIFY(open.waitForFinished(20000));
+    QCOMPARE(open.exitCode(), 0);
+    QTRY_VERIFY_WITH_TIMEOUT(QFile::exists(witness) && read(witness) == "started\n", 20000);
+}
+
+void tst_vel_entryedit::takesATemplate()
+{
+    const QString pattern = write(QStringLiteral("pattern.desktop"),
+                                  "[Desktop Entry]\nType=Application\nName=Pattern\nExec=/bin/sh\n");
+    const QString file = path(QStringLiteral("new.desktop"));
+    QProcess program;
+    start(program, {QStringLiteral("--create"), QStringLiteral("--template"), pattern, file});
+    pressKeys(waitForWindow(QStringLiteral("Desktop Entry Editor")), {QStringLiteral("Return")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 0);
+    QCOMPARE(read(file), QByteArray("[Desktop Entry]\nType=Application\nName=Pattern\nExec=/bin/sh\n"));
+}
+
+void tst_vel_entryedit::changesNothingReadOnly()
+{
+    const QByteArray bytes = "[Desktop Entry]\nType=Application\nName=a\nExec=true\n";
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    QProcess program;
+    start(program, {QStringLiteral("--read-only"), file});
+    const QString window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    typeText(window, QStringLiteral("xyz"));
+    pressKeys(window, {QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Return")});
+    QVERIFY(!program.waitForFinished(500));
+    pressKeys(window, {QStringLiteral("Escape")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 1);
+    QCOMPARE(read(file), bytes);
+}
+
+void tst_vel_entryedit::isDescribedByAnEntryOfItsOwn()
+{
+    QProcess validate;
+    validate.start(QStringLiteral("desktop-file-validate"), {QStringLiteral(VEL_ENTRY)});
+    QVERIFY(validate.waitForFinished());
+    QCOMPARE(validate.exitCode(), 0);
+    QCOMPARE(validate.readAllStandardOutput(), QByteArray());
+    const QByteArray entry = read(QStringLiteral(VEL_ENTRY));
+    QVERIFY(entry.contains("\nMimeType=application/x-desktop;\n"));
+    QVERIFY(entry.contains("\nExec=vel-entryedit %f\n"));
+}
+
+VEL_TEST_MAIN(tst_vel_entryedit)
+
+#include "tst_vel_entryedit.moc"
