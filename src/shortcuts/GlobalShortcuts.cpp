@@ -3,9 +3,8 @@
 
 #include "GlobalShortcuts.h"
 
-#include "KeyNames.h"
-#include "KeySequences.h"
-#include "VelKeyServer.h"
+#include "FileText.h"
+#include "KeyMatcher.h"
 
 #include <velcore/dirs.h>
 #include <velcore/session.h>
@@ -15,7 +14,6 @@
 
 #include <cstdio>
 #include <memory>
-#include <optional>
 
 #include <sys/stat.h>
 
@@ -43,64 +41,6 @@ bool load(CSimpleIniA &ini, const QString &path)
     return file && ini.LoadFile(file.get()) >= 0;
 }
 
-QString withoutQuotes(QString text)
-{
-    if (text.startsWith(QLatin1Char('"'))) {
-        text.remove(0, 1);
-        text.chop(1);
-    }
-    return text;
-}
-
-// Compares the keys of the file with one sequence.
-class KeyMatcher
-{
-public:
-    explicit KeyMatcher(const QKeySequence &wanted)
-        : m_wanted(wanted)
-    {
-    }
-
-    bool matches(const char *fileKey) const
-    {
-        if (const std::optional<int> code = simpleCode(fileKey))
-            return m_wanted.count() == 1 && m_wanted[0] == *code;
-        return matchesText(fileKey);
-    }
-
-private:
-    bool matchesText(const char *fileKey) const
-    {
-        QString key = withoutQuotes(QString::fromUtf8(fileKey));
-        key.replace(QLatin1Char('|'), QLatin1Char('+'));
-        key.remove(QLatin1String("None+"));
-        const QString converted = VelKeyServer::KeyStringXToQt(key);
-        const QKeySequence sequence(converted.isEmpty() ? key : converted, QKeySequence::NativeText);
-        return KeySequences::isKnown(sequence) && sequence == m_wanted;
-    }
-
-    // The key code of a file key for which the way over its text, which takes ten times as
-    // long, is known to end in the same code.
-    static std::optional<int> simpleCode(const char *fileKey)
-    {
-        QByteArray key(fileKey);
-        for (const char byte : qAsConst(key)) {
-            if (static_cast<unsigned char>(byte) >= 0x80)
-                return std::nullopt;
-        }
-        if (key.startsWith('"')) {
-            key.remove(0, 1);
-            key.chop(1);
-        }
-        key.replace('|', '+');
-        key.replace("None+", "");
-        const std::optional<int> code = KeyNames::codeFromKeyString(key);
-        return code && KeyNames::readsBackUnchanged(*code) ? code : std::nullopt;
-    }
-
-    const QKeySequence m_wanted;
-};
-
 } // namespace
 
 QString GlobalShortcuts::filePath()
@@ -120,7 +60,7 @@ QString GlobalShortcuts::find(const QString &path, const QKeySequence &sequence)
     const KeyMatcher matcher(sequence);
     for (const auto &entry : *entries) {
         if (matcher.matches(entry.first.pItem))
-            return withoutQuotes(QString::fromUtf8(entry.second));
+            return FileText::withoutQuotes(QString::fromUtf8(entry.second));
     }
     return {};
 }

@@ -59,12 +59,17 @@ std::optional<int> KeyNames::codeFromKeyString(const QByteArray &keyString)
         mask |= modifierBit(keyString.constData() + begin, end - begin);
         begin = end + 1;
     }
-    int modifiers = 0;
-    KKeyServer::modXToQt(mask, &modifiers);
     int key = 0;
     if (!keyFromSymbol(static_cast<unsigned int>(symbol), &key))
         return std::nullopt;
-    return key | modifiers;
+    return key | qtModifiers(mask);
+}
+
+int KeyNames::qtModifiers(unsigned int mask)
+{
+    int modifiers = 0;
+    KKeyServer::modXToQt(mask, &modifiers);
+    return modifiers;
 }
 
 QString KeyNames::portableText(int code)
@@ -76,7 +81,11 @@ bool KeyNames::readsBackUnchanged(int code)
 {
     const int key = code & ~int(Qt::KeyboardModifierMask);
     const bool isLowerCase = key >= 'a' && key <= 'z';
-    return (key >= Qt::Key_Space && key <= Qt::Key_AsciiTilde && !isLowerCase)
-        || (key >= Qt::Key_Escape && key <= Qt::Key_Clear) || (key >= Qt::Key_Home && key <= Qt::Key_PageDown)
-        || (key >= Qt::Key_F1 && key <= Qt::Key_F35);
+    if (key <= Qt::Key_AsciiTilde)
+        return key >= Qt::Key_Space && !isLowerCase;
+    // The blocks of keys that have names.
+    return (key >= Qt::Key_Escape && key <= Qt::Key_Clear) || (key >= Qt::Key_Home && key <= Qt::Key_PageDown)
+        || (key >= Qt::Key_F1 && key <= Qt::Key_F35) || (key >= Qt::Key_Back && key <= Qt::Key_Refresh)
+        || (key >= Qt::Key_MediaPlay && key <= Qt::Key_MediaTogglePlayPause)
+        || (key >= Qt::Key_LaunchMail && key <= Qt::Key_ContrastAdjust) || key == Qt::Key_Menu;
 }

@@ -18,6 +18,9 @@ namespace KeyNames {
  */
 std::optional<int> codeFromKeyString(const QByteArray &keyString);
 
+/// The Qt modifiers of an X11 modifier mask.
+int qtModifiers(unsigned int mask);
+
 /// The portable text of the key sequence of one key code; empty when it has none.
 QString portableText(int code);
 

@@ -5,8 +5,27 @@
 
 #include "RowsChangedEvent.h"
 #include "ShortcutsModel.h"
+#include "TextWidth.h"
 
 #include <QTimer>
+
+#include <algorithm>
+#include <iterator>
+#include <vector>
+
+namespace {
+
+// So many of the items that seem widest are measured exactly.
+constexpr int measuredItems = 16;
+
+struct Candidate
+{
+    int width;
+    int group;
+    int row; // -1 for the group itself
+};
+
+} // namespace
 
 ShortcutsTreeView::ShortcutsTreeView(QWidget *parent)
     : QTreeView(parent)
@@ -72,6 +91,59 @@ void ShortcutsTreeView::dataChanged(const QModelIndex &topLeft, const QModelInde
         return;
     const ShortcutsModel *shortcuts = shortcutsModel();
     Q_EMIT currentShortcutChanged(shortcuts->defaultKeySequence(current), shortcuts->keySequence(current));
+}
+
+int ShortcutsTreeView::sizeHintForColumn(int column) const
+{
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    if (!shortcuts || column != 0)
+        return QTreeView::sizeHintForColumn(column);
+    ensurePolished();
+    const QStyleOptionViewItem option = viewOptions();
+    int width = 0;
+    const auto items = widestItems(*shortcuts);
+    for (const QModelIndex &index : items)
+        width = qMax(width, itemDelegate(index)->sizeHint(option, index).width() + indentationOf(index));
+    return width;
+}
+
+// Laying every text out would take longer than all the rest of opening the dialog.
+QVector<QModelIndex> ShortcutsTreeView::widestItems(const ShortcutsModel &shortcuts) const
+{
+    TextWidth textWidth(font());
+    const int iconWidth = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
+    std::vector<Candidate> candidates;
+    for (int group = 0; group < shortcuts.m_groups.size(); ++group) {
+        candidates.push_back({textWidth.of(shortcuts.m_groupNames.at(group)), group, -1});
+        if (!isExpanded(shortcuts.index(group, 0)))
+            continue;
+        int row = 0;
+        for (const auto &objects : shortcuts.m_groups.at(group)) {
+            if (!objects.isEmpty()) {
+                const IShortcutObject *object = objects.constFirst();
+                const int icon = object->icon().isNull() ? 0 : iconWidth;
+                candidates.push_back({textWidth.of(object->text()) + icon + indentation(), group, row});
+            }
+            ++row;
+        }
+    }
+    const auto end =
+        candidates.begin() + std::min<std::ptrdiff_t>(measuredItems, std::ptrdiff_t(candidates.size()));
+    std::partial_sort(candidates.begin(), end, candidates.end(),
+                      [](const Candidate &left, const Candidate &right) { return left.width > right.width; });
+    QVector<QModelIndex> items;
+    std::transform(candidates.begin(), end, std::back_inserter(items),
+                   [&shortcuts](const Candidate &candidate) {
+                       const QModelIndex group = shortcuts.index(candidate.group, 0);
+                       return candidate.row < 0 ? group : shortcuts.index(candidate.row, 0, group);
+                   });
+    return items;
+}
+
+int ShortcutsTreeView::indentationOf(const QModelIndex &index) const
+{
+    const int level = (rootIsDecorated() ? 1 : 0) + (index.parent().isValid() ? 1 : 0);
+    return level * indentation();
 }
 
 bool ShortcutsTreeView::eventFilter(QObject *watched, QEvent *event)

@@ -45,6 +45,8 @@ protected:
     void currentChanged(const QModelIndex &current, const QModelIndex &previous) override;
     void dataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
                      const QVector<int> &roles = QVector<int>()) override;
+    /// The width of all items, hidden ones and those of closed groups left out.
+    int sizeHintForColumn(int column) const override;
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
@@ -52,6 +54,8 @@ private:
     void refreshRowsLater();
     void refreshRows();
     void hideEmptyRows(const ShortcutsModel &shortcuts);
+    QVector<QModelIndex> widestItems(const ShortcutsModel &shortcuts) const;
+    int indentationOf(const QModelIndex &index) const;
 
     QVector<QPersistentModelIndex> m_hidden;
     bool m_isRefreshPending = false;

@@ -5,6 +5,7 @@
 
 #include <shortcuts/ActionObject.h>
 
+#include <QRegExp>
 #include <QSignalSpy>
 #include <QWidget>
 
@@ -91,6 +92,7 @@ void tst_ActionObject::leavesTheMnemonicMarksOut_data()
     QTest::newRow("none") << QStringLiteral("Quit") << QStringLiteral("Quit");
     QTest::newRow("at the end") << QStringLiteral("Quit&") << QStringLiteral("Quit");
     QTest::newRow("three") << QStringLiteral("a&&&b") << QStringLiteral("a&&b");
+    QTest::newRow("only ampersands") << QStringLiteral("&&&&") << QStringLiteral("&&&");
     QTest::newRow("two marks") << QStringLiteral("&a &b") << QStringLiteral("a b");
 }
 
@@ -100,6 +102,7 @@ void tst_ActionObject::leavesTheMnemonicMarksOut()
     QAction action(text, nullptr);
     const ActionObject object(QStringLiteral("n"), &action, QStringLiteral("g"));
     QTEST(object.text(), "shown");
+    QCOMPARE(object.text(), QString(text).remove(QRegExp(QStringLiteral("&(?!&)"))));
 }
 
 void tst_ActionObject::showsTheActionAsItIsNow()

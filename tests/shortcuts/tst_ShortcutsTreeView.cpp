@@ -44,6 +44,8 @@ private Q_SLOTS:
     void tellsOfAChangeOfTheFirstRowFromEitherColumn();
     void keepsQuietAboutOtherRows();
     void isAPlainTreeWithAnotherModel();
+    void isAsWideAsItsWidestText_data();
+    void isAsWideAsItsWidestText();
 
     void hidesRowsThatAreEmptyWhenItOpens();
     void hidesRowsThatBecomeEmpty();
@@ -212,6 +214,49 @@ void tst_ShortcutsTreeView::isAPlainTreeWithAnotherModel()
     QCOMPARE(spy.count() + groupSpy.count(), 0);
     m_view->setModel(nullptr);
     m_view->setKeySequence(f1);
+}
+
+void tst_ShortcutsTreeView::isAsWideAsItsWidestText_data()
+{
+    QTest::addColumn<QString>("widest");
+    QTest::addColumn<bool>("hasIcon");
+    QTest::newRow("many equal ones") << str("999") << false;
+    QTest::newRow("wide letters") << str("WWWWWWWW WWWWW") << false;
+    QTest::newRow("icon") << str("wwwwwwwww") << true;
+    QTest::newRow("kerning") << str("AVAVAVAVAVAVAV") << false;
+    QTest::newRow("Arabic")
+        << QString::fromUtf8("\xd8\xa7\xd9\x84\xd8\xb3\xd9\x84\xd8\xa7\xd9\x85 ").repeated(5) << false;
+    QTest::newRow("Greek") << QString::fromUtf8("\xce\xa9\xce\xb8\xce\xbb").repeated(12) << false;
+}
+
+void tst_ShortcutsTreeView::isAsWideAsItsWidestText()
+{
+    QFETCH(QString, widest);
+    QFETCH(bool, hasIcon);
+    for (int i = 100; i < 900; ++i)
+        addAction(qPrintable(QString::number(i)), "Numbers", QKeySequence());
+    QAction *action = addAction("x", "Numbers", QKeySequence());
+    action->setText(widest);
+    QPixmap pixmap(16, 16);
+    pixmap.fill(Qt::red);
+    if (hasIcon)
+        action->setIcon(QIcon(pixmap));
+
+    // A plain tree looks at every row of so few.
+    QTreeView plain;
+    plain.setModel(m_model.get());
+    ShortcutsTreeView view;
+    view.setModel(m_model.get());
+    for (QTreeView *tree : {&plain, static_cast<QTreeView *>(&view)}) {
+        tree->expandAll();
+        tree->resizeColumnToContents(0);
+    }
+    QCOMPARE(view.columnWidth(0), plain.columnWidth(0));
+    view.collapseAll();
+    plain.collapseAll();
+    view.resizeColumnToContents(0);
+    plain.resizeColumnToContents(0);
+    QCOMPARE(view.columnWidth(0), plain.columnWidth(0));
 }
 
 void tst_ShortcutsTreeView::hidesRowsThatAreEmptyWhenItOpens()

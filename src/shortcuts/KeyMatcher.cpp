@@ -1,0 +1,156 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "KeyMatcher.h"
+
+#include "FileText.h"
+#include "KeyNames.h"
+#include "KeySequences.h"
+#include "VelKeyServer.h"
+
+#include <cstring>
+
+namespace {
+
+constexpr int modifiersButKeypad = int(Qt::KeyboardModifierMask) & ~int(Qt::KeypadModifier);
+
+constexpr unsigned int shiftBit = 1;
+constexpr unsigned int controlBit = 2;
+constexpr unsigned int altBit = 4;
+constexpr unsigned int metaBit = 8;
+constexpr unsigned int noModifier = 16;
+
+bool equals(const char *part, std::size_t length, const char *name)
+{
+    return qstrnicmp(part, name, uint(length)) == 0;
+}
+
+// The packed bit of a modifier; noModifier for any other name.
+unsigned int packedBit(const char *part, std::size_t length)
+{
+    switch (length) {
+    case 3:
+        return equals(part, length, "Alt") ? altBit : noModifier;
+    case 4:
+        return equals(part, length, "Ctrl")                                ? controlBit
+            : equals(part, length, "Mod4") || equals(part, length, "Meta") ? metaBit
+                                                                           : noModifier;
+    case 5:
+        return equals(part, length, "Shift") ? shiftBit : noModifier;
+    case 7:
+        return equals(part, length, "Control") ? controlBit : noModifier;
+    default:
+        return noModifier;
+    }
+}
+
+int qtModifiers(unsigned int packed)
+{
+    const unsigned int mask = ((packed & shiftBit) ? 0x01u : 0u) | ((packed & controlBit) ? 0x04u : 0u)
+        | ((packed & altBit) ? 0x08u : 0u) | ((packed & metaBit) ? 0x40u : 0u);
+    return KeyNames::qtModifiers(mask);
+}
+
+bool isLetterOrDigit(char character)
+{
+    return (character >= 'a' && character <= 'z') || (character >= 'A' && character <= 'Z')
+        || (character >= '0' && character <= '9');
+}
+
+} // namespace
+
+// A file key taken apart where that is simple: only known modifiers and "None" before the key.
+struct KeyMatcher::Parts
+{
+    bool isSimple = false;
+    unsigned int mask = 0;
+    const char *key = nullptr;
+    std::size_t keyLength = 0;
+
+    explicit Parts(const char *text)
+    {
+        const char *end = text + std::strlen(text);
+        if (*text == '"') {
+            ++text;
+            end -= end > text ? 1 : 0;
+        }
+        key = text;
+        for (const char *at = text; at != end; ++at) {
+            if (*at == ',' || static_cast<unsigned char>(*at) >= 0x80)
+                return;
+            if (*at != '+' && *at != '|')
+                continue;
+            const std::size_t length = std::size_t(at - key);
+            if (length != 4 || std::memcmp(key, "None", 4) != 0) {
+                const unsigned int bit = packedBit(key, length);
+                if (bit == noModifier)
+                    return;
+                mask |= bit;
+            }
+            key = at + 1;
+        }
+        keyLength = std::size_t(end - key);
+        isSimple = keyLength > 0;
+    }
+};
+
+KeyMatcher::KeyMatcher(const QKeySequence &wanted)
+    : m_wanted(wanted)
+{
+    if (wanted.count() != 1)
+        return;
+    m_wantedKey = wanted[0] & ~int(Qt::KeyboardModifierMask);
+    for (unsigned int packed = 0; packed < m_wantedMasks.size(); ++packed)
+        m_wantedMasks[packed] = qtModifiers(packed) == (wanted[0] & modifiersButKeypad);
+}
+
+bool KeyMatcher::matches(const char *fileKey) const
+{
+    const Parts parts(fileKey);
+    if (parts.isSimple) {
+        if (const std::optional<bool> decision = decideByParts(parts))
+            return *decision;
+        if (const std::optional<bool> decision = decideByCode(parts))
+            return *decision;
+    }
+    return matchesText(fileKey);
+}
+
+std::optional<bool> KeyMatcher::decideByParts(const Parts &parts) const
+{
+    // Without a comma it is one key at most.
+    if (m_wanted.count() != 1 || !m_wantedMasks[parts.mask])
+        return false;
+    const bool isOnKeypad = m_wanted[0] & int(Qt::KeypadModifier);
+    if (parts.keyLength == 1 && isLetterOrDigit(*parts.key))
+        return !isOnKeypad && m_wantedKey == (*parts.key >= 'a' ? *parts.key - 'a' + 'A' : *parts.key);
+    if (*parts.key == 'F' && (parts.keyLength == 2 || parts.keyLength == 3) && parts.key[1] >= '1'
+        && parts.key[1] <= '9') {
+        const int first = parts.key[1] - '0';
+        if (parts.keyLength == 2)
+            return !isOnKeypad && m_wantedKey == Qt::Key_F1 + first - 1;
+        const int number = first * 10 + parts.key[2] - '0';
+        if (parts.key[2] >= '0' && parts.key[2] <= '9' && number <= 35)
+            return !isOnKeypad && m_wantedKey == Qt::Key_F1 + number - 1;
+    }
+    return std::nullopt;
+}
+
+// By the key code, where its text is known to read back as the same one.
+std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
+{
+    const std::optional<int> code = KeyNames::codeFromKeyString(QByteArray(parts.key, int(parts.keyLength)));
+    if (!code || !KeyNames::readsBackUnchanged(*code))
+        return std::nullopt;
+    return m_wanted[0] == (*code | qtModifiers(parts.mask));
+}
+
+bool KeyMatcher::matchesText(const char *fileKey) const
+{
+    QString key = FileText::withoutQuotes(QString::fromUtf8(fileKey));
+    key.replace(QLatin1Char('|'), QLatin1Char('+'));
+    key.remove(QLatin1String("None+"));
+    const QString converted = VelKeyServer::KeyStringXToQt(key);
+    const QKeySequence sequence(converted.isEmpty() ? key : converted, QKeySequence::NativeText);
+    return KeySequences::isKnown(sequence) && sequence == m_wanted;
+}
