@@ -7,6 +7,9 @@
 
 #include <QDir>
 
+#include <pwd.h>
+#include <unistd.h>
+
 class DirsTest : public TestCase
 {
     Q_OBJECT
@@ -31,6 +34,8 @@ private Q_SLOTS:
     void desktopIsInTheHomeWithoutUserDirs();
     void desktopIsTheOneOfUserDirs_data();
     void desktopIsTheOneOfUserDirs();
+    void userDirsLieInTheConfigurationOfTheUser();
+    void theUserDataBaseKnowsTheHomeWhenNothingElseDoes();
     void picturesLieInTheDataDirectory();
     void picturesAreTheInstalledOnesOtherwise();
 };
@@ -172,6 +177,26 @@ void DirsTest::desktopIsTheOneOfUserDirs()
     if (expected.startsWith(QLatin1Char('~')))
         expected.replace(0, 1, folder());
     QCOMPARE(dir(VelDir::Desktop), expected);
+}
+
+void DirsTest::userDirsLieInTheConfigurationOfTheUser()
+{
+    write(QStringLiteral(".config/user-dirs.dirs"), "XDG_DESKTOP_DIR=\"/home's\"\n");
+    write(QStringLiteral("xdg/user-dirs.dirs"), "XDG_DESKTOP_DIR=\"/xdg's\"\n");
+    QCOMPARE(dir(VelDir::Desktop), QStringLiteral("/home's"));
+    setPath("XDG_CONFIG_HOME", path(QStringLiteral("xdg")));
+    QCOMPARE(dir(VelDir::Desktop), QStringLiteral("/xdg's"));
+}
+
+void DirsTest::theUserDataBaseKnowsTheHomeWhenNothingElseDoes()
+{
+    const QByteArray home = qgetenv("HOME");
+    qunsetenv("HOME");
+    const QString root = dir(VelDir::WindowManagerConfig);
+    qputenv("HOME", home);
+    const passwd *user = getpwuid(getuid());
+    QVERIFY(user);
+    QCOMPARE(root, QDir::cleanPath(QFile::decodeName(user->pw_dir) + QStringLiteral("/.config/vel")));
 }
 
 void DirsTest::picturesLieInTheDataDirectory()
