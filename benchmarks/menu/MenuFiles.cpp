@@ -26,20 +26,27 @@ QString fileName(int number)
     return QStringLiteral("entry%1.desktop").arg(number);
 }
 
+// Names and descriptions in 40 languages, as large as real ones.
+QByteArray translations()
+{
+    QByteArray bytes;
+    for (int language = 0; language < 40; ++language) {
+        const char code[] = {char('a' + language % 26), char('a' + language / 3), '\0'};
+        bytes += QByteArray("Name[") + code + "]=Programm mit einem Namen\n";
+        bytes += QByteArray("Comment[") + code + "]=Was das Programm so alles kann\n";
+    }
+    return bytes;
+}
+
 QByteArray entry(int number)
 {
     static const char *const icons[] = {"folder",       "edit-copy", "go-up",
                                         "document-new", "edit-find", "user-trash"};
-    const QByteArray text = QByteArray::number(number);
-    QByteArray bytes = "[Desktop Entry]\nType=Application\nVersion=1.5\nName=Program " + text + '\n';
-    for (int language = 0; language < 40; ++language) {
-        const char code[] = {char('a' + language % 26), char('a' + language / 3), '\0'};
-        bytes += "Name[" + QByteArray(code) + "]=Programm mit Namen " + text + '\n';
-        bytes += "Comment[" + QByteArray(code) + "]=Was das Programm so alles kann " + text + '\n';
-    }
-    bytes +=
-        "GenericName=Tool\nComment=What it does\nExec=true %f\nTerminal=false\nCategories=Utility;\nIcon=";
-    return bytes + icons[number % 6] + '\n';
+    static const QByteArray others = translations();
+    return "[Desktop Entry]\nType=Application\nVersion=1.5\nName=Program " + QByteArray::number(number) + '\n'
+        + others
+        + "GenericName=Tool\nComment=What it does\nExec=true %f\nTerminal=false\nCategories=Utility;\n"
+        + "Icon=" + icons[number % 6] + '\n';
 }
 
 } // namespace

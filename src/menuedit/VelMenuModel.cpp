@@ -11,6 +11,7 @@
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
+#include <QTimer>
 
 namespace {
 
@@ -22,23 +23,49 @@ constexpr int BaseColumns = 4;
 
 } // namespace
 
+/// Gives the icons of the menu, and lets the model read the rest of an entry with it: the base
+/// class asks for the icons of a whole folder before anyone asks for the first name.
+class VelMenuModel::IconProvider : public VelMimeTypeIconProvider
+{
+public:
+    explicit IconProvider(VelMenuModel *model)
+        : m_model(model)
+    {
+    }
+
+    using VelMimeTypeIconProvider::icon;
+    QIcon icon(const QFileInfo &info) const override
+    {
+        if (m_model && info.fileName().endsWith(EntrySuffix) && info.isFile())
+            m_model->readAlong(info.filePath());
+        return VelMimeTypeIconProvider::icon(info);
+    }
+
+private:
+    QPointer<VelMenuModel> m_model;
+};
+
 /// Keeps the icon provider, which the model uses but never deletes.
 class VelMenuModel::IconProviderKeeper : public QObject
 {
 public:
-    using QObject::QObject;
+    IconProviderKeeper(VelMenuModel *model, QObject *parent)
+        : QObject(parent)
+        , m_provider(model)
+    {
+    }
 
-    VelMimeTypeIconProvider *provider() { return &m_provider; }
+    IconProvider *provider() { return &m_provider; }
 
 private:
-    VelMimeTypeIconProvider m_provider;
+    IconProvider m_provider;
 };
 
 VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *menuView, QObject *parent)
     : QFileSystemModel(parent)
     , view(menuView)
     , rootDir(rootDirectory)
-    , m_keeper(new IconProviderKeeper(QCoreApplication::instance()))
+    , m_keeper(new IconProviderKeeper(this, QCoreApplication::instance()))
 {
     setIconProvider(m_keeper->provider());
     connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);
@@ -95,6 +122,7 @@ QString VelMenuModel::menuDirectory() const
 
 void VelMenuModel::forgetItemInfo(const QString &path)
 {
+    m_readAlong.remove(path);
     hiddenItems.remove(path);
     itemNames.remove(path);
     refreshRow(path);
@@ -110,17 +138,39 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 {
     const QString directoryFile = path + DirectorySuffix;
     const QString file = isFolder && QFileInfo::exists(directoryFile) ? directoryFile : path;
-    const bool isEntry = file.endsWith(EntrySuffix);
-    if (!isEntry && !file.endsWith(DirectorySuffix))
+    if (!file.endsWith(EntrySuffix) && !file.endsWith(DirectorySuffix))
         return false;
 
-    const VelUIDesktopEntry entry(file);
-    itemNames.insert(path, EntryName::of(entry));
-    VelUIDesktopEntry::DisplayableError reason = 0;
-    // Codes 1 and 3 hide; an entry that is left out of menus for another reason can be edited.
-    if (isEntry && !entry.isDisplayable(&reason) && (reason & ~2) == 1)
+    const auto known = m_readAlong.find(file);
+    const bool wasRead = known != m_readAlong.end();
+    const ItemInfo info = wasRead ? *known : readItemInfo(file);
+    if (wasRead)
+        m_readAlong.erase(known);
+    itemNames.insert(path, info.name);
+    if (info.isHidden)
         hiddenItems.insert(path, true);
     return true;
+}
+
+VelMenuModel::ItemInfo VelMenuModel::readItemInfo(const QString &file)
+{
+    const VelUIDesktopEntry entry(file);
+    ItemInfo info{EntryName::of(entry), false};
+    // Codes 1 and 3 hide; an entry that is left out of menus for another reason can be edited.
+    VelUIDesktopEntry::DisplayableError reason = 0;
+    if (file.endsWith(EntrySuffix) && !entry.isDisplayable(&reason))
+        info.isHidden = (reason & ~2) == 1;
+    return info;
+}
+
+// Reads an entry together with its icon, to be kept no longer than until the event loop turns.
+void VelMenuModel::readAlong(const QString &path)
+{
+    if (itemNames.contains(path))
+        return;
+    if (m_readAlong.isEmpty())
+        QTimer::singleShot(0, this, [this] { m_readAlong.clear(); });
+    m_readAlong.insert(path, readItemInfo(path));
 }
 
 QVariant VelMenuModel::displayName(const QModelIndex &index) const

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <QFileSystemModel>
+#include <QHash>
 #include <QMap>
 #include <QPointer>
 #include <QSet>
@@ -49,10 +50,19 @@ Q_SIGNALS:
     void changed();
 
 private:
+    class IconProvider;
     class IconProviderKeeper;
     struct Drop;
+    /// What is read of an entry.
+    struct ItemInfo
+    {
+        QString name;
+        bool isHidden;
+    };
 
+    static ItemInfo readItemInfo(const QString &file);
     bool loadItemInfo(const QString &path, bool isFolder) const;
+    void readAlong(const QString &path);
     QVariant displayName(const QModelIndex &index) const;
     bool isHidden(const QModelIndex &index) const;
 
@@ -75,6 +85,8 @@ private:
     mutable QMap<QString, bool> hiddenItems;
     // Rows that were edited here: the base class keeps the icon it has, this model asks anew.
     QSet<QString> m_editedRows;
+    // What was read while the base class asked for icons, until it has told of the rows.
+    mutable QHash<QString, ItemInfo> m_readAlong;
     bool m_isCompleting = false;
     QPointer<IconProviderKeeper> m_keeper;
 };

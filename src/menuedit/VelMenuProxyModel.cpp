@@ -16,6 +16,7 @@
 struct VelMenuProxyModel::Folder
 {
     QString path;
+    bool isInMenu; ///< and so are all its children
     bool isRecents;
     std::optional<SortOrder::Index> order;
 };
@@ -107,6 +108,11 @@ bool VelMenuProxyModel::lessThan(const QModelIndex &left, const QModelIndex &rig
     return QString::localeAwareCompare(displayNameOf(leftRow, left), displayNameOf(rightRow, right)) >= 0;
 }
 
+bool VelMenuProxyModel::isInMenu(const QString &path) const
+{
+    return path.startsWith(m_menuDirectory) || path.endsWith(QLatin1String("/autostart"));
+}
+
 VelMenuProxyModel::Row &VelMenuProxyModel::rowOf(const QModelIndex &index) const
 {
     const auto known = m_rows.find(index.internalId());
@@ -116,8 +122,7 @@ VelMenuProxyModel::Row &VelMenuProxyModel::rowOf(const QModelIndex &index) const
     Row row{};
     row.folder = &folderOf(index);
     row.fileName = index.data(QFileSystemModel::FileNameRole).toString();
-    const QString path = m_files->filePath(index);
-    row.isInMenu = path.startsWith(m_menuDirectory) || path.endsWith(QLatin1String("/autostart"));
+    row.isInMenu = row.folder->isInMenu || isInMenu(m_files->filePath(index));
     row.isFolder = m_files->isDir(index);
     if (row.folder->isRecents)
         row.modified = m_files->lastModified(index).toMSecsSinceEpoch();
@@ -130,7 +135,8 @@ VelMenuProxyModel::Folder &VelMenuProxyModel::folderOf(const QModelIndex &index)
     const auto known = m_folders.find(parent.internalId());
     if (known != m_folders.end())
         return known->second;
-    Folder folder{m_files->filePath(parent),
+    const QString path = m_files->filePath(parent);
+    Folder folder{path, path.startsWith(m_menuDirectory),
                   parent.data(QFileSystemModel::FileNameRole) == QLatin1String("recents"), std::nullopt};
     return m_folders.emplace(parent.internalId(), std::move(folder)).first->second;
 }

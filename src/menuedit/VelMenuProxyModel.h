@@ -51,6 +51,7 @@ private:
     void dropUnnamedRows();
     void dropAll();
 
+    bool isInMenu(const QString &path) const;
     Row &rowOf(const QModelIndex &index) const;
     Folder &folderOf(const QModelIndex &index) const;
     QStringList sortOrderOf(const QString &folderPath) const;
