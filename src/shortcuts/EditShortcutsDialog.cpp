@@ -19,7 +19,6 @@
 #include <QPushButton>
 #include <QRadioButton>
 #include <QSignalBlocker>
-#include <QTimer>
 
 EditShortcutsDialog::EditShortcutsDialog(ShortcutsModel *model, QWidget *parent)
     : QDialog(parent)
@@ -79,6 +78,7 @@ void EditShortcutsDialog::checkEnteredKeySequence(QKeySequence key)
         d->showKey(d->treeView->currentKeySequence());
         return;
     }
+    d->isRecording = false;
     const ShortcutConflict conflict = ShortcutConflict::find(*d->model, key);
     if (conflict.kind != ShortcutConflict::None) {
         const QPointer<EditShortcutsDialog> guard(this);
@@ -190,9 +190,11 @@ bool EditShortcutsDialog::eventFilter(QObject *watched, QEvent *event)
         // These two move the focus and record nothing.
         if (key != Qt::Key_Tab && key != Qt::Key_Backtab)
             d->isRecording = true;
-    } else if (watched == d->keyWidget && event->type() == QEvent::FocusOut) {
-        // After the editor itself has ended its recording.
-        QTimer::singleShot(0, this, [this] { d->endRecording(); });
+    } else if (watched == d->keyWidget && event->type() == QEvent::FocusOut
+               && static_cast<QFocusEvent *>(event)->reason() != Qt::PopupFocusReason) {
+        // The editor itself would wait a second for one more chord, while the user goes on to
+        // another row or to Ok.
+        d->endRecording();
     }
     return QDialog::eventFilter(watched, event);
 }

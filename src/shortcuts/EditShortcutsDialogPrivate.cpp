@@ -172,7 +172,9 @@ void EditShortcutsDialogPrivate::endRecording()
 {
     if (!isRecording)
         return;
-    isRecording = false;
-    if (keyWidget->keySequence().isEmpty())
-        showKey(treeView->currentKeySequence());
+    const QKeySequence key = keyWidget->keySequence();
+    const bool hasKey = !key.isEmpty() && treeView->isShortcutCurrent();
+    showKey(hasKey ? key : treeView->currentKeySequence());
+    if (hasKey)
+        q->checkEnteredKeySequence(key);
 }

@@ -43,7 +43,7 @@ public:
     void reportConflict(const ShortcutConflict &conflict, const QKeySequence &key);
     /// What the user wants with the edits when the window is closed.
     QMessageBox::StandardButton askWhetherToApply();
-    /// The key editor is done; when it recorded no key, it shows the old one again.
+    /// Takes the key recorded so far; when there is none, the editor shows the old one again.
     void endRecording();
 
     EditShortcutsDialog *const q;
