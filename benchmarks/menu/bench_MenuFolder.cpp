@@ -120,7 +120,8 @@ double openKDirModel(const Directory &directory)
     tree.setModel(&proxy);
     for (int column = 1; column < proxy.columnCount(); ++column)
         tree.hideColumn(column);
-    model.openUrl(QUrl::fromLocalFile(directory.path));
+    // Without Reload it would show what it has kept from the round before.
+    model.openUrl(QUrl::fromLocalFile(directory.path), KDirModel::Reload);
     const double time = settle(
         tree, proxy, [] { return QModelIndex(); }, directory);
     tree.setModel(nullptr);

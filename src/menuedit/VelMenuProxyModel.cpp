@@ -12,6 +12,12 @@
 
 #include <optional>
 
+namespace {
+
+constexpr int ManyRows = 200;
+
+} // namespace
+
 /// What is the same for all children of a folder.
 struct VelMenuProxyModel::Folder
 {
@@ -54,11 +60,15 @@ void VelMenuProxyModel::setSourceModel(QAbstractItemModel *model)
     if (m_files)
         watch(model);
     QSortFilterProxyModel::setSourceModel(model);
+    // And behind it, to end what was begun before.
+    if (m_files)
+        connect(model, &QAbstractItemModel::rowsInserted, this, &VelMenuProxyModel::endManyRows);
 }
 
 void VelMenuProxyModel::watch(QAbstractItemModel *model)
 {
     connect(model, &QAbstractItemModel::dataChanged, this, &VelMenuProxyModel::dropRows);
+    connect(model, &QAbstractItemModel::rowsAboutToBeInserted, this, &VelMenuProxyModel::beginManyRows);
     connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuProxyModel::dropAll);
     connect(model, &QAbstractItemModel::rowsRemoved, this, &VelMenuProxyModel::dropAll);
     connect(model, &QAbstractItemModel::modelAboutToBeReset, this, &VelMenuProxyModel::dropAll);
@@ -185,4 +195,23 @@ void VelMenuProxyModel::dropAll()
 {
     m_rows.clear();
     m_folders.clear();
+}
+
+// Sorted in one by one, many new rows of a folder make the base class renumber all of its
+// rows again and again. They are put at the end instead and sorted at once.
+void VelMenuProxyModel::beginManyRows(const QModelIndex &parent, int first, int last)
+{
+    Q_UNUSED(parent)
+    if (!dynamicSortFilter() || last - first < ManyRows)
+        return;
+    m_isTakingMany = true;
+    setDynamicSortFilter(false);
+}
+
+void VelMenuProxyModel::endManyRows()
+{
+    if (!m_isTakingMany)
+        return;
+    m_isTakingMany = false;
+    setDynamicSortFilter(true);
 }

@@ -50,6 +50,8 @@ private:
     void dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight);
     void dropUnnamedRows();
     void dropAll();
+    void beginManyRows(const QModelIndex &parent, int first, int last);
+    void endManyRows();
 
     bool isInMenu(const QString &path) const;
     Row &rowOf(const QModelIndex &index) const;
@@ -62,6 +64,7 @@ private:
 
     VelMenuModel *m_files = nullptr;
     QString m_menuDirectory;
+    bool m_isTakingMany = false;
     mutable std::unordered_map<quintptr, Folder> m_folders;
     mutable std::unordered_map<quintptr, Row> m_rows;
 };

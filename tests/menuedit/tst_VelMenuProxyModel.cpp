@@ -34,6 +34,7 @@ private Q_SLOTS:
     void keepsTheListUntilItIsInvalidated();
     void comparesByFileNameNotByWhatIsShown();
     void putsANewFileInItsPlace();
+    void sortsManyRowsThatComeAtOnce();
     void followsAnEditedName();
     void followsARenamedFile();
     void followsAChangedTime();
@@ -273,6 +274,32 @@ void tst_VelMenuProxyModel::putsANewFileInItsPlace()
     QTRY_COMPARE(order(), words("c b a"));
     write(QStringLiteral("new"), "b");
     QTRY_COMPARE(order(), words("c b a new"));
+}
+
+void tst_VelMenuProxyModel::sortsManyRowsThatComeAtOnce()
+{
+    QStringList expected;
+    for (int i = 0; i < 1500; ++i) {
+        expected.append(QStringLiteral("f%1.desktop").arg(i));
+        write(expected.last(), entry("Name=N" + QByteArray::number(10000 + i) + '\n'));
+    }
+    show(folder());
+    OnlyBelow below(m_proxy.get(), folder());
+    const QAbstractItemModelTester tester(&below, QAbstractItemModelTester::FailureReportingMode::Fatal);
+    bool isSorted = true;
+    // Nobody sees them in another order, not even for a moment.
+    connect(m_model.get(), &QAbstractItemModel::rowsInserted, this, [&] {
+        isSorted = isSorted && m_proxy->dynamicSortFilter();
+        const QStringList names = order();
+        for (int i = 1; i < names.size(); ++i)
+            isSorted = isSorted && expected.indexOf(names.at(i - 1)) < expected.indexOf(names.at(i));
+    });
+
+    QVERIFY(wait(QString(), 1500));
+
+    QVERIFY(isSorted);
+    QCOMPARE(order(), expected);
+    QVERIFY(m_proxy->dynamicSortFilter());
 }
 
 void tst_VelMenuProxyModel::followsAnEditedName()
