@@ -19,8 +19,8 @@
  *
  * GKeyFile takes lang@MODIFIER before lang_COUNTRY, the standard and the record the other way
  * round; it takes the unlocalised value where there is no other, the record gives none; and it
- * has no value for an escape it does not know, where the record keeps the escape. Everything
- * else has to be the same.
+ * has no value for an escape it does not know, where the record keeps the escape; and it refuses
+ * a file for one bad line. Everything else has to be the same.
  */
 class tst_DesktopEntryCorpus : public TestCase
 {
@@ -173,10 +173,14 @@ void tst_DesktopEntryCorpus::givesTheValuesOfGKeyFile()
     int values = 0;
     int otherOrder = 0;
     int unknownEscapes = 0;
+    int refused = 0;
     for (const QString &path : m_files) {
         const KeyFile peer = keyFile(path);
         const VelUIDesktopEntry record(path);
-        QVERIFY2(peer, qPrintable(path));
+        if (!peer) {
+            ++refused;
+            continue;
+        }
         QCOMPARE(record.isValid(), bool(g_key_file_has_group(peer.get(), main.constData())));
 
         const auto compare = [&](const QByteArray &group, const QByteArray &key, const QString &value) {
@@ -242,8 +246,10 @@ void tst_DesktopEntryCorpus::givesTheValuesOfGKeyFile()
         QCOMPARE(ids, list("Actions"));
     }
     qInfo(
-        "%d values compared, %d chosen in the standard's order, %d with escapes that GKeyFile does not know",
-        values, otherOrder, unknownEscapes);
+        "%d values compared, %d chosen in the standard's order, %d with escapes that GKeyFile does not know, "
+        "%d files that it refuses as a whole",
+        values, otherOrder, unknownEscapes, refused);
+    QVERIFY(refused * 50 < m_files.size());
 }
 
 void tst_DesktopEntryCorpus::leavesEveryFileUntouchedWhenNothingChanges()

@@ -20,22 +20,20 @@ bool isBlank(char c)
 
 } // namespace
 
-DesktopEntryText::DesktopEntryText(std::string bytes)
+DesktopEntryText::DesktopEntryText(QByteArray bytes)
     : m_bytes(std::move(bytes))
 {
-    index();
 }
 
 void DesktopEntryText::index()
 {
-    const std::size_t size = m_bytes.size();
+    const auto size = std::size_t(m_bytes.size());
     m_keys.reserve(size / UsualLine + 1);
     m_tags.reserve(size / UsualLine + 1);
     m_groups.reserve(4);
 
-    const char *const data = m_bytes.data();
-    std::size_t begin =
-        m_bytes.compare(0, ByteOrderMark.size(), ByteOrderMark) == 0 ? ByteOrderMark.size() : 0;
+    const char *const data = m_bytes.constData();
+    std::size_t begin = bytes().substr(0, ByteOrderMark.size()) == ByteOrderMark ? ByteOrderMark.size() : 0;
     while (begin < size) {
         const auto *const feed = static_cast<const char *>(std::memchr(data + begin, '\n', size - begin));
         std::size_t end = feed ? std::size_t(feed - data) : size;
@@ -52,12 +50,13 @@ void DesktopEntryText::index()
 
 void DesktopEntryText::addLine(std::uint32_t begin, std::uint32_t end, std::uint32_t next)
 {
+    const char *const data = m_bytes.constData();
     std::uint32_t first = begin;
-    while (first < end && isBlank(m_bytes[first]))
+    while (first < end && isBlank(data[first]))
         ++first;
-    if (first == end || m_bytes[first] == '#')
+    if (first == end || data[first] == '#')
         return;
-    if (m_bytes[first] == '[')
+    if (data[first] == '[')
         addHeader(begin, first, end, next);
     else if (!m_groups.empty())
         addKey(begin, first, end, next);
@@ -69,15 +68,16 @@ void DesktopEntryText::addHeader(std::uint32_t begin, std::uint32_t open, std::u
     if (!m_groups.empty())
         m_groups.back().endKey = std::uint32_t(m_keys.size());
 
+    const char *const data = m_bytes.constData();
     std::uint32_t close = end;
-    while (close > open && isBlank(m_bytes[close - 1]))
+    while (close > open && isBlank(data[close - 1]))
         --close;
     const std::uint32_t name = open + 1;
     std::uint32_t length = 0;
-    if (m_bytes[close - 1] == ']' && close - 1 > name)
+    if (data[close - 1] == ']' && close - 1 > name)
         length = close - 1 - name;
     // A bracket inside makes the line unclear: it still ends the group above it.
-    if (std::memchr(m_bytes.data() + name, ']', length))
+    if (std::memchr(data + name, ']', length))
         length = 0;
     const auto keys = std::uint32_t(m_keys.size());
     m_groups.push_back({begin, name, length, next, keys, keys});
@@ -85,7 +85,7 @@ void DesktopEntryText::addHeader(std::uint32_t begin, std::uint32_t open, std::u
 
 void DesktopEntryText::addKey(std::uint32_t begin, std::uint32_t name, std::uint32_t end, std::uint32_t next)
 {
-    const char *const data = m_bytes.data();
+    const char *const data = m_bytes.constData();
     const auto *const equals = static_cast<const char *>(std::memchr(data + name, '=', end - name));
     if (!equals || equals == data + name)
         return;
@@ -107,7 +107,7 @@ void DesktopEntryText::addKey(std::uint32_t begin, std::uint32_t name, std::uint
         }
     }
     m_keys.push_back(key);
-    m_tags.push_back(tag(keyName(key), key.localeLength != 0));
+    m_tags.push_back(tag(keyName(key), locale(key)));
 }
 
 void DesktopEntryText::indexGroups()
@@ -124,6 +124,7 @@ int DesktopEntryText::group(std::string_view name) const
 {
     if (name.empty())
         return NoGroup;
+    makeIndex();
     if (!m_groupByName.empty()) {
         const auto found = m_groupByName.find(name);
         return found == m_groupByName.end() ? NoGroup : found->second;
@@ -140,7 +141,7 @@ const DesktopEntryText::Key *DesktopEntryText::key(int group, std::string_view n
 {
     if (group == NoGroup || name.empty())
         return nullptr;
-    const std::uint32_t wanted = tag(name, !locale.empty());
+    const Tag wanted = tag(name, locale);
     const Group &place = m_groups[std::size_t(group)];
     for (std::uint32_t i = place.endKey; i > place.firstKey; --i) {
         if (m_tags[i - 1] != wanted)
@@ -154,7 +155,8 @@ const DesktopEntryText::Key *DesktopEntryText::key(int group, std::string_view n
 
 std::size_t DesktopEntryText::cost() const
 {
-    return sizeof(*this) + m_bytes.capacity() + m_groups.capacity() * sizeof(Group)
+    makeIndex();
+    return sizeof(*this) + std::size_t(m_bytes.size()) + m_groups.capacity() * sizeof(Group)
         + m_keys.capacity() * sizeof(Key) + m_tags.capacity() * sizeof(std::uint32_t)
         + m_groupByName.size() * 4 * sizeof(void *);
 }

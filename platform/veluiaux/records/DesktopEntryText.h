@@ -3,7 +3,10 @@
 
 #pragma once
 
+#include <QByteArray>
+
 #include <cstdint>
+#include <mutex>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -12,9 +15,10 @@
 /**
  * The bytes of one desktop entry file and the places of its groups and keys.
  *
- * Immutable once made, so any number of records and threads may share one. Nothing of the
- * file is lost or judged: lines that are neither key, header, comment nor blank simply have
- * no place in the index. Values stay as they stand in the file (see DesktopEntryValue).
+ * Immutable, so any number of records and threads may share one; the index is made when it is
+ * first asked for. Nothing of the file is lost or judged: lines that are neither key, header,
+ * comment nor blank simply have no place in the index. Values stay as they stand in the file
+ * (see DesktopEntryValue).
  */
 class DesktopEntryText
 {
@@ -44,14 +48,21 @@ public:
 
     static constexpr int NoGroup = -1;
 
-    DesktopEntryText() = default;
-    explicit DesktopEntryText(std::string bytes);
+    explicit DesktopEntryText(QByteArray bytes = {});
     DesktopEntryText(const DesktopEntryText &) = delete;
     DesktopEntryText &operator=(const DesktopEntryText &) = delete;
 
-    const std::string &bytes() const { return m_bytes; }
-    const std::vector<Group> &groups() const { return m_groups; }
-    const std::vector<Key> &keys() const { return m_keys; }
+    std::string_view bytes() const { return {m_bytes.constData(), std::size_t(m_bytes.size())}; }
+    const std::vector<Group> &groups() const
+    {
+        makeIndex();
+        return m_groups;
+    }
+    const std::vector<Key> &keys() const
+    {
+        makeIndex();
+        return m_keys;
+    }
 
     std::string_view groupName(const Group &group) const { return view(group.name, group.nameLength); }
     std::string_view keyName(const Key &key) const { return view(key.key, key.keyLength); }
@@ -67,16 +78,19 @@ public:
     /// The key line that counts: the last one of that name in the group, or null.
     const Key *key(int group, std::string_view name, std::string_view locale = {}) const;
 
-    /// Calls \a visit(Key) for each localised line of \a name in the group, in the file's order.
+    /// Calls \a visit(Key) for each line of \a name in the group that has a language, in the
+    /// file's order; only those whose language begins like \a language, if that is given.
     template <typename Visitor>
-    void forEachVariant(int group, std::string_view name, Visitor visit) const
+    void forEachVariant(int group, std::string_view name, Visitor visit, std::string_view language = {}) const
     {
         if (group == NoGroup)
             return;
-        const std::uint32_t wanted = tag(name, true);
+        const bool anyLanguage = language.size() < 2;
+        const Tag mask = anyLanguage ? NameBits : ~Tag(0);
+        const Tag wanted = tag(name, language) & mask;
         const Group &place = m_groups[std::size_t(group)];
         for (std::uint32_t i = place.firstKey; i < place.endKey; ++i) {
-            if (m_tags[i] == wanted && keyName(m_keys[i]) == name)
+            if ((m_tags[i] & mask) == wanted && m_keys[i].localeLength && keyName(m_keys[i]) == name)
                 visit(m_keys[i]);
         }
     }
@@ -85,29 +99,39 @@ public:
     std::size_t cost() const;
 
 private:
+    // A few bits that nearly always tell two keys apart, so that a look-up is a walk over one
+    // short array of numbers: length, first and last byte of the name, begin of the language.
+    using Tag = std::uint64_t;
+    static constexpr Tag NameBits = 0xffffffffU;
+
+    static Tag tag(std::string_view name, std::string_view locale)
+    {
+        const auto byte = [](char c) { return Tag(static_cast<unsigned char>(c)); };
+        Tag tag = Tag(name.size() & 0xffff) << 16 | byte(name.front()) << 8 | byte(name.back());
+        if (!locale.empty())
+            tag |= byte(locale[0]) << 40 | (locale.size() > 1 ? byte(locale[1]) << 32 : 0);
+        return tag;
+    }
+
     std::string_view view(std::uint32_t at, std::uint32_t length) const
     {
-        return {m_bytes.data() + at, length};
+        return {m_bytes.constData() + at, length};
     }
 
-    // A few bits that nearly always tell two key names apart, so that a look-up is a walk
-    // over one short array of numbers.
-    static std::uint32_t tag(std::string_view name, bool localised)
+    void makeIndex() const
     {
-        return (localised ? 0x80000000U : 0U) | (std::uint32_t(name.size() & 0x7fff) << 16)
-            | (std::uint32_t(static_cast<unsigned char>(name.front())) << 8)
-            | std::uint32_t(static_cast<unsigned char>(name.back()));
+        std::call_once(m_indexed, [this] { const_cast<DesktopEntryText *>(this)->index(); });
     }
-
     void index();
     void addLine(std::uint32_t begin, std::uint32_t end, std::uint32_t next);
     void addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end, std::uint32_t next);
     void addKey(std::uint32_t begin, std::uint32_t name, std::uint32_t end, std::uint32_t next);
     void indexGroups();
 
-    std::string m_bytes;
+    const QByteArray m_bytes;
+    mutable std::once_flag m_indexed;
     std::vector<Group> m_groups;
     std::vector<Key> m_keys;
-    std::vector<std::uint32_t> m_tags;
+    std::vector<Tag> m_tags;
     std::unordered_map<std::string_view, int> m_groupByName; ///< only where there are many
 };

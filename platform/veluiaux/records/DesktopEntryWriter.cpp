@@ -71,7 +71,7 @@ public:
     {
     }
 
-    std::string run();
+    QByteArray run();
 
 private:
     bool survives(const Text::Group &group) const { return !m_changes.isRemoved(m_text.groupName(group)); }
@@ -85,7 +85,7 @@ private:
     void insertNewKeys();
     void insertNewGroups();
     std::size_t newGroupPlace(const std::string &name, bool *beforeOthers) const;
-    std::string join();
+    QByteArray join();
 
     const Text &m_text;
     const DesktopEntryChanges &m_changes;
@@ -96,7 +96,7 @@ private:
     std::unordered_map<std::string, std::size_t> m_newGroupOf;
 };
 
-std::string Writer::run()
+QByteArray Writer::run()
 {
     removeGroups();
     // A new file starts with the main group, also where it has no key.
@@ -241,31 +241,34 @@ void Writer::insertNewGroups()
     }
 }
 
-std::string Writer::join()
+QByteArray Writer::join()
 {
     std::stable_sort(m_splices.begin(), m_splices.end(), [](const Splice &a, const Splice &b) {
         return a.at != b.at ? a.at < b.at : a.rank < b.rank;
     });
-    const std::string &old = m_text.bytes();
-    std::string result;
-    result.reserve(old.size() + 256);
+    const std::string_view old = m_text.bytes();
+    const auto begin = int(m_lines.begin());
+    QByteArray result;
+    result.reserve(int(old.size()) + 256);
+    const auto append = [&result](std::string_view bytes) { result.append(bytes.data(), int(bytes.size())); };
     std::size_t done = 0;
     for (const Splice &splice : m_splices) {
         if (splice.at > done) {
-            result.append(old, done, splice.at - done);
+            append(old.substr(done, splice.at - done));
             done = splice.at;
         }
-        if (splice.isLine && result.size() > m_lines.begin() && result.back() != '\n')
-            result += m_lines.lineEndAt(splice.at);
-        result += splice.inserted;
+        if (splice.isLine && result.size() > begin && !result.endsWith('\n'))
+            append(m_lines.lineEndAt(splice.at));
+        append(splice.inserted);
         done = std::max(done, splice.at + splice.removed);
     }
-    return result.append(old, done, std::string::npos);
+    append(old.substr(done));
+    return result;
 }
 
 } // namespace
 
-std::string DesktopEntryWriter::apply(const DesktopEntryText &text, const DesktopEntryChanges &changes)
+QByteArray DesktopEntryWriter::apply(const DesktopEntryText &text, const DesktopEntryChanges &changes)
 {
     return Writer(text, changes).run();
 }

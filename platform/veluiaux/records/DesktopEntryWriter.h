@@ -6,7 +6,7 @@
 #include "DesktopEntryChanges.h"
 #include "DesktopEntryText.h"
 
-#include <string>
+#include <QByteArray>
 
 /**
  * Makes the bytes of a file out of its old text and what a record changed.
@@ -17,6 +17,6 @@
  */
 namespace DesktopEntryWriter {
 
-std::string apply(const DesktopEntryText &text, const DesktopEntryChanges &changes);
+QByteArray apply(const DesktopEntryText &text, const DesktopEntryChanges &changes);
 
 } // namespace DesktopEntryWriter

@@ -116,9 +116,10 @@ std::optional<T> EntryDocument::readLocal(std::string_view group, std::string_vi
 {
     const MessageLocale messages = MessageLocale::current();
     Value byRank[MessageLocale::BestRank + 1];
-    m_text->forEachVariant(baseGroup(group), key, [&](const DesktopEntryText::Key &variant) {
+    const auto note = [&](const DesktopEntryText::Key &variant) {
         byRank[messages.rank(m_text->locale(variant))] = m_text->value(variant);
-    });
+    };
+    m_text->forEachVariant(baseGroup(group), key, note, messages.language());
     for (int rank = MessageLocale::BestRank; rank > 0; --rank) {
         if (!m_changes.isEmpty()) {
             const std::string wanted = messages.keyLocale(rank);
@@ -345,20 +346,21 @@ bool EntryDocument::save()
         const auto file = EntryFile::readAnew(target);
         if (!file)
             return false;
-        text = file->text;
+        if (file->text->bytes() != text->bytes())
+            text = file->text;
     }
     return replace(target, DesktopEntryWriter::apply(*text, m_changes));
 }
 
-bool EntryDocument::replace(const QByteArray &target, std::string bytes)
+bool EntryDocument::replace(const QByteArray &target, const QByteArray &bytes)
 {
     // A larger one could not be read again.
-    if (std::int64_t(bytes.size()) > EntryFile::LargestSize)
+    if (bytes.size() > EntryFile::LargestSize)
         return false;
-    const auto stamp = AtomicFile::replace(target, bytes);
+    const auto stamp = AtomicFile::replace(target, {bytes.constData(), std::size_t(bytes.size())});
     if (!stamp)
         return false;
-    m_text = std::make_shared<DesktopEntryText>(std::move(bytes));
+    m_text = std::make_shared<DesktopEntryText>(bytes);
     m_stamp = *stamp;
     m_settled = false;
     m_read = true;

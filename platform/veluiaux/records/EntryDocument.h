@@ -87,7 +87,7 @@ private:
     void writeLocal(std::string_view group, std::string_view key, const T &value);
 
     bool isFromPath() const { return m_read && m_textPath == m_path; }
-    bool replace(const QByteArray &target, std::string bytes);
+    bool replace(const QByteArray &target, const QByteArray &bytes);
 
     QByteArray m_path;
     std::shared_ptr<const DesktopEntryText> m_text; ///< never null

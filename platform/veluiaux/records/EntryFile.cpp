@@ -24,25 +24,25 @@ std::int64_t nanoseconds(const timespec &time)
 }
 
 // Reads until the end, or until there is more than a desktop entry may have.
-bool readAll(int file, std::size_t expected, std::string *bytes)
+bool readAll(int file, int expected, QByteArray *bytes)
 {
     // One byte more than expected: the read that fills less has met the end.
-    bytes->resize(expected + 1);
-    std::size_t done = 0;
+    *bytes = QByteArray(expected + 1, Qt::Uninitialized);
+    int done = 0;
     for (;;) {
-        const ssize_t count = ::read(file, bytes->data() + done, bytes->size() - done);
+        const ssize_t count = ::read(file, bytes->data() + done, std::size_t(bytes->size() - done));
         if (count < 0 && errno == EINTR)
             continue;
         if (count < 0)
             return false;
-        done += std::size_t(count);
+        done += int(count);
         if (done < bytes->size())
             break;
-        if (done > std::size_t(EntryFile::LargestSize))
+        if (done > EntryFile::LargestSize)
             return false;
         bytes->resize(done + 4096);
     }
-    bytes->resize(done);
+    bytes->truncate(done);
     return true;
 }
 
@@ -85,10 +85,10 @@ std::optional<EntryFile> EntryFile::readAnew(const QByteArray &path)
     EntryFile result;
     result.stamp = FileStamp(status);
     result.settled = result.stamp.isSettled();
-    std::string bytes;
-    if (!readAll(file.get(), std::size_t(status.st_size), &bytes) || std::int64_t(bytes.size()) > LargestSize)
+    QByteArray bytes;
+    if (!readAll(file.get(), int(status.st_size), &bytes) || bytes.size() > LargestSize)
         return std::nullopt;
-    result.settled = result.settled && std::int64_t(bytes.size()) == result.stamp.size;
+    result.settled = result.settled && bytes.size() == result.stamp.size;
     result.text = std::make_shared<DesktopEntryText>(std::move(bytes));
     return result;
 }

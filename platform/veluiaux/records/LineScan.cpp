@@ -3,9 +3,9 @@
 
 #include "LineScan.h"
 
-LineScan::LineScan(const std::string &text)
+LineScan::LineScan(std::string_view text)
     : m_text(text)
-    , m_begin(text.compare(0, 3, "\xEF\xBB\xBF") == 0 ? 3 : 0)
+    , m_begin(text.substr(0, 3) == "\xEF\xBB\xBF" ? 3 : 0)
 {
 }
 
@@ -14,13 +14,13 @@ std::size_t LineScan::lineAbove(std::size_t line) const
     if (line < m_begin + 2)
         return m_begin;
     const std::size_t feed = m_text.rfind('\n', line - 2);
-    return feed == std::string::npos || feed + 1 < m_begin ? m_begin : feed + 1;
+    return feed == std::string_view::npos || feed + 1 < m_begin ? m_begin : feed + 1;
 }
 
 LineScan::Kind LineScan::kind(std::size_t line, std::size_t end) const
 {
     const std::size_t first = m_text.find_first_not_of(" \t\r\n", line);
-    if (first == std::string::npos || first >= end)
+    if (first == std::string_view::npos || first >= end)
         return Kind::Blank;
     return m_text[first] == '#' ? Kind::Comment : Kind::Other;
 }
@@ -49,10 +49,10 @@ std::size_t LineScan::contentEnd(std::size_t end) const
 
 std::string LineScan::lineEndAt(std::size_t at) const
 {
-    std::size_t feed = at > 0 ? m_text.rfind('\n', at - 1) : std::string::npos;
-    if (feed == std::string::npos)
+    std::size_t feed = at > 0 ? m_text.rfind('\n', at - 1) : std::string_view::npos;
+    if (feed == std::string_view::npos)
         feed = m_text.find('\n');
-    if (feed == std::string::npos)
+    if (feed == std::string_view::npos)
         return "\n";
     return feed > 0 && m_text[feed - 1] == '\r' ? "\r\n" : "\n";
 }

@@ -5,13 +5,14 @@
 
 #include <cstddef>
 #include <string>
+#include <string_view>
 
 /// Answers about the lines of a text that no index keeps, because only writing asks for them.
 class LineScan
 {
 public:
-    /// \a text has to outlive this object.
-    explicit LineScan(const std::string &text);
+    /// The bytes of \a text have to outlive this object.
+    explicit LineScan(std::string_view text);
 
     /// The first byte behind a byte order mark.
     std::size_t begin() const { return m_begin; }
@@ -30,6 +31,6 @@ private:
     std::size_t lineAbove(std::size_t line) const;
     Kind kind(std::size_t line, std::size_t end) const;
 
-    const std::string &m_text;
+    std::string_view m_text;
     std::size_t m_begin;
 };

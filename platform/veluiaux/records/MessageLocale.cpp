@@ -3,14 +3,33 @@
 
 #include "MessageLocale.h"
 
-#include <cstdlib>
+#include <unistd.h>
+
+#include <iterator>
+
+namespace {
+
+// By rank; the first that is set and not empty counts.
+constexpr std::string_view Variables[] = {"LC_ALL=", "LC_MESSAGES=", "LANG="};
+
+} // namespace
 
 MessageLocale MessageLocale::current()
 {
-    for (const char *variable : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
-        const char *const text = std::getenv(variable);
-        if (text && *text)
-            return MessageLocale(text);
+    // One walk over the environment instead of three: this runs for every local value.
+    std::string_view values[std::size(Variables)];
+    for (char **entry = ::environ; entry && *entry; ++entry) {
+        if (**entry != 'L')
+            continue;
+        const std::string_view assignment(*entry);
+        for (std::size_t i = 0; i < std::size(Variables); ++i) {
+            if (values[i].empty() && assignment.substr(0, Variables[i].size()) == Variables[i])
+                values[i] = assignment.substr(Variables[i].size());
+        }
+    }
+    for (const std::string_view value : values) {
+        if (!value.empty())
+            return MessageLocale(value);
     }
     return MessageLocale({});
 }

@@ -25,6 +25,9 @@ public:
     /// The locale written as "lang_COUNTRY.ENCODING@MODIFIER", all but the first optional.
     explicit MessageLocale(std::string_view text);
 
+    /// The language without country and modifier.
+    std::string_view language() const { return m_language; }
+
     /// How well \a keyLocale fits: lang_COUNTRY@MODIFIER 4, lang_COUNTRY 3, lang@MODIFIER 2, lang 1, else 0.
     int rank(std::string_view keyLocale) const;
 
