@@ -141,6 +141,7 @@ const DesktopEntryText::Key *DesktopEntryText::key(int group, std::string_view n
 {
     if (group == NoGroup || name.empty())
         return nullptr;
+    makeIndex();
     const Tag wanted = tag(name, locale);
     const Group &place = m_groups[std::size_t(group)];
     for (std::uint32_t i = place.endKey; i > place.firstKey; --i) {

@@ -85,6 +85,7 @@ public:
     {
         if (group == NoGroup)
             return;
+        makeIndex();
         const bool anyLanguage = language.size() < 2;
         const Tag mask = anyLanguage ? NameBits : ~Tag(0);
         const Tag wanted = tag(name, language) & mask;

@@ -1,0 +1,165 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "TestCase.h"
+
+#include <DesktopEntryChanges.h>
+#include <DesktopEntryText.h>
+#include <DesktopEntryWriter.h>
+#include <MessageLocale.h>
+#include <ProgramSearch.h>
+
+#include <QElapsedTimer>
+#include <QMap>
+
+#include <random>
+
+/// The parts of the text engine, each by itself.
+class tst_DesktopEntryText : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void findsTheSameAsAPlainWalkOverTheLines();
+    void findsAGroupAmongThousands();
+    void tellsVariantsOfOneKeyApart();
+    void forgetsChangesOfRemovedGroups();
+    void keepsTheOrderOfTheFirstSetting();
+    void ranksLocales();
+    void takesTheTimeThatTheSizeAsksFor();
+    void searchesAsAShellDoes();
+};
+
+namespace {
+
+std::string_view view(const QByteArray &bytes)
+{
+    return {bytes.constData(), std::size_t(bytes.size())};
+}
+
+} // namespace
+
+void tst_DesktopEntryText::findsTheSameAsAPlainWalkOverTheLines()
+{
+    std::mt19937 random(7);
+    const QByteArrayList names = {"Name",    "Nome", "Nbme", "Name[de]", "Name[df]",
+                                  "Name[d]", "Icon", "N",    "Exec"};
+    for (int round = 0; round < 500; ++round) {
+        QByteArray bytes = "[G]\n";
+        QMap<QByteArray, QByteArray> expected;
+        for (int i = 0; i < 20; ++i) {
+            const QByteArray name = names.at(int(random() % unsigned(names.size())));
+            bytes += name + "=" + QByteArray::number(i) + "\n";
+            expected[name] = QByteArray::number(i);
+        }
+        const DesktopEntryText text(bytes);
+        for (const QByteArray &name : names) {
+            const QByteArray locale = name.contains('[') ? name.mid(5).chopped(1) : QByteArray();
+            const QByteArray base = name.split('[').constFirst();
+            const auto *key = text.key(text.group("G"), view(base), view(locale));
+            QCOMPARE(key != nullptr, expected.contains(name));
+            if (key)
+                QVERIFY(text.value(*key) == view(expected[name]));
+        }
+    }
+}
+
+void tst_DesktopEntryText::findsAGroupAmongThousands()
+{
+    QByteArray bytes;
+    for (int i = 0; i < 5000; ++i)
+        bytes += "[g" + QByteArray::number(i % 4000) + "]\nk=" + QByteArray::number(i) + "\n";
+    const DesktopEntryText text(bytes);
+    QCOMPARE(text.groups().size(), std::size_t(5000));
+    QCOMPARE(text.group("g999"), 4999);
+    QCOMPARE(text.group("g3999"), 3999);
+    QCOMPARE(text.group("g5000"), DesktopEntryText::NoGroup);
+    QVERIFY(text.value(*text.key(text.group("g999"), "k")) == "4999");
+}
+
+void tst_DesktopEntryText::tellsVariantsOfOneKeyApart()
+{
+    const DesktopEntryText text("[G]\nName=0\nName[de]=1\nName[de_AT]=2\nNome[de]=3\nName[fr]=4\n");
+    QStringList all;
+    QStringList german;
+    const auto note = [&text](QStringList *to) {
+        return [&text, to](const DesktopEntryText::Key &key) {
+            to->append(QString::fromStdString(std::string(text.locale(key))));
+        };
+    };
+    text.forEachVariant(0, "Name", note(&all));
+    text.forEachVariant(0, "Name", note(&german), "de");
+    QCOMPARE(all.join(QLatin1Char(' ')), QStringLiteral("de de_AT fr"));
+    QCOMPARE(german.join(QLatin1Char(' ')), QStringLiteral("de de_AT"));
+}
+
+void tst_DesktopEntryText::forgetsChangesOfRemovedGroups()
+{
+    DesktopEntryChanges changes;
+    changes.set({"G", "k", "", "1"});
+    changes.set({"H", "k", "", "2"});
+    changes.removeGroups({"G"});
+    QVERIFY(changes.isRemoved("G") && !changes.isRemoved("H"));
+    QVERIFY(!changes.find("G", "k", ""));
+    QCOMPARE(*changes.find("H", "k", "")->value, std::string("2"));
+    changes.drop("H", "k", "");
+    QVERIFY(changes.all().empty() && !changes.isEmpty());
+}
+
+void tst_DesktopEntryText::keepsTheOrderOfTheFirstSetting()
+{
+    DesktopEntryChanges changes;
+    for (const char *key : {"c", "a", "b", "a"})
+        changes.set({"G", key, "", key});
+    changes.drop("G", "c", "");
+    changes.set({"G", "c", "", "c"});
+    QCOMPARE(DesktopEntryWriter::apply(DesktopEntryText("[Desktop Entry]\n[G]\n"), changes),
+             QByteArray("[Desktop Entry]\n[G]\na=a\nb=b\nc=c\n"));
+}
+
+void tst_DesktopEntryText::ranksLocales()
+{
+    const MessageLocale locale("sr_RS.UTF-8@latin");
+    QCOMPARE(locale.rank("sr_RS@latin"), 4);
+    QCOMPARE(locale.rank("sr_RS"), 3);
+    QCOMPARE(locale.rank("sr@latin"), 2);
+    QCOMPARE(locale.rank("sr"), 1);
+    for (const char *other :
+         {"", "s", "srp", "sr_", "sr_RSX", "sr_RS@", "sr_RS@latinx", "sr@", "SR", "sr_RS.UTF-8"})
+        QVERIFY2(locale.rank(other) == 0, other);
+    for (int rank = 1; rank <= MessageLocale::BestRank; ++rank)
+        QCOMPARE(locale.rank(locale.keyLocale(rank)), rank);
+    QVERIFY(MessageLocale("de").keyLocale(2).empty() && MessageLocale("de").keyLocale(3).empty());
+}
+
+void tst_DesktopEntryText::takesTheTimeThatTheSizeAsksFor()
+{
+    // As many keys as a file can have: a walk over all for each would not end in this life.
+    QByteArray bytes = "[Desktop Entry]\n";
+    DesktopEntryChanges changes;
+    for (int i = 0; i < 40000; ++i) {
+        bytes += "K" + QByteArray::number(i) + "=1\n[Desktop Action " + QByteArray::number(i) + "]\n";
+        changes.set({"New" + std::to_string(i % 1000), "k" + std::to_string(i), "", "v"});
+    }
+    const DesktopEntryText text(bytes);
+    QElapsedTimer timer;
+    timer.start();
+    const QByteArray result = DesktopEntryWriter::apply(text, changes);
+    QVERIFY(result.size() > bytes.size());
+    QVERIFY2(timer.elapsed() < 20000, QByteArray::number(timer.elapsed()));
+}
+
+void tst_DesktopEntryText::searchesAsAShellDoes()
+{
+    using ProgramSearch::Result;
+    QCOMPARE(ProgramSearch::find({}), Result::Missing);
+    QCOMPARE(ProgramSearch::find(QStringLiteral("/bin/sh")), Result::Found);
+    QCOMPARE(ProgramSearch::find(QStringLiteral("/etc/passwd")), Result::NotExecutable);
+    QCOMPARE(ProgramSearch::find(QStringLiteral("sh"), QStringLiteral("/nosuch")), Result::Found);
+    QCOMPARE(ProgramSearch::find(QStringLiteral("./sh"), QStringLiteral("/bin")), Result::Found);
+    QCOMPARE(ProgramSearch::find(QString(QChar(0))), Result::Missing);
+}
+
+VEL_TEST_GUILESS_MAIN(tst_DesktopEntryText)
+
+#include "tst_DesktopEntryText.moc"
