@@ -76,6 +76,8 @@ void VelMenuDialogPrivate::buildToolBar()
 {
     toolBar = new QToolBar(VelMenuDialog::tr("Edit"), q);
     toolBar->setObjectName(QStringLiteral("toolBar"));
+    // Outside a main window it would stand back from the tree by a margin of its own.
+    toolBar->layout()->setContentsMargins(0, 0, 0, 0);
     for (const char *name : {"fileNewAction", "dirNewAction", "editAction", "deleteAction"})
         addAction(name);
     toolBar->addSeparator();
