@@ -6,6 +6,7 @@
 #include "FormLayout.h"
 #include "IconEdit.h"
 #include "LocalisedLabel.h"
+#include "NamedField.h"
 #include "PathEdit.h"
 #include "ShowInChoice.h"
 #include "StringListEdit.h"
@@ -15,26 +16,9 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
-#include <climits>
-
 namespace VelUI {
 
 namespace {
-
-template <typename Field>
-Field *make(const QString &name, QWidget *parent)
-{
-    auto *field = new Field(parent);
-    field->setObjectName(name);
-    return field;
-}
-
-QLineEdit *makeLine(const QString &name, QWidget *parent)
-{
-    auto *line = make<QLineEdit>(name, parent);
-    line->setMaxLength(INT_MAX);
-    return line;
-}
 
 bool isBlank(const QString &text)
 {
@@ -69,18 +53,18 @@ void ActionPropsDialog::build()
 
 void ActionPropsDialog::addRows(FormLayout *layout)
 {
-    m_id = makeLine(QStringLiteral("idEdit"), this);
+    m_id = makeField<QLineEdit>("idEdit", this);
     layout->setRowLabelBold(layout->addRow(tr("Id"), m_id));
-    m_name = makeLine(QStringLiteral("nameEdit"), this);
+    m_name = makeField<QLineEdit>("nameEdit", this);
     layout->setRowLabelBold(layout->addRow(tr("Name"), m_name));
-    m_localName = makeLine(QStringLiteral("localNameEdit"), this);
+    m_localName = makeField<QLineEdit>("localNameEdit", this);
     layout->addRow(localisedLabel(tr("Name")), m_localName);
-    m_icon = make<IconEdit>(QStringLiteral("iconEdit"), this);
+    m_icon = makeField<IconEdit>("iconEdit", this);
     layout->addRow(tr("Icon"), m_icon);
-    m_localIcon = make<IconEdit>(QStringLiteral("localIconEdit"), this);
+    m_localIcon = makeField<IconEdit>("localIconEdit", this);
     layout->addRow(localisedLabel(tr("Icon")), m_localIcon);
     addShowInRows(layout);
-    m_exec = make<PathEdit>(QStringLiteral("execEdit"), this);
+    m_exec = makeField<PathEdit>("execEdit", this);
     layout->setRowLabelBold(layout->addRow(tr("Exec"), m_exec));
 }
 
@@ -88,14 +72,14 @@ void ActionPropsDialog::addShowInRows(FormLayout *layout)
 {
     m_onlyShowInButton = new RowRadioButton(tr("Only show in"), this);
     m_onlyShowInButton->setObjectName(QStringLiteral("onlyShowInButton"));
-    m_onlyShowIn = make<StringListEdit>(QStringLiteral("onlyShowInEdit"), this);
+    m_onlyShowIn = makeField<StringListEdit>("onlyShowInEdit", this);
     m_onlyShowIn->setTexts(tr("Only show in"), tr("Only show in"), tr("Add desktop environment:"),
                            tr("Only show in"), tr("Edit desktop environment:"));
     layout->addRow(m_onlyShowInButton, m_onlyShowIn);
 
     m_notShowInButton = new RowRadioButton(tr("Not show in"), this);
     m_notShowInButton->setObjectName(QStringLiteral("notShowInButton"));
-    m_notShowIn = make<StringListEdit>(QStringLiteral("notShowInEdit"), this);
+    m_notShowIn = makeField<StringListEdit>("notShowInEdit", this);
     m_notShowIn->setTexts(tr("Not show in"), tr("Not show in"), tr("Add desktop environment:"),
                           tr("Not show in"), tr("Edit desktop environment:"));
     layout->addRow(m_notShowInButton, m_notShowIn);

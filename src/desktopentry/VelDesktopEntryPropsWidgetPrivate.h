@@ -100,6 +100,7 @@ public:
 
 private:
     static const std::vector<VelUI::PropsRow> &rows();
+    static QString typeName(const QString &type);
 
     void build();
     void addRow(const VelUI::PropsRow &row);

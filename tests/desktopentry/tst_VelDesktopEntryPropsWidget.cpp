@@ -155,6 +155,7 @@ private Q_SLOTS:
     void keepsOddValues_data();
     void keepsOddValues();
     void keepsAPastedLineFeed();
+    void keepsOddActions();
     void reachesEveryRowByTab_data();
     void reachesEveryRowByTab();
     void scrollsToTheFocusedField_data();
@@ -955,6 +956,30 @@ void tst_VelDesktopEntryPropsWidget::keepsAPastedLineFeed()
     form.saveTo(&record);
     QCOMPARE(record.getName(), QStringLiteral("a\nb"));
     QVERIFY(saved(record).contains("Name=a\\nb\n"));
+}
+
+void tst_VelDesktopEntryPropsWidget::keepsOddActions()
+{
+    VelUIDesktopAction action(QStringLiteral("odd;id"));
+    action.setName(QStringLiteral("  a;b\nc\\n"));
+    action.setExec(QStringLiteral(" run \\ %u\t"));
+    action.setOnlyShowIn({QStringLiteral("a;b"), QStringLiteral(" c")});
+    VelDesktopEntryPropsWidget form;
+    VelUIDesktopEntry record = entry(EntrySamples::fullApplication());
+    form.loadFrom(record);
+    child<ActionListEdit>(&form, "actionsEdit")->setActions({action});
+    form.saveTo(&record);
+    saved(record);
+
+    VelUIDesktopEntry again(path(QStringLiteral("saved.desktop")));
+    QVERIFY(again.load());
+    form.loadFrom(again);
+    const QList<VelUIDesktopAction> actions = child<ActionListEdit>(&form, "actionsEdit")->actions();
+    QCOMPARE(actions.size(), 1);
+    QCOMPARE(actions.constFirst().getId(), action.getId());
+    QCOMPARE(actions.constFirst().getName(), action.getName());
+    QCOMPARE(actions.constFirst().getExec(), action.getExec());
+    QCOMPARE(actions.constFirst().getOnlyShowIn(), action.getOnlyShowIn());
 }
 
 void tst_VelDesktopEntryPropsWidget::reachesEveryRowByTab_data()
