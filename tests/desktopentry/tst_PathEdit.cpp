@@ -111,7 +111,7 @@ void tst_PathEdit::takesTheChosenFile()
         QCOMPARE(dialog->fileMode(), QFileDialog::ExistingFile);
         QCOMPARE(dialog->parentWidget(), &edit);
         auto *name = dialog->findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
-        QTest::keyClicks(name, QStringLiteral("/usr/bin/env"));
+        name->setText(QStringLiteral("/usr/bin/env")); // typed, it would bring up completions
         QTest::keyClick(name, Qt::Key_Return);
     });
     edit.show();
