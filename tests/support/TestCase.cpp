@@ -41,8 +41,10 @@ void handleMessage(QtMsgType type, const QMessageLogContext &context, const QStr
     MessageLog &log = messageLog();
     {
         QMutexLocker lock(&log.mutex);
-        // The offscreen platform complains about every window with a smallest size.
-        if (message == QLatin1String("This plugin does not support propagateSizeHints()"))
+        // The offscreen platform complains about every window with a smallest size and every
+        // tool tip.
+        if (message == QLatin1String("This plugin does not support propagateSizeHints()")
+            || message == QLatin1String("This plugin does not support raise()"))
             return;
         if (type == QtWarningMsg || type == QtCriticalMsg) {
             if (takeAnnounced(log, message))

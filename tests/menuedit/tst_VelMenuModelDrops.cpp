@@ -1,0 +1,241 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ModalDriver.h"
+#include "TestCase.h"
+
+#include <VelMenuView.h>
+#include <menuedit/VelMenuModel.h>
+
+#include <QMimeData>
+#include <QSignalSpy>
+#include <QSortFilterProxyModel>
+#include <QToolTip>
+
+#include <memory>
+
+#include <sys/stat.h>
+
+/// Drops into a menu that is shown, with the list of the folder that they change.
+class tst_VelMenuModelDrops : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init();
+    void cleanup();
+
+    void listsAFileBeforeTheRowItIsDroppedAt();
+    void listsAFileLast();
+    void leavesTheListForADropOnTheFolder();
+    void reordersWithinTheFolder();
+    void leavesTheListForACopyWithinTheFolder();
+    void listsOnlyTheFirstOfSeveral();
+    void selectsWhatWasDropped();
+    void putsTheDirectoryFileBack_data();
+    void putsTheDirectoryFileBack();
+    void takesAwayADirectoryFileThatWasNotThere();
+    void tellsAtTheItemThatItWasLeft();
+    void tellsWhyAFolderIsRefused();
+
+private:
+    bool drop(const QStringList &files, Qt::DropAction action, int row);
+    int rowOf(const QString &name) const { return source(name).row(); }
+    QModelIndex source(const QString &name) const { return m_model->index(path(name)); }
+    QByteArray list() const;
+    QStringList shown() const;
+
+    std::unique_ptr<VelMenuView> m_view;
+    QSortFilterProxyModel *m_proxy = nullptr;
+    VelMenuModel *m_model = nullptr;
+};
+
+namespace {
+
+const QByteArray Directory = "# mine\n[Desktop Entry]\nType=Directory\nName=To\nSortOrder=c;b;a;\n";
+
+} // namespace
+
+void tst_VelMenuModelDrops::init()
+{
+    TestCase::init();
+    for (const char *name : {"menu/to/a", "menu/to/b", "menu/to/c", "menu/from/x", "menu/from/y"})
+        write(QString::fromUtf8(name), name);
+    write(QStringLiteral("menu/to/.directory"), Directory);
+    m_view = std::make_unique<VelMenuView>(path(QStringLiteral("menu")), -1, true);
+    m_view->show();
+    m_proxy = qobject_cast<QSortFilterProxyModel *>(m_view->model());
+    m_model = qobject_cast<VelMenuModel *>(m_proxy->sourceModel());
+    const auto isThere = [this](const QString &name, int rows) {
+        const QModelIndex index = source(name);
+        if (m_model->canFetchMore(index))
+            m_model->fetchMore(index);
+        return m_proxy->rowCount(m_proxy->mapFromSource(index)) == rows;
+    };
+    QTRY_VERIFY(isThere(QStringLiteral("menu"), 2));
+    QTRY_VERIFY(isThere(QStringLiteral("menu/to"), 3));
+    QTRY_VERIFY(isThere(QStringLiteral("menu/from"), 2));
+    QCOMPARE(shown().join(QString()), QStringLiteral("cba"));
+}
+
+void tst_VelMenuModelDrops::cleanup()
+{
+    QToolTip::hideText();
+    m_view.reset();
+    TestCase::cleanup();
+}
+
+bool tst_VelMenuModelDrops::drop(const QStringList &files, Qt::DropAction action, int row)
+{
+    QList<QUrl> urls;
+    for (const QString &file : files)
+        urls.append(QUrl::fromLocalFile(path(file)));
+    QMimeData data;
+    data.setUrls(urls);
+    return m_model->dropMimeData(&data, action, row, row == -1 ? -1 : 0, source(QStringLiteral("menu/to")));
+}
+
+QByteArray tst_VelMenuModelDrops::list() const
+{
+    const QList<QByteArray> lines = read(path(QStringLiteral("menu/to/.directory"))).split('\n');
+    for (const QByteArray &line : lines) {
+        if (line.startsWith("SortOrder="))
+            return line.mid(10);
+    }
+    return QByteArray();
+}
+
+QStringList tst_VelMenuModelDrops::shown() const
+{
+    const QModelIndex parent = m_proxy->mapFromSource(source(QStringLiteral("menu/to")));
+    QStringList names;
+    for (int row = 0; row < m_proxy->rowCount(parent); ++row)
+        names.append(m_proxy->index(row, 0, parent).data().toString());
+    return names;
+}
+
+void tst_VelMenuModelDrops::listsAFileBeforeTheRowItIsDroppedAt()
+{
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::MoveAction, rowOf(QStringLiteral("menu/to/b"))));
+
+    QCOMPARE(list(), QByteArray("*;c;x;b;a;"));
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("cxba"));
+    QVERIFY(!QFile::exists(path(QStringLiteral("menu/from/x"))));
+}
+
+void tst_VelMenuModelDrops::listsAFileLast()
+{
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::CopyAction, 3));
+
+    QCOMPARE(list(), QByteArray("*;c;b;a;x;"));
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("cbax"));
+}
+
+void tst_VelMenuModelDrops::leavesTheListForADropOnTheFolder()
+{
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::CopyAction, -1));
+
+    QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("cbax"));
+}
+
+void tst_VelMenuModelDrops::reordersWithinTheFolder()
+{
+    QSignalSpy changed(m_view.get(), &VelMenuView::changed);
+
+    QVERIFY(drop({QStringLiteral("menu/to/a")}, Qt::MoveAction, rowOf(QStringLiteral("menu/to/c"))));
+
+    QCOMPARE(list(), QByteArray("*;a;c;b;"));
+    QCOMPARE(shown().join(QString()), QStringLiteral("acb"));
+    QCOMPARE(changed.size(), 1);
+}
+
+void tst_VelMenuModelDrops::leavesTheListForACopyWithinTheFolder()
+{
+    QVERIFY(drop({QStringLiteral("menu/to/a")}, Qt::CopyAction, rowOf(QStringLiteral("menu/to/c"))));
+
+    QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
+    QCOMPARE(m_view->selectedPath(), path(QStringLiteral("menu/to/a")));
+}
+
+void tst_VelMenuModelDrops::listsOnlyTheFirstOfSeveral()
+{
+    QVERIFY(drop({QStringLiteral("menu/from/y"), QStringLiteral("menu/from/x")}, Qt::MoveAction,
+                 rowOf(QStringLiteral("menu/to/b"))));
+
+    QCOMPARE(list(), QByteArray("*;c;y;b;a;"));
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("xcyba"));
+}
+
+void tst_VelMenuModelDrops::selectsWhatWasDropped()
+{
+    QSignalSpy changed(m_view.get(), &VelMenuView::changed);
+
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::MoveAction, 0));
+
+    QTRY_COMPARE(m_view->selectedPath(), path(QStringLiteral("menu/to/x")));
+    QCOMPARE(changed.size(), 1);
+}
+
+void tst_VelMenuModelDrops::putsTheDirectoryFileBack_data()
+{
+    QTest::addColumn<int>("row");
+    QTest::newRow("on the folder") << -1;
+    QTest::newRow("at the top") << 0;
+    QTest::newRow("at the end") << 3;
+}
+
+void tst_VelMenuModelDrops::putsTheDirectoryFileBack()
+{
+    QFETCH(int, row);
+    // Such a thing can be moved within a file system, but not be copied.
+    QVERIFY(mkfifo(QFile::encodeName(path(QStringLiteral("menu/from/pipe"))).constData(), 0600) == 0);
+    QSignalSpy changed(m_view.get(), &VelMenuView::changed);
+
+    QVERIFY(!drop({QStringLiteral("menu/from/x"), QStringLiteral("menu/from/pipe")}, Qt::CopyAction, row));
+
+    QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
+    QVERIFY(!QFile::exists(path(QStringLiteral("menu/to/x"))));
+    QCOMPARE(changed.size(), 0);
+    QVERIFY(!QToolTip::text().isEmpty());
+}
+
+void tst_VelMenuModelDrops::takesAwayADirectoryFileThatWasNotThere()
+{
+    QVERIFY(QFile::remove(path(QStringLiteral("menu/to/.directory"))));
+    QVERIFY(mkfifo(QFile::encodeName(path(QStringLiteral("menu/from/pipe"))).constData(), 0600) == 0);
+
+    QVERIFY(!drop({QStringLiteral("menu/from/pipe")}, Qt::CopyAction, 0));
+
+    QVERIFY(!QFile::exists(path(QStringLiteral("menu/to/.directory"))));
+}
+
+void tst_VelMenuModelDrops::tellsAtTheItemThatItWasLeft()
+{
+    const QString target = write(QStringLiteral("menu/to/x"), "old");
+    ModalDriver modal;
+    modal.answer({QMessageBox::Question, QStringLiteral("Attention"),
+                  QStringLiteral("%1 already exists. Overwrite?").arg(target), QMessageBox::Yes},
+                 QMessageBox::Yes);
+
+    QVERIFY(!drop({QStringLiteral("menu/from/x")}, Qt::MoveAction, 0));
+
+    QVERIFY(modal.finished());
+    QCOMPARE(read(target), QByteArray("old"));
+    QCOMPARE(read(path(QStringLiteral("menu/from/x"))), QByteArray("menu/from/x"));
+    QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
+    QCOMPARE(QToolTip::text(), QStringLiteral("%1 exists and was left as it is.").arg(target));
+}
+
+void tst_VelMenuModelDrops::tellsWhyAFolderIsRefused()
+{
+    QVERIFY(!drop({QStringLiteral("menu/to")}, Qt::MoveAction, 0));
+
+    QCOMPARE(QToolTip::text(),
+             QStringLiteral("%1 cannot be put into itself.").arg(path(QStringLiteral("menu/to"))));
+    QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
+}
+
+VEL_TEST_MAIN(tst_VelMenuModelDrops)
+
+#include "tst_VelMenuModelDrops.moc"
