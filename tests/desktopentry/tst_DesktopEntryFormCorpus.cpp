@@ -67,6 +67,7 @@ private Q_SLOTS:
     void initTestCase();
     void changesNothingWithoutAnEdit();
     void changesTheCommentOnly();
+    void leavesNothingOfTheOldType();
 
 private:
     QString copy(const Sample &sample);
@@ -176,6 +177,37 @@ void tst_DesktopEntryFormCorpus::changesTheCommentOnly()
         for (const QByteArray &complaint : said)
             QVERIFY2(before.contains(complaint), qPrintable(sample.origin + QString::fromUtf8(complaint)));
     }
+}
+
+void tst_DesktopEntryFormCorpus::leavesNothingOfTheOldType()
+{
+    const QByteArrayList ofApplications{"Exec",           "TryExec",    "Path",           "Terminal",
+                                        "MimeType",       "Categories", "Keywords",       "StartupNotify",
+                                        "StartupWMClass", "Actions",    "DBusActivatable"};
+    int changed = 0;
+    for (const Sample &sample : qAsConst(m_samples)) {
+        const QByteArrayList before = complaints(copy(sample));
+        // The validator wants the name that goes with the new type.
+        const QString file = write(QStringLiteral("x/.directory"), sample.bytes);
+        VelUIDesktopEntry entry(file);
+        if (entry.getType() != QLatin1String("Application"))
+            continue;
+        VelDesktopEntryPropsWidget form;
+        form.loadFrom(entry);
+        form.setType(QStringLiteral("Directory"), {});
+        form.saveTo(&entry);
+        QVERIFY(entry.save());
+        const QByteArray after = read(file);
+        for (const QByteArray &key : ofApplications) {
+            QVERIFY2(!after.contains('\n' + key + '='), qPrintable(sample.origin));
+            QVERIFY2(!after.contains('\n' + key + '['), qPrintable(sample.origin));
+        }
+        QVERIFY2(!after.contains("[Desktop Action"), qPrintable(sample.origin));
+        for (const QByteArray &complaint : complaints(file))
+            QVERIFY2(before.contains(complaint), qPrintable(sample.origin + QString::fromUtf8(complaint)));
+        ++changed;
+    }
+    QVERIFY(changed >= enoughPackages);
 }
 
 VEL_TEST_MAIN(tst_DesktopEntryFormCorpus)
