@@ -10,8 +10,13 @@
 
 #include <QCoreApplication>
 #include <QDir>
+#include <QFile>
 #include <QFileInfo>
 #include <QTimer>
+
+#include <ctime>
+
+#include <sys/stat.h>
 
 namespace {
 
@@ -20,6 +25,43 @@ const QLatin1String EntrySuffix(".desktop");
 
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
+
+// What tells that a file is still the same.
+class FileStamp
+{
+public:
+    explicit FileStamp(const QString &path)
+    {
+        if (::stat(QFile::encodeName(path).constData(), &m_status) != 0)
+            m_status = {};
+    }
+
+    bool operator==(const FileStamp &other) const
+    {
+        return m_status.st_dev == other.m_status.st_dev && m_status.st_ino == other.m_status.st_ino
+            && m_status.st_size == other.m_status.st_size && isEqual(m_status.st_mtim, other.m_status.st_mtim)
+            && isEqual(m_status.st_ctim, other.m_status.st_ctim);
+    }
+
+    // Whether the last change is long enough ago that another would have another time.
+    bool isSettled() const
+    {
+        timespec now = {};
+        clock_gettime(CLOCK_REALTIME, &now);
+        constexpr qint64 Enough = 50'000'000;
+        return nanoseconds(m_status.st_mtim) + Enough < nanoseconds(now)
+            && nanoseconds(m_status.st_ctim) + Enough < nanoseconds(now);
+    }
+
+private:
+    static qint64 nanoseconds(const timespec &time)
+    {
+        return qint64(time.tv_sec) * 1'000'000'000 + qint64(time.tv_nsec);
+    }
+    static bool isEqual(const timespec &a, const timespec &b) { return nanoseconds(a) == nanoseconds(b); }
+
+    struct stat m_status = {};
+};
 
 } // namespace
 
@@ -36,13 +78,32 @@ public:
     using VelMimeTypeIconProvider::icon;
     QIcon icon(const QFileInfo &info) const override
     {
-        if (m_model && info.fileName().endsWith(EntrySuffix) && info.isFile())
-            m_model->readAlong(info.filePath());
-        return VelMimeTypeIconProvider::icon(info);
+        if (!m_model || !info.fileName().endsWith(EntrySuffix) || info.isSymLink() || !info.isFile())
+            return VelMimeTypeIconProvider::icon(info);
+        const QString path = info.filePath();
+        const FileStamp stamp(path);
+        const auto known = m_icons.constFind(path);
+        if (known != m_icons.constEnd() && known->stamp == stamp)
+            return known->icon;
+        m_model->readAlong(path);
+        const QIcon icon = VelMimeTypeIconProvider::icon(info);
+        if (stamp.isSettled())
+            m_icons.insert(path, {stamp, icon});
+        else
+            m_icons.remove(path);
+        return icon;
     }
 
 private:
+    struct Known
+    {
+        FileStamp stamp;
+        QIcon icon;
+    };
+
     QPointer<VelMenuModel> m_model;
+    // After any change in a folder the base class asks for all its icons again.
+    mutable QHash<QString, Known> m_icons;
 };
 
 /// Keeps the icon provider, which the model uses but never deletes.

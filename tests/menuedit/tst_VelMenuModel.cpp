@@ -10,6 +10,7 @@
 
 #include <QAbstractItemModelTester>
 #include <QDir>
+#include <QFileIconProvider>
 #include <QMimeData>
 #include <QSaveFile>
 #include <QSignalSpy>
@@ -37,6 +38,7 @@ private Q_SLOTS:
     void announcesTheRowOfAForgottenName();
     void announcesTheFolderOfAForgottenDirectoryFile();
     void announcesAChangeOnDisk();
+    void readsAnIconAnewOnlyForAChangedEntry();
     void livesWithOddFiles();
     void survivesAFolderThatVanishes();
 
@@ -330,6 +332,22 @@ void tst_VelMenuModel::announcesAChangeOnDisk()
 
     for (const char *name : {"a1.desktop", "a2.desktop", "a10.desktop"})
         QTRY_VERIFY(isAnnounced(QString::fromUtf8(name)));
+}
+
+void tst_VelMenuModel::readsAnIconAnewOnlyForAChangedEntry()
+{
+    const QString file = write(QStringLiteral("a.desktop"), entry("Name=A\nIcon=folder\n"));
+    m_model = modelOf(folder(), 1);
+    const auto icon = [&] { return m_model->iconProvider()->icon(QFileInfo(file)); };
+    // Younger than the clock can tell, the file might have changed.
+    QTRY_COMPARE(icon().cacheKey(), icon().cacheKey());
+    const QIcon before = icon();
+
+    write(QStringLiteral("a.desktop"), entry("Name=A\nIcon=go-up\n"));
+
+    QVERIFY(icon().cacheKey() != before.cacheKey());
+    QVERIFY(QFile::remove(file));
+    QVERIFY(icon().cacheKey() != before.cacheKey());
 }
 
 void tst_VelMenuModel::livesWithOddFiles()
