@@ -19,6 +19,7 @@
 #include <QMenu>
 #include <QMimeData>
 #include <QPointer>
+#include <QProcess>
 #include <QPushButton>
 #include <QSettings>
 #include <QSignalSpy>
@@ -641,6 +642,7 @@ void tst_VelMenuDialog::startsProgramsThatOutliveIt()
     const QByteArray searchPath = qgetenv("PATH");
     qputenv("PATH", QFile::encodeName(path(QStringLiteral("bin"))) + ':' + searchPath);
     const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    QPointer<QProcess> started;
     {
         VelMenuDialog dialog(menu(), -1, true, true);
         auto *view = dialog.findChild<VelMenuView *>();
@@ -650,9 +652,13 @@ void tst_VelMenuDialog::startsProgramsThatOutliveIt()
         view->setFocus();
         select(*view, a);
         QTest::keyClick(view, Qt::Key_E, Qt::ControlModifier);
+        started = view->findChild<QProcess *>();
+        QVERIFY(started);
     }
+    QVERIFY(started);
     write(QStringLiteral("go"), "");
     QTRY_COMPARE(QFileInfo(log).size(), qint64(QFile::encodeName(a).size()) + 8);
+    QTRY_VERIFY(!started);
     qputenv("PATH", searchPath);
 }
 

@@ -465,14 +465,19 @@ void tst_VelMenuView::leavesTheStartedProgramRunningWhenItGoesAway()
                     "echo alive >'"
                   + QFile::encodeName(log) + "'\n");
     const QString entry = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    QPointer<QProcess> started;
     {
         VelMenuView view(menu(), -1, true);
         QVERIFY(open(view, menu(), 1));
         select(view, entry);
         view.slotExe();
+        started = view.findChild<QProcess *>();
     }
+    QVERIFY(started);
     write(QStringLiteral("go"), "");
     QTRY_VERIFY(QFile::exists(log));
+    // It has gone when the program had.
+    QTRY_VERIFY(!started);
 }
 
 void tst_VelMenuView::goesAwayWhileItTellsThatNothingStarted()

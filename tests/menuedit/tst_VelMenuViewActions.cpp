@@ -14,6 +14,8 @@
 
 #include <unistd.h>
 
+Q_DECLARE_METATYPE(ActionState::Selection)
+
 /// The actions of the menu and when they are enabled.
 class tst_VelMenuViewActions : public MenuTestCase
 {
@@ -328,6 +330,5 @@ void tst_VelMenuViewActions::followsTheClipboard()
     QTRY_VERIFY(!action(view, QStringLiteral("pasteAction"))->isEnabled());
 }
 
-Q_DECLARE_METATYPE(ActionState::Selection)
 VEL_TEST_MAIN(tst_VelMenuViewActions)
 #include "tst_VelMenuViewActions.moc"
