@@ -46,6 +46,9 @@ void handleMessage(QtMsgType type, const QMessageLogContext &context, const QStr
         if (message == QLatin1String("This plugin does not support propagateSizeHints()")
             || message == QLatin1String("This plugin does not support raise()"))
             return;
+        // Qt asks for the place of a window that the window manager takes away at that moment.
+        if (message.startsWith(QLatin1String("QXcbConnection: XCB error: 3 (BadWindow)")))
+            return;
         if (type == QtWarningMsg || type == QtCriticalMsg) {
             if (takeAnnounced(log, message))
                 return;
