@@ -8,6 +8,7 @@ GalleryPage desktopEntryFieldsPage();
 GalleryPage desktopEntryFormPage();
 GalleryPage radioGroupBoxPage();
 GalleryPage settingsPage();
+GalleryPage shortcutsPage();
 
 QVector<GalleryPage> galleryPages()
 {
@@ -16,5 +17,6 @@ QVector<GalleryPage> galleryPages()
         settingsPage(),
         desktopEntryFormPage(),
         desktopEntryFieldsPage(),
+        shortcutsPage(),
     };
 }

@@ -1,0 +1,28 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+#include <QVector>
+
+#include <functional>
+
+class QPlainTextEdit;
+
+/// One command of the small text editor.
+struct EditorCommand
+{
+    /// The name under which its key is saved.
+    QString name;
+    /// The menu that it stands in: "File", "Edit" or "View".
+    QString menu;
+    /// The text, with a mnemonic.
+    QString text;
+    /// The key that the editor gives it, as portable text; may be empty.
+    QString key;
+    std::function<void(QPlainTextEdit *)> run;
+};
+
+/// All of them, in the order of the menus.
+QVector<EditorCommand> editorCommands();

@@ -1,0 +1,116 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "EditorCommands.h"
+#include "GalleryPage.h"
+
+#include <EditShortcutsDialog.h>
+#include <ShortcutsModel.h>
+
+#include <QAction>
+#include <QCoreApplication>
+#include <QLabel>
+#include <QMainWindow>
+#include <QMenu>
+#include <QMenuBar>
+#include <QPlainTextEdit>
+#include <QPointer>
+#include <QSettings>
+#include <QShortcut>
+#include <QStatusBar>
+
+namespace {
+
+struct PageTexts
+{
+    Q_DECLARE_TR_FUNCTIONS(ShortcutsPage)
+};
+
+const QString settingsGroup = QStringLiteral("Shortcuts");
+
+QString settingsName()
+{
+    return QStringLiteral("vel-gallery");
+}
+
+void configure(QMainWindow *page, ShortcutsModel *model)
+{
+    const QPointer<EditShortcutsDialog> dialog(new EditShortcutsDialog(model, page));
+    if (dialog->exec() == QDialog::Accepted && dialog) {
+        QSettings settings(settingsName(), settingsName());
+        model->saveKeys(&settings, settingsGroup);
+    }
+    delete dialog;
+}
+
+// The menus of the commands, each with its action of the command's name.
+void addCommands(QMainWindow *page, QPlainTextEdit *editor, QLabel *last, ShortcutsModel *model)
+{
+    QMap<QString, QMenu *> menus;
+    const auto commands = editorCommands();
+    for (const EditorCommand &command : commands) {
+        QMenu *&menu = menus[command.menu];
+        if (!menu)
+            menu = page->menuBar()->addMenu(command.menu);
+        QAction *action = menu->addAction(command.text);
+        action->setObjectName(command.name);
+        action->setShortcut(QKeySequence(command.key, QKeySequence::PortableText));
+        QObject::connect(action, &QAction::triggered, editor, [editor, last, action, command] {
+            command.run(editor);
+            last->setText(PageTexts::tr("Used: %1").arg(action->iconText()));
+        });
+        model->registerAction(command.name, action, command.menu);
+    }
+}
+
+QWidget *createPage(const GalleryContext &context, QWidget *parent)
+{
+    Q_UNUSED(context)
+    auto *page = new QMainWindow(parent, Qt::Widget);
+    QSettings settings(settingsName(), settingsName());
+    auto *model = new ShortcutsModel(&settings, settingsGroup, page);
+    model->setObjectName(QStringLiteral("shortcutsModel"));
+    auto *editor = new QPlainTextEdit(page);
+    editor->setObjectName(QStringLiteral("editor"));
+    editor->setPlainText(PageTexts::tr("one line\nanother line\nand a third one\n"));
+    page->setCentralWidget(editor);
+    auto *last = new QLabel(page);
+    last->setObjectName(QStringLiteral("lastCommand"));
+    page->statusBar()->addWidget(last);
+    page->statusBar()->setSizeGripEnabled(false);
+    addCommands(page, editor, last, model);
+
+    auto *focusShortcut = new QShortcut(QKeySequence(Qt::Key_F6), page);
+    QObject::connect(focusShortcut, &QShortcut::activated, editor, [editor] { editor->setFocus(); });
+    model->registerShortcut(QStringLiteral("focus-editor"), focusShortcut, PageTexts::tr("Go to the editor"),
+                            QStringLiteral("View"));
+
+    QAction *configureAction = page->menuBar()
+                                   ->addMenu(PageTexts::tr("Settings"))
+                                   ->addAction(PageTexts::tr("Configure shortcuts..."));
+    configureAction->setObjectName(QStringLiteral("configure-shortcuts"));
+    configureAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_F12));
+    QObject::connect(configureAction, &QAction::triggered, page, [page, model] { configure(page, model); });
+    model->registerAction(configureAction->objectName(), configureAction, QStringLiteral("Settings"));
+    return page;
+}
+
+} // namespace
+
+GalleryPage shortcutsPage()
+{
+    GalleryPage page;
+    page.name = QStringLiteral("shortcuts");
+    page.title = PageTexts::tr("Shortcuts");
+    page.category = PageTexts::tr("Dialogs");
+    page.snippet = QStringLiteral(R"(QSettings settings;
+auto *model = new ShortcutsModel(&settings, "Shortcuts", this);
+model->registerAction("file-save", saveAction, tr("File"));
+model->registerShortcut("focus", focusShortcut, tr("Go to the editor"), tr("View"));
+
+EditShortcutsDialog dialog(model, this);
+if (dialog.exec() == QDialog::Accepted)
+    model->saveKeys(&settings, "Shortcuts");)");
+    page.create = createPage;
+    return page;
+}
