@@ -179,7 +179,7 @@ QVector<EditorCommand> basicEditCommands()
          [](auto *e) { select(e, QTextCursor::LineUnderCursor); }},
         {QStringLiteral("select-paragraph"), menu, EditorTexts::tr("Select paragraph"), QString(),
          [](auto *e) { select(e, QTextCursor::BlockUnderCursor); }},
-        {QStringLiteral("find-selected"), menu, EditorTexts::tr("Find selected &&again"),
+        {QStringLiteral("find-selected"), menu, EditorTexts::tr("Find selected a&gain"),
          QStringLiteral("F3"), [](auto *e) { find(e, {}); }},
         {QStringLiteral("find-previous"), menu, EditorTexts::tr("Find selected before"),
          QStringLiteral("Shift+F3"), [](auto *e) { find(e, QTextDocument::FindBackward); }},
