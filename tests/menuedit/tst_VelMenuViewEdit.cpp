@@ -55,6 +55,8 @@ private Q_SLOTS:
     void listsChildrenInTheOrderShownWithTheNewOneInItsPlace();
     void makesARecordForAFolderWithoutOne();
     void keepsTheRestOfAFoldersRecord();
+    void leavesARecordThatCannotBeRead_data();
+    void leavesARecordThatCannotBeRead();
     void refusesToListInNoFolder();
     void movesAnItemUpAndDown_data();
     void movesAnItemUpAndDown();
@@ -211,6 +213,32 @@ void tst_VelMenuViewEdit::keepsTheRestOfAFoldersRecord()
     QVERIFY(view.fixSortOrderForNew(QStringLiteral("a.desktop"), 2, files(view)->index(menu())));
     QCOMPARE(read(menu() + QLatin1String("/.directory")),
              before + "SortOrder=*;b.desktop;a.desktop;\nX-Own=1\n");
+}
+
+void tst_VelMenuViewEdit::leavesARecordThatCannotBeRead_data()
+{
+    QTest::addColumn<QByteArray>("contents");
+    QTest::newRow("too large") << QByteArray(1024 * 1024 + 1, 'x');
+    QTest::newRow("a directory") << QByteArray();
+}
+
+void tst_VelMenuViewEdit::leavesARecordThatCannotBeRead()
+{
+    QFETCH(QByteArray, contents);
+    const QString record = menu() + QLatin1String("/.directory");
+    if (contents.isEmpty())
+        QDir().mkpath(record + QLatin1String("/mine"));
+    else
+        write(QStringLiteral("menu/.directory"), contents);
+    const QString b = writeLetters("ab").constLast();
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 2));
+    select(view, b);
+    view.slotUp();
+    if (contents.isEmpty())
+        QVERIFY(QFileInfo(record + QLatin1String("/mine")).isDir());
+    else
+        QCOMPARE(read(record), contents);
 }
 
 void tst_VelMenuViewEdit::refusesToListInNoFolder()

@@ -342,6 +342,8 @@ void tst_VelMenuViewFind::passesOverFoldersThatCannotBeRead()
     QVERIFY(QFile::setPermissions(closed, QFile::Permissions()));
     VelMenuView view(menu(), -1, true);
     const bool isRoot = QFileInfo(closed).isReadable();
+    if (!isRoot)
+        expectWarning(QRegularExpression(QStringLiteral("^inotify_add_watch\\(.*\\) failed: ")));
     find(view, QStringLiteral("needle"));
     QVERIFY(QFile::setPermissions(closed, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
     QCOMPARE(view.selectedPath(), isRoot ? closed + QLatin1String("/y.desktop") : needle);
