@@ -82,7 +82,11 @@ bool peerHas(GKeyFile *file, const QByteArray &group, const QByteArray &key)
 // The raw value, to tell an unknown escape from a wrong value of ours.
 bool peerCannotRead(GKeyFile *file, const QByteArray &group, const QByteArray &key)
 {
-    return peerHas(file, group, key) && peerText(file, group, key).isNull();
+    GError *error = nullptr;
+    g_free(g_key_file_get_string(file, group.constData(), key.constData(), &error));
+    const bool isSpoiled = error && peerHas(file, group, key);
+    g_clear_error(&error);
+    return isSpoiled;
 }
 
 // The value for a locale in the standard's order, found with GKeyFile's help.
@@ -93,6 +97,17 @@ QString peerLocalText(GKeyFile *file, const QByteArray &group, const QByteArray 
         const QByteArray variant = key + '[' + locale + ']';
         if (peerHas(file, group, variant) && !peerCannotRead(file, group, variant))
             return peerText(file, group, variant);
+    }
+    return {};
+}
+
+// The variant of a key that stands first in the standard's order; empty where there is none.
+QByteArray peerVariant(GKeyFile *file, const QByteArray &group, const QByteArray &key,
+                       const QByteArrayList &order)
+{
+    for (const QByteArray &locale : order) {
+        if (peerHas(file, group, key + '[' + locale + ']'))
+            return key + '[' + locale + ']';
     }
     return {};
 }
@@ -134,6 +149,12 @@ public:
 
     void localText(const QByteArray &group, const QByteArray &key, const QString &value)
     {
+        // An escape that GKeyFile does not know spoils its value; ours keeps it as it stands.
+        const QByteArray variant = peerVariant(m_peer, group, key, m_order);
+        if (!variant.isEmpty() && peerCannotRead(m_peer, group, variant)) {
+            ++unknownEscapes;
+            return;
+        }
         const QString expected = peerLocalText(m_peer, group, key, m_order);
         const QByteArray chosen = peerLocale(m_peer, group, key, m_order.constFirst());
         same(key, value == expected);
