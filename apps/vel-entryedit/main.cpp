@@ -1,6 +1,8 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include <support/Program.h>
+
 #include <VelDesktopEntryEditDialog.h>
 #include <VelDesktopEntryPropsWidget.h>
 
@@ -9,8 +11,6 @@
 #include <QDialogButtonBox>
 #include <QFileInfo>
 #include <QPushButton>
-
-#include <cstdio>
 
 namespace {
 
@@ -27,7 +27,7 @@ struct Options
 
 QString text(const char *source)
 {
-    return QCoreApplication::translate("main", source);
+    return QCoreApplication::translate("vel-entryedit", source);
 }
 
 QString absolute(const QString &path)
@@ -38,21 +38,21 @@ QString absolute(const QString &path)
 Options parse(const QStringList &arguments)
 {
     QCommandLineParser parser;
-    parser.setApplicationDescription(text(QT_TRANSLATE_NOOP("main", "Edits a desktop entry.")));
+    parser.setApplicationDescription(text(QT_TRANSLATE_NOOP("vel-entryedit", "Edits a desktop entry.")));
     const QCommandLineOption help = parser.addHelpOption();
     const QCommandLineOption version = parser.addVersionOption();
     const QCommandLineOption create(
         QStringLiteral("create"),
-        text(QT_TRANSLATE_NOOP("main", "Make a new entry when there is no such file.")));
+        text(QT_TRANSLATE_NOOP("vel-entryedit", "Make a new entry when there is no such file.")));
     const QCommandLineOption pattern(
         QStringLiteral("template"),
-        text(QT_TRANSLATE_NOOP("main", "Begin with the values of the entry <file>.")),
+        text(QT_TRANSLATE_NOOP("vel-entryedit", "Begin with the values of the entry <file>.")),
         QStringLiteral("file"));
     const QCommandLineOption readOnly(QStringLiteral("read-only"),
-                                      text(QT_TRANSLATE_NOOP("main", "Show the entry only.")));
+                                      text(QT_TRANSLATE_NOOP("vel-entryedit", "Show the entry only.")));
     parser.addOptions({create, pattern, readOnly});
     parser.addPositionalArgument(QStringLiteral("file"),
-                                 text(QT_TRANSLATE_NOOP("main", "The entry to edit.")));
+                                 text(QT_TRANSLATE_NOOP("vel-entryedit", "The entry to edit.")));
 
     Options options;
     if (!parser.parse(arguments))
@@ -62,7 +62,7 @@ Options parse(const QStringList &arguments)
     else if (parser.isSet(version))
         parser.showVersion();
     else if (parser.positionalArguments().size() != 1 || parser.positionalArguments().constFirst().isEmpty())
-        options.error = text(QT_TRANSLATE_NOOP("main", "one file has to be named"));
+        options.error = text(QT_TRANSLATE_NOOP("vel-entryedit", "one file has to be named"));
     else
         options.file = absolute(parser.positionalArguments().constFirst());
     options.pattern = absolute(parser.value(pattern));
@@ -73,7 +73,7 @@ Options parse(const QStringList &arguments)
 
 int fail(const QString &reason)
 {
-    std::fprintf(stderr, "vel-entryedit: %s\n", qPrintable(reason));
+    Program::printError(reason);
     return NotOpened;
 }
 
@@ -93,10 +93,9 @@ void makeReadOnly(VelDesktopEntryEditDialog *dialog)
 int main(int argc, char **argv)
 {
     QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    Program::describe(QStringLiteral("vel-entryedit"));
     QApplication application(argc, argv);
-    QApplication::setOrganizationName(QStringLiteral("vel"));
-    QApplication::setApplicationName(QStringLiteral("vel-entryedit"));
-    QApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+    Program::loadCatalogues();
     QApplication::setDesktopFileName(QStringLiteral("vel-entryedit"));
     QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
 
@@ -106,7 +105,7 @@ int main(int argc, char **argv)
 
     VelDesktopEntryEditDialog dialog;
     if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
-        return fail(text(QT_TRANSLATE_NOOP("main", "cannot open %1")).arg(options.file));
+        return fail(text(QT_TRANSLATE_NOOP("vel-entryedit", "cannot open %1")).arg(options.file));
     if (options.readOnly)
         makeReadOnly(&dialog);
     return dialog.exec() == QDialog::Accepted ? Saved : Cancelled;

@@ -5,14 +5,14 @@
 
 #include "GalleryWindow.h"
 
+#include <support/Program.h>
+
 #include <QApplication>
 #include <QDeadlineTimer>
 #include <QDir>
 #include <QPixmap>
 #include <QProcess>
 #include <QStyle>
-
-#include <cstdio>
 
 namespace {
 
@@ -48,7 +48,8 @@ bool waitUntilReady(const GalleryPage &page, QWidget *widget)
             return true;
         }
     } while (!deadline.hasExpired());
-    std::fprintf(stderr, "vel-gallery: the page %s did not get ready\n", qPrintable(page.name));
+    Program::printError(
+        QCoreApplication::translate("vel-gallery", "the page %1 did not get ready").arg(page.name));
     return false;
 }
 
@@ -59,7 +60,7 @@ bool writePicture(GalleryWindow *window, const GalleryPage &page, const QString 
         return false;
     if (window->grab().save(path))
         return true;
-    std::fprintf(stderr, "vel-gallery: cannot write %s\n", qPrintable(path));
+    Program::printError(QCoreApplication::translate("vel-gallery", "cannot write %1").arg(path));
     return false;
 }
 
@@ -71,7 +72,8 @@ bool writeAtThisScale(const QVector<GalleryPage> &pages, const GalleryContext &c
                       const QString &directory, int scale)
 {
     if (!QDir().mkpath(directory)) {
-        std::fprintf(stderr, "vel-gallery: cannot make the folder %s\n", qPrintable(directory));
+        Program::printError(
+            QCoreApplication::translate("vel-gallery", "cannot make the folder %1").arg(directory));
         return false;
     }
     const struct

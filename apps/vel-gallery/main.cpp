@@ -5,11 +5,12 @@
 #include "GalleryPictures.h"
 #include "GalleryWindow.h"
 
+#include <support/Program.h>
+
 #include <QApplication>
 #include <QCommandLineParser>
 
 #include <algorithm>
-#include <cstdio>
 
 namespace {
 
@@ -24,17 +25,17 @@ struct Options
 Options parse(const QApplication &application)
 {
     QCommandLineParser parser;
-    parser.setApplicationDescription(
-        QCoreApplication::translate("main", "Shows the widgets, dialogs and models of the library at work."));
+    parser.setApplicationDescription(QCoreApplication::translate(
+        "vel-gallery", "Shows the widgets, dialogs and models of the library at work."));
     parser.addHelpOption();
     parser.addVersionOption();
     const QCommandLineOption page(QStringLiteral("page"),
-                                  QCoreApplication::translate("main", "Begin with the page <name>."),
+                                  QCoreApplication::translate("vel-gallery", "Begin with the page <name>."),
                                   QStringLiteral("name"));
     const QCommandLineOption screenshots(
         QStringLiteral("screenshots"),
         QCoreApplication::translate(
-            "main", "Write pictures of every page, or of that given with --page, to <dir> and end."),
+            "vel-gallery", "Write pictures of every page, or of that given with --page, to <dir> and end."),
         QStringLiteral("dir"));
     QCommandLineOption scale(QStringLiteral("scale"), QString(), QStringLiteral("factor"),
                              QStringLiteral("0"));
@@ -42,7 +43,7 @@ Options parse(const QApplication &application)
     parser.addOptions({page, screenshots, scale});
     parser.addPositionalArgument(
         QStringLiteral("file"),
-        QCoreApplication::translate("main", "The settings file that the settings page edits."),
+        QCoreApplication::translate("vel-gallery", "The settings file that the settings page edits."),
         QStringLiteral("[file]"));
     parser.process(application);
 
@@ -75,10 +76,10 @@ int main(int argc, char **argv)
         arguments.append(QString::fromLocal8Bit(argv[i]));
 
     QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    Program::describe(QStringLiteral("vel-gallery"));
     QApplication application(argc, argv);
-    QApplication::setApplicationName(QStringLiteral("vel-gallery"));
-    QApplication::setApplicationDisplayName(QCoreApplication::translate("main", "Widget gallery"));
-    QApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+    Program::loadCatalogues();
+    QApplication::setApplicationDisplayName(QCoreApplication::translate("vel-gallery", "Widget gallery"));
     QApplication::setDesktopFileName(QStringLiteral("vel-gallery"));
 
     const Options options = parse(application);
@@ -87,7 +88,8 @@ int main(int argc, char **argv)
         || std::any_of(pages.begin(), pages.end(),
                        [&options](const GalleryPage &page) { return page.name == options.page; });
     if (!known) {
-        std::fprintf(stderr, "vel-gallery: there is no page %s\n", qPrintable(options.page));
+        Program::printError(
+            QCoreApplication::translate("vel-gallery", "there is no page %1").arg(options.page));
         return 1;
     }
     if (!options.screenshots.isEmpty())

@@ -11,11 +11,6 @@
 
 namespace {
 
-QString tr(const char *text)
-{
-    return QCoreApplication::translate("vel-menuedit", text);
-}
-
 QString standardDir(VelDir kind)
 {
     return QString::fromStdString(GetVelDir(kind));
@@ -26,17 +21,25 @@ QString standardDir(VelDir kind)
 Options Options::parse(const QStringList &arguments)
 {
     QCommandLineParser parser;
-    parser.setApplicationDescription(tr("Edits the start menu, or picks an entry of it."));
+    parser.setApplicationDescription(
+        QCoreApplication::translate("vel-menuedit", "Edits the start menu, or picks an entry of it."));
     parser.addHelpOption();
     parser.addVersionOption();
     parser.addOptions({
-        {QStringLiteral("dir"), tr("Show the menu directory <dir> instead of the start menu."),
+        {QStringLiteral("dir"),
+         QCoreApplication::translate("vel-menuedit",
+                                     "Show the menu directory <dir> instead of the start menu."),
          QStringLiteral("dir")},
-        {QStringLiteral("desktop"), tr("Show the desktop folder.")},
-        {QStringLiteral("toolbar"), tr("Show the tool bar.")},
-        {QStringLiteral("read-only"), tr("Look only, change nothing.")},
-        {QStringLiteral("icon-size"), tr("Show icons of <pixels> pixels."), QStringLiteral("pixels")},
-        {QStringLiteral("pick"), tr("Pick an entry and print its path and its command line.")},
+        {QStringLiteral("desktop"), QCoreApplication::translate("vel-menuedit", "Show the desktop folder.")},
+        {QStringLiteral("toolbar"), QCoreApplication::translate("vel-menuedit", "Show the tool bar.")},
+        {QStringLiteral("read-only"),
+         QCoreApplication::translate("vel-menuedit", "Look only, change nothing.")},
+        {QStringLiteral("icon-size"),
+         QCoreApplication::translate("vel-menuedit", "Show icons of <pixels> pixels."),
+         QStringLiteral("pixels")},
+        {QStringLiteral("pick"),
+         QCoreApplication::translate("vel-menuedit",
+                                     "Pick an entry and print its path and its command line.")},
     });
 
     Options options;
@@ -49,7 +52,8 @@ Options Options::parse(const QStringList &arguments)
     if (parser.isSet(QStringLiteral("version")))
         parser.showVersion();
     if (!parser.positionalArguments().isEmpty())
-        options.error = tr("unexpected argument: %1").arg(parser.positionalArguments().constFirst());
+        options.error = QCoreApplication::translate("vel-menuedit", "unexpected argument: %1")
+                            .arg(parser.positionalArguments().constFirst());
     options.pick = parser.isSet(QStringLiteral("pick"));
     options.editable = !options.pick && !parser.isSet(QStringLiteral("read-only"));
     options.chooseDir(parser);
@@ -64,7 +68,8 @@ void Options::chooseDir(const QCommandLineParser &parser)
     const bool isDesktop = parser.isSet(QStringLiteral("desktop"));
     const bool isToolBar = parser.isSet(QStringLiteral("toolbar"));
     if (int(isDir) + int(isDesktop) + int(isToolBar) > 1)
-        error = tr("only one of --dir, --desktop and --toolbar can be given");
+        error = QCoreApplication::translate("vel-menuedit",
+                                            "only one of --dir, --desktop and --toolbar can be given");
     const QString startMenu = standardDir(VelDir::StartMenu);
     dir = startMenu;
     if (isDir) {
@@ -84,5 +89,7 @@ void Options::chooseIconSize(const QString &text)
     bool isNumber = false;
     iconSize = text.toInt(&isNumber);
     if (!isNumber || iconSize < 1 || iconSize > 512)
-        error = tr("--icon-size needs a number of pixels from 1 to 512, not \"%1\"").arg(text);
+        error = QCoreApplication::translate("vel-menuedit",
+                                            "--icon-size needs a number of pixels from 1 to 512, not \"%1\"")
+                    .arg(text);
 }

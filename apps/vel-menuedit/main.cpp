@@ -4,6 +4,7 @@
 #include "Options.h"
 
 #include <VelMenuDialog.h>
+#include <support/Program.h>
 
 #include <velintegration/startmenu.h>
 
@@ -22,23 +23,10 @@ namespace {
 
 enum ExitStatus { Done = 0, NothingPicked = 1, CannotStart = 2 };
 
-void describeApplication()
-{
-    QCoreApplication::setOrganizationName(QStringLiteral("vel"));
-    QCoreApplication::setApplicationName(QStringLiteral("vel-menuedit"));
-    QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
-    QGuiApplication::setDesktopFileName(QStringLiteral("vel-menuedit"));
-}
-
 int fail(const QString &text)
 {
-    std::fprintf(stderr, "vel-menuedit: %s\n", text.toLocal8Bit().constData());
+    Program::printError(text);
     return CannotStart;
-}
-
-QString tr(const char *text)
-{
-    return QCoreApplication::translate("vel-menuedit", text);
 }
 
 // Whether the directory can be shown; the reason if not.
@@ -46,14 +34,15 @@ QString obstacle(const Options &options)
 {
     if (options.isStartMenu && !QFileInfo::exists(options.dir)
         && !CreateStartMenu(QFile::encodeName(options.dir).constData(), nullptr))
-        return tr("cannot create the start menu %1").arg(options.dir);
+        return QCoreApplication::translate("vel-menuedit", "cannot create the start menu %1")
+            .arg(options.dir);
     const QFileInfo info(options.dir);
     if (!info.exists())
-        return tr("no such directory: %1").arg(options.dir);
+        return QCoreApplication::translate("vel-menuedit", "no such directory: %1").arg(options.dir);
     if (!info.isDir())
-        return tr("not a directory: %1").arg(options.dir);
+        return QCoreApplication::translate("vel-menuedit", "not a directory: %1").arg(options.dir);
     if (!info.isReadable() || !info.isExecutable())
-        return tr("cannot read the directory %1").arg(options.dir);
+        return QCoreApplication::translate("vel-menuedit", "cannot read the directory %1").arg(options.dir);
     return {};
 }
 
@@ -105,9 +94,11 @@ bool wantsNoWindow(int argc, char **argv)
 
 int main(int argc, char **argv)
 {
-    describeApplication();
+    Program::describe(QStringLiteral("vel-menuedit"));
+    QGuiApplication::setDesktopFileName(QStringLiteral("vel-menuedit"));
     if (wantsNoWindow(argc, argv)) {
         QCoreApplication application(argc, argv);
+        Program::loadCatalogues();
         const Options options = Options::parse(QCoreApplication::arguments());
         if (!options.error.isEmpty())
             return fail(options.error);
@@ -116,6 +107,7 @@ int main(int argc, char **argv)
 
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     QApplication application(argc, argv);
+    Program::loadCatalogues();
     // The message box that may follow the dialog would end before it is seen.
     QGuiApplication::setQuitOnLastWindowClosed(false);
     const Options options = Options::parse(QCoreApplication::arguments());

@@ -6,6 +6,7 @@
 #include "MenuFormat.h"
 #include "MenuTree.h"
 
+#include <support/Program.h>
 #include <velcore/dirs.h>
 
 #include <QCommandLineParser>
@@ -22,13 +23,8 @@ enum ExitStatus { Done = 0, CannotWrite = 1, CannotStart = 2 };
 
 int fail(const QString &text)
 {
-    std::fprintf(stderr, "vel-menuprint: %s\n", text.toLocal8Bit().constData());
+    Program::printError(text);
     return CannotStart;
-}
-
-QString tr(const char *text)
-{
-    return QCoreApplication::translate("vel-menuprint", text);
 }
 
 QByteArray printed(const QString &format, const MenuItem &menu)
@@ -44,37 +40,42 @@ QByteArray printed(const QString &format, const MenuItem &menu)
 
 int main(int argc, char **argv)
 {
+    Program::describe(QStringLiteral("vel-menuprint"));
     QCoreApplication application(argc, argv);
+    Program::loadCatalogues();
     std::setlocale(LC_ALL, ""); // names are ordered as the user's language orders them
-    QCoreApplication::setOrganizationName(QStringLiteral("vel"));
-    QCoreApplication::setApplicationName(QStringLiteral("vel-menuprint"));
-    QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
 
     QCommandLineParser parser;
-    parser.setApplicationDescription(tr("Prints a menu directory in its order."));
+    parser.setApplicationDescription(
+        QCoreApplication::translate("vel-menuprint", "Prints a menu directory in its order."));
     parser.addHelpOption();
     parser.addVersionOption();
-    const QCommandLineOption formatOption(QStringLiteral("format"),
-                                          tr("openbox (a pipe menu), json or text (the default)."),
-                                          QStringLiteral("FORMAT"), QStringLiteral("text"));
+    const QCommandLineOption formatOption(
+        QStringLiteral("format"),
+        QCoreApplication::translate("vel-menuprint", "openbox (a pipe menu), json or text (the default)."),
+        QStringLiteral("FORMAT"), QStringLiteral("text"));
     parser.addOption(formatOption);
-    parser.addPositionalArgument(QStringLiteral("DIR"),
-                                 tr("The menu directory; the start menu when none is given."),
-                                 QStringLiteral("[DIR]"));
+    parser.addPositionalArgument(
+        QStringLiteral("DIR"),
+        QCoreApplication::translate("vel-menuprint",
+                                    "The menu directory; the start menu when none is given."),
+        QStringLiteral("[DIR]"));
     parser.process(application);
 
     const QString format = parser.value(formatOption);
     if (!QStringList({QStringLiteral("openbox"), QStringLiteral("json"), QStringLiteral("text")})
              .contains(format))
-        return fail(tr("unknown format: %1").arg(format));
+        return fail(QCoreApplication::translate("vel-menuprint", "unknown format: %1").arg(format));
     if (parser.positionalArguments().size() > 1)
-        return fail(tr("more than one directory"));
+        return fail(QCoreApplication::translate("vel-menuprint", "more than one directory"));
     const QFileInfo directory(
         parser.positionalArguments().value(0, QString::fromStdString(GetVelDir(VelDir::StartMenu))));
     if (!directory.isDir())
-        return fail(tr("no such directory: %1").arg(directory.filePath()));
+        return fail(
+            QCoreApplication::translate("vel-menuprint", "no such directory: %1").arg(directory.filePath()));
     if (!directory.isReadable() || !directory.isExecutable())
-        return fail(tr("cannot read the directory %1").arg(directory.filePath()));
+        return fail(QCoreApplication::translate("vel-menuprint", "cannot read the directory %1")
+                        .arg(directory.filePath()));
 
     const QByteArray out = printed(format, MenuTree::read(directory.absoluteFilePath()));
     const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())

@@ -5,12 +5,13 @@
 
 #include "Bridge.h"
 
+#include <support/Program.h>
+
 #include <QCommandLineParser>
 #include <QCoreApplication>
 #include <QSocketNotifier>
 
 #include <csignal>
-#include <cstdio>
 #include <unistd.h>
 
 namespace {
@@ -27,16 +28,6 @@ void handleSignal(int)
     (void)written; // a full pipe wakes it up as well
 }
 
-void say(const QString &text)
-{
-    std::fprintf(stderr, "vel-wmbridge: %s\n", text.toLocal8Bit().constData());
-}
-
-QString tr(const char *text)
-{
-    return QCoreApplication::translate("vel-wmbridge", text);
-}
-
 void quitOnSignals()
 {
     if (pipe(signalPipe) != 0)
@@ -51,45 +42,55 @@ void quitOnSignals()
 
 int main(int argc, char **argv)
 {
+    Program::describe(QStringLiteral("vel-wmbridge"));
     QCoreApplication application(argc, argv);
-    QCoreApplication::setOrganizationName(QStringLiteral("vel"));
-    QCoreApplication::setApplicationName(QStringLiteral("vel-wmbridge"));
-    QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+    Program::loadCatalogues();
 
     QCommandLineParser parser;
-    parser.setApplicationDescription(
-        tr("Owns the window manager's command channel on a desktop that has none, and runs a command of the "
-           "shell for "
-           "each kind of update. The variable VEL_COMMAND holds the line that came."));
+    parser.setApplicationDescription(QCoreApplication::translate(
+        "vel-wmbridge",
+        "Owns the window manager's command channel on a desktop that has none, and runs a command of the "
+        "shell for each kind of update. The variable VEL_COMMAND holds the line that came."));
     parser.addHelpOption();
     parser.addVersionOption();
     const QString command = QStringLiteral("COMMAND");
-    const QCommandLineOption startMenu(QStringLiteral("startmenu"),
-                                       tr("Run when the start menu has changed."), command);
-    const QCommandLineOption toolBar(QStringLiteral("toolbar"), tr("Run when the tool bar has changed."),
-                                     command);
-    const QCommandLineOption shortcut(QStringLiteral("shortcut"),
-                                      tr("Run when the desktop's entries have changed."), command);
-    const QCommandLineOption other(QStringLiteral("other"), tr("Run for every other line."), command);
-    const QCommandLineOption replace(QStringLiteral("replace"),
-                                     tr("Take the channel from the program that has it."));
+    const QCommandLineOption startMenu(
+        QStringLiteral("startmenu"),
+        QCoreApplication::translate("vel-wmbridge", "Run when the start menu has changed."), command);
+    const QCommandLineOption toolBar(
+        QStringLiteral("toolbar"),
+        QCoreApplication::translate("vel-wmbridge", "Run when the tool bar has changed."), command);
+    const QCommandLineOption shortcut(
+        QStringLiteral("shortcut"),
+        QCoreApplication::translate("vel-wmbridge", "Run when the desktop's entries have changed."), command);
+    const QCommandLineOption other(QStringLiteral("other"),
+                                   QCoreApplication::translate("vel-wmbridge", "Run for every other line."),
+                                   command);
+    const QCommandLineOption replace(
+        QStringLiteral("replace"),
+        QCoreApplication::translate("vel-wmbridge", "Take the channel from the program that has it."));
     parser.addOptions({startMenu, toolBar, shortcut, other, replace});
     parser.process(application);
     if (!parser.positionalArguments().isEmpty()) {
-        say(tr("unexpected argument: %1").arg(parser.positionalArguments().constFirst()));
+        Program::printError(QCoreApplication::translate("vel-wmbridge", "unexpected argument: %1")
+                                .arg(parser.positionalArguments().constFirst()));
         return CannotStart;
     }
 
     Bridge bridge(
         {parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)});
-    QObject::connect(&bridge, &Bridge::failed, &application,
-                     [](const QString &line) { say(tr("cannot run the command for %1").arg(line)); });
+    QObject::connect(&bridge, &Bridge::failed, &application, [](const QString &line) {
+        Program::printError(
+            QCoreApplication::translate("vel-wmbridge", "cannot run the command for %1").arg(line));
+    });
     QObject::connect(&bridge, &Bridge::lost, &application, [] {
-        say(tr("another program has taken the channel"));
+        Program::printError(
+            QCoreApplication::translate("vel-wmbridge", "another program has taken the channel"));
         QCoreApplication::exit(ChannelTaken);
     });
     if (!bridge.start(parser.isSet(replace))) {
-        say(tr("cannot take the channel: there is no display, or another program has it"));
+        Program::printError(QCoreApplication::translate(
+            "vel-wmbridge", "cannot take the channel: there is no display, or another program has it"));
         return ChannelTaken;
     }
     quitOnSignals();

@@ -96,7 +96,7 @@ QString relative(const QString &path)
 QString resolve(const QString &includer, const QString &written)
 {
     QStringList candidates {QFileInfo(includer).absolutePath(), sourceDir + QStringLiteral("/src"),
-                            sourceDir + QStringLiteral("/include")};
+                            sourceDir + QStringLiteral("/include"), sourceDir + QStringLiteral("/apps")};
     for (const char *library : {"velcore", "veluiaux", "velintegration"}) {
         candidates << sourceDir + QStringLiteral("/platform/%1/include").arg(QLatin1String(library))
                    << sourceDir + QStringLiteral("/platform/%1").arg(QLatin1String(library));

@@ -1,0 +1,53 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "Program.h"
+
+#include <QCoreApplication>
+#include <QLibraryInfo>
+#include <QLocale>
+#include <QTranslator>
+
+#include <cstdio>
+#include <memory>
+
+namespace {
+
+bool loadCatalogue(const QString &name, const QString &directory)
+{
+    // Without a directory Qt would look in the working directory.
+    if (directory.isEmpty())
+        return false;
+    auto translator = std::make_unique<QTranslator>(QCoreApplication::instance());
+    if (!translator->load(QLocale::system(), name, QStringLiteral("_"), directory))
+        return false;
+    QCoreApplication::installTranslator(translator.release()); // the application's now
+    return true;
+}
+
+} // namespace
+
+void Program::describe(const QString &name)
+{
+    QCoreApplication::setOrganizationName(QStringLiteral("vel"));
+    QCoreApplication::setApplicationName(name);
+    QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
+}
+
+void Program::loadCatalogues()
+{
+    // The buttons of message boxes and what the command line's parser says.
+    loadCatalogue(QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
+
+    const QString name = QStringLiteral("veluiextra-tools");
+    const QString besideProgram =
+        QCoreApplication::applicationDirPath() + QLatin1String("/../share/vel/translations");
+    if (!loadCatalogue(name, besideProgram))
+        loadCatalogue(name, QStringLiteral(VEL_TRANSLATIONS_DIR));
+}
+
+void Program::printError(const QString &text)
+{
+    std::fprintf(stderr, "%s: %s\n", QCoreApplication::applicationName().toLocal8Bit().constData(),
+                 text.toLocal8Bit().constData());
+}
