@@ -3,9 +3,13 @@
 
 #include "GalleryPages.h"
 
-// Each stands in the source file of its name; those of desktop entries share one.
+// Each stands in the source file of its name; those of desktop entries and of menus share one.
 GalleryPage desktopEntryFieldsPage();
 GalleryPage desktopEntryFormPage();
+GalleryPage fileIconsPage();
+GalleryPage keyNamesPage();
+GalleryPage menuDialogsPage();
+GalleryPage menuViewPage();
 GalleryPage radioGroupBoxPage();
 GalleryPage settingsPage();
 GalleryPage shortcutsPage();
@@ -13,10 +17,8 @@ GalleryPage shortcutsPage();
 QVector<GalleryPage> galleryPages()
 {
     return {
-        radioGroupBoxPage(),
-        settingsPage(),
-        desktopEntryFormPage(),
-        desktopEntryFieldsPage(),
-        shortcutsPage(),
+        menuViewPage(),           menuDialogsPage(), desktopEntryFormPage(),
+        desktopEntryFieldsPage(), shortcutsPage(),   keyNamesPage(),
+        radioGroupBoxPage(),      settingsPage(),    fileIconsPage(),
     };
 }

@@ -102,7 +102,7 @@ GalleryPage shortcutsPage()
     GalleryPage page;
     page.name = QStringLiteral("shortcuts");
     page.title = PageTexts::tr("Shortcuts");
-    page.category = PageTexts::tr("Dialogs");
+    page.category = PageTexts::tr("Shortcuts");
     page.snippet = QStringLiteral(R"(QSettings settings;
 auto *model = new ShortcutsModel(&settings, "Shortcuts", this);
 model->registerAction("file-save", saveAction, tr("File"));

@@ -1,0 +1,69 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "GalleryPage.h"
+
+#include <VelKeyServer.h>
+
+#include <QCoreApplication>
+#include <QFormLayout>
+#include <QKeySequenceEdit>
+#include <QLabel>
+
+namespace {
+
+QString text(const char *source)
+{
+    return QCoreApplication::translate("KeyNamesPage", source);
+}
+
+QLabel *addRow(QFormLayout *layout, const QString &title)
+{
+    auto *label = new QLabel(layout->parentWidget());
+    label->setTextFormat(Qt::PlainText);
+    label->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
+    layout->addRow(title, label);
+    return label;
+}
+
+QWidget *createPage(const GalleryContext &, QWidget *parent)
+{
+    auto *page = new QWidget(parent);
+    auto *layout = new QFormLayout(page);
+    auto *keys = new QKeySequenceEdit(page);
+    layout->addRow(text(QT_TRANSLATE_NOOP("KeyNamesPage", "&Press keys:")), keys);
+    QLabel *x11 =
+        addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "As the window manager writes them:")));
+    QLabel *qt = addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "Read back:")));
+    QLabel *global =
+        addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "Global action with these keys:")));
+
+    QObject::connect(keys, &QKeySequenceEdit::keySequenceChanged, page, [=](const QKeySequence &sequence) {
+        const QString name = sequence.isEmpty() ? QString() : VelKeyServer::KeyQtToKeyStringX(sequence[0]);
+        x11->setText(name);
+        qt->setText(VelKeyServer::KeyStringXToQt(name));
+        global->setText(sequence.isEmpty() ? QString() : VelKeyServer::checkForGlobalShortcut(sequence));
+    });
+    keys->setKeySequence(QKeySequence(Qt::CTRL + Qt::ALT + Qt::Key_F2));
+    return page;
+}
+
+} // namespace
+
+GalleryPage keyNamesPage()
+{
+    GalleryPage page;
+    page.name = QStringLiteral("key-names");
+    page.title = text(QT_TRANSLATE_NOOP("KeyNamesPage", "Key names"));
+    page.category = text(QT_TRANSLATE_NOOP("KeyNamesPage", "Shortcuts"));
+    page.snippet = QStringLiteral(R"(const int code = sequence[0];
+// "Ctrl+Alt+F2"
+const QString name = VelKeyServer::KeyQtToKeyStringX(code);
+const QString back = VelKeyServer::KeyStringXToQt(name);
+
+// Empty when no global action has these keys.
+const QString action =
+    VelKeyServer::checkForGlobalShortcut(sequence);)");
+    page.create = createPage;
+    return page;
+}
