@@ -137,7 +137,7 @@ QString swapCase(const QString &word)
 
 QVector<EditorCommand> fileCommands()
 {
-    const QString menu = QStringLiteral("File");
+    const QString menu = EditorTexts::tr("File");
     const auto insert = [](const QString &format) {
         return [format](QPlainTextEdit *e) {
             e->insertPlainText(QDateTime::currentDateTime().toString(format));
@@ -159,7 +159,7 @@ QVector<EditorCommand> fileCommands()
 
 QVector<EditorCommand> basicEditCommands()
 {
-    const QString menu = QStringLiteral("Edit");
+    const QString menu = EditorTexts::tr("Edit");
     return {
         {QStringLiteral("edit-undo"), menu, EditorTexts::tr("&Undo"), QStringLiteral("Ctrl+Z"),
          [](auto *e) { e->undo(); }},
@@ -179,15 +179,15 @@ QVector<EditorCommand> basicEditCommands()
          [](auto *e) { select(e, QTextCursor::LineUnderCursor); }},
         {QStringLiteral("select-paragraph"), menu, EditorTexts::tr("Select paragraph"), QString(),
          [](auto *e) { select(e, QTextCursor::BlockUnderCursor); }},
-        {QStringLiteral("find-selected"), menu, EditorTexts::tr("Find selected a&gain"),
-         QStringLiteral("F3"), [](auto *e) { find(e, {}); }},
+        {QStringLiteral("find-selected"), menu, EditorTexts::tr("Find selected a&gain"), QStringLiteral("F3"),
+         [](auto *e) { find(e, {}); }},
         {QStringLiteral("find-previous"), menu, EditorTexts::tr("Find selected before"),
          QStringLiteral("Shift+F3"), [](auto *e) { find(e, QTextDocument::FindBackward); }},
         {QStringLiteral("find-word"), menu, EditorTexts::tr("Find selected word"), QString(),
          [](auto *e) { find(e, QTextDocument::FindWholeWords); }},
         {QStringLiteral("find-case"), menu, EditorTexts::tr("Find selected in this case"), QString(),
          [](auto *e) { find(e, QTextDocument::FindCaseSensitively); }},
-        {QStringLiteral("go-line"), menu, EditorTexts::tr("&Go to line..."), QStringLiteral("Ctrl+G"),
+        {QStringLiteral("go-line"), menu, EditorTexts::tr("Go to &line..."), QStringLiteral("Ctrl+G"),
          goToLine},
         {QStringLiteral("go-start"), menu, EditorTexts::tr("Go to start"), QString(),
          [](auto *e) { e->moveCursor(QTextCursor::Start); }},
@@ -210,7 +210,7 @@ QVector<EditorCommand> basicEditCommands()
 
 QVector<EditorCommand> changeCommands()
 {
-    const QString menu = QStringLiteral("Edit");
+    const QString menu = EditorTexts::tr("Edit");
     const auto lines = [](const std::function<void(QStringList &)> &change) {
         return [change](QPlainTextEdit *editor) { changeLines(editor, change); };
     };
@@ -270,7 +270,7 @@ QVector<EditorCommand> changeCommands()
 
 QVector<EditorCommand> viewCommands()
 {
-    const QString menu = QStringLiteral("View");
+    const QString menu = EditorTexts::tr("View");
     return {
         {QStringLiteral("zoom-in"), menu, EditorTexts::tr("Zoom &in"), QStringLiteral("Ctrl++"),
          [](auto *e) { e->zoomIn(); }},
@@ -285,7 +285,7 @@ QVector<EditorCommand> viewCommands()
          [](auto *e) { e->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont)); }},
         {QStringLiteral("view-proportional"), menu, EditorTexts::tr("&Proportional width"), QString(),
          [](auto *e) { e->setFont(QFontDatabase::systemFont(QFontDatabase::GeneralFont)); }},
-        {QStringLiteral("view-overwrite"), menu, EditorTexts::tr("Over&write"), QString(),
+        {QStringLiteral("view-overwrite"), menu, EditorTexts::tr("O&verwrite"), QString(),
          [](auto *e) { e->setOverwriteMode(!e->overwriteMode()); }},
         {QStringLiteral("view-read-only"), menu, EditorTexts::tr("&Read only"), QString(),
          [](auto *e) { e->setReadOnly(!e->isReadOnly()); }},

@@ -83,7 +83,7 @@ QWidget *createPage(const GalleryContext &context, QWidget *parent)
     auto *focusShortcut = new QShortcut(QKeySequence(Qt::Key_F6), page);
     QObject::connect(focusShortcut, &QShortcut::activated, editor, [editor] { editor->setFocus(); });
     model->registerShortcut(QStringLiteral("focus-editor"), focusShortcut, PageTexts::tr("Go to the editor"),
-                            QStringLiteral("View"));
+                            PageTexts::tr("View"));
 
     QAction *configureAction = page->menuBar()
                                    ->addMenu(PageTexts::tr("Settings"))
@@ -91,7 +91,7 @@ QWidget *createPage(const GalleryContext &context, QWidget *parent)
     configureAction->setObjectName(QStringLiteral("configure-shortcuts"));
     configureAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_F12));
     QObject::connect(configureAction, &QAction::triggered, page, [page, model] { configure(page, model); });
-    model->registerAction(configureAction->objectName(), configureAction, QStringLiteral("Settings"));
+    model->registerAction(configureAction->objectName(), configureAction, PageTexts::tr("Settings"));
     return page;
 }
 

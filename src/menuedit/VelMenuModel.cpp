@@ -48,7 +48,7 @@ public:
     {
         timespec now = {};
         clock_gettime(CLOCK_REALTIME, &now);
-        constexpr qint64 Enough = 50'000'000;
+        constexpr qint64 Enough = 50000000;
         return nanoseconds(m_status.st_mtim) + Enough < nanoseconds(now)
             && nanoseconds(m_status.st_ctim) + Enough < nanoseconds(now);
     }
@@ -56,7 +56,7 @@ public:
 private:
     static qint64 nanoseconds(const timespec &time)
     {
-        return qint64(time.tv_sec) * 1'000'000'000 + qint64(time.tv_nsec);
+        return qint64(time.tv_sec) * 1000000000 + qint64(time.tv_nsec);
     }
     static bool isEqual(const timespec &a, const timespec &b) { return nanoseconds(a) == nanoseconds(b); }
 

@@ -1,0 +1,663 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="ja" sourcelanguage="en">
+<context>
+    <name>DesktopEntryPages</name>
+    <message>
+        <source>&amp;Read-only</source>
+        <translation>読み取り専用(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Button beside the address</source>
+        <translation>アドレスの横のボタン(&amp;B)</translation>
+    </message>
+    <message>
+        <source>Asked about %1</source>
+        <translation>%1 について問い合わせました</translation>
+    </message>
+    <message>
+        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <translation>コマンドとファイル、アイコン、リスト、アクションは、それぞれのフィールドのボタンから編集します。</translation>
+    </message>
+    <message>
+        <source>Properties form</source>
+        <translation>プロパティのフォーム</translation>
+    </message>
+    <message>
+        <source>Desktop entries</source>
+        <translation>デスクトップエントリ</translation>
+    </message>
+    <message>
+        <source>Paths, icons, lists and actions</source>
+        <translation>パス、アイコン、リスト、アクション</translation>
+    </message>
+</context>
+<context>
+    <name>EditorCommands</name>
+    <message>
+        <source>Open</source>
+        <translation>開く</translation>
+    </message>
+    <message>
+        <source>Cannot read %1.</source>
+        <translation>%1 を読み取れません。</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>保存</translation>
+    </message>
+    <message>
+        <source>Cannot write %1.</source>
+        <translation>%1 に書き込めません。</translation>
+    </message>
+    <message>
+        <source>Go to line</source>
+        <translation>指定行に移動</translation>
+    </message>
+    <message>
+        <source>Line:</source>
+        <translation>行:</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>ファイル</translation>
+    </message>
+    <message>
+        <source>&amp;New</source>
+        <translation>新規(&amp;N)</translation>
+    </message>
+    <message>
+        <source>&amp;Open...</source>
+        <translation>開く(&amp;O)...</translation>
+    </message>
+    <message>
+        <source>&amp;Save...</source>
+        <translation>保存(&amp;S)...</translation>
+    </message>
+    <message>
+        <source>Insert &amp;date</source>
+        <translation>日付を挿入(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Insert &amp;time</source>
+        <translation>時刻を挿入(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Insert &amp;rule</source>
+        <translation>区切り線を挿入(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>編集</translation>
+    </message>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>元に戻す(&amp;U)</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>やり直し(&amp;R)</translation>
+    </message>
+    <message>
+        <source>Cu&amp;t</source>
+        <translation>切り取り(&amp;T)</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>コピー(&amp;C)</translation>
+    </message>
+    <message>
+        <source>&amp;Paste</source>
+        <translation>貼り付け(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Select &amp;all</source>
+        <translation>すべて選択(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Select word</source>
+        <translation>単語を選択</translation>
+    </message>
+    <message>
+        <source>Select line</source>
+        <translation>行を選択</translation>
+    </message>
+    <message>
+        <source>Select paragraph</source>
+        <translation>段落を選択</translation>
+    </message>
+    <message>
+        <source>Find selected a&amp;gain</source>
+        <translation>選択した文字列の次を検索(&amp;G)</translation>
+    </message>
+    <message>
+        <source>Find selected before</source>
+        <translation>選択した文字列の前を検索</translation>
+    </message>
+    <message>
+        <source>Find selected word</source>
+        <translation>選択した単語を検索</translation>
+    </message>
+    <message>
+        <source>Find selected in this case</source>
+        <translation>大文字と小文字を区別して検索</translation>
+    </message>
+    <message>
+        <source>Go to &amp;line...</source>
+        <translation>指定行に移動(&amp;L)...</translation>
+    </message>
+    <message>
+        <source>Go to start</source>
+        <translation>先頭に移動</translation>
+    </message>
+    <message>
+        <source>Go to end</source>
+        <translation>末尾に移動</translation>
+    </message>
+    <message>
+        <source>Go to next paragraph</source>
+        <translation>次の段落に移動</translation>
+    </message>
+    <message>
+        <source>Go to previous paragraph</source>
+        <translation>前の段落に移動</translation>
+    </message>
+    <message>
+        <source>Delete word to the left</source>
+        <translation>左の単語を削除</translation>
+    </message>
+    <message>
+        <source>Delete word to the right</source>
+        <translation>右の単語を削除</translation>
+    </message>
+    <message>
+        <source>Delete to start of line</source>
+        <translation>行頭まで削除</translation>
+    </message>
+    <message>
+        <source>Delete to end of line</source>
+        <translation>行末まで削除</translation>
+    </message>
+    <message>
+        <source>To upper case</source>
+        <translation>大文字にする</translation>
+    </message>
+    <message>
+        <source>To lower case</source>
+        <translation>小文字にする</translation>
+    </message>
+    <message>
+        <source>Swap case</source>
+        <translation>大文字と小文字を入れ替える</translation>
+    </message>
+    <message>
+        <source>Capitalise</source>
+        <translation>先頭の文字を大文字にする</translation>
+    </message>
+    <message>
+        <source>Move line up</source>
+        <translation>行を上に移動</translation>
+    </message>
+    <message>
+        <source>Move line down</source>
+        <translation>行を下に移動</translation>
+    </message>
+    <message>
+        <source>New line above</source>
+        <translation>上に新しい行</translation>
+    </message>
+    <message>
+        <source>New line below</source>
+        <translation>下に新しい行</translation>
+    </message>
+    <message>
+        <source>Double lines</source>
+        <translation>行を複製</translation>
+    </message>
+    <message>
+        <source>Join lines</source>
+        <translation>行を連結</translation>
+    </message>
+    <message>
+        <source>Sort lines</source>
+        <translation>行を並べ替え</translation>
+    </message>
+    <message>
+        <source>Reverse lines</source>
+        <translation>行を逆順にする</translation>
+    </message>
+    <message>
+        <source>Remove double lines</source>
+        <translation>重複する行を削除</translation>
+    </message>
+    <message>
+        <source>Remove empty lines</source>
+        <translation>空行を削除</translation>
+    </message>
+    <message>
+        <source>Trim lines</source>
+        <translation>行の前後の空白を削除</translation>
+    </message>
+    <message>
+        <source>Indent lines</source>
+        <translation>行をインデント</translation>
+    </message>
+    <message>
+        <source>Unindent lines</source>
+        <translation>行のインデントを解除</translation>
+    </message>
+    <message>
+        <source>Comment lines</source>
+        <translation>行をコメントにする</translation>
+    </message>
+    <message>
+        <source>Uncomment lines</source>
+        <translation>行のコメントを解除</translation>
+    </message>
+    <message>
+        <source>Tabulators to spaces</source>
+        <translation>タブを空白に変換</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>表示</translation>
+    </message>
+    <message>
+        <source>Zoom &amp;in</source>
+        <translation>拡大(&amp;I)</translation>
+    </message>
+    <message>
+        <source>Zoom &amp;out</source>
+        <translation>縮小(&amp;O)</translation>
+    </message>
+    <message>
+        <source>&amp;Wrap lines</source>
+        <translation>行を折り返す(&amp;W)</translation>
+    </message>
+    <message>
+        <source>&amp;Fixed width</source>
+        <translation>等幅フォント(&amp;F)</translation>
+    </message>
+    <message>
+        <source>&amp;Proportional width</source>
+        <translation>プロポーショナルフォント(&amp;P)</translation>
+    </message>
+    <message>
+        <source>O&amp;verwrite</source>
+        <translation>上書き(&amp;V)</translation>
+    </message>
+    <message>
+        <source>&amp;Read only</source>
+        <translation>読み取り専用(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Broad cursor</source>
+        <translation>太いカーソル(&amp;B)</translation>
+    </message>
+    <message>
+        <source>&amp;Centre on cursor</source>
+        <translation>カーソルを中央に表示(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Scroll &amp;up</source>
+        <translation>上にスクロール(&amp;U)</translation>
+    </message>
+    <message>
+        <source>Scroll &amp;down</source>
+        <translation>下にスクロール(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Scroll to &amp;top</source>
+        <translation>先頭までスクロール(&amp;T)</translation>
+    </message>
+    <message>
+        <source>Scroll to botto&amp;m</source>
+        <translation>末尾までスクロール(&amp;M)</translation>
+    </message>
+</context>
+<context>
+    <name>GalleryWindow</name>
+    <message>
+        <source>Widget gallery</source>
+        <translation>ウィジェットギャラリー</translation>
+    </message>
+    <message>
+        <source>Pages</source>
+        <translation>ページ</translation>
+    </message>
+    <message>
+        <source>Code of this page</source>
+        <translation>このページのコード</translation>
+    </message>
+</context>
+<context>
+    <name>RadioGroupBoxPage</name>
+    <message>
+        <source>&amp;Automatic configuration</source>
+        <translation>自動設定(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Script address:</source>
+        <translation>スクリプトのアドレス:</translation>
+    </message>
+    <message>
+        <source>Ask again at every start</source>
+        <translation>起動のたびに確認する</translation>
+    </message>
+    <message>
+        <source>&amp;Manual configuration</source>
+        <translation>手動設定(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Host:</source>
+        <translation>ホスト:</translation>
+    </message>
+    <message>
+        <source>Port:</source>
+        <translation>ポート:</translation>
+    </message>
+    <message>
+        <source>Protocol:</source>
+        <translation>プロトコル:</translation>
+    </message>
+    <message>
+        <source>&amp;Direct connection</source>
+        <translation>直接接続(&amp;D)</translation>
+    </message>
+    <message>
+        <source>Nothing has to be set.</source>
+        <translation>設定の必要はありません。</translation>
+    </message>
+    <message>
+        <source>Radio group boxes</source>
+        <translation>ラジオボタン付きグループボックス</translation>
+    </message>
+    <message>
+        <source>Widgets</source>
+        <translation>ウィジェット</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPage</name>
+    <message>
+        <source>Settings file</source>
+        <translation>設定ファイル</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>設定</translation>
+    </message>
+    <message>
+        <source>F&amp;lat buttons</source>
+        <translation>フラットなボタン(&amp;L)</translation>
+    </message>
+    <message>
+        <source>S&amp;ection:</source>
+        <translation>セクション(&amp;E):</translation>
+    </message>
+    <message>
+        <source>&amp;Font:</source>
+        <translation>フォント(&amp;F):</translation>
+    </message>
+    <message>
+        <source>&amp;Size:</source>
+        <translation>サイズ(&amp;S):</translation>
+    </message>
+    <message>
+        <source>The file as it stands on disk</source>
+        <translation>ディスク上のファイルの内容</translation>
+    </message>
+    <message>
+        <source>Name a settings file on the command line to edit it here.</source>
+        <translation>コマンドラインで設定ファイルを指定すると、ここで編集できます。</translation>
+    </message>
+    <message>
+        <source>%1 cannot be opened.</source>
+        <translation>%1 を開けません。</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutsPage</name>
+    <message>
+        <source>Used: %1</source>
+        <translation>使用: %1</translation>
+    </message>
+    <message>
+        <source>one line
+another line
+and a third one
+</source>
+        <translation>1 行目
+2 行目
+そして 3 行目
+</translation>
+    </message>
+    <message>
+        <source>Go to the editor</source>
+        <translation>エディタに移動</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>表示</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>設定</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts...</source>
+        <translation>ショートカットを設定...</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>ショートカット</translation>
+    </message>
+    <message>
+        <source>Dialogs</source>
+        <translation>ダイアログ</translation>
+    </message>
+</context>
+<context>
+    <name>vel-entryedit</name>
+    <message>
+        <source>Edits a desktop entry.</source>
+        <translation>デスクトップエントリを編集します。</translation>
+    </message>
+    <message>
+        <source>Make a new entry when there is no such file.</source>
+        <translation>ファイルがない場合は新しいエントリを作ります。</translation>
+    </message>
+    <message>
+        <source>Begin with the values of the entry &lt;file&gt;.</source>
+        <translation>エントリ &lt;file&gt; の値から始めます。</translation>
+    </message>
+    <message>
+        <source>Show the entry only.</source>
+        <translation>エントリを表示するだけです。</translation>
+    </message>
+    <message>
+        <source>The entry to edit.</source>
+        <translation>編集するエントリです。</translation>
+    </message>
+    <message>
+        <source>one file has to be named</source>
+        <translation>ファイルを 1 つ指定してください</translation>
+    </message>
+    <message>
+        <source>cannot open %1</source>
+        <translation>%1 を開けません</translation>
+    </message>
+</context>
+<context>
+    <name>vel-gallery</name>
+    <message>
+        <source>the page %1 did not get ready</source>
+        <translation>ページ %1 の準備ができませんでした</translation>
+    </message>
+    <message>
+        <source>cannot write %1</source>
+        <translation>%1 に書き込めません</translation>
+    </message>
+    <message>
+        <source>cannot make the folder %1</source>
+        <translation>フォルダ %1 を作成できません</translation>
+    </message>
+    <message>
+        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <translation>ライブラリのウィジェット、ダイアログ、モデルが動く様子を表示します。</translation>
+    </message>
+    <message>
+        <source>Begin with the page &lt;name&gt;.</source>
+        <translation>ページ &lt;name&gt; から始めます。</translation>
+    </message>
+    <message>
+        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <translation>すべてのページ、または --page で指定したページの画像を &lt;dir&gt; に書き込んで終了します。</translation>
+    </message>
+    <message>
+        <source>The settings file that the settings page edits.</source>
+        <translation>設定のページで編集する設定ファイルです。</translation>
+    </message>
+    <message>
+        <source>Widget gallery</source>
+        <translation>ウィジェットギャラリー</translation>
+    </message>
+    <message>
+        <source>there is no page %1</source>
+        <translation>ページ %1 はありません</translation>
+    </message>
+</context>
+<context>
+    <name>vel-menuedit</name>
+    <message>
+        <source>cannot create the start menu %1</source>
+        <translation>スタートメニュー %1 を作成できません</translation>
+    </message>
+    <message>
+        <source>no such directory: %1</source>
+        <translation>そのようなフォルダはありません: %1</translation>
+    </message>
+    <message>
+        <source>not a directory: %1</source>
+        <translation>フォルダではありません: %1</translation>
+    </message>
+    <message>
+        <source>cannot read the directory %1</source>
+        <translation>フォルダ %1 を読み取れません</translation>
+    </message>
+    <message>
+        <source>Edits the start menu, or picks an entry of it.</source>
+        <translation>スタートメニューを編集するか、そのエントリを選択します。</translation>
+    </message>
+    <message>
+        <source>Show the menu directory &lt;dir&gt; instead of the start menu.</source>
+        <translation>スタートメニューの代わりにメニューフォルダ &lt;dir&gt; を表示します。</translation>
+    </message>
+    <message>
+        <source>Show the desktop folder.</source>
+        <translation>デスクトップフォルダを表示します。</translation>
+    </message>
+    <message>
+        <source>Show the tool bar.</source>
+        <translation>ツールバーを表示します。</translation>
+    </message>
+    <message>
+        <source>Look only, change nothing.</source>
+        <translation>表示するだけで、何も変更しません。</translation>
+    </message>
+    <message>
+        <source>Show icons of &lt;pixels&gt; pixels.</source>
+        <translation>&lt;pixels&gt; ピクセルのアイコンを表示します。</translation>
+    </message>
+    <message>
+        <source>Pick an entry and print its path and its command line.</source>
+        <translation>エントリを選択し、そのパスとコマンドラインを出力します。</translation>
+    </message>
+    <message>
+        <source>unexpected argument: %1</source>
+        <translation>予期しない引数: %1</translation>
+    </message>
+    <message>
+        <source>only one of --dir, --desktop and --toolbar can be given</source>
+        <translation>--dir、--desktop、--toolbar のうち指定できるのは 1 つだけです</translation>
+    </message>
+    <message>
+        <source>--icon-size needs a number of pixels from 1 to 512, not &quot;%1&quot;</source>
+        <translation>--icon-size には 1 から 512 までのピクセル数を指定してください。「%1」は使えません</translation>
+    </message>
+</context>
+<context>
+    <name>vel-menuprint</name>
+    <message>
+        <source>Prints a menu directory in its order.</source>
+        <translation>メニューフォルダをその順序で出力します。</translation>
+    </message>
+    <message>
+        <source>openbox (a pipe menu), json or text (the default).</source>
+        <translation>openbox (パイプメニュー)、json、text (標準) のいずれかです。</translation>
+    </message>
+    <message>
+        <source>The menu directory; the start menu when none is given.</source>
+        <translation>メニューフォルダです。省略した場合はスタートメニューです。</translation>
+    </message>
+    <message>
+        <source>unknown format: %1</source>
+        <translation>不明な形式: %1</translation>
+    </message>
+    <message>
+        <source>more than one directory</source>
+        <translation>フォルダが 2 つ以上指定されています</translation>
+    </message>
+    <message>
+        <source>no such directory: %1</source>
+        <translation>そのようなフォルダはありません: %1</translation>
+    </message>
+    <message>
+        <source>cannot read the directory %1</source>
+        <translation>フォルダ %1 を読み取れません</translation>
+    </message>
+</context>
+<context>
+    <name>vel-wmbridge</name>
+    <message>
+        <source>Owns the window manager&apos;s command channel on a desktop that has none, and runs a command of the shell for each kind of update. The variable VEL_COMMAND holds the line that came.</source>
+        <translation>ウィンドウマネージャのコマンドチャンネルがないデスクトップでそれを受け持ち、更新の種類ごとにシェルのコマンドを実行します。変数 VEL_COMMAND に受信した行が入ります。</translation>
+    </message>
+    <message>
+        <source>Run when the start menu has changed.</source>
+        <translation>スタートメニューが変更されたときに実行します。</translation>
+    </message>
+    <message>
+        <source>Run when the tool bar has changed.</source>
+        <translation>ツールバーが変更されたときに実行します。</translation>
+    </message>
+    <message>
+        <source>Run when the desktop&apos;s entries have changed.</source>
+        <translation>デスクトップのエントリが変更されたときに実行します。</translation>
+    </message>
+    <message>
+        <source>Run for every other line.</source>
+        <translation>その他の行で実行します。</translation>
+    </message>
+    <message>
+        <source>Take the channel from the program that has it.</source>
+        <translation>チャンネルを使用中のプログラムから引き継ぎます。</translation>
+    </message>
+    <message>
+        <source>unexpected argument: %1</source>
+        <translation>予期しない引数: %1</translation>
+    </message>
+    <message>
+        <source>cannot run the command for %1</source>
+        <translation>%1 のコマンドを実行できません</translation>
+    </message>
+    <message>
+        <source>another program has taken the channel</source>
+        <translation>別のプログラムがチャンネルを引き継ぎました</translation>
+    </message>
+    <message>
+        <source>cannot take the channel: there is no display, or another program has it</source>
+        <translation>チャンネルを引き継げません: ディスプレイがないか、別のプログラムが使用中です</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,663 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="ru" sourcelanguage="en">
+<context>
+    <name>DesktopEntryPages</name>
+    <message>
+        <source>&amp;Read-only</source>
+        <translation>&amp;Только чтение</translation>
+    </message>
+    <message>
+        <source>&amp;Button beside the address</source>
+        <translation>&amp;Кнопка рядом с адресом</translation>
+    </message>
+    <message>
+        <source>Asked about %1</source>
+        <translation>Запрошены сведения о %1</translation>
+    </message>
+    <message>
+        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <translation>Команды и файлы, значки, списки и действия изменяются с помощью кнопок в их полях.</translation>
+    </message>
+    <message>
+        <source>Properties form</source>
+        <translation>Форма свойств</translation>
+    </message>
+    <message>
+        <source>Desktop entries</source>
+        <translation>Записи рабочего стола</translation>
+    </message>
+    <message>
+        <source>Paths, icons, lists and actions</source>
+        <translation>Пути, значки, списки и действия</translation>
+    </message>
+</context>
+<context>
+    <name>EditorCommands</name>
+    <message>
+        <source>Open</source>
+        <translation>Открыть</translation>
+    </message>
+    <message>
+        <source>Cannot read %1.</source>
+        <translation>Не удалось прочитать %1.</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Сохранить</translation>
+    </message>
+    <message>
+        <source>Cannot write %1.</source>
+        <translation>Не удалось записать %1.</translation>
+    </message>
+    <message>
+        <source>Go to line</source>
+        <translation>Переход на строку</translation>
+    </message>
+    <message>
+        <source>Line:</source>
+        <translation>Строка:</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>Файл</translation>
+    </message>
+    <message>
+        <source>&amp;New</source>
+        <translation>Созд&amp;ать</translation>
+    </message>
+    <message>
+        <source>&amp;Open...</source>
+        <translation>&amp;Открыть...</translation>
+    </message>
+    <message>
+        <source>&amp;Save...</source>
+        <translation>&amp;Сохранить...</translation>
+    </message>
+    <message>
+        <source>Insert &amp;date</source>
+        <translation>Вставить &amp;дату</translation>
+    </message>
+    <message>
+        <source>Insert &amp;time</source>
+        <translation>Вставить &amp;время</translation>
+    </message>
+    <message>
+        <source>Insert &amp;rule</source>
+        <translation>Вставить &amp;разделитель</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Правка</translation>
+    </message>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>&amp;Отменить</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>Верну&amp;ть</translation>
+    </message>
+    <message>
+        <source>Cu&amp;t</source>
+        <translation>&amp;Вырезать</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>&amp;Копировать</translation>
+    </message>
+    <message>
+        <source>&amp;Paste</source>
+        <translation>В&amp;ставить</translation>
+    </message>
+    <message>
+        <source>Select &amp;all</source>
+        <translation>В&amp;ыделить всё</translation>
+    </message>
+    <message>
+        <source>Select word</source>
+        <translation>Выделить слово</translation>
+    </message>
+    <message>
+        <source>Select line</source>
+        <translation>Выделить строку</translation>
+    </message>
+    <message>
+        <source>Select paragraph</source>
+        <translation>Выделить абзац</translation>
+    </message>
+    <message>
+        <source>Find selected a&amp;gain</source>
+        <translation>&amp;Найти выделенное далее</translation>
+    </message>
+    <message>
+        <source>Find selected before</source>
+        <translation>Найти выделенное ранее</translation>
+    </message>
+    <message>
+        <source>Find selected word</source>
+        <translation>Найти выделенное слово</translation>
+    </message>
+    <message>
+        <source>Find selected in this case</source>
+        <translation>Найти выделенное с учётом регистра</translation>
+    </message>
+    <message>
+        <source>Go to &amp;line...</source>
+        <translation>&amp;Перейти на строку...</translation>
+    </message>
+    <message>
+        <source>Go to start</source>
+        <translation>В начало</translation>
+    </message>
+    <message>
+        <source>Go to end</source>
+        <translation>В конец</translation>
+    </message>
+    <message>
+        <source>Go to next paragraph</source>
+        <translation>К следующему абзацу</translation>
+    </message>
+    <message>
+        <source>Go to previous paragraph</source>
+        <translation>К предыдущему абзацу</translation>
+    </message>
+    <message>
+        <source>Delete word to the left</source>
+        <translation>Удалить слово слева</translation>
+    </message>
+    <message>
+        <source>Delete word to the right</source>
+        <translation>Удалить слово справа</translation>
+    </message>
+    <message>
+        <source>Delete to start of line</source>
+        <translation>Удалить до начала строки</translation>
+    </message>
+    <message>
+        <source>Delete to end of line</source>
+        <translation>Удалить до конца строки</translation>
+    </message>
+    <message>
+        <source>To upper case</source>
+        <translation>В верхний регистр</translation>
+    </message>
+    <message>
+        <source>To lower case</source>
+        <translation>В нижний регистр</translation>
+    </message>
+    <message>
+        <source>Swap case</source>
+        <translation>Поменять регистр</translation>
+    </message>
+    <message>
+        <source>Capitalise</source>
+        <translation>С прописной буквы</translation>
+    </message>
+    <message>
+        <source>Move line up</source>
+        <translation>Переместить строку вверх</translation>
+    </message>
+    <message>
+        <source>Move line down</source>
+        <translation>Переместить строку вниз</translation>
+    </message>
+    <message>
+        <source>New line above</source>
+        <translation>Новая строка выше</translation>
+    </message>
+    <message>
+        <source>New line below</source>
+        <translation>Новая строка ниже</translation>
+    </message>
+    <message>
+        <source>Double lines</source>
+        <translation>Дублировать строки</translation>
+    </message>
+    <message>
+        <source>Join lines</source>
+        <translation>Объединить строки</translation>
+    </message>
+    <message>
+        <source>Sort lines</source>
+        <translation>Сортировать строки</translation>
+    </message>
+    <message>
+        <source>Reverse lines</source>
+        <translation>Обратить порядок строк</translation>
+    </message>
+    <message>
+        <source>Remove double lines</source>
+        <translation>Удалить повторяющиеся строки</translation>
+    </message>
+    <message>
+        <source>Remove empty lines</source>
+        <translation>Удалить пустые строки</translation>
+    </message>
+    <message>
+        <source>Trim lines</source>
+        <translation>Удалить крайние пробелы строк</translation>
+    </message>
+    <message>
+        <source>Indent lines</source>
+        <translation>Увеличить отступ строк</translation>
+    </message>
+    <message>
+        <source>Unindent lines</source>
+        <translation>Уменьшить отступ строк</translation>
+    </message>
+    <message>
+        <source>Comment lines</source>
+        <translation>Закомментировать строки</translation>
+    </message>
+    <message>
+        <source>Uncomment lines</source>
+        <translation>Раскомментировать строки</translation>
+    </message>
+    <message>
+        <source>Tabulators to spaces</source>
+        <translation>Табуляции в пробелы</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>Вид</translation>
+    </message>
+    <message>
+        <source>Zoom &amp;in</source>
+        <translation>&amp;Увеличить</translation>
+    </message>
+    <message>
+        <source>Zoom &amp;out</source>
+        <translation>У&amp;меньшить</translation>
+    </message>
+    <message>
+        <source>&amp;Wrap lines</source>
+        <translation>Перенос &amp;строк</translation>
+    </message>
+    <message>
+        <source>&amp;Fixed width</source>
+        <translation>М&amp;оноширинный шрифт</translation>
+    </message>
+    <message>
+        <source>&amp;Proportional width</source>
+        <translation>&amp;Пропорциональный шрифт</translation>
+    </message>
+    <message>
+        <source>O&amp;verwrite</source>
+        <translation>&amp;Замена</translation>
+    </message>
+    <message>
+        <source>&amp;Read only</source>
+        <translation>&amp;Только чтение</translation>
+    </message>
+    <message>
+        <source>&amp;Broad cursor</source>
+        <translation>&amp;Широкий курсор</translation>
+    </message>
+    <message>
+        <source>&amp;Centre on cursor</source>
+        <translation>По &amp;центру</translation>
+    </message>
+    <message>
+        <source>Scroll &amp;up</source>
+        <translation>Прокрутить &amp;вверх</translation>
+    </message>
+    <message>
+        <source>Scroll &amp;down</source>
+        <translation>Прокрутить в&amp;низ</translation>
+    </message>
+    <message>
+        <source>Scroll to &amp;top</source>
+        <translation>Прокрутить в н&amp;ачало</translation>
+    </message>
+    <message>
+        <source>Scroll to botto&amp;m</source>
+        <translation>Прокрутить в &amp;конец</translation>
+    </message>
+</context>
+<context>
+    <name>GalleryWindow</name>
+    <message>
+        <source>Widget gallery</source>
+        <translation>Галерея виджетов</translation>
+    </message>
+    <message>
+        <source>Pages</source>
+        <translation>Страницы</translation>
+    </message>
+    <message>
+        <source>Code of this page</source>
+        <translation>Код этой страницы</translation>
+    </message>
+</context>
+<context>
+    <name>RadioGroupBoxPage</name>
+    <message>
+        <source>&amp;Automatic configuration</source>
+        <translation>&amp;Автоматическая настройка</translation>
+    </message>
+    <message>
+        <source>Script address:</source>
+        <translation>Адрес сценария:</translation>
+    </message>
+    <message>
+        <source>Ask again at every start</source>
+        <translation>Спрашивать при каждом запуске</translation>
+    </message>
+    <message>
+        <source>&amp;Manual configuration</source>
+        <translation>&amp;Ручная настройка</translation>
+    </message>
+    <message>
+        <source>Host:</source>
+        <translation>Узел:</translation>
+    </message>
+    <message>
+        <source>Port:</source>
+        <translation>Порт:</translation>
+    </message>
+    <message>
+        <source>Protocol:</source>
+        <translation>Протокол:</translation>
+    </message>
+    <message>
+        <source>&amp;Direct connection</source>
+        <translation>&amp;Прямое соединение</translation>
+    </message>
+    <message>
+        <source>Nothing has to be set.</source>
+        <translation>Ничего настраивать не нужно.</translation>
+    </message>
+    <message>
+        <source>Radio group boxes</source>
+        <translation>Группы с переключателем</translation>
+    </message>
+    <message>
+        <source>Widgets</source>
+        <translation>Виджеты</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPage</name>
+    <message>
+        <source>Settings file</source>
+        <translation>Файл настроек</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Настройки</translation>
+    </message>
+    <message>
+        <source>F&amp;lat buttons</source>
+        <translation>&amp;Плоские кнопки</translation>
+    </message>
+    <message>
+        <source>S&amp;ection:</source>
+        <translation>Ра&amp;здел:</translation>
+    </message>
+    <message>
+        <source>&amp;Font:</source>
+        <translation>&amp;Шрифт:</translation>
+    </message>
+    <message>
+        <source>&amp;Size:</source>
+        <translation>&amp;Размер:</translation>
+    </message>
+    <message>
+        <source>The file as it stands on disk</source>
+        <translation>Файл в том виде, как он записан на диске</translation>
+    </message>
+    <message>
+        <source>Name a settings file on the command line to edit it here.</source>
+        <translation>Укажите файл настроек в командной строке, чтобы изменить его здесь.</translation>
+    </message>
+    <message>
+        <source>%1 cannot be opened.</source>
+        <translation>Не удалось открыть %1.</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutsPage</name>
+    <message>
+        <source>Used: %1</source>
+        <translation>Использовано: %1</translation>
+    </message>
+    <message>
+        <source>one line
+another line
+and a third one
+</source>
+        <translation>одна строка
+другая строка
+и третья
+</translation>
+    </message>
+    <message>
+        <source>Go to the editor</source>
+        <translation>Перейти к редактору</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>Вид</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Настройки</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts...</source>
+        <translation>Настроить комбинации клавиш...</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Комбинации клавиш</translation>
+    </message>
+    <message>
+        <source>Dialogs</source>
+        <translation>Диалоговые окна</translation>
+    </message>
+</context>
+<context>
+    <name>vel-entryedit</name>
+    <message>
+        <source>Edits a desktop entry.</source>
+        <translation>Изменяет запись рабочего стола.</translation>
+    </message>
+    <message>
+        <source>Make a new entry when there is no such file.</source>
+        <translation>Создать новую запись, если такого файла нет.</translation>
+    </message>
+    <message>
+        <source>Begin with the values of the entry &lt;file&gt;.</source>
+        <translation>Начать со значений записи &lt;file&gt;.</translation>
+    </message>
+    <message>
+        <source>Show the entry only.</source>
+        <translation>Только показать запись.</translation>
+    </message>
+    <message>
+        <source>The entry to edit.</source>
+        <translation>Изменяемая запись.</translation>
+    </message>
+    <message>
+        <source>one file has to be named</source>
+        <translation>нужно указать один файл</translation>
+    </message>
+    <message>
+        <source>cannot open %1</source>
+        <translation>не удалось открыть %1</translation>
+    </message>
+</context>
+<context>
+    <name>vel-gallery</name>
+    <message>
+        <source>the page %1 did not get ready</source>
+        <translation>страница %1 не готова</translation>
+    </message>
+    <message>
+        <source>cannot write %1</source>
+        <translation>не удалось записать %1</translation>
+    </message>
+    <message>
+        <source>cannot make the folder %1</source>
+        <translation>не удалось создать папку %1</translation>
+    </message>
+    <message>
+        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <translation>Показывает виджеты, диалоговые окна и модели библиотеки в работе.</translation>
+    </message>
+    <message>
+        <source>Begin with the page &lt;name&gt;.</source>
+        <translation>Начать со страницы &lt;name&gt;.</translation>
+    </message>
+    <message>
+        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <translation>Записать в &lt;dir&gt; изображения всех страниц или указанной в --page и завершить работу.</translation>
+    </message>
+    <message>
+        <source>The settings file that the settings page edits.</source>
+        <translation>Файл настроек, изменяемый на странице настроек.</translation>
+    </message>
+    <message>
+        <source>Widget gallery</source>
+        <translation>Галерея виджетов</translation>
+    </message>
+    <message>
+        <source>there is no page %1</source>
+        <translation>нет страницы %1</translation>
+    </message>
+</context>
+<context>
+    <name>vel-menuedit</name>
+    <message>
+        <source>cannot create the start menu %1</source>
+        <translation>не удалось создать меню запуска %1</translation>
+    </message>
+    <message>
+        <source>no such directory: %1</source>
+        <translation>нет такой папки: %1</translation>
+    </message>
+    <message>
+        <source>not a directory: %1</source>
+        <translation>не является папкой: %1</translation>
+    </message>
+    <message>
+        <source>cannot read the directory %1</source>
+        <translation>не удалось прочитать папку %1</translation>
+    </message>
+    <message>
+        <source>Edits the start menu, or picks an entry of it.</source>
+        <translation>Изменяет меню запуска или выбирает его запись.</translation>
+    </message>
+    <message>
+        <source>Show the menu directory &lt;dir&gt; instead of the start menu.</source>
+        <translation>Показать папку меню &lt;dir&gt; вместо меню запуска.</translation>
+    </message>
+    <message>
+        <source>Show the desktop folder.</source>
+        <translation>Показать папку рабочего стола.</translation>
+    </message>
+    <message>
+        <source>Show the tool bar.</source>
+        <translation>Показать панель инструментов.</translation>
+    </message>
+    <message>
+        <source>Look only, change nothing.</source>
+        <translation>Только просмотр, ничего не изменять.</translation>
+    </message>
+    <message>
+        <source>Show icons of &lt;pixels&gt; pixels.</source>
+        <translation>Показывать значки размером &lt;pixels&gt; пикселей.</translation>
+    </message>
+    <message>
+        <source>Pick an entry and print its path and its command line.</source>
+        <translation>Выбрать запись и вывести её путь и командную строку.</translation>
+    </message>
+    <message>
+        <source>unexpected argument: %1</source>
+        <translation>неожиданный аргумент: %1</translation>
+    </message>
+    <message>
+        <source>only one of --dir, --desktop and --toolbar can be given</source>
+        <translation>можно указать только один из параметров --dir, --desktop и --toolbar</translation>
+    </message>
+    <message>
+        <source>--icon-size needs a number of pixels from 1 to 512, not &quot;%1&quot;</source>
+        <translation>для --icon-size нужно число пикселей от 1 до 512, а не «%1»</translation>
+    </message>
+</context>
+<context>
+    <name>vel-menuprint</name>
+    <message>
+        <source>Prints a menu directory in its order.</source>
+        <translation>Выводит папку меню в её порядке.</translation>
+    </message>
+    <message>
+        <source>openbox (a pipe menu), json or text (the default).</source>
+        <translation>openbox (конвейерное меню), json или text (по умолчанию).</translation>
+    </message>
+    <message>
+        <source>The menu directory; the start menu when none is given.</source>
+        <translation>Папка меню; если не указана — меню запуска.</translation>
+    </message>
+    <message>
+        <source>unknown format: %1</source>
+        <translation>неизвестный формат: %1</translation>
+    </message>
+    <message>
+        <source>more than one directory</source>
+        <translation>указано больше одной папки</translation>
+    </message>
+    <message>
+        <source>no such directory: %1</source>
+        <translation>нет такой папки: %1</translation>
+    </message>
+    <message>
+        <source>cannot read the directory %1</source>
+        <translation>не удалось прочитать папку %1</translation>
+    </message>
+</context>
+<context>
+    <name>vel-wmbridge</name>
+    <message>
+        <source>Owns the window manager&apos;s command channel on a desktop that has none, and runs a command of the shell for each kind of update. The variable VEL_COMMAND holds the line that came.</source>
+        <translation>Держит командный канал диспетчера окон в рабочей среде, где его нет, и выполняет команду оболочки для каждого вида обновления. Переменная VEL_COMMAND содержит полученную строку.</translation>
+    </message>
+    <message>
+        <source>Run when the start menu has changed.</source>
+        <translation>Выполнить при изменении меню запуска.</translation>
+    </message>
+    <message>
+        <source>Run when the tool bar has changed.</source>
+        <translation>Выполнить при изменении панели инструментов.</translation>
+    </message>
+    <message>
+        <source>Run when the desktop&apos;s entries have changed.</source>
+        <translation>Выполнить при изменении записей рабочего стола.</translation>
+    </message>
+    <message>
+        <source>Run for every other line.</source>
+        <translation>Выполнить для любой другой строки.</translation>
+    </message>
+    <message>
+        <source>Take the channel from the program that has it.</source>
+        <translation>Забрать канал у программы, которая его занимает.</translation>
+    </message>
+    <message>
+        <source>unexpected argument: %1</source>
+        <translation>неожиданный аргумент: %1</translation>
+    </message>
+    <message>
+        <source>cannot run the command for %1</source>
+        <translation>не удалось выполнить команду для %1</translation>
+    </message>
+    <message>
+        <source>another program has taken the channel</source>
+        <translation>канал занят другой программой</translation>
+    </message>
+    <message>
+        <source>cannot take the channel: there is no display, or another program has it</source>
+        <translation>не удалось занять канал: нет дисплея или канал занят другой программой</translation>
+    </message>
+</context>
+</TS>

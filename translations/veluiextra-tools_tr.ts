@@ -1,0 +1,663 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="tr" sourcelanguage="en">
+<context>
+    <name>DesktopEntryPages</name>
+    <message>
+        <source>&amp;Read-only</source>
+        <translation>&amp;Salt okunur</translation>
+    </message>
+    <message>
+        <source>&amp;Button beside the address</source>
+        <translation>Adresin yanında &amp;düğme</translation>
+    </message>
+    <message>
+        <source>Asked about %1</source>
+        <translation>%1 hakkında soruldu</translation>
+    </message>
+    <message>
+        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <translation>Komutlar ve dosyalar, simgeler, listeler ve eylemler alanlarının düğmeleriyle düzenlenir.</translation>
+    </message>
+    <message>
+        <source>Properties form</source>
+        <translation>Özellikler formu</translation>
+    </message>
+    <message>
+        <source>Desktop entries</source>
+        <translation>Masaüstü girdileri</translation>
+    </message>
+    <message>
+        <source>Paths, icons, lists and actions</source>
+        <translation>Yollar, simgeler, listeler ve eylemler</translation>
+    </message>
+</context>
+<context>
+    <name>EditorCommands</name>
+    <message>
+        <source>Open</source>
+        <translation>Aç</translation>
+    </message>
+    <message>
+        <source>Cannot read %1.</source>
+        <translation>%1 okunamıyor.</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Kaydet</translation>
+    </message>
+    <message>
+        <source>Cannot write %1.</source>
+        <translation>%1 yazılamıyor.</translation>
+    </message>
+    <message>
+        <source>Go to line</source>
+        <translation>Satıra git</translation>
+    </message>
+    <message>
+        <source>Line:</source>
+        <translation>Satır:</translation>
+    </message>
+    <message>
+        <source>File</source>
+        <translation>Dosya</translation>
+    </message>
+    <message>
+        <source>&amp;New</source>
+        <translation>&amp;Yeni</translation>
+    </message>
+    <message>
+        <source>&amp;Open...</source>
+        <translation>&amp;Aç...</translation>
+    </message>
+    <message>
+        <source>&amp;Save...</source>
+        <translation>&amp;Kaydet...</translation>
+    </message>
+    <message>
+        <source>Insert &amp;date</source>
+        <translation>&amp;Tarih ekle</translation>
+    </message>
+    <message>
+        <source>Insert &amp;time</source>
+        <translation>&amp;Saat ekle</translation>
+    </message>
+    <message>
+        <source>Insert &amp;rule</source>
+        <translation>Ayı&amp;rma çizgisi ekle</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Düzen</translation>
+    </message>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>&amp;Geri al</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>&amp;Yinele</translation>
+    </message>
+    <message>
+        <source>Cu&amp;t</source>
+        <translation>Ke&amp;s</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>&amp;Kopyala</translation>
+    </message>
+    <message>
+        <source>&amp;Paste</source>
+        <translation>Ya&amp;pıştır</translation>
+    </message>
+    <message>
+        <source>Select &amp;all</source>
+        <translation>&amp;Tümünü seç</translation>
+    </message>
+    <message>
+        <source>Select word</source>
+        <translation>Sözcüğü seç</translation>
+    </message>
+    <message>
+        <source>Select line</source>
+        <translation>Satırı seç</translation>
+    </message>
+    <message>
+        <source>Select paragraph</source>
+        <translation>Paragrafı seç</translation>
+    </message>
+    <message>
+        <source>Find selected a&amp;gain</source>
+        <translation>Seçileni yine &amp;bul</translation>
+    </message>
+    <message>
+        <source>Find selected before</source>
+        <translation>Seçileni önceki konumda bul</translation>
+    </message>
+    <message>
+        <source>Find selected word</source>
+        <translation>Seçili sözcüğü bul</translation>
+    </message>
+    <message>
+        <source>Find selected in this case</source>
+        <translation>Seçileni büyük/küçük harfe duyarlı bul</translation>
+    </message>
+    <message>
+        <source>Go to &amp;line...</source>
+        <translation>S&amp;atıra git...</translation>
+    </message>
+    <message>
+        <source>Go to start</source>
+        <translation>Başa git</translation>
+    </message>
+    <message>
+        <source>Go to end</source>
+        <translation>Sona git</translation>
+    </message>
+    <message>
+        <source>Go to next paragraph</source>
+        <translation>Sonraki paragrafa git</translation>
+    </message>
+    <message>
+        <source>Go to previous paragraph</source>
+        <translation>Önceki paragrafa git</translation>
+    </message>
+    <message>
+        <source>Delete word to the left</source>
+        <translation>Soldaki sözcüğü sil</translation>
+    </message>
+    <message>
+        <source>Delete word to the right</source>
+        <translation>Sağdaki sözcüğü sil</translation>
+    </message>
+    <message>
+        <source>Delete to start of line</source>
+        <translation>Satır başına kadar sil</translation>
+    </message>
+    <message>
+        <source>Delete to end of line</source>
+        <translation>Satır sonuna kadar sil</translation>
+    </message>
+    <message>
+        <source>To upper case</source>
+        <translation>Büyük harfe çevir</translation>
+    </message>
+    <message>
+        <source>To lower case</source>
+        <translation>Küçük harfe çevir</translation>
+    </message>
+    <message>
+        <source>Swap case</source>
+        <translation>Büyük ve küçük harfleri değiştir</translation>
+    </message>
+    <message>
+        <source>Capitalise</source>
+        <translation>İlk harfi büyüt</translation>
+    </message>
+    <message>
+        <source>Move line up</source>
+        <translation>Satırı yukarı taşı</translation>
+    </message>
+    <message>
+        <source>Move line down</source>
+        <translation>Satırı aşağı taşı</translation>
+    </message>
+    <message>
+        <source>New line above</source>
+        <translation>Üste yeni satır</translation>
+    </message>
+    <message>
+        <source>New line below</source>
+        <translation>Alta yeni satır</translation>
+    </message>
+    <message>
+        <source>Double lines</source>
+        <translation>Satırları çoğalt</translation>
+    </message>
+    <message>
+        <source>Join lines</source>
+        <translation>Satırları birleştir</translation>
+    </message>
+    <message>
+        <source>Sort lines</source>
+        <translation>Satırları sırala</translation>
+    </message>
+    <message>
+        <source>Reverse lines</source>
+        <translation>Satırları ters çevir</translation>
+    </message>
+    <message>
+        <source>Remove double lines</source>
+        <translation>Yinelenen satırları kaldır</translation>
+    </message>
+    <message>
+        <source>Remove empty lines</source>
+        <translation>Boş satırları kaldır</translation>
+    </message>
+    <message>
+        <source>Trim lines</source>
+        <translation>Satır boşluklarını kırp</translation>
+    </message>
+    <message>
+        <source>Indent lines</source>
+        <translation>Satırları girintile</translation>
+    </message>
+    <message>
+        <source>Unindent lines</source>
+        <translation>Satır girintisini azalt</translation>
+    </message>
+    <message>
+        <source>Comment lines</source>
+        <translation>Satırları yorum yap</translation>
+    </message>
+    <message>
+        <source>Uncomment lines</source>
+        <translation>Satırları yorumdan çıkar</translation>
+    </message>
+    <message>
+        <source>Tabulators to spaces</source>
+        <translation>Sekmeleri boşluğa çevir</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>Görünüm</translation>
+    </message>
+    <message>
+        <source>Zoom &amp;in</source>
+        <translation>&amp;Yakınlaştır</translation>
+    </message>
+    <message>
+        <source>Zoom &amp;out</source>
+        <translation>&amp;Uzaklaştır</translation>
+    </message>
+    <message>
+        <source>&amp;Wrap lines</source>
+        <translation>Satırları &amp;kaydır</translation>
+    </message>
+    <message>
+        <source>&amp;Fixed width</source>
+        <translation>&amp;Sabit genişlik</translation>
+    </message>
+    <message>
+        <source>&amp;Proportional width</source>
+        <translation>&amp;Orantılı genişlik</translation>
+    </message>
+    <message>
+        <source>O&amp;verwrite</source>
+        <translation>Ü&amp;zerine yaz</translation>
+    </message>
+    <message>
+        <source>&amp;Read only</source>
+        <translation>Sal&amp;t okunur</translation>
+    </message>
+    <message>
+        <source>&amp;Broad cursor</source>
+        <translation>&amp;Geniş imleç</translation>
+    </message>
+    <message>
+        <source>&amp;Centre on cursor</source>
+        <translation>İ&amp;mlece ortala</translation>
+    </message>
+    <message>
+        <source>Scroll &amp;up</source>
+        <translation>Yuka&amp;rı kaydır</translation>
+    </message>
+    <message>
+        <source>Scroll &amp;down</source>
+        <translation>&amp;Aşağı kaydır</translation>
+    </message>
+    <message>
+        <source>Scroll to &amp;top</source>
+        <translation>En başa kay&amp;dır</translation>
+    </message>
+    <message>
+        <source>Scroll to botto&amp;m</source>
+        <translation>&amp;En sona kaydır</translation>
+    </message>
+</context>
+<context>
+    <name>GalleryWindow</name>
+    <message>
+        <source>Widget gallery</source>
+        <translation>Parçacık galerisi</translation>
+    </message>
+    <message>
+        <source>Pages</source>
+        <translation>Sayfalar</translation>
+    </message>
+    <message>
+        <source>Code of this page</source>
+        <translation>Bu sayfanın kodu</translation>
+    </message>
+</context>
+<context>
+    <name>RadioGroupBoxPage</name>
+    <message>
+        <source>&amp;Automatic configuration</source>
+        <translation>&amp;Otomatik yapılandırma</translation>
+    </message>
+    <message>
+        <source>Script address:</source>
+        <translation>Betik adresi:</translation>
+    </message>
+    <message>
+        <source>Ask again at every start</source>
+        <translation>Her başlangıçta yeniden sor</translation>
+    </message>
+    <message>
+        <source>&amp;Manual configuration</source>
+        <translation>&amp;Elle yapılandırma</translation>
+    </message>
+    <message>
+        <source>Host:</source>
+        <translation>Makine:</translation>
+    </message>
+    <message>
+        <source>Port:</source>
+        <translation>Kapı:</translation>
+    </message>
+    <message>
+        <source>Protocol:</source>
+        <translation>İletişim kuralı:</translation>
+    </message>
+    <message>
+        <source>&amp;Direct connection</source>
+        <translation>&amp;Doğrudan bağlantı</translation>
+    </message>
+    <message>
+        <source>Nothing has to be set.</source>
+        <translation>Hiçbir şeyin ayarlanması gerekmiyor.</translation>
+    </message>
+    <message>
+        <source>Radio group boxes</source>
+        <translation>Radyo düğmeli grup kutuları</translation>
+    </message>
+    <message>
+        <source>Widgets</source>
+        <translation>Parçacıklar</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPage</name>
+    <message>
+        <source>Settings file</source>
+        <translation>Ayarlar dosyası</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Ayarlar</translation>
+    </message>
+    <message>
+        <source>F&amp;lat buttons</source>
+        <translation>&amp;Düz düğmeler</translation>
+    </message>
+    <message>
+        <source>S&amp;ection:</source>
+        <translation>&amp;Bölüm:</translation>
+    </message>
+    <message>
+        <source>&amp;Font:</source>
+        <translation>&amp;Yazı tipi:</translation>
+    </message>
+    <message>
+        <source>&amp;Size:</source>
+        <translation>B&amp;oyut:</translation>
+    </message>
+    <message>
+        <source>The file as it stands on disk</source>
+        <translation>Diskteki haliyle dosya</translation>
+    </message>
+    <message>
+        <source>Name a settings file on the command line to edit it here.</source>
+        <translation>Burada düzenlemek için komut satırında bir ayarlar dosyası belirtin.</translation>
+    </message>
+    <message>
+        <source>%1 cannot be opened.</source>
+        <translation>%1 açılamıyor.</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutsPage</name>
+    <message>
+        <source>Used: %1</source>
+        <translation>Kullanıldı: %1</translation>
+    </message>
+    <message>
+        <source>one line
+another line
+and a third one
+</source>
+        <translation>bir satır
+bir satır daha
+ve bir üçüncüsü
+</translation>
+    </message>
+    <message>
+        <source>Go to the editor</source>
+        <translation>Düzenleyiciye git</translation>
+    </message>
+    <message>
+        <source>View</source>
+        <translation>Görünüm</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Ayarlar</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts...</source>
+        <translation>Kısayolları yapılandır...</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Kısayollar</translation>
+    </message>
+    <message>
+        <source>Dialogs</source>
+        <translation>İletişim kutuları</translation>
+    </message>
+</context>
+<context>
+    <name>vel-entryedit</name>
+    <message>
+        <source>Edits a desktop entry.</source>
+        <translation>Bir masaüstü girdisini düzenler.</translation>
+    </message>
+    <message>
+        <source>Make a new entry when there is no such file.</source>
+        <translation>Böyle bir dosya yoksa yeni bir girdi oluştur.</translation>
+    </message>
+    <message>
+        <source>Begin with the values of the entry &lt;file&gt;.</source>
+        <translation>&lt;file&gt; girdisinin değerleriyle başla.</translation>
+    </message>
+    <message>
+        <source>Show the entry only.</source>
+        <translation>Girdiyi yalnızca göster.</translation>
+    </message>
+    <message>
+        <source>The entry to edit.</source>
+        <translation>Düzenlenecek girdi.</translation>
+    </message>
+    <message>
+        <source>one file has to be named</source>
+        <translation>bir dosya belirtilmeli</translation>
+    </message>
+    <message>
+        <source>cannot open %1</source>
+        <translation>%1 açılamıyor</translation>
+    </message>
+</context>
+<context>
+    <name>vel-gallery</name>
+    <message>
+        <source>the page %1 did not get ready</source>
+        <translation>%1 sayfası hazır olmadı</translation>
+    </message>
+    <message>
+        <source>cannot write %1</source>
+        <translation>%1 yazılamıyor</translation>
+    </message>
+    <message>
+        <source>cannot make the folder %1</source>
+        <translation>%1 klasörü oluşturulamıyor</translation>
+    </message>
+    <message>
+        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <translation>Kitaplığın parçacıklarını, iletişim kutularını ve modellerini çalışırken gösterir.</translation>
+    </message>
+    <message>
+        <source>Begin with the page &lt;name&gt;.</source>
+        <translation>&lt;name&gt; sayfasıyla başla.</translation>
+    </message>
+    <message>
+        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <translation>Tüm sayfaların ya da --page ile verilen sayfanın resimlerini &lt;dir&gt; dizinine yaz ve bitir.</translation>
+    </message>
+    <message>
+        <source>The settings file that the settings page edits.</source>
+        <translation>Ayarlar sayfasının düzenlediği ayarlar dosyası.</translation>
+    </message>
+    <message>
+        <source>Widget gallery</source>
+        <translation>Parçacık galerisi</translation>
+    </message>
+    <message>
+        <source>there is no page %1</source>
+        <translation>%1 adlı bir sayfa yok</translation>
+    </message>
+</context>
+<context>
+    <name>vel-menuedit</name>
+    <message>
+        <source>cannot create the start menu %1</source>
+        <translation>%1 başlat menüsü oluşturulamıyor</translation>
+    </message>
+    <message>
+        <source>no such directory: %1</source>
+        <translation>böyle bir klasör yok: %1</translation>
+    </message>
+    <message>
+        <source>not a directory: %1</source>
+        <translation>klasör değil: %1</translation>
+    </message>
+    <message>
+        <source>cannot read the directory %1</source>
+        <translation>%1 klasörü okunamıyor</translation>
+    </message>
+    <message>
+        <source>Edits the start menu, or picks an entry of it.</source>
+        <translation>Başlat menüsünü düzenler veya ondan bir girdi seçer.</translation>
+    </message>
+    <message>
+        <source>Show the menu directory &lt;dir&gt; instead of the start menu.</source>
+        <translation>Başlat menüsü yerine &lt;dir&gt; menü klasörünü göster.</translation>
+    </message>
+    <message>
+        <source>Show the desktop folder.</source>
+        <translation>Masaüstü klasörünü göster.</translation>
+    </message>
+    <message>
+        <source>Show the tool bar.</source>
+        <translation>Araç çubuğunu göster.</translation>
+    </message>
+    <message>
+        <source>Look only, change nothing.</source>
+        <translation>Yalnızca bak, hiçbir şeyi değiştirme.</translation>
+    </message>
+    <message>
+        <source>Show icons of &lt;pixels&gt; pixels.</source>
+        <translation>&lt;pixels&gt; piksellik simgeler göster.</translation>
+    </message>
+    <message>
+        <source>Pick an entry and print its path and its command line.</source>
+        <translation>Bir girdi seç ve yolunu ve komut satırını yazdır.</translation>
+    </message>
+    <message>
+        <source>unexpected argument: %1</source>
+        <translation>beklenmeyen argüman: %1</translation>
+    </message>
+    <message>
+        <source>only one of --dir, --desktop and --toolbar can be given</source>
+        <translation>--dir, --desktop ve --toolbar seçeneklerinden yalnızca biri verilebilir</translation>
+    </message>
+    <message>
+        <source>--icon-size needs a number of pixels from 1 to 512, not &quot;%1&quot;</source>
+        <translation>--icon-size için 1 ile 512 arasında bir piksel sayısı gerekir, &quot;%1&quot; değil</translation>
+    </message>
+</context>
+<context>
+    <name>vel-menuprint</name>
+    <message>
+        <source>Prints a menu directory in its order.</source>
+        <translation>Bir menü klasörünü kendi sırasıyla yazdırır.</translation>
+    </message>
+    <message>
+        <source>openbox (a pipe menu), json or text (the default).</source>
+        <translation>openbox (boru menüsü), json veya text (öntanımlı).</translation>
+    </message>
+    <message>
+        <source>The menu directory; the start menu when none is given.</source>
+        <translation>Menü klasörü; verilmezse başlat menüsü.</translation>
+    </message>
+    <message>
+        <source>unknown format: %1</source>
+        <translation>bilinmeyen biçim: %1</translation>
+    </message>
+    <message>
+        <source>more than one directory</source>
+        <translation>birden çok klasör</translation>
+    </message>
+    <message>
+        <source>no such directory: %1</source>
+        <translation>böyle bir klasör yok: %1</translation>
+    </message>
+    <message>
+        <source>cannot read the directory %1</source>
+        <translation>%1 klasörü okunamıyor</translation>
+    </message>
+</context>
+<context>
+    <name>vel-wmbridge</name>
+    <message>
+        <source>Owns the window manager&apos;s command channel on a desktop that has none, and runs a command of the shell for each kind of update. The variable VEL_COMMAND holds the line that came.</source>
+        <translation>Pencere yöneticisi komut kanalı olmayan bir masaüstünde bu kanalı üstlenir ve her güncelleme türü için bir kabuk komutu çalıştırır. VEL_COMMAND değişkeni gelen satırı içerir.</translation>
+    </message>
+    <message>
+        <source>Run when the start menu has changed.</source>
+        <translation>Başlat menüsü değiştiğinde çalıştır.</translation>
+    </message>
+    <message>
+        <source>Run when the tool bar has changed.</source>
+        <translation>Araç çubuğu değiştiğinde çalıştır.</translation>
+    </message>
+    <message>
+        <source>Run when the desktop&apos;s entries have changed.</source>
+        <translation>Masaüstünün girdileri değiştiğinde çalıştır.</translation>
+    </message>
+    <message>
+        <source>Run for every other line.</source>
+        <translation>Diğer her satır için çalıştır.</translation>
+    </message>
+    <message>
+        <source>Take the channel from the program that has it.</source>
+        <translation>Kanalı elinde tutan programdan al.</translation>
+    </message>
+    <message>
+        <source>unexpected argument: %1</source>
+        <translation>beklenmeyen argüman: %1</translation>
+    </message>
+    <message>
+        <source>cannot run the command for %1</source>
+        <translation>%1 için komut çalıştırılamıyor</translation>
+    </message>
+    <message>
+        <source>another program has taken the channel</source>
+        <translation>kanalı başka bir program aldı</translation>
+    </message>
+    <message>
+        <source>cannot take the channel: there is no display, or another program has it</source>
+        <translation>kanal alınamıyor: ekran yok veya kanal başka bir programda</translation>
+    </message>
+</context>
+</TS>
