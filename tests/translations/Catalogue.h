@@ -1,0 +1,34 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+#include <QStringList>
+#include <QVector>
+
+/// One text of a catalogue's source file.
+struct Message
+{
+    QString context;
+    QString source;
+    QString comment;
+    QString translation;
+    QString type; ///< of the translation; empty when it is finished
+
+    /// The text's line in a list of texts.
+    QString line() const;
+};
+
+/// A catalogue's source file.
+struct Catalogue
+{
+    QString language;
+    QVector<Message> messages;
+    QString error; ///< empty when the file could be read
+
+    static Catalogue read(const QString &path);
+
+    /// The lines of all texts, sorted.
+    QStringList lines() const;
+};
