@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Dateisymbole</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modelle</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Quelltext dieser Seite</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Tasten drücken:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>So schreibt sie die Fensterverwaltung:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Zurückgelesen:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Globale Aktion mit diesen Tasten:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Tastennamen</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Kurzbefehle</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>Eintrag &amp;wählen...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>&amp;Menü bearbeiten...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>&amp;Eintrag bearbeiten...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Menübaum</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menüs</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Menü- und Eintragsdialoge</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ und eine dritte
     <message>
         <source>Shortcuts</source>
         <translation>Kurzbefehle</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Dialoge</translation>
     </message>
 </context>
 <context>

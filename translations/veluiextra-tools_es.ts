@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Iconos de archivos</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modelos</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Código de esta página</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Pulsar teclas:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Tal como las escribe el gestor de ventanas:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Leído de nuevo:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Acción global con estas teclas:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Nombres de teclas</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Accesos rápidos</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>&amp;Elegir una entrada...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Editar el &amp;menú...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Editar una e&amp;ntrada...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Árbol del menú</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menús</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Diálogos de menú y de entrada</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ y una tercera
     <message>
         <source>Shortcuts</source>
         <translation>Accesos rápidos</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Diálogos</translation>
     </message>
 </context>
 <context>

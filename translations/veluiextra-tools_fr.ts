@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Icônes de fichiers</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modèles</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Code de cette page</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Appuyer sur des touches :</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Telles que les écrit le gestionnaire de fenêtres :</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Relu :</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Action globale avec ces touches :</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Noms des touches</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Raccourcis clavier</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>&amp;Choisir une entrée...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Modifier le &amp;menu...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Modifier une e&amp;ntrée...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Arborescence de menu</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menus</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Boîtes de dialogue de menu et d&apos;entrée</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ et une troisième
     <message>
         <source>Shortcuts</source>
         <translation>Raccourcis clavier</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Boîtes de dialogue</translation>
     </message>
 </context>
 <context>

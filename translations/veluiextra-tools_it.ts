@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Icone dei file</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modelli</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Codice di questa pagina</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Premi i tasti:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Come li scrive il gestore delle finestre:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Riletto:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Azione globale con questi tasti:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Nomi dei tasti</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Scorciatoie</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>&amp;Scegli una voce...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Modifica il &amp;menu...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Modifica una &amp;voce...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Albero del menu</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menu</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Finestre di menu e di voce</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ e una terza
     <message>
         <source>Shortcuts</source>
         <translation>Scorciatoie</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Finestre di dialogo</translation>
     </message>
 </context>
 <context>

@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>ファイルのアイコン</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>モデル</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>このページのコード</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>キーを押してください(&amp;P):</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>ウィンドウマネージャでの表記:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>読み戻した結果:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>このキーのグローバルアクション:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>キーの名前</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>ショートカット</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>エントリを選択(&amp;P)...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>メニューを編集(&amp;M)...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>エントリを編集(&amp;N)...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>メニューのツリー</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>メニュー</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>メニューとエントリのダイアログ</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>ショートカット</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>ダイアログ</translation>
     </message>
 </context>
 <context>

@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Ikony plików</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modele</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Kod tej strony</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Naciśnij klawisze:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>W zapisie zarządcy okien:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Odczytano z powrotem:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Globalne działanie z tymi klawiszami:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Nazwy klawiszy</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Skróty</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>Wy&amp;bierz wpis...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Edytuj &amp;menu...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Edytuj &amp;wpis...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Drzewo menu</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menu</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Okna dialogowe menu i wpisu</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ i jeszcze trzeci
     <message>
         <source>Shortcuts</source>
         <translation>Skróty</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Okna dialogowe</translation>
     </message>
 </context>
 <context>

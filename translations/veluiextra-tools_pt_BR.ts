@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Ícones de arquivos</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modelos</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Código desta página</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Pressione teclas:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Como o gerenciador de janelas as escreve:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Lido de volta:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Ação global com estas teclas:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Nomes de teclas</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Atalhos</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>Es&amp;colher uma entrada...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Editar o &amp;menu...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Editar uma e&amp;ntrada...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Árvore do menu</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menus</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Diálogos de menu e de entrada</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ e uma terceira
     <message>
         <source>Shortcuts</source>
         <translation>Atalhos</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Diálogos</translation>
     </message>
 </context>
 <context>

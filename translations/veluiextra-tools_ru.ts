@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Значки файлов</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Модели</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Код этой страницы</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Нажмите клавиши:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Как их записывает диспетчер окон:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Прочитано обратно:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Глобальное действие с этими клавишами:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Имена клавиш</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Комбинации клавиш</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>&amp;Выбрать запись...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Изменить &amp;меню...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Изменить &amp;запись...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Дерево меню</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Меню</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Диалоговые окна меню и записи</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>Комбинации клавиш</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Диалоговые окна</translation>
     </message>
 </context>
 <context>

@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Dosya simgeleri</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modeller</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Bu sayfanın kodu</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Tuşlara basın:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Pencere yöneticisinin yazdığı biçimde:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Geri okunan:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Bu tuşlarla genel eylem:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Tuş adları</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Kısayollar</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>Bir girdi &amp;seç...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>&amp;Menüyü düzenle...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Bir &amp;girdiyi düzenle...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Menü ağacı</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Menüler</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Menü ve girdi iletişim kutuları</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ ve bir üçüncüsü
     <message>
         <source>Shortcuts</source>
         <translation>Kısayollar</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>İletişim kutuları</translation>
     </message>
 </context>
 <context>

@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>Піктограми файлів</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Моделі</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>Код цієї сторінки</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>&amp;Натисніть клавіші:</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>Як їх записує засіб керування вікнами:</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>Прочитано назад:</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>Загальна дія з цими клавішами:</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>Назви клавіш</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>Скорочення</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>&amp;Вибрати запис...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>Змінити &amp;меню...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>Змінити &amp;запис...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>Дерево меню</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>Меню</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>Діалогові вікна меню і запису</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>Скорочення</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>Діалогові вікна</translation>
     </message>
 </context>
 <context>

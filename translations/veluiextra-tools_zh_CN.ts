@@ -316,6 +316,17 @@
     </message>
 </context>
 <context>
+    <name>FileIconsPage</name>
+    <message>
+        <source>File icons</source>
+        <translation>文件图标</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>模型</translation>
+    </message>
+</context>
+<context>
     <name>GalleryWindow</name>
     <message>
         <source>Widget gallery</source>
@@ -328,6 +339,60 @@
     <message>
         <source>Code of this page</source>
         <translation>此页面的代码</translation>
+    </message>
+</context>
+<context>
+    <name>KeyNamesPage</name>
+    <message>
+        <source>&amp;Press keys:</source>
+        <translation>按下按键(&amp;P)：</translation>
+    </message>
+    <message>
+        <source>As the window manager writes them:</source>
+        <translation>窗口管理器的写法：</translation>
+    </message>
+    <message>
+        <source>Read back:</source>
+        <translation>读回结果：</translation>
+    </message>
+    <message>
+        <source>Global action with these keys:</source>
+        <translation>使用这些按键的全局操作：</translation>
+    </message>
+    <message>
+        <source>Key names</source>
+        <translation>按键名称</translation>
+    </message>
+    <message>
+        <source>Shortcuts</source>
+        <translation>快捷键</translation>
+    </message>
+</context>
+<context>
+    <name>MenuPages</name>
+    <message>
+        <source>&amp;Pick an entry...</source>
+        <translation>选取条目(&amp;P)...</translation>
+    </message>
+    <message>
+        <source>Edit the &amp;menu...</source>
+        <translation>编辑菜单(&amp;M)...</translation>
+    </message>
+    <message>
+        <source>Edit an e&amp;ntry...</source>
+        <translation>编辑条目(&amp;N)...</translation>
+    </message>
+    <message>
+        <source>Menu tree</source>
+        <translation>菜单树</translation>
+    </message>
+    <message>
+        <source>Menus</source>
+        <translation>菜单</translation>
+    </message>
+    <message>
+        <source>Menu and entry dialogs</source>
+        <translation>菜单和条目对话框</translation>
     </message>
 </context>
 <context>
@@ -451,10 +516,6 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>快捷键</translation>
-    </message>
-    <message>
-        <source>Dialogs</source>
-        <translation>对话框</translation>
     </message>
 </context>
 <context>

@@ -32,6 +32,8 @@ const QVector<QStringList> &together()
         list("&Read-only|&Button beside the address"),
         list("&Automatic configuration|&Manual configuration|&Direct connection"),
         list("F&lat buttons|S&ection:|&Font:|&Size:"),
+        list("&Press keys:"),
+        list("Edit the &menu...|Edit an e&ntry...|&Pick an entry..."),
         list("&New|&Open...|&Save...|Insert &date|Insert &time|Insert &rule"),
         list("&Undo|&Redo|Cu&t|&Copy|&Paste|Select &all|Find selected a&gain|Go to &line..."),
         list("Zoom &in|Zoom &out|&Wrap lines|&Fixed width|&Proportional width|O&verwrite|&Read only|&Broad "
@@ -162,7 +164,7 @@ void tst_Catalogues::keepWhatIsNoWord()
     static const QRegularExpression pattern(
         QStringLiteral("%[0-9n]|--[a-z]+[a-z-]*|</?[a-z]+>|<a "
                        "href=\"[^\"]*\">|https://[a-z.]+|vel-wm|VEL_COMMAND|openbox|json"
-                       "|\\[Desktop Entry\\]|Desktop Entry Standard|Actions\\b(?=\\s*['»”“\"」])"));
+                       "|\\[Desktop Entry\\]|Desktop Entry Standard|Actions\\b(?=[\\s\\x{a0}]*['»”“\"」])"));
     for (const Message &message : Catalogue::read(sourcePath(name, language)).messages) {
         QVERIFY2(found(message.translation, pattern) == found(message.source, pattern),
                  qPrintable(message.line() + QLatin1Char('\n') + message.translation));
