@@ -23,6 +23,7 @@
 #include <QHBoxLayout>
 #include <QLineEdit>
 #include <QMessageBox>
+#include <QPointer>
 #include <QScrollArea>
 #include <QSignalBlocker>
 #include <QStyle>
@@ -67,6 +68,14 @@ VelDesktopEntryPropsWidgetPrivate::VelDesktopEntryPropsWidgetPrivate(VelDesktopE
     build();
     setType(applicationType, {});
     connectChanges();
+}
+
+VelDesktopEntryPropsWidgetPrivate::~VelDesktopEntryPropsWidgetPrivate()
+{
+    // Behind the question the combo box is in the middle of telling of its new item, and must
+    // not go with the form; confirmTypeChange() deletes it afterwards.
+    if (isAskingForType)
+        typeBox->setParent(nullptr);
 }
 
 void VelDesktopEntryPropsWidgetPrivate::build()
@@ -281,21 +290,36 @@ void VelDesktopEntryPropsWidgetPrivate::typeChosen(int index)
     const QString chosen = typeBox->itemData(index).toString();
     if (chosen.isEmpty() || chosen == type)
         return;
+    const QPointer<Form> alive(this);
+    const bool isConfirmed = confirmTypeChange();
+    if (!alive)
+        return;
+    if (!isConfirmed) {
+        selectType();
+        return;
+    }
+    applyType(chosen);
+    Q_EMIT q->changed();
+}
+
+bool VelDesktopEntryPropsWidgetPrivate::confirmTypeChange()
+{
     // By hand: the ready-made question adds a No button to make No the default.
     GuardedDialog<QMessageBox> box(
         QMessageBox::Question, tr("Attention"),
         tr("Desktop entry type was changed.\nSome field values may be lost...\nContinue?"), QMessageBox::Yes,
         q);
     box->setDefaultButton(QMessageBox::No);
+
+    const QPointer<Form> alive(this);
+    QComboBox *const orphan = isAskingForType ? nullptr : typeBox;
+    isAskingForType = true;
     const int answer = box.exec();
-    if (!box.isAlive())
-        return;
-    if (answer != QMessageBox::Yes) {
-        selectType();
-        return;
-    }
-    applyType(chosen);
-    Q_EMIT q->changed();
+    if (alive)
+        isAskingForType = !orphan;
+    else if (orphan)
+        orphan->deleteLater();
+    return answer == QMessageBox::Yes;
 }
 
 void VelDesktopEntryPropsWidgetPrivate::loadFrom(const VelUIDesktopEntry &entry)

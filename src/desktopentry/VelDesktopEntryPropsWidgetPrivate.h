@@ -33,6 +33,7 @@ class VelDesktopEntryPropsWidgetPrivate : public QObject
 
 public:
     explicit VelDesktopEntryPropsWidgetPrivate(VelDesktopEntryPropsWidget *widget);
+    ~VelDesktopEntryPropsWidgetPrivate() override;
 
     void setType(const QString &newType, const QStringList &newAllowedTypes);
     void loadFrom(const VelUIDesktopEntry &entry);
@@ -97,6 +98,7 @@ public:
     bool readOnly = false;
     bool showURLInfoButton = false;
     bool showInSwitched = false; // since the last loading
+    bool isAskingForType = false;
 
 private:
     static const std::vector<VelUI::PropsRow> &rows();
