@@ -52,6 +52,9 @@ public:
      */
     void setChanged(bool changed);
 
+    /// Hides the dialog with the result Rejected; throws away what is changed.
+    void reject() override;
+
 public Q_SLOTS:
     /**
      * Shows the keys of the shortcut that is current now or whose key changed.
@@ -81,8 +84,6 @@ public Q_SLOTS:
     void slotAccept();
     /// Throws the edits away and rejects the dialog.
     void slotReject();
-    /// Hides the dialog with the result Rejected; throws away what is changed.
-    void reject() override;
 
 protected:
     /// Asks what to do with edits; the dialog stays open when the answer is Cancel.
