@@ -57,15 +57,16 @@ QList<VelUIDesktopAction> writable(const QList<VelUIDesktopAction> &actions, con
 
 VelUIDesktopAction read(const EntryDocument &entry, const QString &id)
 {
-    const std::string group = groupOf(id);
+    const std::string name = groupOf(id);
+    const EntryReader group = entry.group(name);
     VelUIDesktopAction action(id);
-    action.setName(entry.text(group, Names::Name));
-    action.setLocalName(entry.localText(group, Names::Name));
-    action.setIcon(entry.text(group, Names::Icon));
-    action.setLocalIcon(entry.localText(group, Names::Icon));
-    action.setExec(entry.text(group, Names::Exec));
-    action.setOnlyShowIn(entry.list(group, Names::OnlyShowIn));
-    action.setNotShowIn(entry.list(group, Names::NotShowIn));
+    action.setName(group.text(Names::Name));
+    action.setLocalName(group.localText(Names::Name));
+    action.setIcon(group.text(Names::Icon));
+    action.setLocalIcon(group.localText(Names::Icon));
+    action.setExec(group.text(Names::Exec));
+    action.setOnlyShowIn(group.list(Names::OnlyShowIn));
+    action.setNotShowIn(group.list(Names::NotShowIn));
     return action;
 }
 

@@ -56,8 +56,8 @@ void tst_DesktopEntryText::findsTheSameAsAPlainWalkOverTheLines()
         for (const QByteArray &name : names) {
             const QByteArray locale = name.contains('[') ? name.mid(5).chopped(1) : QByteArray();
             const QByteArray base = name.split('[').constFirst();
-            const auto *key = text.key(text.group("G"), view(base), view(locale));
-            QCOMPARE(key != nullptr, expected.contains(name));
+            const auto key = text.key(text.group("G"), view(base), view(locale));
+            QCOMPARE(key.has_value(), expected.contains(name));
             if (key)
                 QVERIFY(text.value(*key) == view(expected[name]));
         }

@@ -40,6 +40,7 @@ private Q_SLOTS:
     void doesNotReplaceAFileThatItCouldNotRead();
     void writesEverythingWhenWritesComeInPieces();
 
+    void syncsAHiddenFileBesideTheTargetAndRenamesIt_data();
     void syncsAHiddenFileBesideTheTargetAndRenamesIt();
     void keepsThePermissions_data();
     void keepsThePermissions();
@@ -112,6 +113,8 @@ void tst_VelUIDesktopEntrySaving::leavesTheOldFileWholeWhenACallFails()
 {
     QFETCH(QByteArray, call);
     QFETCH(int, error);
+    // Permissions that a new file does not have by itself.
+    QCOMPARE(::chmod(qPrintable(m_file), 0640), 0);
     VelUIDesktopEntry record(m_file);
     record.setName(QStringLiteral("B"));
     FaultySystem::failAt(call, error);
@@ -244,22 +247,34 @@ void tst_VelUIDesktopEntrySaving::writesEverythingWhenWritesComeInPieces()
     QCOMPARE(read(m_file), Header + "Name=B\n");
 }
 
+void tst_VelUIDesktopEntrySaving::syncsAHiddenFileBesideTheTargetAndRenamesIt_data()
+{
+    QTest::addColumn<uint>("mode");
+    QTest::addColumn<QByteArrayList>("calls");
+    QTest::newRow("usual permissions") << 0644U << QByteArrayList{"write", "fsync"};
+    QTest::newRow("a group of its own") << 0640U << QByteArrayList{"write", "fchmod", "fsync"};
+}
+
 void tst_VelUIDesktopEntrySaving::syncsAHiddenFileBesideTheTargetAndRenamesIt()
 {
+    QFETCH(uint, mode);
+    QFETCH(QByteArrayList, calls);
+    QCOMPARE(::chmod(qPrintable(m_file), mode), 0);
+    const mode_t previous = ::umask(022);
     VelUIDesktopEntry record(m_file);
     record.setName(QStringLiteral("B"));
     FaultySystem::reset();
     const bool saved = record.save();
     const QByteArrayList log = FaultySystem::log();
+    ::umask(previous);
     QVERIFY(saved);
-    QCOMPARE(log.size(), 5);
+    QCOMPARE(log.size(), calls.size() + 2);
     QVERIFY2(log[0].startsWith("open " + QFile::encodeName(folder()) + "/."), log[0].constData());
     const QByteArray temporary = log[0].mid(5);
     QVERIFY2(!temporary.endsWith(".desktop") && !temporary.mid(folder().size() + 1).contains('/'),
              temporary.constData());
-    QCOMPARE(log.mid(1),
-             (QByteArrayList{"write", "fchmod", "fsync",
-                             "rename " + temporary + " " + QFile::encodeName(m_file)}));
+    calls.append("rename " + temporary + " " + QFile::encodeName(m_file));
+    QCOMPARE(log.mid(1), calls);
     QCOMPARE(everything(folder()), QStringList{QStringLiteral("x.desktop")});
 }
 

@@ -86,51 +86,68 @@ private:
     FileDescriptor m_file;
 };
 
+// The bits of a file whose owner and group are not those of the old one yet: nobody may do more
+// than he might with the old one.
+mode_t firstBits(mode_t old)
+{
+    const mode_t others = old & S_IRWXO;
+    const bool groupIsAsOthers = (old & S_IRWXG) == others << 3;
+    return groupIsAsOthers ? old & (S_IRWXU | S_IRWXG | S_IRWXO) : OwnerOnly;
+}
+
 // The new file gets what the old one allows to whom.
 bool takeOver(int file, const struct stat &old)
 {
     struct stat status;
     if (::fstat(file, &status) != 0)
         return false;
+    bool sameBits = ((status.st_mode ^ old.st_mode) & PermissionBits) == 0;
     if (status.st_uid != old.st_uid || status.st_gid != old.st_gid) {
         // Giving a file away is only for the privileged; the group may still be kept.
         if (::fchown(file, old.st_uid, old.st_gid) != 0 && ::fchown(file, uid_t(-1), old.st_gid) != 0)
             errno = 0;
+        sameBits = false; // A new owner costs some.
     }
-    return ::fchmod(file, old.st_mode & PermissionBits) == 0;
+    return sameBits || ::fchmod(file, old.st_mode & PermissionBits) == 0;
+}
+
+// Renaming would replace a file that is write-protected, too.
+bool isWritable(const AtomicFile::Target &target)
+{
+    if (!S_ISREG(target.status.st_mode))
+        return false;
+    const bool byOwner = (target.status.st_mode & S_IWUSR) != 0 && target.status.st_uid == ::geteuid();
+    return byOwner || ::access(target.path.constData(), W_OK) == 0;
 }
 
 } // namespace
 
-QByteArray AtomicFile::target(const QByteArray &path)
+std::optional<AtomicFile::Target> AtomicFile::find(const QByteArray &path)
 {
     if (path.contains('\0'))
-        return {};
-    QByteArray at = path;
+        return std::nullopt;
+    Target target{path, false, {}};
     for (int i = 0; i < MostLinks; ++i) {
+        target.exists = ::lstat(target.path.constData(), &target.status) == 0;
+        if (!target.exists)
+            return errno == ENOENT ? std::make_optional(target) : std::nullopt;
+        if (!S_ISLNK(target.status.st_mode))
+            return target;
         std::array<char, PATH_MAX> link;
-        const ssize_t length = ::readlink(at.constData(), link.data(), link.size());
+        const ssize_t length = ::readlink(target.path.constData(), link.data(), link.size());
         if (length < 0)
-            return at;
+            return std::nullopt;
         const QByteArray to(link.data(), int(length));
-        at = to.startsWith('/') ? to : folderOf(at) + to;
+        target.path = to.startsWith('/') ? to : folderOf(target.path) + to;
     }
-    return {};
+    return std::nullopt;
 }
 
-std::optional<FileStamp> AtomicFile::replace(const QByteArray &target, std::string_view bytes)
+bool AtomicFile::replace(const Target &target, std::string_view bytes)
 {
-    struct stat status;
-    const bool exists = ::lstat(target.constData(), &status) == 0;
-    if (!exists && errno != ENOENT)
-        return std::nullopt;
-    // Renaming would replace a file that is write-protected, too.
-    if (exists && (!S_ISREG(status.st_mode) || ::access(target.constData(), W_OK) != 0))
-        return std::nullopt;
-
-    TemporaryFile file(folderOf(target), exists ? OwnerOnly : NewFile);
-    if (!file.isOpen() || !file.write(bytes) || (exists && !takeOver(file.get(), status))
-        || ::fsync(file.get()) != 0 || !file.rename(target) || ::fstat(file.get(), &status) != 0)
-        return std::nullopt;
-    return FileStamp(status);
+    if (target.exists && !isWritable(target))
+        return false;
+    TemporaryFile file(folderOf(target.path), target.exists ? firstBits(target.status.st_mode) : NewFile);
+    return file.isOpen() && file.write(bytes) && (!target.exists || takeOver(file.get(), target.status))
+        && ::fsync(file.get()) == 0 && file.rename(target.path);
 }

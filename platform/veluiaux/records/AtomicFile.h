@@ -3,9 +3,9 @@
 
 #pragma once
 
-#include "EntryFile.h"
-
 #include <QByteArray>
+
+#include <sys/stat.h>
 
 #include <optional>
 #include <string_view>
@@ -16,18 +16,24 @@
  */
 namespace AtomicFile {
 
-/// The file that \a path leads to through any symbolic links, which need not exist; empty if
-/// they lead in a circle.
-QByteArray target(const QByteArray &path);
+/// A place for a file, whatever links led there.
+struct Target
+{
+    QByteArray path;
+    bool exists = false;
+    struct stat status = {}; ///< of what exists
+};
+
+/// The file that \a path leads to through any symbolic links, which need not exist; none if
+/// they lead in a circle or it cannot be told what is there.
+std::optional<Target> find(const QByteArray &path);
 
 /**
- * Gives \a target, which is no symbolic link, the contents \a bytes.
+ * Gives \a target the contents \a bytes; false if that failed.
  *
  * Keeps the permissions (and, where it may, the owner) of an existing file, which has to be a
  * regular one that the caller may write to. Makes no folder.
- *
- * @return the stamp of the new file; none if it could not be written
  */
-std::optional<FileStamp> replace(const QByteArray &target, std::string_view bytes);
+bool replace(const Target &target, std::string_view bytes);
 
 } // namespace AtomicFile

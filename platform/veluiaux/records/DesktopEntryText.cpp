@@ -3,19 +3,26 @@
 
 #include "DesktopEntryText.h"
 
-#include <cstring>
+#include <algorithm>
 #include <utility>
 
 namespace {
 
 constexpr std::string_view ByteOrderMark = "\xEF\xBB\xBF";
 constexpr std::size_t ManyGroups = 16;
-// Rough bytes a key line takes; a guess that saves the index from growing step by step.
-constexpr std::size_t UsualLine = 32;
+// Rough bytes that a key line and a key with all its languages take; guesses that save the
+// index from growing step by step.
+constexpr std::size_t UsualLine = 40;
+constexpr std::size_t UsualRun = 256;
 
 bool isBlank(char c)
 {
     return c == ' ' || c == '\t';
+}
+
+std::uint32_t withoutReturn(const char *data, std::uint32_t begin, std::uint32_t end)
+{
+    return end > begin && data[end - 1] == '\r' ? end - 1 : end;
 }
 
 } // namespace
@@ -28,48 +35,67 @@ DesktopEntryText::DesktopEntryText(QByteArray bytes)
 void DesktopEntryText::index()
 {
     const auto size = std::size_t(m_bytes.size());
-    m_keys.reserve(size / UsualLine + 1);
-    m_tags.reserve(size / UsualLine + 1);
+    m_lines.reserve(size / UsualLine + 8);
+    m_runs.reserve(size / UsualRun + 8);
     m_groups.reserve(4);
 
     const char *const data = m_bytes.constData();
     std::size_t begin = bytes().substr(0, ByteOrderMark.size()) == ByteOrderMark ? ByteOrderMark.size() : 0;
     while (begin < size) {
         const auto *const feed = static_cast<const char *>(std::memchr(data + begin, '\n', size - begin));
-        std::size_t end = feed ? std::size_t(feed - data) : size;
-        const std::size_t next = feed ? end + 1 : size;
-        if (end > begin && data[end - 1] == '\r')
-            --end;
-        addLine(std::uint32_t(begin), std::uint32_t(end), std::uint32_t(next));
-        begin = next;
+        const std::size_t end = feed ? std::size_t(feed - data) : size;
+        addLine(std::uint32_t(begin), std::uint32_t(end));
+        begin = end + 1;
     }
-    if (!m_groups.empty())
-        m_groups.back().endKey = std::uint32_t(m_keys.size());
+    endGroup();
     indexGroups();
+    m_isIndexed.store(true, std::memory_order_release);
 }
 
-void DesktopEntryText::addLine(std::uint32_t begin, std::uint32_t end, std::uint32_t next)
+void DesktopEntryText::addLine(std::uint32_t begin, std::uint32_t end)
 {
+    if (addVariant(begin, end))
+        return;
     const char *const data = m_bytes.constData();
     std::uint32_t first = begin;
     while (first < end && isBlank(data[first]))
         ++first;
     if (first == end || data[first] == '#')
         return;
+    Key key;
     if (data[first] == '[')
-        addHeader(begin, first, end, next);
-    else if (!m_groups.empty())
-        addKey(begin, first, end, next);
+        addHeader(begin, first, end);
+    else if (!m_groups.empty() && parse(begin, end, &key))
+        addKey(key);
 }
 
-void DesktopEntryText::addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end,
-                                 std::uint32_t next)
+// The short way for most lines of most files: the key of the line above in another language.
+bool DesktopEntryText::addVariant(std::uint32_t begin, std::uint32_t end)
 {
-    if (!m_groups.empty())
-        m_groups.back().endKey = std::uint32_t(m_keys.size());
-
+    if (m_groups.empty() || m_runs.size() == m_groups.back().firstRun || !m_runs.back().isPlain)
+        return false;
+    Run &run = m_runs.back();
     const char *const data = m_bytes.constData();
-    std::uint32_t close = end;
+    if (end - begin <= run.nameLength || data[begin + run.nameLength] != '['
+        || std::memcmp(data + begin, data + run.name, run.nameLength) != 0)
+        return false;
+    const char *const locale = data + begin + run.nameLength + 1;
+    const char *const stop = data + end;
+    const char *at = locale;
+    while (at < stop && *at != ']' && *at != '=')
+        ++at;
+    if (at == locale || stop - at < 2 || at[0] != ']' || at[1] != '=')
+        return false;
+    m_lines.push_back({begin, tag({locale, std::size_t(at - locale)})});
+    ++run.endKey;
+    return true;
+}
+
+void DesktopEntryText::addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end)
+{
+    endGroup();
+    const char *const data = m_bytes.constData();
+    std::uint32_t close = withoutReturn(data, begin, end);
     while (close > open && isBlank(data[close - 1]))
         --close;
     const std::uint32_t name = open + 1;
@@ -79,35 +105,62 @@ void DesktopEntryText::addHeader(std::uint32_t begin, std::uint32_t open, std::u
     // A bracket inside makes the line unclear: it still ends the group above it.
     if (std::memchr(data + name, ']', length))
         length = 0;
-    const auto keys = std::uint32_t(m_keys.size());
-    m_groups.push_back({begin, name, length, next, keys, keys});
+    const auto keys = std::uint32_t(m_lines.size());
+    const auto runs = std::uint32_t(m_runs.size());
+    m_groups.push_back(
+        {begin, name, length, std::min(end + 1, std::uint32_t(m_bytes.size())), keys, keys, runs, runs});
 }
 
-void DesktopEntryText::addKey(std::uint32_t begin, std::uint32_t name, std::uint32_t end, std::uint32_t next)
+void DesktopEntryText::endGroup()
+{
+    if (m_groups.empty())
+        return;
+    m_groups.back().endKey = std::uint32_t(m_lines.size());
+    m_groups.back().endRun = std::uint32_t(m_runs.size());
+}
+
+// Takes the line apart that begins and ends there, without its line feed; false if it is no key line.
+bool DesktopEntryText::parse(std::uint32_t begin, std::uint32_t end, Key *key) const
 {
     const char *const data = m_bytes.constData();
-    const auto *const equals = static_cast<const char *>(std::memchr(data + name, '=', end - name));
+    const std::uint32_t valueEnd = withoutReturn(data, begin, end);
+    std::uint32_t name = begin;
+    while (isBlank(data[name]))
+        ++name;
+    const auto *const equals = static_cast<const char *>(std::memchr(data + name, '=', valueEnd - name));
     if (!equals || equals == data + name)
-        return;
+        return false;
     const auto equalsAt = std::uint32_t(equals - data);
     std::uint32_t nameEnd = equalsAt;
     while (isBlank(data[nameEnd - 1]))
         --nameEnd;
     std::uint32_t value = equalsAt + 1;
-    while (value < end && isBlank(data[value]))
+    while (value < valueEnd && isBlank(data[value]))
         ++value;
 
-    Key key{begin, name, nameEnd - name, 0, value, end, next};
+    *key = {
+        begin, name, nameEnd - name, 0, value, valueEnd, std::min(end + 1, std::uint32_t(m_bytes.size()))};
     if (data[nameEnd - 1] == ']') {
-        const auto *const open = static_cast<const char *>(std::memchr(data + name, '[', key.keyLength));
+        const auto *const open = static_cast<const char *>(std::memchr(data + name, '[', key->keyLength));
         const auto openAt = open ? std::uint32_t(open - data) : name;
         if (openAt > name && nameEnd - openAt > 2) {
-            key.keyLength = openAt - name;
-            key.localeLength = nameEnd - openAt - 2;
+            key->keyLength = openAt - name;
+            key->localeLength = nameEnd - openAt - 2;
         }
     }
-    m_keys.push_back(key);
-    m_tags.push_back(tag(keyName(key), locale(key)));
+    return true;
+}
+
+void DesktopEntryText::addKey(const Key &key)
+{
+    const auto index = std::uint32_t(m_lines.size());
+    m_lines.push_back({key.line, tag(locale(key))});
+    const std::string_view name = keyName(key);
+    if (m_runs.size() > m_groups.back().firstRun && isOf(m_runs.back(), name))
+        m_runs.back().endKey = index + 1;
+    else
+        m_runs.push_back(
+            {key.key, key.keyLength, index, index + 1, !std::memchr(name.data(), '[', name.size())});
 }
 
 void DesktopEntryText::indexGroups()
@@ -136,28 +189,45 @@ int DesktopEntryText::group(std::string_view name) const
     return NoGroup;
 }
 
-const DesktopEntryText::Key *DesktopEntryText::key(int group, std::string_view name,
-                                                   std::string_view locale) const
+DesktopEntryText::Key DesktopEntryText::keyAt(std::uint32_t index) const
+{
+    makeIndex();
+    const char *const data = m_bytes.constData();
+    const std::uint32_t begin = m_lines[index].begin;
+    const auto rest = std::size_t(m_bytes.size()) - begin;
+    const auto *const feed = static_cast<const char *>(std::memchr(data + begin, '\n', rest));
+    Key key{};
+    parse(begin, feed ? std::uint32_t(feed - data) : std::uint32_t(m_bytes.size()), &key);
+    return key;
+}
+
+std::optional<DesktopEntryText::Key> DesktopEntryText::key(int group, std::string_view name,
+                                                           std::string_view locale) const
 {
     if (group == NoGroup || name.empty())
-        return nullptr;
+        return std::nullopt;
     makeIndex();
-    const Tag wanted = tag(name, locale);
+    const std::uint32_t wanted = tag(locale);
     const Group &place = m_groups[std::size_t(group)];
-    for (std::uint32_t i = place.endKey; i > place.firstKey; --i) {
-        if (m_tags[i - 1] != wanted)
+    for (std::uint32_t r = place.endRun; r > place.firstRun; --r) {
+        const Run &run = m_runs[r - 1];
+        if (!isOf(run, name))
             continue;
-        const Key &key = m_keys[i - 1];
-        if (keyName(key) == name && this->locale(key) == locale)
-            return &key;
+        for (std::uint32_t i = run.endKey; i > run.firstKey; --i) {
+            if (m_lines[i - 1].tag != wanted)
+                continue;
+            const Key key = keyAt(i - 1);
+            if (this->locale(key) == locale)
+                return key;
+        }
     }
-    return nullptr;
+    return std::nullopt;
 }
 
 std::size_t DesktopEntryText::cost() const
 {
     makeIndex();
     return sizeof(*this) + std::size_t(m_bytes.size()) + m_groups.capacity() * sizeof(Group)
-        + m_keys.capacity() * sizeof(Key) + m_tags.capacity() * sizeof(std::uint32_t)
+        + m_runs.capacity() * sizeof(Run) + m_lines.capacity() * sizeof(Line)
         + m_groupByName.size() * 4 * sizeof(void *);
 }

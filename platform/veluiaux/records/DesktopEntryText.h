@@ -5,8 +5,11 @@
 
 #include <QByteArray>
 
+#include <atomic>
 #include <cstdint>
+#include <cstring>
 #include <mutex>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -16,9 +19,10 @@
  * The bytes of one desktop entry file and the places of its groups and keys.
  *
  * Immutable, so any number of records and threads may share one; the index is made when it is
- * first asked for. Nothing of the file is lost or judged: lines that are neither key, header,
- * comment nor blank simply have no place in the index. Values stay as they stand in the file
- * (see DesktopEntryValue).
+ * first asked for. It knows of each key line no more than where it begins, so it stays small;
+ * a line is taken apart when it is asked for. Nothing of the file is lost or judged: lines that
+ * are neither key, header, comment nor blank simply have no place in the index. Values stay as
+ * they stand in the file (see DesktopEntryValue).
  */
 class DesktopEntryText
 {
@@ -44,6 +48,8 @@ public:
         std::uint32_t lineEnd; ///< begin of the line after the header
         std::uint32_t firstKey; ///< index of the first key
         std::uint32_t endKey; ///< index behind the last key
+        std::uint32_t firstRun;
+        std::uint32_t endRun;
     };
 
     static constexpr int NoGroup = -1;
@@ -58,11 +64,8 @@ public:
         makeIndex();
         return m_groups;
     }
-    const std::vector<Key> &keys() const
-    {
-        makeIndex();
-        return m_keys;
-    }
+    /// The key line of that index.
+    Key keyAt(std::uint32_t index) const;
 
     std::string_view groupName(const Group &group) const { return view(group.name, group.nameLength); }
     std::string_view keyName(const Key &key) const { return view(key.key, key.keyLength); }
@@ -75,43 +78,85 @@ public:
     /// The index of the group that counts: the last one of that name, or NoGroup.
     int group(std::string_view name) const;
 
-    /// The key line that counts: the last one of that name in the group, or null.
-    const Key *key(int group, std::string_view name, std::string_view locale = {}) const;
+    /// The key line that counts: the last one of that name in the group, or none.
+    std::optional<Key> key(int group, std::string_view name, std::string_view locale = {}) const;
 
-    /// Calls \a visit(Key) for each line of \a name in the group that has a language, in the
-    /// file's order; only those whose language begins like \a language, if that is given.
+    /// Calls \a visit(Key) for each line of \a name in the group, with a language or without,
+    /// in the file's order.
+    template <typename Visitor>
+    void forEachLine(int group, std::string_view name, Visitor visit) const
+    {
+        forEachRun(group, name, [this, &visit](const Run &run) {
+            for (std::uint32_t i = run.firstKey; i < run.endKey; ++i)
+                visit(keyAt(i));
+        });
+    }
+
+    /// The same for the lines with a language; only those whose language begins with the same
+    /// two letters as \a language, if that is given.
     template <typename Visitor>
     void forEachVariant(int group, std::string_view name, Visitor visit, std::string_view language = {}) const
     {
-        if (group == NoGroup)
-            return;
-        makeIndex();
         const bool anyLanguage = language.size() < 2;
-        const Tag mask = anyLanguage ? NameBits : ~Tag(0);
-        const Tag wanted = tag(name, language) & mask;
-        const Group &place = m_groups[std::size_t(group)];
-        for (std::uint32_t i = place.firstKey; i < place.endKey; ++i) {
-            if ((m_tags[i] & mask) == wanted && m_keys[i].localeLength && keyName(m_keys[i]) == name)
-                visit(m_keys[i]);
-        }
+        const std::uint32_t wanted = tag(language);
+        forEachRun(group, name, [&](const Run &run) {
+            for (std::uint32_t i = run.firstKey; i < run.endKey; ++i) {
+                if (m_lines[i].tag != wanted && !anyLanguage)
+                    continue;
+                const Key key = keyAt(i);
+                if (key.localeLength)
+                    visit(key);
+            }
+        });
     }
 
     /// The memory this object takes, in bytes.
     std::size_t cost() const;
 
 private:
-    // A few bits that nearly always tell two keys apart, so that a look-up is a walk over one
-    // short array of numbers: length, first and last byte of the name, begin of the language.
-    using Tag = std::uint64_t;
-    static constexpr Tag NameBits = 0xffffffffU;
-
-    static Tag tag(std::string_view name, std::string_view locale)
+    // Where a key line begins, and the first two bytes of its language.
+    struct Line
     {
-        const auto byte = [](char c) { return Tag(static_cast<unsigned char>(c)); };
-        Tag tag = Tag(name.size() & 0xffff) << 16 | byte(name.front()) << 8 | byte(name.back());
-        if (!locale.empty())
-            tag |= byte(locale[0]) << 40 | (locale.size() > 1 ? byte(locale[1]) << 32 : 0);
-        return tag;
+        std::uint32_t begin;
+        std::uint32_t tag;
+    };
+
+    // Lines of one key that follow each other: mostly the key and all its languages. A look-up
+    // walks over these few instead of over all lines.
+    struct Run
+    {
+        std::uint32_t name;
+        std::uint32_t nameLength;
+        std::uint32_t firstKey;
+        std::uint32_t endKey;
+        bool isPlain; // no bracket in the name
+    };
+
+    static std::uint32_t tag(std::string_view locale)
+    {
+        const auto byte = [locale](std::size_t i) {
+            return i < locale.size() ? std::uint32_t(static_cast<unsigned char>(locale[i])) : 0U;
+        };
+        return byte(0) << 8 | byte(1);
+    }
+
+    bool isOf(const Run &run, std::string_view name) const
+    {
+        return run.nameLength == name.size()
+            && std::memcmp(m_bytes.constData() + run.name, name.data(), name.size()) == 0;
+    }
+
+    template <typename Visitor>
+    void forEachRun(int group, std::string_view name, Visitor visit) const
+    {
+        if (group == NoGroup)
+            return;
+        makeIndex();
+        const Group &place = m_groups[std::size_t(group)];
+        for (std::uint32_t i = place.firstRun; i < place.endRun; ++i) {
+            if (isOf(m_runs[i], name))
+                visit(m_runs[i]);
+        }
     }
 
     std::string_view view(std::uint32_t at, std::uint32_t length) const
@@ -121,18 +166,24 @@ private:
 
     void makeIndex() const
     {
-        std::call_once(m_indexed, [this] { const_cast<DesktopEntryText *>(this)->index(); });
+        // std::call_once alone costs more than most of the look-ups that come here.
+        if (!m_isIndexed.load(std::memory_order_acquire))
+            std::call_once(m_indexing, [this] { const_cast<DesktopEntryText *>(this)->index(); });
     }
     void index();
-    void addLine(std::uint32_t begin, std::uint32_t end, std::uint32_t next);
-    void addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end, std::uint32_t next);
-    void addKey(std::uint32_t begin, std::uint32_t name, std::uint32_t end, std::uint32_t next);
+    void addLine(std::uint32_t begin, std::uint32_t end);
+    bool addVariant(std::uint32_t begin, std::uint32_t end);
+    void addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end);
+    bool parse(std::uint32_t begin, std::uint32_t end, Key *key) const;
+    void addKey(const Key &key);
+    void endGroup();
     void indexGroups();
 
     const QByteArray m_bytes;
-    mutable std::once_flag m_indexed;
+    mutable std::once_flag m_indexing;
+    std::atomic<bool> m_isIndexed{false};
     std::vector<Group> m_groups;
-    std::vector<Key> m_keys;
-    std::vector<Tag> m_tags;
+    std::vector<Run> m_runs;
+    std::vector<Line> m_lines;
     std::unordered_map<std::string_view, int> m_groupByName; ///< only where there are many
 };

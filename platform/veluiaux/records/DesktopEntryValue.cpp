@@ -3,6 +3,7 @@
 
 #include "DesktopEntryValue.h"
 
+#include <cstdint>
 #include <cstring>
 
 namespace {
@@ -58,6 +59,22 @@ bool hasEscape(std::string_view bytes)
     return !bytes.empty() && std::memchr(bytes.data(), '\\', bytes.size());
 }
 
+bool isAscii(std::string_view bytes)
+{
+    constexpr std::uint64_t HighBits = 0x8080808080808080U;
+    std::uint64_t block = 0;
+    std::size_t i = 0;
+    for (; i + sizeof block <= bytes.size(); i += sizeof block) {
+        std::memcpy(&block, bytes.data() + i, sizeof block);
+        if (block & HighBits)
+            return false;
+    }
+    block = 0;
+    for (; i < bytes.size(); ++i)
+        block |= static_cast<unsigned char>(bytes[i]);
+    return !(block & HighBits);
+}
+
 void appendEscaped(std::string &out, const QString &text, bool first, bool inList)
 {
     const QByteArray bytes = text.toUtf8();
@@ -85,6 +102,8 @@ void appendEscaped(std::string &out, const QString &text, bool first, bool inLis
 
 std::optional<QString> DesktopEntryValue::decodeUtf8(std::string_view bytes)
 {
+    if (isAscii(bytes))
+        return QString::fromLatin1(bytes.data(), int(bytes.size()));
     // A result never has more units than the source has bytes.
     QString text(int(bytes.size()), Qt::Uninitialized);
     auto *out = reinterpret_cast<ushort *>(text.data());

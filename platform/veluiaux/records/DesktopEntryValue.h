@@ -9,6 +9,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <type_traits>
 
 /**
  * The way from the bytes of a value in a desktop entry file to what they mean, and back.
@@ -27,6 +28,16 @@ std::optional<QString> toText(std::string_view bytes);
 std::optional<QStringList> toList(std::string_view bytes);
 /// Whether the bytes of a boolean say true.
 bool toFlag(std::string_view bytes);
+
+/// toText or toList, by the type of the result.
+template <typename T>
+std::optional<T> decode(std::string_view bytes)
+{
+    if constexpr (std::is_same_v<T, QString>)
+        return toText(bytes);
+    else
+        return toList(bytes);
+}
 
 /// The bytes that read as \a text.
 std::string fromText(const QString &text);

@@ -146,7 +146,7 @@ void Writer::place(const Change &change)
         newGroup(change.group).add(change);
         return;
     }
-    if (const Text::Key *key = m_text.key(group, change.key, change.locale))
+    if (const auto key = m_text.key(group, change.key, change.locale))
         m_splices.push_back({key->value, key->valueEnd - key->value, Rank::Variant, false, *change.value});
     else if (!change.locale.empty())
         insertVariant(group, change);
@@ -156,25 +156,22 @@ void Writer::place(const Change &change)
 
 void Writer::removeKey(const Change &change)
 {
-    for (const Text::Group &group : m_text.groups()) {
-        if (m_text.groupName(group) != change.group || !survives(group))
+    const auto &groups = m_text.groups();
+    for (std::size_t i = 0; i < groups.size(); ++i) {
+        if (m_text.groupName(groups[i]) != change.group || !survives(groups[i]))
             continue;
-        for (std::uint32_t i = group.firstKey; i < group.endKey; ++i) {
-            const Text::Key &key = m_text.keys()[i];
-            if (m_text.keyName(key) == change.key && m_text.locale(key) == change.locale)
+        m_text.forEachLine(int(i), change.key, [this, &change](const Text::Key &key) {
+            if (m_text.locale(key) == change.locale)
                 m_splices.push_back({key.line, key.lineEnd - key.line, Rank::Variant, false, {}});
-        }
+        });
     }
 }
 
 void Writer::insertVariant(int group, const Change &change)
 {
     std::size_t after = 0;
-    if (const Text::Key *key = m_text.key(group, change.key))
-        after = key->lineEnd;
-    m_text.forEachVariant(group, change.key, [&after](const Text::Key &key) {
-        after = std::max(after, std::size_t(key.lineEnd));
-    });
+    m_text.forEachLine(group, change.key,
+                       [&after](const Text::Key &key) { after = std::max(after, std::size_t(key.lineEnd)); });
     if (after)
         m_splices.push_back({after, 0, Rank::Variant, true, keyLine(change, m_lines.lineEndAt(after))});
     else
@@ -186,7 +183,7 @@ void Writer::insertNewKeys()
     for (const auto &[index, keys] : m_newKeys) {
         const Text::Group &group = m_text.groups()[std::size_t(index)];
         const std::size_t after =
-            group.endKey > group.firstKey ? m_text.keys()[group.endKey - 1].lineEnd : group.lineEnd;
+            group.endKey > group.firstKey ? m_text.keyAt(group.endKey - 1).lineEnd : group.lineEnd;
         m_splices.push_back({after, 0, Rank::Key, true, keyLines(keys, m_lines.lineEndAt(after))});
     }
 }

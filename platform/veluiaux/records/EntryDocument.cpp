@@ -3,31 +3,16 @@
 
 #include "EntryDocument.h"
 
-#include "AtomicFile.h"
 #include "DesktopEntryNames.h"
 #include "DesktopEntryValue.h"
 #include "DesktopEntryWriter.h"
-#include "MessageLocale.h"
 
 #include <velcore/language.h>
 
-#include <sys/stat.h>
-
-#include <cerrno>
 #include <mutex>
-#include <type_traits>
 #include <utility>
 
 namespace {
-
-template <typename T>
-std::optional<T> decode(std::string_view bytes)
-{
-    if constexpr (std::is_same_v<T, QString>)
-        return DesktopEntryValue::toText(bytes);
-    else
-        return DesktopEntryValue::toList(bytes);
-}
 
 std::string encode(const QString &text)
 {
@@ -83,66 +68,12 @@ bool EntryDocument::load()
     return m_read;
 }
 
-int EntryDocument::baseGroup(std::string_view group) const
-{
-    return m_changes.isRemoved(group) ? DesktopEntryText::NoGroup : m_text->group(group);
-}
-
-EntryDocument::Value EntryDocument::baseValue(std::string_view group, std::string_view key,
-                                              std::string_view locale) const
-{
-    const DesktopEntryText::Key *const place = m_text->key(baseGroup(group), key, locale);
-    return place ? Value(m_text->value(*place)) : std::nullopt;
-}
-
-EntryDocument::Value EntryDocument::value(std::string_view group, std::string_view key,
-                                          std::string_view locale) const
-{
-    if (const auto *change = m_changes.find(group, key, locale))
-        return change->value ? Value(*change->value) : std::nullopt;
-    return baseValue(group, key, locale);
-}
-
-template <typename T>
-std::optional<T> EntryDocument::read(std::string_view group, std::string_view key) const
-{
-    const Value bytes = value(group, key, {});
-    return bytes ? decode<T>(*bytes) : std::nullopt;
-}
-
-template <typename T>
-std::optional<T> EntryDocument::readLocal(std::string_view group, std::string_view key,
-                                          std::string *locale) const
-{
-    const MessageLocale messages = MessageLocale::current();
-    Value byRank[MessageLocale::BestRank + 1];
-    const auto note = [&](const DesktopEntryText::Key &variant) {
-        byRank[messages.rank(m_text->locale(variant))] = m_text->value(variant);
-    };
-    m_text->forEachVariant(baseGroup(group), key, note, messages.language());
-    for (int rank = MessageLocale::BestRank; rank > 0; --rank) {
-        if (!m_changes.isEmpty()) {
-            const std::string wanted = messages.keyLocale(rank);
-            if (const auto *change = wanted.empty() ? nullptr : m_changes.find(group, key, wanted))
-                byRank[rank] = change->value ? Value(*change->value) : std::nullopt;
-        }
-        // A variant that is spoiled does not stand in the way of a less exact one.
-        auto result = byRank[rank] ? decode<T>(*byRank[rank]) : std::nullopt;
-        if (!result)
-            continue;
-        if (locale)
-            *locale = messages.keyLocale(rank);
-        return result;
-    }
-    return std::nullopt;
-}
-
 template <typename T>
 void EntryDocument::write(std::string_view group, std::string_view key, std::string_view locale,
                           const T &value)
 {
-    const Value base = baseValue(group, key, locale);
-    const bool asInFile = value.isEmpty() ? !base : base && decode<T>(*base) == value;
+    const auto base = this->group(group).base(key, locale);
+    const bool asInFile = value.isEmpty() ? !base : base && DesktopEntryValue::decode<T>(*base) == value;
     if (asInFile)
         m_changes.drop(group, key, locale);
     else
@@ -154,7 +85,7 @@ template <typename T>
 void EntryDocument::writeLocal(std::string_view group, std::string_view key, const T &value)
 {
     std::string locale;
-    const auto now = readLocal<T>(group, key, &locale);
+    const auto now = this->group(group).readLocal<T>(key, &locale);
     if (now.value_or(T()) == value)
         return;
     if (!now)
@@ -164,33 +95,32 @@ void EntryDocument::writeLocal(std::string_view group, std::string_view key, con
 
 bool EntryDocument::has(std::string_view group, std::string_view key) const
 {
-    return value(group, key, {}).has_value();
+    return this->group(group).value(key).has_value();
 }
 
 QString EntryDocument::text(std::string_view group, std::string_view key) const
 {
-    return read<QString>(group, key).value_or(QString());
+    return this->group(group).text(key);
 }
 
 QString EntryDocument::localText(std::string_view group, std::string_view key) const
 {
-    return readLocal<QString>(group, key).value_or(QString());
+    return this->group(group).localText(key);
 }
 
 QStringList EntryDocument::list(std::string_view group, std::string_view key) const
 {
-    return read<QStringList>(group, key).value_or(QStringList());
+    return this->group(group).list(key);
 }
 
 QStringList EntryDocument::localList(std::string_view group, std::string_view key) const
 {
-    return readLocal<QStringList>(group, key).value_or(QStringList());
+    return this->group(group).localList(key);
 }
 
 bool EntryDocument::flag(std::string_view group, std::string_view key) const
 {
-    const Value bytes = value(group, key, {});
-    return bytes && DesktopEntryValue::toFlag(*bytes);
+    return this->group(group).flag(key);
 }
 
 void EntryDocument::setText(std::string_view group, std::string_view key, const QString &value)
@@ -220,7 +150,7 @@ void EntryDocument::setFlag(std::string_view group, std::string_view key, bool v
 {
     if (flag(group, key) == value)
         return;
-    const Value base = baseValue(group, key, {});
+    const auto base = this->group(group).base(key);
     if (base ? DesktopEntryValue::toFlag(*base) == value : !value)
         m_changes.drop(group, key, {});
     else
@@ -229,7 +159,7 @@ void EntryDocument::setFlag(std::string_view group, std::string_view key, bool v
 
 bool EntryDocument::hasGroup(std::string_view group) const
 {
-    if (baseGroup(group) != DesktopEntryText::NoGroup)
+    if (this->group(group).group() != DesktopEntryText::NoGroup)
         return true;
     for (const auto &change : m_changes.all()) {
         if (change.value && change.group == group)
@@ -241,7 +171,8 @@ bool EntryDocument::hasGroup(std::string_view group) const
 void EntryDocument::removeKey(std::string_view group, std::string_view key)
 {
     std::unordered_set<std::string> locales{std::string()};
-    m_text->forEachVariant(baseGroup(group), key, [&](const DesktopEntryText::Key &variant) {
+    const EntryReader reader = this->group(group);
+    m_text->forEachVariant(reader.group(), key, [&](const DesktopEntryText::Key &variant) {
         locales.emplace(m_text->locale(variant));
     });
     for (const auto &change : m_changes.all()) {
@@ -249,7 +180,7 @@ void EntryDocument::removeKey(std::string_view group, std::string_view key)
             locales.insert(change.locale);
     }
     for (const std::string &locale : locales) {
-        if (baseValue(group, key, locale))
+        if (reader.base(key, locale))
             m_changes.set({std::string(group), std::string(key), locale, std::nullopt});
         else
             m_changes.drop(group, key, locale);
@@ -278,10 +209,10 @@ std::vector<EntryDocument::Entry> EntryDocument::entries() const
     for (std::size_t i = 0; i < m_text->groups().size(); ++i) {
         const auto &group = m_text->groups()[i];
         const std::string_view name = m_text->groupName(group);
-        if (baseGroup(name) != int(i))
+        if (this->group(name).group() != int(i))
             continue;
         for (std::uint32_t k = group.firstKey; k < group.endKey; ++k) {
-            const auto &key = m_text->keys()[k];
+            const auto key = m_text->keyAt(k);
             const auto *change = m_changes.find(name, m_text->keyName(key), m_text->locale(key));
             if (!change)
                 add(name, m_text->keyName(key), m_text->locale(key), m_text->value(key));
@@ -311,7 +242,7 @@ void EntryDocument::inheritFrom(const EntryDocument &other)
         if (has(entry.group, entry.key))
             continue;
         if (!entry.locale.empty()
-            && (!other.has(entry.group, entry.key) || value(entry.group, entry.key, entry.locale)))
+            && (!other.has(entry.group, entry.key) || group(entry.group).value(entry.key, entry.locale)))
             continue;
         taken.push_back(std::move(entry));
     }
@@ -326,42 +257,33 @@ bool EntryDocument::save()
     if (m_path.isEmpty())
         return false;
     const std::lock_guard<std::mutex> lock(savingMutex());
-    const QByteArray target = AtomicFile::target(m_path);
-    if (target.isEmpty())
-        return false;
-
-    struct stat status;
-    const bool exists = ::stat(target.constData(), &status) == 0;
-    if (!exists && errno != ENOENT)
+    const auto target = AtomicFile::find(m_path);
+    if (!target)
         return false;
     // A file that is gone is written whole, and so is one that this text did not come from.
-    if (!exists || (m_read && !isFromPath()))
-        return replace(target, DesktopEntryWriter::apply(*m_text, m_changes));
+    if (!target->exists || (m_read && !isFromPath()))
+        return replace(*target, *m_text);
     if (m_changes.isEmpty())
         return true;
+    if (isFromPath() && m_settled && FileStamp(target->status) == m_stamp)
+        return replace(*target, *m_text);
 
-    auto text = m_text;
-    if (!isFromPath() || !m_settled || FileStamp(status) != m_stamp) {
-        // Somebody else may have written meanwhile: our changes go into what stands there now.
-        const auto file = EntryFile::readAnew(target);
-        if (!file)
-            return false;
-        if (file->text->bytes() != text->bytes())
-            text = file->text;
-    }
-    return replace(target, DesktopEntryWriter::apply(*text, m_changes));
+    // Somebody else may have written meanwhile: our changes go into what stands there now.
+    const auto file = EntryFile::readAnew(target->path);
+    if (!file)
+        return false;
+    return replace(*target, file->text->bytes() == m_text->bytes() ? *m_text : *file->text);
 }
 
-bool EntryDocument::replace(const QByteArray &target, const QByteArray &bytes)
+bool EntryDocument::replace(const AtomicFile::Target &target, const DesktopEntryText &text)
 {
+    const QByteArray bytes = DesktopEntryWriter::apply(text, m_changes);
     // A larger one could not be read again.
-    if (bytes.size() > EntryFile::LargestSize)
-        return false;
-    const auto stamp = AtomicFile::replace(target, {bytes.constData(), std::size_t(bytes.size())});
-    if (!stamp)
+    if (bytes.size() > EntryFile::LargestSize
+        || !AtomicFile::replace(target, {bytes.constData(), std::size_t(bytes.size())}))
         return false;
     m_text = std::make_shared<DesktopEntryText>(bytes);
-    m_stamp = *stamp;
+    // So young a file could change without getting another stamp.
     m_settled = false;
     m_read = true;
     m_textPath = m_path;

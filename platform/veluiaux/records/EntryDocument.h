@@ -3,8 +3,10 @@
 
 #pragma once
 
+#include "AtomicFile.h"
 #include "DesktopEntryChanges.h"
 #include "EntryFile.h"
+#include "EntryReader.h"
 
 #include <QByteArray>
 #include <QString>
@@ -47,6 +49,9 @@ public:
     /// Takes over the keys of \a other that this document does not have.
     void inheritFrom(const EntryDocument &other);
 
+    /// The values of one group, for looking at several at once; see there for how long.
+    EntryReader group(std::string_view name) const { return {*m_text, m_changes, name}; }
+
     /// Whether the key stands in the entry, if only with an empty value.
     bool has(std::string_view group, std::string_view key) const;
     QString text(std::string_view group, std::string_view key) const;
@@ -70,28 +75,17 @@ public:
     std::vector<Entry> entries() const;
 
 private:
-    using Value = std::optional<std::string_view>;
-
-    int baseGroup(std::string_view group) const;
-    Value baseValue(std::string_view group, std::string_view key, std::string_view locale) const;
-    Value value(std::string_view group, std::string_view key, std::string_view locale) const;
-
-    template <typename T>
-    std::optional<T> read(std::string_view group, std::string_view key) const;
-    template <typename T>
-    std::optional<T> readLocal(std::string_view group, std::string_view key,
-                               std::string *locale = nullptr) const;
     template <typename T>
     void write(std::string_view group, std::string_view key, std::string_view locale, const T &value);
     template <typename T>
     void writeLocal(std::string_view group, std::string_view key, const T &value);
 
     bool isFromPath() const { return m_read && m_textPath == m_path; }
-    bool replace(const QByteArray &target, const QByteArray &bytes);
+    bool replace(const AtomicFile::Target &target, const DesktopEntryText &text);
 
     QByteArray m_path;
     std::shared_ptr<const DesktopEntryText> m_text; ///< never null
-    FileStamp m_stamp;
+    FileStamp m_stamp; ///< of the file when it was read
     bool m_read = false; ///< m_text is that of a file
     QByteArray m_textPath; ///< and of this one
     bool m_settled = false; ///< m_stamp alone tells whether that file has changed since

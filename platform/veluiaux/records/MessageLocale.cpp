@@ -5,6 +5,7 @@
 
 #include <unistd.h>
 
+#include <cstring>
 #include <iterator>
 
 namespace {
@@ -19,12 +20,12 @@ MessageLocale MessageLocale::current()
     // One walk over the environment instead of three: this runs for every local value.
     std::string_view values[std::size(Variables)];
     for (char **entry = ::environ; entry && *entry; ++entry) {
-        if (**entry != 'L')
+        if ((*entry)[0] != 'L' || ((*entry)[1] != 'C' && (*entry)[1] != 'A'))
             continue;
-        const std::string_view assignment(*entry);
         for (std::size_t i = 0; i < std::size(Variables); ++i) {
-            if (values[i].empty() && assignment.substr(0, Variables[i].size()) == Variables[i])
-                values[i] = assignment.substr(Variables[i].size());
+            const std::string_view name = Variables[i];
+            if (values[i].empty() && std::strncmp(*entry, name.data(), name.size()) == 0)
+                values[i] = *entry + name.size();
         }
     }
     for (const std::string_view value : values) {
