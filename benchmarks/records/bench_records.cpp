@@ -2,12 +2,11 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "Comparison.h"
+#include "EntryFiles.h"
 
 #include <veluiaux/VelUIDesktopEntry.h>
 
 #include <QDir>
-#include <QFile>
-#include <QTemporaryDir>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -15,8 +14,9 @@
 
 #include <glib.h>
 
-#include <array>
+#include <chrono>
 #include <cstdlib>
+#include <functional>
 #include <memory>
 
 // Reading and saving desktop entries: the record class beside GKeyFile and beside the least
@@ -24,8 +24,10 @@
 
 namespace {
 
-constexpr int Files = 100;
-constexpr int Languages = 66;
+constexpr int Rounds = 15;
+constexpr int Candidates = 3;
+// No more than there are files, so that each save meets one that nobody has just written.
+constexpr int Saves = 20;
 
 // Keeps the compiler from leaving out what nobody looks at.
 volatile int sink = 0;
@@ -35,80 +37,7 @@ void use(int value)
     sink = sink + value;
 }
 
-QByteArray languageCode(int i)
-{
-    static const char *const first[] = {"de", "fr", "es",    "it",    "pl",
-                                        "ru", "ja", "zh_CN", "pt_BR", "sr@latin"};
-    if (i < int(std::size(first)))
-        return first[i];
-    return QByteArray(1, char('a' + i / 26)) + char('a' + i % 26);
-}
-
-// An entry as applications install them: some languages, comments, two actions.
-QByteArray entry(int languages, int number)
-{
-    QByteArray bytes = "# A desktop entry\n[Desktop Entry]\nVersion=1.0\nType=Application\n";
-    const auto localised = [&](const QByteArray &key, const QByteArray &value) {
-        bytes += key + "=" + value + "\n";
-        for (int i = 0; i < languages; ++i)
-            bytes += key + "[" + languageCode(i) + "]=" + value + " \xC3\xBC" + languageCode(i) + "\n";
-    };
-    const QByteArray name = "Application " + QByteArray::number(number);
-    localised("Name", name);
-    localised("GenericName", "Text editor of the kind");
-    localised("Comment", "Edit text files and look at what is in them");
-    localised("Keywords", "text;editor;notes;plain;");
-    bytes += "Exec=application-" + QByteArray::number(number)
-        + " --new-window %U\nTryExec=application\nIcon=accessories"
-          "-text-editor\nTerminal=false\nStartupNotify=true\nCategories=Utility;TextEditor;\nMimeType=text/"
-          "plain;"
-          "text/x-c;text/x-c++;application/x-shellscript;\nActions=window;document;\n";
-    for (const QByteArray id : {"window", "document"}) {
-        bytes += "\n[Desktop Action " + id + "]\n";
-        localised("Name", "New " + id);
-        bytes += "Exec=application --new-" + id + "\n";
-    }
-    return bytes;
-}
-
-// A folder of entries on the file system that holds `parent`.
-class Entries
-{
-public:
-    Entries(const QString &parent, int languages)
-        : m_folder(parent + QStringLiteral("/records-XXXXXX"))
-    {
-        for (int i = 0; i < Files; ++i) {
-            const QString path = m_folder.filePath(QStringLiteral("entry%1.desktop").arg(i));
-            QFile file(path);
-            const QByteArray bytes = entry(languages, i);
-            if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
-                qFatal("cannot write %s", qPrintable(path));
-            m_paths.append(path);
-            m_encoded.append(QFile::encodeName(path));
-            m_size = bytes.size();
-        }
-    }
-
-    int size() const { return m_size; }
-    const QString &path(int i) const { return m_paths.at(i % Files); }
-    const QByteArray &encoded(int i) const { return m_encoded.at(i % Files); }
-
-    // Makes the files younger than any record that knows them.
-    void touch() const
-    {
-        for (const QByteArray &path : m_encoded)
-            ::utimensat(AT_FDCWD, path.constData(), nullptr, 0);
-    }
-
-private:
-    QTemporaryDir m_folder;
-    QStringList m_paths;
-    QByteArrayList m_encoded;
-    int m_size = 0;
-};
-
-void readRecord(const QString &path)
+[[gnu::noinline]] void readRecord(const QString &path)
 {
     const VelUIDesktopEntry record(path);
     use(record.getType().size() + record.getName().size() + record.getIcon().size() + record.getExec().size()
@@ -118,28 +47,26 @@ void readRecord(const QString &path)
         use(action.getLocalName().size());
 }
 
-void readKeyFile(const QByteArray &path)
+void useAndFree(char *value)
+{
+    use(value ? value[0] : 0);
+    g_free(value);
+}
+
+[[gnu::noinline]] void readKeyFile(const QByteArray &path)
 {
     constexpr const char *Main = "Desktop Entry";
     GKeyFile *const file = g_key_file_new();
     if (!g_key_file_load_from_file(file, path.constData(), G_KEY_FILE_NONE, nullptr))
         std::abort();
-    for (const char *key : {"Type", "Name", "Icon", "Exec"}) {
-        char *const value = g_key_file_get_string(file, Main, key, nullptr);
-        use(value[0]);
-        g_free(value);
-    }
-    for (const char *key : {"Name", "GenericName"}) {
-        char *const value = g_key_file_get_locale_string(file, Main, key, nullptr, nullptr);
-        use(value[0]);
-        g_free(value);
-    }
+    for (const char *key : {"Type", "Name", "Icon", "Exec"})
+        useAndFree(g_key_file_get_string(file, Main, key, nullptr));
+    for (const char *key : {"Name", "GenericName"})
+        useAndFree(g_key_file_get_locale_string(file, Main, key, nullptr, nullptr));
     char **const actions = g_key_file_get_string_list(file, Main, "Actions", nullptr, nullptr);
-    for (char **action = actions; *action; ++action) {
+    for (char **action = actions; action && *action; ++action) {
         const QByteArray group = "Desktop Action " + QByteArray(*action);
-        char *const name = g_key_file_get_locale_string(file, group.constData(), "Name", nullptr, nullptr);
-        use(name[0]);
-        g_free(name);
+        useAndFree(g_key_file_get_locale_string(file, group.constData(), "Name", nullptr, nullptr));
     }
     g_strfreev(actions);
     g_key_file_free(file);
@@ -158,27 +85,43 @@ void readBytes(const QByteArray &path)
     ::close(file);
 }
 
-void saveRecord(const QString &path)
+[[gnu::noinline]] void changeRecord(VelUIDesktopEntry &record)
 {
     static int number = 0;
-    VelUIDesktopEntry record(path);
     record.setIcon(QStringLiteral("icon-%1").arg(++number));
     if (!record.save())
         std::abort();
 }
 
-void saveKeyFile(const QByteArray &path)
+[[gnu::noinline]] void saveRecord(const QString &path)
+{
+    VelUIDesktopEntry record(path);
+    changeRecord(record);
+}
+
+// Without these flags the comments and all other languages would be lost.
+GKeyFile *loadKeyFile(const QByteArray &path)
+{
+    constexpr auto Everything = GKeyFileFlags(G_KEY_FILE_KEEP_COMMENTS | G_KEY_FILE_KEEP_TRANSLATIONS);
+    GKeyFile *const file = g_key_file_new();
+    if (!g_key_file_load_from_file(file, path.constData(), Everything, nullptr))
+        std::abort();
+    return file;
+}
+
+[[gnu::noinline]] void changeKeyFile(GKeyFile *file, const QByteArray &path)
 {
     static int number = 0;
-    GKeyFile *const file = g_key_file_new();
-    if (!g_key_file_load_from_file(file, path.constData(),
-                                   GKeyFileFlags(G_KEY_FILE_KEEP_COMMENTS | G_KEY_FILE_KEEP_TRANSLATIONS),
-                                   nullptr))
-        std::abort();
-    g_key_file_set_string(file, "Desktop Entry", "Icon",
-                          ("icon-" + QByteArray::number(++number)).constData());
+    const QByteArray icon = "icon-" + QByteArray::number(++number);
+    g_key_file_set_string(file, "Desktop Entry", "Icon", icon.constData());
     if (!g_key_file_save_to_file(file, path.constData(), nullptr))
         std::abort();
+}
+
+[[gnu::noinline]] void saveKeyFile(const QByteArray &path)
+{
+    GKeyFile *const file = loadKeyFile(path);
+    changeKeyFile(file, path);
     g_key_file_free(file);
 }
 
@@ -195,49 +138,90 @@ void replaceBytes(const QByteArray &path, int size)
         std::abort();
 }
 
-bool compareLoading(const QString &parent, const char *title, int languages)
+bool compareLoading(const QString &parent, const std::string &title, const QByteArrayList &contents)
 {
-    const Entries entries(parent, languages);
+    if (contents.isEmpty())
+        return true;
+    // Every measurement of a first time has files that nobody has ever read.
+    EntryFiles entries(parent, contents, Candidates * (Rounds + 1) + 1);
     const auto each = [&entries](auto work) {
         return [&entries, work] {
-            for (int i = 0; i < Files; ++i)
+            for (int i = 0; i < entries.count(); ++i)
                 work(entries, i);
         };
     };
-    const std::string size = std::string(title) + ", " + std::to_string(entries.size()) + " bytes";
-    const auto ours = each([](const Entries &from, int i) { readRecord(from.path(i)); });
-    const auto peer = each([](const Entries &from, int i) { readKeyFile(from.encoded(i)); });
-    const auto least = each([](const Entries &from, int i) { readBytes(from.encoded(i)); });
+    const std::string what = title + " (" + std::to_string(entries.count()) + " files of "
+        + std::to_string(entries.size()) + " bytes)";
+    const auto ours = each([](const EntryFiles &from, int i) { readRecord(from.path(i)); });
+    const auto peer = each([](const EntryFiles &from, int i) { readKeyFile(from.encoded(i)); });
+    const auto least = each([](const EntryFiles &from, int i) { readBytes(from.encoded(i)); });
 
-    Comparison cold("desktop entry: load and read 8 values, each file for the first time; " + size);
-    cold.setPreparation([&entries] { entries.touch(); });
+    Comparison cold("desktop entry: load and read 8 values, first time; " + what);
+    cold.setPreparation([&entries] { entries.useNextSet(); });
     cold.add("VelUIDesktopEntry", ours);
     cold.add("GKeyFile", peer, 0.25);
     cold.add("read() alone", least);
-    const bool coldKept = cold.run();
+    const bool coldKept = cold.run(Rounds);
 
-    Comparison warm("desktop entry: load and read 8 values, files read before; " + size);
-    ::usleep(100000); // Until the files count as settled.
-    ours();
+    Comparison warm("desktop entry: load and read 8 values, read before; " + what);
+    warm.setPreparation(ours);
     warm.add("VelUIDesktopEntry", ours);
     warm.add("GKeyFile", peer, 0.25);
     warm.add("read() alone", least);
-    return warm.run() && coldKept;
+    return warm.run(Rounds) && coldKept;
 }
 
-bool compareSaving(const QString &parent, const char *title, double peerLimit, double leastLimit)
+double microseconds(const std::function<void()> &work)
 {
-    const Entries entries(parent, 12);
+    using Clock = std::chrono::steady_clock;
+    const Clock::time_point start = Clock::now();
+    work();
+    return std::chrono::duration<double, std::micro>(Clock::now() - start).count();
+}
+
+// The whole of what a user does, and then each half of it.
+bool compareSaving(const QString &parent, const std::string &title, const QByteArrayList &contents,
+                   double peerLimit, double leastLimit)
+{
+    if (contents.isEmpty())
+        return true;
+    const EntryFiles entries(parent, contents);
     int next = 0;
-    Comparison comparison(std::string("desktop entry: load, change one key, save; ") + title);
-    comparison.add("VelUIDesktopEntry", [&] { saveRecord(entries.path(++next)); });
-    comparison.add(
+    Comparison whole("desktop entry: load, change one key, save; " + title);
+    whole.setPreparation(&EntryFiles::settle);
+    whole.setRepetitions(Saves);
+    whole.add("VelUIDesktopEntry", [&] { saveRecord(entries.path(++next)); });
+    whole.add(
         "GKeyFile", [&] { saveKeyFile(entries.encoded(++next)); }, peerLimit);
-    comparison.add(
+    whole.add(
         "new file, fsync, rename", [&] { replaceBytes(entries.encoded(++next), entries.size()); },
         leastLimit);
-    comparison.setRepetitions(20);
-    return comparison.run();
+    const bool kept = whole.run(Rounds);
+
+    Comparison loading("of these, load; " + title);
+    loading.setPreparation(&EntryFiles::settle);
+    loading.setRepetitions(Saves);
+    loading.add("VelUIDesktopEntry", [&] { use(VelUIDesktopEntry(entries.path(++next)).isValid()); });
+    loading.add("GKeyFile", [&] { g_key_file_free(loadKeyFile(entries.encoded(++next))); });
+    loading.run(Rounds);
+
+    Comparison saving("of these, change one key, save; " + title);
+    saving.setPreparation(&EntryFiles::settle);
+    saving.setRepetitions(Saves);
+    saving.addTimed("VelUIDesktopEntry", [&] {
+        VelUIDesktopEntry record(entries.path(++next));
+        return microseconds([&record] { changeRecord(record); });
+    });
+    saving.addTimed("GKeyFile", [&] {
+        const std::unique_ptr<GKeyFile, decltype(&g_key_file_free)> file(loadKeyFile(entries.encoded(++next)),
+                                                                         &g_key_file_free);
+        return microseconds([&] { changeKeyFile(file.get(), entries.encoded(next)); });
+    });
+    saving.addTimed("new file, fsync, rename", [&] {
+        return microseconds([&] { replaceBytes(entries.encoded(++next), entries.size()); });
+    });
+    saving.run(Rounds);
+    return kept;
 }
 
 } // namespace
@@ -250,9 +234,11 @@ int main()
     qunsetenv("LANGUAGE");
     const QString memory = QStringLiteral("/dev/shm");
     const QString disk = QDir::currentPath();
-    bool kept = compareLoading(memory, "12 languages", 12);
-    kept = compareLoading(memory, "66 languages", Languages) && kept;
-    kept = compareSaving(memory, "memory disk", 0.30, 0) && kept;
-    kept = compareSaving(disk, "disk", 0, 1.1) && kept;
+    bool kept = compareLoading(memory, "installed entries", EntryFiles::installed());
+    kept = compareLoading(memory, "12 languages", EntryFiles::synthetic(12)) && kept;
+    kept = compareLoading(memory, "66 languages", EntryFiles::synthetic(66)) && kept;
+    kept = compareSaving(memory, "installed entries, memory disk", EntryFiles::installed(), 0.30, 0) && kept;
+    kept = compareSaving(memory, "12 languages, memory disk", EntryFiles::synthetic(12), 0.30, 0) && kept;
+    kept = compareSaving(disk, "12 languages, disk", EntryFiles::synthetic(12), 0, 1.1) && kept;
     return kept ? 0 : 1;
 }

@@ -64,6 +64,9 @@ double Comparison::measure(const Candidate &candidate) const
 
 bool Comparison::run(int rounds)
 {
+    const char *const part = std::getenv("VEL_BENCHMARK_PART");
+    if (part && m_title.find(part) == std::string::npos)
+        return true;
     if (const char *only = std::getenv("VEL_BENCHMARK_ONLY")) {
         for (const Candidate &candidate : m_candidates) {
             if (candidate.name == only)

@@ -23,7 +23,8 @@
  *
  * Every program prints a line for each candidate; with the variable VEL_BENCHMARK_TABLE set to
  * a file name, a Markdown row for each peer is appended to that file too. With the argument of
- * \c VEL_BENCHMARK_ONLY the candidate of that name alone runs, once (for callgrind).
+ * \c VEL_BENCHMARK_ONLY the candidate of that name alone runs, once (for callgrind); with
+ * \c VEL_BENCHMARK_PART only comparisons that have that text in their title run.
  */
 class Comparison
 {
