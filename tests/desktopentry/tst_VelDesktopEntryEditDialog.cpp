@@ -19,7 +19,6 @@
 #include <QComboBox>
 #include <QDir>
 #include <QFileInfo>
-#include <QMetaMethod>
 #include <QRadioButton>
 #include <QSettings>
 #include <QVBoxLayout>
@@ -62,7 +61,6 @@ class tst_VelDesktopEntryEditDialog : public TestCase
 private Q_SLOTS:
     void init();
     void laysOutTheFormAboveTheButtons();
-    void hasTheSlotsAsMetaMethods();
     void remembersItsSize();
     void readsASizeThatIsNoNumberAsNothing();
     void refusesAMissingFile();
@@ -129,26 +127,6 @@ void tst_VelDesktopEntryEditDialog::laysOutTheFormAboveTheButtons()
     QCOMPARE(box->buttonRole(copyButton), QDialogButtonBox::ResetRole);
     QCOMPARE(box->button(QDialogButtonBox::Help)->shortcut(), QKeySequence(QStringLiteral("F1")));
     QCOMPARE(dialog.size(), QSize(560, 440));
-}
-
-void tst_VelDesktopEntryEditDialog::hasTheSlotsAsMetaMethods()
-{
-    const QMetaObject &meta = VelDesktopEntryEditDialog::staticMetaObject;
-    QStringList methods;
-    for (int i = meta.methodOffset(); i < meta.methodCount(); ++i) {
-        const QMetaMethod method = meta.method(i);
-        QCOMPARE(method.methodType(), QMetaMethod::Slot);
-        methods.append(
-            (method.access() == QMetaMethod::Public ? QStringLiteral("public ") : QStringLiteral("private "))
-            + QString::fromLatin1(method.methodSignature()));
-    }
-    QCOMPARE(methods,
-             QStringList({QStringLiteral("public setDesktopEntryPath(QString,bool,QString)"),
-                          QStringLiteral("public setDesktopEntryPath(QString,bool)"),
-                          QStringLiteral("public setDesktopEntryPath(QString)"),
-                          QStringLiteral("public setDesktopEntryCoords(int,int)"),
-                          QStringLiteral("public accept()"), QStringLiteral("private copyFrom()"),
-                          QStringLiteral("private helpSlot()")}));
 }
 
 void tst_VelDesktopEntryEditDialog::remembersItsSize()

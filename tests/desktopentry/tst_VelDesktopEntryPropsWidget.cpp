@@ -19,6 +19,7 @@
 #include <QCheckBox>
 #include <QComboBox>
 #include <QListWidget>
+#include <QPointer>
 #include <QRadioButton>
 #include <QScrollArea>
 #include <QScrollBar>
@@ -131,6 +132,7 @@ private Q_SLOTS:
     void takesClosingAndEscapingForYes_data();
     void takesClosingAndEscapingForYes();
     void restoresTheTypeOnAnyOtherAnswer();
+    void survivesItsDeletionBehindTheQuestion();
     void emptiesTheRowsOfTheOldType();
     void keepsTheCommonRowsWhenTheTypeChanges();
     void savesNothingOfTheOldType();
@@ -536,6 +538,19 @@ void tst_VelDesktopEntryPropsWidget::restoresTheTypeOnAnyOtherAnswer()
     QCOMPARE(typeBox(form)->currentData().toString(), application);
     QCOMPARE(child<PathEdit>(&form, "execEdit")->text(), QStringLiteral("/bin/sh -c true %u"));
     QCOMPARE(changed.count(), 0);
+}
+
+void tst_VelDesktopEntryPropsWidget::survivesItsDeletionBehindTheQuestion()
+{
+    auto *form = new VelDesktopEntryPropsWidget;
+    const QPointer<QWidget> alive(form);
+    const QPointer<QComboBox> box(typeBox(*form));
+    ModalDriver modal;
+    modal.answerWith(typeQuestion, [form](QMessageBox *) { delete form; });
+    chooseType(*form, directory);
+    QVERIFY(modal.finished());
+    QVERIFY(!alive);
+    QTRY_VERIFY(!box);
 }
 
 void tst_VelDesktopEntryPropsWidget::emptiesTheRowsOfTheOldType()

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "DialogTestCase.h"
+#include "MetaMethods.h"
 
 #include <QGridLayout>
 #include <QSignalSpy>
@@ -22,6 +23,7 @@ class tst_EditShortcutsDialog : public DialogTestCase
 
 private Q_SLOTS:
     void hasTheFormThatIsDesigned();
+    void hasTheSlotsThatAreDesigned();
     void beginsUnchangedWithNothingToEdit();
     void showsAllGroupsOpenWithReadableColumns();
     void showsADefaultKey();
@@ -96,6 +98,25 @@ void tst_EditShortcutsDialog::hasTheFormThatIsDesigned()
     QCOMPARE(int(child<QDialogButtonBox>("buttonBox")->standardButtons()),
              int(QDialogButtonBox::Ok | QDialogButtonBox::Cancel | QDialogButtonBox::Reset
                  | QDialogButtonBox::RestoreDefaults));
+}
+
+void tst_EditShortcutsDialog::hasTheSlotsThatAreDesigned()
+{
+    QCOMPARE(metaMethodsOf(EditShortcutsDialog::staticMetaObject),
+             QStringList({str("public slot checkCurrentShortcut(QKeySequence,QKeySequence)"),
+                          str("public slot checkEnteredKeySequence(QKeySequence)"),
+                          str("public slot disableShortcutEdit()"),
+                          str("public slot processButtonBox(QAbstractButton*)"),
+                          str("public slot setDefaultShortcut()"), str("public slot slotAccept()"),
+                          str("public slot slotReject()")}));
+    QCOMPARE(metaMethodsOf(ShortcutsTreeView::staticMetaObject),
+             QStringList({str("signal currentShortcutChanged(QKeySequence,QKeySequence)"),
+                          str("signal currentItemIsNotShortcut()"),
+                          str("public slot setKeySequence(QKeySequence)")}));
+    QCOMPARE(
+        metaMethodsOf(ShortcutsModel::staticMetaObject),
+        QStringList({str("public slot restoreDefaults()"), str("public slot resetShortcuts()"),
+                     str("public slot commitChanges()"), str("public slot saveKeys(QSettings*,QString)")}));
 }
 
 void tst_EditShortcutsDialog::beginsUnchangedWithNothingToEdit()
