@@ -119,4 +119,5 @@ private:
     bool parsed = false;
     std::unique_ptr<QSettings> settings;
     QString fileName;
+    bool mayBeEmptied = false;
 };

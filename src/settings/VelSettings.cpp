@@ -89,8 +89,10 @@ void VelSettings::setValue(const QString &key, const QVariant &value)
 
 void VelSettings::remove(const QString &key)
 {
-    if (settings)
-        settings->remove(key);
+    if (!settings)
+        return;
+    settings->remove(key);
+    mayBeEmptied = true;
 }
 
 void VelSettings::sync(bool touch)
@@ -102,13 +104,16 @@ void VelSettings::sync(bool touch)
     settings->sync();
 }
 
-// Writes what is pending and lets go of the file.
+// Lets go of the file. QSettings writes what this object left pending; a sync here would write
+// the edits of other objects on the file as well.
 void VelSettings::close()
 {
-    if (!settings)
-        return;
-    settings->sync();
-    if (EmptiedSettings::isLeft(*settings))
-        EmptiedSettings::drop(*settings);
+    if (mayBeEmptied && settings->allKeys().isEmpty()) {
+        if (settings->status() == QSettings::NoError)
+            settings->sync();
+        if (EmptiedSettings::isLeft(*settings))
+            EmptiedSettings::drop(*settings);
+    }
+    mayBeEmptied = false;
     settings.reset();
 }

@@ -8,10 +8,12 @@
 
 #include <QDateTime>
 #include <QDir>
+#include <QSettings>
 
 #include <type_traits>
 
 #include <sys/stat.h>
+#include <sys/time.h>
 #include <utime.h>
 
 static_assert(!std::is_copy_constructible<VelSettings>::value && !std::is_copy_assignable<VelSettings>::value,
@@ -54,8 +56,10 @@ private Q_SLOTS:
     void writesChangesOnSync();
     void writesChangesWhenItIsDestroyed();
     void leavesAnUnchangedFileAlone();
+    void leavesTheEditsOfOthersUnwrittenWhenItIsDestroyed();
     void touchesAnUnchangedFileOnSync();
     void touchesNothingWithoutBeingAsked();
+    void touchesAFileWhoseNameIsNotAscii();
     void renamesTheSection();
     void dropsTheHeaderWithTheSectionName();
     void removesAKey();
@@ -64,6 +68,7 @@ private Q_SLOTS:
     void keepsItsFileWhenTheOtherOneIsMissing();
     void doesNotCallItselfParsedAfterALaterSuccess();
     void setsAndWritesThoughItIsNotParsed();
+    void keepsItsFileNameWhenTheOtherFileGivesAnError();
     void opensAnEmptyFile();
     void opensADirectoryWithoutACrash();
     void sharesChangesBetweenObjectsOnOneFile();
@@ -73,6 +78,7 @@ private Q_SLOTS:
     void writesAKeyThatIsSetAfterTheLastOneWasRemoved();
     void keepsEverySlashedKeyWhenAllWereRemoved();
     void sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved();
+    void registersItsFormatOnce();
 };
 
 void tst_VelSettings::doesNothingWithoutAFile()
@@ -166,6 +172,23 @@ void tst_VelSettings::leavesAnUnchangedFileAlone()
     QCOMPARE(statusOf(file).st_ino, before.st_ino);
 }
 
+void tst_VelSettings::leavesTheEditsOfOthersUnwrittenWhenItIsDestroyed()
+{
+    const QByteArray bytes("a=1\nb=2\n");
+    const QString file = write(s("rc"), bytes);
+    VelSettings other(file);
+    {
+        VelSettings settings(file);
+        settings.remove(s("b"));
+        settings.sync();
+        write(s("rc"), bytes);
+        other.setValue(s("a"), 3);
+    }
+    QCOMPARE(read(file), bytes);
+    other.sync();
+    QCOMPARE(read(file), QByteArray("a=3\nb=2\n"));
+}
+
 void tst_VelSettings::touchesAnUnchangedFileOnSync()
 {
     const QByteArray bytes("# comment\n\n[b]\nx=007\n");
@@ -188,6 +211,19 @@ void tst_VelSettings::touchesNothingWithoutBeingAsked()
     VelSettings settings(file);
     settings.sync();
     QCOMPARE(statusOf(file).st_mtime, time_t(1000000000));
+}
+
+void tst_VelSettings::touchesAFileWhoseNameIsNotAscii()
+{
+    const QString file = write(s("\u00e4 %1"), "a=1\n");
+    makeOld(file);
+    VelSettings settings(file);
+    // A reader sets the access time of an old file by itself, but not back from the future.
+    const timeval future[2] = {{time(nullptr) + 3600, 0}, {1000000000, 0}};
+    QCOMPARE(utimes(QFile::encodeName(file).constData(), future), 0);
+    settings.sync(true);
+    QVERIFY(qAbs(statusOf(file).st_mtime - time(nullptr)) < 60);
+    QVERIFY(qAbs(statusOf(file).st_atime - time(nullptr)) < 60);
 }
 
 void tst_VelSettings::renamesTheSection()
@@ -273,6 +309,21 @@ void tst_VelSettings::setsAndWritesThoughItIsNotParsed()
     settings.remove(s("b"));
     settings.sync();
     QCOMPARE(read(file), QByteArray("a=3\n"));
+}
+
+void tst_VelSettings::keepsItsFileNameWhenTheOtherFileGivesAnError()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    VelSettings settings(file);
+    expectWarning(s("Cant register format!"));
+    QVERIFY(!settings.ParseConfigFile(folder()));
+    QVERIFY(settings.isParsed());
+    // The settings are those of the other one already, the name is still that of the first.
+    QCOMPARE(settings.value(s("a"), 5), QVariant(5));
+    makeOld(file);
+    settings.sync(true);
+    QVERIFY(qAbs(statusOf(file).st_mtime - time(nullptr)) < 60);
+    QCOMPARE(read(file), QByteArray("a=1\n"));
 }
 
 void tst_VelSettings::opensAnEmptyFile()
@@ -411,6 +462,20 @@ void tst_VelSettings::sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved(
     settings.sync();
     QCOMPARE(read(file), QByteArray("from=elsewhere\n"));
     QCOMPARE(settings.value(s("from")), QVariant(s("elsewhere")));
+}
+
+// The last one: it takes all the formats that are left.
+void tst_VelSettings::registersItsFormatOnce()
+{
+    const VelSettings one(write(s("one"), "a=1\n"));
+    const VelSettings other(write(s("other"), "a=1\n"));
+    QVERIFY(one.isParsed() && other.isParsed());
+    int left = 0;
+    const auto read = [](QIODevice &, QSettings::SettingsMap &) { return false; };
+    const auto write = [](QIODevice &, const QSettings::SettingsMap &) { return false; };
+    while (QSettings::registerFormat(s("taken"), read, write) != QSettings::InvalidFormat)
+        ++left;
+    QCOMPARE(left, 15); // of sixteen
 }
 
 VEL_TEST_GUILESS_MAIN(tst_VelSettings)
