@@ -29,6 +29,7 @@ private Q_SLOTS:
     void listsAFileLast();
     void leavesTheListForADropOnTheFolder();
     void reordersWithinTheFolder();
+    void unlistsAFileThatIsMovedOntoItsOwnFolder();
     void leavesTheListForACopyWithinTheFolder();
     void listsOnlyTheFirstOfSeveral();
     void selectsWhatWasDropped();
@@ -148,6 +149,14 @@ void tst_VelMenuModelDrops::reordersWithinTheFolder()
     QCOMPARE(list(), QByteArray("*;a;c;b;"));
     QCOMPARE(shown().join(QString()), QStringLiteral("acb"));
     QCOMPARE(changed.size(), 1);
+}
+
+void tst_VelMenuModelDrops::unlistsAFileThatIsMovedOntoItsOwnFolder()
+{
+    QVERIFY(drop({QStringLiteral("menu/to/a")}, Qt::MoveAction, -1));
+
+    QCOMPARE(list(), QByteArray("*;c;b;"));
+    QCOMPARE(shown().join(QString()), QStringLiteral("acb"));
 }
 
 void tst_VelMenuModelDrops::leavesTheListForACopyWithinTheFolder()

@@ -54,6 +54,7 @@ private Q_SLOTS:
     void keepsPlaceInALargeFolder();
     void asksWhatToDoWithADrop_data();
     void asksWhatToDoWithADrop();
+    void listsADropBetweenTwoRowsThere();
     void tellsTheSourceWhatWasDone();
     void keepsToWhatTheSourceAllows();
     void offersTheChoiceAtTheDrop();
@@ -61,6 +62,8 @@ private Q_SLOTS:
     void removesNothingAfterADrag();
 
 private:
+    void dropAt(VelMenuView &view, const QString &source, const QPointF &at, const QString &choice,
+                Qt::DropActions allowed);
     void dropOn(VelMenuView &view, const QString &source, const QString &target, const QString &choice,
                 Qt::DropActions allowed = Qt::CopyAction | Qt::MoveAction | Qt::LinkAction);
 
@@ -452,9 +455,14 @@ void tst_VelMenuViewClipboard::keepsPlaceInALargeFolder()
 void tst_VelMenuViewClipboard::dropOn(VelMenuView &view, const QString &source, const QString &target,
                                       const QString &choice, Qt::DropActions allowed)
 {
+    dropAt(view, source, view.visualRect(shown(view, target)).center(), choice, allowed);
+}
+
+void tst_VelMenuViewClipboard::dropAt(VelMenuView &view, const QString &source, const QPointF &at,
+                                      const QString &choice, Qt::DropActions allowed)
+{
     QMimeData data;
     data.setUrls({QUrl::fromLocalFile(source)});
-    const QPointF at = view.visualRect(shown(view, target)).center();
     QDragEnterEvent enter(at.toPoint(), allowed, &data, Qt::LeftButton, Qt::NoModifier);
     QCoreApplication::sendEvent(view.viewport(), &enter);
     QDragMoveEvent move(at.toPoint(), allowed, &data, Qt::LeftButton, Qt::NoModifier);
@@ -510,6 +518,21 @@ void tst_VelMenuViewClipboard::asksWhatToDoWithADrop()
     QCOMPARE(changes.count(), isThere ? 1 : 0);
     if (!isThere)
         QCOMPARE(m_told, Qt::IgnoreAction);
+}
+
+void tst_VelMenuViewClipboard::listsADropBetweenTwoRowsThere()
+{
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&view));
+    QVERIFY(open(view, menu(), 2));
+    QVERIFY(open(view, m_sub, 3));
+    QTRY_COMPARE(names(view, m_sub).join(QString()), QStringLiteral("XYZ"));
+    const QRect y = view.visualRect(shown(view, m_sub + QLatin1String("/y.desktop")));
+    dropAt(view, m_a, QPointF(y.center().x(), y.top()), QStringLiteral("Copy"),
+           Qt::MoveAction | Qt::CopyAction);
+    QCOMPARE(sortOrderOf(m_sub), QByteArray("*;x.desktop;a.desktop;y.desktop;z.desktop;"));
+    QTRY_COMPARE(names(view, m_sub).join(QString()), QStringLiteral("XAYZ"));
 }
 
 void tst_VelMenuViewClipboard::tellsTheSourceWhatWasDone()

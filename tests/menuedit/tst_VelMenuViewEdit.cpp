@@ -54,6 +54,7 @@ private Q_SLOTS:
     void listsChildrenInTheOrderShownWithTheNewOneInItsPlace_data();
     void listsChildrenInTheOrderShownWithTheNewOneInItsPlace();
     void makesARecordForAFolderWithoutOne();
+    void listsOnlyWhatIsShown();
     void keepsTheRestOfAFoldersRecord();
     void leavesARecordThatCannotBeRead_data();
     void leavesARecordThatCannotBeRead();
@@ -63,6 +64,8 @@ private Q_SLOTS:
     void movesNothingWithoutASelection();
     void movesInALargeFolderWithoutLosingSight();
     void namesNewItemsByTheFirstFreeNumber();
+    void makesNothingInAMenuThatIsNotThere();
+    void showsANewEntryByItsNameWhateverWasThereBefore();
     void writesTheRecordOfANewEntry();
     void writesTheRecordOfANewFolder();
     void putsANewItemIntoTheSelectedFolderOrBesideTheSelectedFile();
@@ -79,12 +82,16 @@ private Q_SLOTS:
     void makesTheRecordOfAFolderOnlyWhenSaved();
     void editsNothingElse();
     void editsNothingWithoutASelection();
+    void editsNothingThatCannotBeRead();
+    void makesAnEntryThatIsGone();
     void putsAnEditedEntryIntoItsPlace();
     void hidesAnEntryThatWasEditedToBeHidden();
     void goesAwayWhileItEdits();
     void deletesAfterAsking_data();
     void deletesAfterAsking();
     void deletesALinkAndNotWhatItLeadsTo_data();
+    void forgetsWhatItDeletes();
+    void leavesADeletedNameInTheListUntilItIsRewritten();
     void deletesALinkAndNotWhatItLeadsTo();
     void selectsNothingWhenTheDeletedRowGoes_data();
     void selectsNothingWhenTheDeletedRowGoes();
@@ -188,6 +195,24 @@ void tst_VelMenuViewEdit::listsChildrenInTheOrderShownWithTheNewOneInItsPlace()
         row = -1;
     QVERIFY(view.fixSortOrderForNew(name, row, folder));
     QCOMPARE(sortOrderOf(menu()), order);
+}
+
+void tst_VelMenuViewEdit::listsOnlyWhatIsShown()
+{
+    writeFolder(QString(), QStringLiteral("Menu"), "gone.desktop;b.desktop;h.desktop;a.desktop;");
+    writeLetters("ab");
+    const QString hidden =
+        writeEntry(QStringLiteral("h.desktop"), QStringLiteral("H"), "Exec=true\nHidden=true\n");
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 2));
+    const QModelIndex folder = files(view)->index(menu());
+    QCOMPARE(files(view)->rowCount(folder), 3);
+    // The end is told by the rows of the model, the hidden one included.
+    QVERIFY(view.fixSortOrderForNew(QStringLiteral("x.desktop"), 3, folder));
+    QCOMPARE(sortOrderOf(menu()), QByteArray("*;b.desktop;a.desktop;x.desktop;"));
+    // Before a row that is not shown is nowhere.
+    QVERIFY(view.fixSortOrderForNew(QStringLiteral("x.desktop"), files(view)->index(hidden).row(), folder));
+    QCOMPARE(sortOrderOf(menu()), QByteArray("*;b.desktop;a.desktop;"));
 }
 
 void tst_VelMenuViewEdit::makesARecordForAFolderWithoutOne()
@@ -352,6 +377,35 @@ void tst_VelMenuViewEdit::namesNewItemsByTheFirstFreeNumber()
         QStringLiteral("group group/.directory group1 group1/.directory shortcut.desktop shortcut1.desktop"));
 }
 
+void tst_VelMenuViewEdit::makesNothingInAMenuThatIsNotThere()
+{
+    VelMenuView view(menu() + QLatin1String("/missing"), -1, true);
+    QVERIFY(!view.rootIndex().isValid());
+    QSignalSpy changes(&view, &VelMenuView::changed);
+    const ModalDriver modal;
+    QVERIFY(!view.createNew(false));
+    QVERIFY(!view.createNew(true));
+    QVERIFY(modal.finished());
+    QCOMPARE(changes.count(), 0);
+    QCOMPARE(everythingIn(menu()), QStringList());
+}
+
+void tst_VelMenuViewEdit::showsANewEntryByItsNameWhateverWasThereBefore()
+{
+    const QString path = writeEntry(QStringLiteral("shortcut.desktop"), QStringLiteral("Old"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("Old")});
+    QVERIFY(QFile::remove(path)); // behind the back of the model, which keeps the name
+    ModalDriver modal;
+    modal.handle([&](QWidget *dialog) {
+        QCOMPARE(shown(view, path).data().toString(), QStringLiteral("Shortcut"));
+        reject(dialog);
+    });
+    QVERIFY(!view.createNew(false));
+    QVERIFY(modal.finished());
+}
+
 void tst_VelMenuViewEdit::writesTheRecordOfANewEntry()
 {
     write(QStringLiteral("menu/shortcut.desktop"), "taken");
@@ -372,7 +426,7 @@ void tst_VelMenuViewEdit::writesTheRecordOfANewEntry()
     });
     view.slotFileNew();
     QVERIFY(modal.finished());
-    QVERIFY(changes.count() >= 1);
+    QCOMPARE(changes.count(), 2); // by the edit and by the creation
     QCOMPARE(view.selectedPath(), path);
     QVERIFY(read(path).contains("\nExec=true\n"));
 }
@@ -597,6 +651,40 @@ void tst_VelMenuViewEdit::editsNothingWithoutASelection()
     QVERIFY(modal.finished());
 }
 
+void tst_VelMenuViewEdit::editsNothingThatCannotBeRead()
+{
+    const QByteArray contents(1024 * 1024 + 1, 'x');
+    const QString path = write(QStringLiteral("menu/large.desktop"), contents);
+    VelMenuView view(menu(), -1, true);
+    QTRY_VERIFY(shown(view, path).isValid());
+    select(view, path);
+    QSignalSpy changes(&view, &VelMenuView::changed);
+    ModalDriver modal;
+    modal.handle([](QWidget *box) {
+        QCOMPARE(box->windowTitle(), QStringLiteral("Warning"));
+        reject(box);
+    });
+    QVERIFY(!view.slotEdit());
+    QVERIFY(modal.finished());
+    QCOMPARE(changes.count(), 0);
+    QCOMPARE(read(path), contents);
+    QVERIFY(view.findChildren<VelDesktopEntryEditDialog *>().isEmpty());
+}
+
+void tst_VelMenuViewEdit::makesAnEntryThatIsGone()
+{
+    const QString path = writeLetters("a").constFirst();
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    select(view, path);
+    QVERIFY(QFile::remove(path));
+    ModalDriver modal;
+    modal.handle([](QWidget *dialog) { accept(dialog, QStringLiteral("Anew")); });
+    QVERIFY(view.slotEdit());
+    QVERIFY(modal.finished());
+    QVERIFY(read(path).contains("\nName=Anew\n"));
+}
+
 void tst_VelMenuViewEdit::putsAnEditedEntryIntoItsPlace()
 {
     const QString a = writeLetters("abc").constFirst();
@@ -681,6 +769,39 @@ void tst_VelMenuViewEdit::deletesAfterAsking()
     QCOMPARE(changes.count(), 1);
     QVERIFY(!view.selectedItem().isValid());
     QTRY_COMPARE(names(view, menu()).size(), 2);
+}
+
+void tst_VelMenuViewEdit::forgetsWhatItDeletes()
+{
+    const QString a = writeLetters("a").constFirst();
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("A")});
+    select(view, a);
+    ModalDriver modal;
+    announceDeleteQuestion(modal, QMessageBox::Yes);
+    view.slotDel();
+    QVERIFY(modal.finished());
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("Another"));
+    QTRY_COMPARE(names(view, menu()), QStringList{QStringLiteral("Another")});
+}
+
+void tst_VelMenuViewEdit::leavesADeletedNameInTheListUntilItIsRewritten()
+{
+    writeFolder(QString(), QStringLiteral("Menu"), "c.desktop;b.desktop;a.desktop;");
+    const QString b = writeLetters("abc").at(1);
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 3));
+    select(view, b);
+    ModalDriver modal;
+    announceDeleteQuestion(modal, QMessageBox::Yes);
+    view.slotDel();
+    QVERIFY(modal.finished());
+    QCOMPARE(sortOrderOf(menu()), QByteArray("c.desktop;b.desktop;a.desktop;"));
+    QTRY_COMPARE(names(view, menu()), QStringList({QStringLiteral("C"), QStringLiteral("A")}));
+    select(view, menu() + QLatin1String("/a.desktop"));
+    view.slotUp();
+    QCOMPARE(sortOrderOf(menu()), QByteArray("*;a.desktop;c.desktop;"));
 }
 
 void tst_VelMenuViewEdit::deletesALinkAndNotWhatItLeadsTo_data()
