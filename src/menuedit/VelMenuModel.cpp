@@ -178,7 +178,10 @@ Qt::ItemFlags VelMenuModel::flags(const QModelIndex &index) const
 
 QString VelMenuModel::menuDirectory() const
 {
-    return rootDir.isEmpty() ? QString() : QDir::cleanPath(QFileInfo(rootDir).absoluteFilePath());
+    if (rootDir.isEmpty())
+        return QString();
+    const QString path = QDir::cleanPath(QFileInfo(rootDir).absoluteFilePath());
+    return rootDir.endsWith(QLatin1Char('/')) && path != QLatin1String("/") ? path + QLatin1Char('/') : path;
 }
 
 void VelMenuModel::forgetItemInfo(const QString &path)

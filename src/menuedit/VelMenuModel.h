@@ -37,7 +37,8 @@ public:
                       const QModelIndex &parent) override;
     Qt::ItemFlags flags(const QModelIndex &index) const override;
 
-    /// The menu directory, clean and absolute; empty if none was given.
+    /// The menu directory, clean and absolute, with a "/" at the end if it was given with one;
+    /// empty if none was given.
     QString menuDirectory() const;
 
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.

@@ -34,7 +34,7 @@ struct VelMenuProxyModel::Row
     QString fileName;
     bool isInMenu;
     bool isFolder;
-    qint64 modified;
+    std::optional<qint64> modified;
     std::optional<SortOrder::Mention> mention;
     std::optional<QString> displayName;
 };
@@ -103,13 +103,16 @@ bool VelMenuProxyModel::lessThan(const QModelIndex &left, const QModelIndex &rig
     if (!leftRow.isInMenu)
         return false;
     if (leftRow.folder->isRecents)
-        return leftRow.modified < rightRow.modified;
+        return modifiedOf(leftRow, left) < modifiedOf(rightRow, right);
 
     Folder &folder = *leftRow.folder;
     if (!folder.order)
         folder.order.emplace(sortOrderOf(folder.path));
     if (!folder.order->isEmpty()) {
-        const SortOrder::Places places = SortOrder::places(mentionOf(leftRow), mentionOf(rightRow));
+        // A sort compares siblings only; for others the list of the left one's folder counts.
+        const SortOrder::Places places = rightRow.folder == &folder
+            ? SortOrder::places(mentionOf(leftRow), mentionOf(rightRow))
+            : SortOrder::places(mentionOf(leftRow), folder.order->mention(rightRow.fileName));
         if (places.left != places.right)
             return places.right < places.left;
     }
@@ -134,8 +137,6 @@ VelMenuProxyModel::Row &VelMenuProxyModel::rowOf(const QModelIndex &index) const
     row.fileName = index.data(QFileSystemModel::FileNameRole).toString();
     row.isInMenu = row.folder->isInMenu || isInMenu(m_files->filePath(index));
     row.isFolder = m_files->isDir(index);
-    if (row.folder->isRecents)
-        row.modified = m_files->lastModified(index).toMSecsSinceEpoch();
     return m_rows.emplace(index.internalId(), std::move(row)).first->second;
 }
 
@@ -162,6 +163,13 @@ QStringList VelMenuProxyModel::sortOrderOf(const QString &folderPath) const
         list = VelUIDesktopEntry(file).getSortOrder();
     sortOrders.insert(folderPath, list);
     return list;
+}
+
+qint64 VelMenuProxyModel::modifiedOf(Row &row, const QModelIndex &index) const
+{
+    if (!row.modified)
+        row.modified = m_files->lastModified(index).toMSecsSinceEpoch();
+    return *row.modified;
 }
 
 const SortOrder::Mention &VelMenuProxyModel::mentionOf(Row &row) const

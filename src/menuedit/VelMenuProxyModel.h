@@ -57,6 +57,7 @@ private:
     Row &rowOf(const QModelIndex &index) const;
     Folder &folderOf(const QModelIndex &index) const;
     QStringList sortOrderOf(const QString &folderPath) const;
+    qint64 modifiedOf(Row &row, const QModelIndex &index) const;
     const SortOrder::Mention &mentionOf(Row &row) const;
     const QString &displayNameOf(Row &row, const QModelIndex &index) const;
 

@@ -62,6 +62,7 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
     setUniformRowHeights(true);
     if (iconSize != -1)
         setIconSize(QSize(iconSize, iconSize));
+    setDragDropMode(editable ? QAbstractItemView::DragDrop : QAbstractItemView::NoDragDrop);
 
     d->proxy = new VelMenuProxyModel(this);
     d->buildModel();

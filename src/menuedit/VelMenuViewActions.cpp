@@ -88,10 +88,7 @@ void VelMenuViewPrivate::makeEditable()
     QObject::connect(q, &QAbstractItemView::doubleClicked, q, &VelMenuView::slotEdit);
     QObject::connect(QGuiApplication::clipboard(), &QClipboard::dataChanged, editMenu,
                      [this] { q->setActionsEnabled(); });
-    q->setDragEnabled(true);
-    q->setAcceptDrops(true);
     q->setDropIndicatorShown(true);
-    q->setDragDropMode(QAbstractItemView::DragDrop);
 }
 
 void VelMenuView::setActionsEnabled()

@@ -18,7 +18,9 @@
 #include <QSortFilterProxyModel>
 #include <QStandardPaths>
 
+#include <fstream>
 #include <memory>
+#include <string>
 
 /// Building, selecting, showing, running and rebuilding.
 class tst_VelMenuView : public MenuTestCase
@@ -129,7 +131,10 @@ void tst_VelMenuView::survivesOddFiles()
     writeEntry(QStringLiteral("garbage.desktop"), QStringLiteral("x"));
     write(QStringLiteral("menu/garbage.desktop"), QByteArray(1024 * 1024 + 1, '\xff'));
     writeEntry(QStringLiteral("new\nline.desktop"), QStringLiteral("Line"));
-    QFile raw(QFile::decodeName(QFile::encodeName(menu()) + "/raw\xff.txt"));
+    // Made without Qt, which cannot name it.
+    const std::string raw = menu().toStdString() + "/raw\xff.desktop";
+    std::ofstream(raw) << "[Desktop Entry]\nType=Application\nName=Raw\nExec=true\n";
+    QVERIFY(std::ifstream(raw).is_open());
     VelMenuView view(menu(), -1, true);
     view.resize(300, 300);
     view.show();
@@ -138,6 +143,7 @@ void tst_VelMenuView::survivesOddFiles()
     QTest::qWait(0);
     view.grab();
     QVERIFY(!view.selectedItem().isValid());
+    QVERIFY(std::ifstream(raw).is_open());
 }
 
 void tst_VelMenuView::showsTheStartMenuByDefault()
@@ -404,6 +410,9 @@ void tst_VelMenuView::startsAfreshOnAnotherDirectory()
     view.init(other, 32, false, &parent);
     QCOMPARE(view.parentWidget(), &parent);
     QVERIFY(view.actions().isEmpty());
+    QVERIFY(!view.dragEnabled());
+    QVERIFY(!view.acceptDrops());
+    QCOMPARE(view.dragDropMode(), QAbstractItemView::NoDragDrop);
     view.setParent(nullptr);
 }
 
