@@ -20,14 +20,21 @@ std::string variable(const char *name, const std::string &otherwise)
     return value && *value ? std::string(value) : otherwise;
 }
 
+// The standard has paths ignored that are not absolute.
+fs::path dataHome()
+{
+    const fs::path path = variable("XDG_DATA_HOME", "");
+    return path.is_absolute() ? path : fs::path(variable("HOME", "") + "/.local/share");
+}
+
 std::vector<fs::path> dataDirectories()
 {
     std::vector<fs::path> directories;
     const auto append = [&directories](const fs::path &path) {
-        if (path.is_absolute()) // the standard has others ignored
+        if (path.is_absolute())
             directories.push_back(path);
     };
-    append(variable("XDG_DATA_HOME", variable("HOME", "") + "/.local/share"));
+    append(dataHome());
     std::istringstream list(variable("XDG_DATA_DIRS", "/usr/local/share:/usr/share"));
     for (std::string path; std::getline(list, path, ':');)
         append(path);

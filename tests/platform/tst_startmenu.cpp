@@ -62,6 +62,7 @@ private Q_SLOTS:
     void hidesAnIdBehindWhatIsNoApplication();
     void findsApplicationsInSubfolders();
     void survivesLinksInACircle();
+    void usesTheDefaultDirectories_data();
     void usesTheDefaultDirectories();
     void namesThatClashGetTheirIds();
     void namesThatClashWithAnIdGetTheirsToo();
@@ -373,11 +374,22 @@ void StartMenuTest::survivesLinksInACircle()
              QStringList({QStringLiteral(".directory"), QStringLiteral("app.desktop")}));
 }
 
+void StartMenuTest::usesTheDefaultDirectories_data()
+{
+    QTest::addColumn<QByteArray>("dataHome");
+    QTest::newRow("none set") << QByteArray();
+    QTest::newRow("no absolute path") << QByteArray("relative");
+}
+
 void StartMenuTest::usesTheDefaultDirectories()
 {
+    QFETCH(QByteArray, dataHome);
     const QByteArray home = qgetenv("HOME");
     qputenv("HOME", QFile::encodeName(folder()));
-    qunsetenv("XDG_DATA_HOME");
+    if (dataHome.isEmpty())
+        qunsetenv("XDG_DATA_HOME");
+    else
+        qputenv("XDG_DATA_HOME", dataHome);
     qputenv("XDG_DATA_DIRS", "relative");
     write(QStringLiteral(".local/share/applications/a.desktop"),
           "[Desktop Entry]\nType=Application\nExec=true\nCategories=Game;\nName=x\n");

@@ -64,7 +64,8 @@ private:
     int open(const QString &path);
     QByteArray told(const char *name = "told") const;
     QString startBus();
-    void activate(BusApplication::Manner manner, int activations, bool execRuns);
+    void activate(BusApplication::Manner manner, int activations, bool execRuns,
+                  const QByteArray &beforeAll = QByteArray());
 
     QByteArray m_path;
     QByteArray m_error;
@@ -96,6 +97,7 @@ private Q_SLOTS:
     void doesNotWaitForABrowser();
     void sendsWindowManagerCommands();
     void failsWithoutAWindowManager();
+    void activatesOverTheBusFirst_data();
     void activatesOverTheBusFirst();
     void runsTheCommandWhenTheBusRefuses();
     void runsTheCommandWhenNobodyIsOnTheBus();
@@ -430,7 +432,8 @@ QString VelOpenTest::startBus()
     return QString::fromLatin1(address.trimmed());
 }
 
-void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool execRuns)
+void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool execRuns,
+                           const QByteArray &beforeAll)
 {
     const QString address = startBus();
     QVERIFY(!address.isEmpty());
@@ -444,8 +447,9 @@ void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool 
         probe("probe", "echo ran");
         // Where the command must not run, to try it would be an error.
         const QByteArray program = execRuns ? "probe" : "no-such-program-here";
-        const QString path = entry("Type=Application\nName=x\nExec=" + program + "\nDBusActivatable=true\n",
-                                   QStringLiteral("org.example.My-App.desktop"));
+        const QString path = write(QStringLiteral("org.example.My-App.desktop"),
+                                   beforeAll + "[Desktop Entry]\nType=Application\nName=x\nExec=" + program
+                                       + "\nDBusActivatable=true\n");
         QCOMPARE(open(path), 0);
         QVERIFY2(m_time < 2000, qPrintable(QString::number(m_time)));
         QCOMPARE(application.activations(), activations);
@@ -454,9 +458,17 @@ void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool 
         QTRY_COMPARE(told(), QByteArray("ran\n"));
 }
 
+void VelOpenTest::activatesOverTheBusFirst_data()
+{
+    QTest::addColumn<QByteArray>("beforeAll");
+    QTest::newRow("plain") << QByteArray();
+    QTest::newRow("byte order mark") << QByteArray("\xEF\xBB\xBF");
+}
+
 void VelOpenTest::activatesOverTheBusFirst()
 {
-    activate(BusApplication::Answers, 1, false);
+    QFETCH(QByteArray, beforeAll);
+    activate(BusApplication::Answers, 1, false, beforeAll);
 }
 
 void VelOpenTest::runsTheCommandWhenTheBusRefuses()

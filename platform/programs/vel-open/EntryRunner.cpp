@@ -20,6 +20,8 @@
 
 namespace {
 
+const QByteArray ByteOrderMark("\xEF\xBB\xBF");
+
 struct CloseDisplay
 {
     void operator()(Display *display) const { XCloseDisplay(display); }
@@ -34,7 +36,9 @@ bool isBusActivatable(const QString &path)
     bool inEntry = false;
     bool result = false;
     while (!file.atEnd()) {
-        const QByteArray line = file.readLine().trimmed();
+        QByteArray line = file.readLine().trimmed();
+        if (line.startsWith(ByteOrderMark))
+            line.remove(0, ByteOrderMark.size());
         if (line.startsWith('['))
             inEntry = line == "[Desktop Entry]";
         const int equals = line.indexOf('=');
