@@ -7,6 +7,7 @@
 
 #include <QDir>
 #include <QFile>
+#include <QFileInfo>
 
 /// A program of ours stands in for the one that opens pages, and notes what it is asked for.
 class HelpTest : public TestCase
@@ -40,6 +41,7 @@ private Q_SLOTS:
     {
         qputenv("PATH", m_path);
         qunsetenv("VEL_DATA_DIR");
+        QDir(QStringLiteral(VEL_INSTALLED_DATA_DIR)).removeRecursively();
         TestCase::cleanup();
     }
 
@@ -89,13 +91,25 @@ private Q_SLOTS:
 
     void opensTheInstalledPageWhereTheDataDirectoryLacksIt()
     {
-        const QByteArray installed = VEL_INSTALLED_DATA_DIR "/doc/index.html";
-        const bool isThere = QFile::exists(QFile::decodeName(installed));
-        QCOMPARE(velHelpShow(std::string()), isThere);
-        if (isThere)
-            QTRY_COMPARE(opened(), installed + '|');
+        QVERIFY(!velHelpShow(std::string()));
+        const QString page = QStringLiteral(VEL_INSTALLED_DATA_DIR "/doc/index.html");
+        QVERIFY(QDir().mkpath(QFileInfo(page).path()));
+        QFile file(page);
+        QVERIFY(file.open(QIODevice::WriteOnly));
+        file.close();
+
+        QVERIFY(velHelpShow(std::string()));
+        QTRY_COMPARE(opened(), QFile::encodeName(page) + '|');
+        QVERIFY(QFile::remove(path(QStringLiteral("opened"))));
         qunsetenv("VEL_DATA_DIR");
-        QCOMPARE(velHelpShow(std::string()), isThere);
+        QVERIFY(velHelpShow(std::string()));
+        QTRY_COMPARE(opened(), QFile::encodeName(page) + '|');
+
+        // The data directory comes first.
+        qputenv("VEL_DATA_DIR", QFile::encodeName(path(QStringLiteral("data"))));
+        const QString own = write(QStringLiteral("data/doc/index.html"), "<p>");
+        QVERIFY(velHelpShow(std::string()));
+        QTRY_COMPARE(opened(), QFile::encodeName(own) + '|');
     }
 
     void startsTheProgramOffTheStreamsOfTheCaller()

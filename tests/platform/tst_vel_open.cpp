@@ -84,6 +84,7 @@ private Q_SLOTS:
     void runsTheCommandWithItsArguments();
     void findsAPathThatIsRelative();
     void startsInTheFolderOfTheEntry();
+    void givesTheProgramASessionOfItsOwn_data();
     void givesTheProgramASessionOfItsOwn();
     void keepsTheProgramOffTheFilesOfTheCaller();
     void programOutlivesIt();
@@ -264,10 +265,20 @@ void VelOpenTest::startsInTheFolderOfTheEntry()
     QTRY_COMPARE(told("local"), QByteArray("\n"));
 }
 
+void VelOpenTest::givesTheProgramASessionOfItsOwn_data()
+{
+    QTest::addColumn<QByteArray>("program");
+    QTest::addColumn<QByteArray>("keys");
+    QTest::newRow("application") << QByteArray("probe") << QByteArray("Type=Application\nExec=probe\n");
+    QTest::newRow("link") << QByteArray("xdg-open") << QByteArray("Type=Link\nURL=https://localhost/\n");
+}
+
 void VelOpenTest::givesTheProgramASessionOfItsOwn()
 {
-    probe("probe", "/bin/ps -o sid= -p $$");
-    QCOMPARE(open(application("Exec=probe\n")), 0);
+    QFETCH(QByteArray, program);
+    QFETCH(QByteArray, keys);
+    probe(program, "/bin/ps -o sid= -p $$");
+    QCOMPARE(open(entry(keys)), 0);
     QTRY_VERIFY(!told().isEmpty());
     const int session = told().trimmed().toInt();
     QVERIFY(session > 0);
