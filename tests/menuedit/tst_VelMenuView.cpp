@@ -57,6 +57,7 @@ private Q_SLOTS:
     void goesAwayWhileItTellsThatNothingStarted();
     void rebuildsTheStartMenuAfterAsking();
     void leavesTheStartMenuWhenToldSo();
+    void leavesTheStartMenuWhenItCannotBeRebuilt();
     void goesAwayWhileItAsksToRebuild();
     void goesAwayWhileItLoads();
 
@@ -561,6 +562,22 @@ void tst_VelMenuView::leavesTheStartMenuWhenToldSo()
     QCOMPARE(changes.count(), 0);
     QCOMPARE(names(view, startMenu()), QStringList{QStringLiteral("Old")});
     QVERIFY(QFile::exists(startMenu() + QLatin1String("/old.desktop")));
+}
+
+void tst_VelMenuView::leavesTheStartMenuWhenItCannotBeRebuilt()
+{
+    write(QStringLiteral("config/startmenu"), "in the way");
+    VelMenuView view(QString(), -1, true);
+    ModalDriver modal;
+    modal.handle(
+        [](QWidget *window) { qobject_cast<QMessageBox *>(window)->button(QMessageBox::Ok)->click(); });
+    expectWarning(QStringLiteral("VelMenuView: can't create the start menu"));
+    view.slotRecreate();
+    QVERIFY(modal.finished());
+    QVERIFY(!QGuiApplication::overrideCursor());
+    QCOMPARE(read(startMenu()), QByteArray("in the way"));
+    QVERIFY(!view.selectedItem().isValid());
+    QVERIFY(!view.rootIndex().isValid() || view.model()->rowCount(view.rootIndex()) == 0);
 }
 
 void tst_VelMenuView::goesAwayWhileItAsksToRebuild()
