@@ -98,6 +98,97 @@ private:
     bool m_given = false;
 };
 
+void addRowsOfHeaders()
+{
+    const QString section = s("SectionName");
+    QTest::newRow("nothing") << QByteArray() << Map();
+    QTest::newRow("blank lines") << QByteArray("\n \n\t\n\r\n") << Map();
+    QTest::newRow("header with blanks") << QByteArray("[ Main ]\n") << Map{{section, s("Main")}};
+    QTest::newRow("doubled brackets") << QByteArray("[[a]]\n") << Map{{section, s("a")}};
+    QTest::newRow("inner bracket") << QByteArray("[a]b]\n") << Map{{section, s("ab")}};
+    QTest::newRow("header with =") << QByteArray("[a=b]\n") << Map{{s("[a"), s("b]")}};
+    QTest::newRow("empty header") << QByteArray("[]\n") << Map{{section, s("")}};
+    QTest::newRow("lone [") << QByteArray("[\n") << Map();
+    QTest::newRow("lone ]") << QByteArray("]\n") << Map();
+    QTest::newRow("text after the header") << QByteArray("[a] b\n") << Map();
+    QTest::newRow("text before the header") << QByteArray("b [a]\n") << Map();
+    QTest::newRow("indented header") << QByteArray("  [a]  \n") << Map{{section, s("a")}};
+    QTest::newRow("last header counts")
+        << QByteArray("[a]\nx=1\n[b]\ny=2\n") << Map{{section, s("b")}, {s("x"), 1}, {s("y"), 2}};
+    QTest::newRow("header as a key") << QByteArray("[a]\nSectionName=b\n") << Map{{section, s("b")}};
+    QTest::newRow("key, then header") << QByteArray("SectionName=b\n[a]\n") << Map{{section, s("a")}};
+    QTest::newRow("last key counts") << QByteArray("[a]\nx=1\n[b]\nx=two\n")
+                                     << Map{{section, s("b")}, {s("x"), s("two")}};
+}
+
+void addRowsOfKeys()
+{
+    QTest::newRow("more than one =") << QByteArray("path = one = two\n") << Map{{s("path"), s("one = two")}};
+    QTest::newRow("== alone") << QByteArray("a==\n") << Map{{s("a"), s("=")}};
+    QTest::newRow("blanks around") << QByteArray(" \t a\t =\t b c \t\n") << Map{{s("a"), s("b c")}};
+    QTest::newRow("blanks inside the key") << QByteArray("a b=c\n") << Map{{s("a b"), s("c")}};
+    QTest::newRow("no key") << QByteArray("=a\n =b\n") << Map();
+    QTest::newRow("no value") << QByteArray("a=\nb= \n") << Map();
+    QTest::newRow("no value keeps the earlier one") << QByteArray("a=1\na=\n") << Map{{s("a"), 1}};
+    QTest::newRow("neither") << QByteArray("=\n") << Map();
+    QTest::newRow("comments") << QByteArray("#a=1\n;b=2\n  #c=3\n\t;d=4\n#[e]\n") << Map();
+    QTest::newRow("no comment") << QByteArray("a=1 #x\nb;=2\n") << Map{{s("a"), s("1 #x")}, {s("b;"), 2}};
+    QTest::newRow("text") << QByteArray("just text\n") << Map();
+    QTest::newRow("case of keys") << QByteArray("a=1\nA=2\n") << Map{{s("a"), 1}, {s("A"), 2}};
+    QTest::newRow("slash in a key") << QByteArray("a/b=1\n") << Map{{s("a/b"), 1}};
+}
+
+void addRowsOfValues()
+{
+    QTest::newRow("booleans") << QByteArray("a=true\nb=True\nc=false\nd=False\n")
+                              << Map{{s("a"), true}, {s("b"), true}, {s("c"), false}, {s("d"), false}};
+    QTest::newRow("no booleans") << QByteArray("a=TRUE\nb=tRue\nc=truex\nd=xfalse\ne=True False\n")
+                                 << Map{{s("a"), s("TRUE")},
+                                        {s("b"), s("tRue")},
+                                        {s("c"), s("truex")},
+                                        {s("d"), s("xfalse")},
+                                        {s("e"), s("True False")}};
+    QTest::newRow("quoted boolean") << QByteArray("a=\"true\"\n") << Map{{s("a"), s("true")}};
+    QTest::newRow("numbers") << QByteArray("a=0\nb=007\nc=2147483647\n")
+                             << Map{{s("a"), 0}, {s("b"), 7}, {s("c"), 2147483647}};
+    QTest::newRow("beyond the range") << QByteArray("a=2147483648\nb=99999999999\nc=4294967297\n"
+                                                    "d=18446744073709551617\ne=00000000000000000000000001\n")
+                                      << Map{{s("a"), 0}, {s("b"), 0}, {s("c"), 0}, {s("d"), 0}, {s("e"), 1}};
+    QTest::newRow("no numbers") << QByteArray("a=-1\nb=+1\nc=1.5\nd=1 2\ne=0x1\nf=\xd9\xa1\n")
+                                << Map{{s("a"), s("-1")},  {s("b"), s("+1")},  {s("c"), s("1.5")},
+                                       {s("d"), s("1 2")}, {s("e"), s("0x1")}, {s("f"), s("\xd9\xa1")}};
+    QTest::newRow("quoted number") << QByteArray("a=\"7\"\n") << Map{{s("a"), s("7")}};
+    QTest::newRow("quotes") << QByteArray("a=\"v\"\nb=\"a b\"\nc=\"\"\nd=\"\"x\"\"\n")
+                            << Map{{s("a"), s("v")},
+                                   {s("b"), s("a b")},
+                                   {s("c"), s("")},
+                                   {s("d"), s("\"x\"")}};
+    QTest::newRow("nothing unescaped") << QByteArray("a=\"x\\n\\\"y\"\n") << Map{{s("a"), s("x\\n\\\"y")}};
+    QTest::newRow("unpaired quotes") << QByteArray("a=\"x\nb=x\"\nc='x'\n")
+                                     << Map{{s("a"), s("\"x")}, {s("b"), s("x\"")}, {s("c"), s("'x'")}};
+    QTest::newRow("one lone quote") << QByteArray("a=\"\n") << Map{{s("a"), s("\"")}};
+    QTest::newRow("blanks inside quotes") << QByteArray("a=\" \"\n") << Map{{s("a"), s(" ")}};
+}
+
+void addRowsOfLineEnds()
+{
+    const QString section = s("SectionName");
+    QTest::newRow("CR LF") << QByteArray("[a]\r\nx=1\r\ny=true\r\n")
+                           << Map{{section, s("a")}, {s("x"), 1}, {s("y"), true}};
+    QTest::newRow("CR alone ends no line") << QByteArray("x=1\ry=2\r") << Map{{s("x"), s("1\ry=2")}};
+    QTest::newRow("no last line end") << QByteArray("[a]\nx=1") << Map{{section, s("a")}, {s("x"), 1}};
+    QTest::newRow("NUL ends the line's text")
+        << QByteArray("x=1\0y=2\nz=3\n", 12) << Map{{s("x"), 1}, {s("z"), 3}};
+    QTest::newRow("NUL before =") << QByteArray("x\0=1\n", 5) << Map();
+    QTest::newRow("NUL first") << QByteArray("\0x=1\n", 5) << Map();
+    // The blank is stripped with the bytes, before the text ends at the NUL; then with the value.
+    QTest::newRow("blank before NUL") << QByteArray("[a] \0\nx=1 \0\n", 12) << Map{{s("x"), 1}};
+    QTest::newRow("wide blanks") << QByteArray("\xc2\xa0k\xc2\xa0=\xe2\x80\x83v\xc2\xa0\n[\xc2\xa0n ]")
+                                 << Map{{s("k"), s("v")}, {section, s("n")}};
+    QTest::newRow("broken UTF-8") << QByteArray("a=x\xff\n")
+                                  << Map{{s("a"), QString(s("x") + QChar(0xfffd))}};
+}
+
 } // namespace
 
 class tst_ThemeRcFormat : public TestCase
@@ -188,83 +279,10 @@ void tst_ThemeRcFormat::readsLines_data()
 {
     QTest::addColumn<QByteArray>("bytes");
     QTest::addColumn<Map>("expected");
-    const QString section = s("SectionName");
-
-    QTest::newRow("nothing") << QByteArray() << Map();
-    QTest::newRow("blank lines") << QByteArray("\n \n\t\n\r\n") << Map();
-    QTest::newRow("header with blanks") << QByteArray("[ Main ]\n") << Map{{section, s("Main")}};
-    QTest::newRow("doubled brackets") << QByteArray("[[a]]\n") << Map{{section, s("a")}};
-    QTest::newRow("inner bracket") << QByteArray("[a]b]\n") << Map{{section, s("ab")}};
-    QTest::newRow("header with =") << QByteArray("[a=b]\n") << Map{{s("[a"), s("b]")}};
-    QTest::newRow("empty header") << QByteArray("[]\n") << Map{{section, s("")}};
-    QTest::newRow("lone [") << QByteArray("[\n") << Map();
-    QTest::newRow("lone ]") << QByteArray("]\n") << Map();
-    QTest::newRow("text after the header") << QByteArray("[a] b\n") << Map();
-    QTest::newRow("text before the header") << QByteArray("b [a]\n") << Map();
-    QTest::newRow("indented header") << QByteArray("  [a]  \n") << Map{{section, s("a")}};
-    QTest::newRow("last header counts")
-        << QByteArray("[a]\nx=1\n[b]\ny=2\n") << Map{{section, s("b")}, {s("x"), 1}, {s("y"), 2}};
-    QTest::newRow("header as a key") << QByteArray("[a]\nSectionName=b\n") << Map{{section, s("b")}};
-    QTest::newRow("key, then header") << QByteArray("SectionName=b\n[a]\n") << Map{{section, s("a")}};
-    QTest::newRow("last key counts") << QByteArray("[a]\nx=1\n[b]\nx=two\n")
-                                     << Map{{section, s("b")}, {s("x"), s("two")}};
-    QTest::newRow("more than one =") << QByteArray("path = one = two\n") << Map{{s("path"), s("one = two")}};
-    QTest::newRow("== alone") << QByteArray("a==\n") << Map{{s("a"), s("=")}};
-    QTest::newRow("blanks around") << QByteArray(" \t a\t =\t b c \t\n") << Map{{s("a"), s("b c")}};
-    QTest::newRow("blanks inside the key") << QByteArray("a b=c\n") << Map{{s("a b"), s("c")}};
-    QTest::newRow("no key") << QByteArray("=a\n =b\n") << Map();
-    QTest::newRow("no value") << QByteArray("a=\nb= \n") << Map();
-    QTest::newRow("no value keeps the earlier one") << QByteArray("a=1\na=\n") << Map{{s("a"), 1}};
-    QTest::newRow("neither") << QByteArray("=\n") << Map();
-    QTest::newRow("comments") << QByteArray("#a=1\n;b=2\n  #c=3\n\t;d=4\n#[e]\n") << Map();
-    QTest::newRow("no comment") << QByteArray("a=1 #x\nb;=2\n") << Map{{s("a"), s("1 #x")}, {s("b;"), 2}};
-    QTest::newRow("text") << QByteArray("just text\n") << Map();
-    QTest::newRow("case of keys") << QByteArray("a=1\nA=2\n") << Map{{s("a"), 1}, {s("A"), 2}};
-    QTest::newRow("slash in a key") << QByteArray("a/b=1\n") << Map{{s("a/b"), 1}};
-
-    QTest::newRow("booleans") << QByteArray("a=true\nb=True\nc=false\nd=False\n")
-                              << Map{{s("a"), true}, {s("b"), true}, {s("c"), false}, {s("d"), false}};
-    QTest::newRow("no booleans") << QByteArray("a=TRUE\nb=tRue\nc=truex\nd=xfalse\ne=True False\n")
-                                 << Map{{s("a"), s("TRUE")},
-                                        {s("b"), s("tRue")},
-                                        {s("c"), s("truex")},
-                                        {s("d"), s("xfalse")},
-                                        {s("e"), s("True False")}};
-    QTest::newRow("quoted boolean") << QByteArray("a=\"true\"\n") << Map{{s("a"), s("true")}};
-    QTest::newRow("numbers") << QByteArray("a=0\nb=007\nc=2147483647\n")
-                             << Map{{s("a"), 0}, {s("b"), 7}, {s("c"), 2147483647}};
-    QTest::newRow("beyond the range") << QByteArray("a=2147483648\nb=99999999999\nc=4294967297\n"
-                                                    "d=18446744073709551617\ne=00000000000000000000000001\n")
-                                      << Map{{s("a"), 0}, {s("b"), 0}, {s("c"), 0}, {s("d"), 0}, {s("e"), 1}};
-    QTest::newRow("no numbers") << QByteArray("a=-1\nb=+1\nc=1.5\nd=1 2\ne=0x1\nf=\xd9\xa1\n")
-                                << Map{{s("a"), s("-1")},  {s("b"), s("+1")},  {s("c"), s("1.5")},
-                                       {s("d"), s("1 2")}, {s("e"), s("0x1")}, {s("f"), s("\xd9\xa1")}};
-    QTest::newRow("quoted number") << QByteArray("a=\"7\"\n") << Map{{s("a"), s("7")}};
-    QTest::newRow("quotes") << QByteArray("a=\"v\"\nb=\"a b\"\nc=\"\"\nd=\"\"x\"\"\n")
-                            << Map{{s("a"), s("v")},
-                                   {s("b"), s("a b")},
-                                   {s("c"), s("")},
-                                   {s("d"), s("\"x\"")}};
-    QTest::newRow("nothing unescaped") << QByteArray("a=\"x\\n\\\"y\"\n") << Map{{s("a"), s("x\\n\\\"y")}};
-    QTest::newRow("unpaired quotes") << QByteArray("a=\"x\nb=x\"\nc='x'\n")
-                                     << Map{{s("a"), s("\"x")}, {s("b"), s("x\"")}, {s("c"), s("'x'")}};
-    QTest::newRow("one lone quote") << QByteArray("a=\"\n") << Map{{s("a"), s("\"")}};
-    QTest::newRow("blanks inside quotes") << QByteArray("a=\" \"\n") << Map{{s("a"), s(" ")}};
-
-    QTest::newRow("CR LF") << QByteArray("[a]\r\nx=1\r\ny=true\r\n")
-                           << Map{{section, s("a")}, {s("x"), 1}, {s("y"), true}};
-    QTest::newRow("CR alone ends no line") << QByteArray("x=1\ry=2\r") << Map{{s("x"), s("1\ry=2")}};
-    QTest::newRow("no last line end") << QByteArray("[a]\nx=1") << Map{{section, s("a")}, {s("x"), 1}};
-    QTest::newRow("NUL ends the line's text")
-        << QByteArray("x=1\0y=2\nz=3\n", 12) << Map{{s("x"), 1}, {s("z"), 3}};
-    QTest::newRow("NUL before =") << QByteArray("x\0=1\n", 5) << Map();
-    QTest::newRow("NUL first") << QByteArray("\0x=1\n", 5) << Map();
-    // The blank is stripped with the bytes, before the text ends at the NUL; then with the value.
-    QTest::newRow("blank before NUL") << QByteArray("[a] \0\nx=1 \0\n", 12) << Map{{s("x"), 1}};
-    QTest::newRow("wide blanks") << QByteArray("\xc2\xa0k\xc2\xa0=\xe2\x80\x83v\xc2\xa0\n[\xc2\xa0n ]")
-                                 << Map{{s("k"), s("v")}, {section, s("n")}};
-    QTest::newRow("broken UTF-8") << QByteArray("a=x\xff\n")
-                                  << Map{{s("a"), QString(s("x") + QChar(0xfffd))}};
+    addRowsOfHeaders();
+    addRowsOfKeys();
+    addRowsOfValues();
+    addRowsOfLineEnds();
 }
 
 void tst_ThemeRcFormat::readsLines()
