@@ -196,7 +196,10 @@ public Q_SLOTS:
     bool slotEdit();
     /// Deletes the selected item, a folder with everything in it, after asking.
     void slotDel();
-    /// Runs the selected entry.
+    /**
+     * Runs the selected entry with the desktop's program "vel-open", which lives on when the
+     * view goes away. A message box tells when that cannot be started within two seconds.
+     */
     void slotExe();
     /// Puts the selected item on the clipboard, to be moved where it is pasted.
     void slotCut();
@@ -208,7 +211,8 @@ public Q_SLOTS:
     void slotUp();
     /// Moves the selected item down by one place.
     void slotDown();
-    /// Builds the default start menu anew, after asking.
+    /// Builds the default start menu anew, after asking; what was in it before is lost. When that
+    /// fails, the old menu stays as it was.
     void slotRecreate();
     /// Asks for a text and selects the first item whose name contains it.
     void slotFind();
