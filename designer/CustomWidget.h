@@ -7,7 +7,8 @@
 #include <QtUiPlugin/QDesignerCustomWidgetInterface>
 
 /// What Designer shows and writes of one widget class.
-struct CustomWidgetInfo {
+struct CustomWidgetInfo
+{
     QString className;
     QString header;
     QString icon;

@@ -31,8 +31,9 @@ CustomWidgetInfo menuView()
             QStringLiteral("VelMenuView.h"),
             QStringLiteral(":/veluiextra-designer/icons/menuview.png"),
             QStringLiteral("Tree of a menu directory"),
-            QStringLiteral("Shows the start menu, or another menu directory, in the desktop's order. A view made in a "
-                           "form shows the start menu and cannot be edited; construct one in code for the rest."),
+            QStringLiteral(
+                "Shows the start menu, or another menu directory, in the desktop's order. A view made in a "
+                "form shows the start menu and cannot be edited; construct one in code for the rest."),
             sizeOf(240, 320),
             false,
             create<VelMenuView>};
@@ -44,9 +45,11 @@ CustomWidgetInfo radioGroupBox()
             QStringLiteral("VelRadioGroupBox.h"),
             QStringLiteral(":/veluiextra-designer/icons/radiogroupbox.png"),
             QStringLiteral("Group box whose title is a radio button"),
-            QStringLiteral("The boxes under one parent exclude one another. The property \"checked\" set in a form goes "
-                           "past that exclusivity: set it on one box of a group only, or call setChecked() in code."),
-            sizeOf(200, 120) + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
+            QStringLiteral(
+                "The boxes under one parent exclude one another. The property \"checked\" set in a form goes "
+                "past that exclusivity: set it on one box of a group only, or call setChecked() in code."),
+            sizeOf(200, 120)
+                + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
             true,
             create<VelRadioGroupBox>};
 }
@@ -57,8 +60,9 @@ CustomWidgetInfo entryProperties()
             QStringLiteral("VelDesktopEntryPropsWidget.h"),
             QStringLiteral(":/veluiextra-designer/icons/entryprops.png"),
             QStringLiteral("Form with every key of a desktop entry"),
-            QStringLiteral("Shows and edits a desktop entry record: load it with loadFrom() and write it back with "
-                           "saveTo() in code."),
+            QStringLiteral(
+                "Shows and edits a desktop entry record: load it with loadFrom() and write it back with "
+                "saveTo() in code."),
             sizeOf(420, 400),
             false,
             create<VelDesktopEntryPropsWidget>};

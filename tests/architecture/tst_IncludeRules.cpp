@@ -15,15 +15,18 @@ const QString sourceDir = QStringLiteral(VEL_SOURCE_DIR);
 // A folder of the house and the folders whose files its own may include. A folder may always
 // include its own files; "include" stands for the public headers, "platform" for the public
 // headers of all three platform libraries.
-struct Rule {
+struct Rule
+{
     const char *folder;
     QStringList allowed;
 };
 
 const QVector<Rule> &rules()
 {
-    static const auto text = [](const char *list) { return QString::fromLatin1(list).split(QLatin1Char(' ')); };
-    static const QVector<Rule> all {
+    static const auto text = [](const char *list) {
+        return QString::fromLatin1(list).split(QLatin1Char(' '));
+    };
+    static const QVector<Rule> all{
         {"platform/velcore", {}},
         {"platform/veluiaux", text("platform/velcore/include")},
         {"platform/velintegration", text("platform/velcore/include platform/veluiaux/include")},
@@ -46,7 +49,8 @@ const QVector<Rule> &rules()
 // Which subsystem a public header belongs to. Across subsystems only these arrows exist, and only
 // from a .cpp file: the menu view opens the entry editor, the entry editor opens the menu dialog,
 // and the menu model shows the icons of the provider.
-struct Door {
+struct Door
+{
     const char *from;
     const char *header;
 };
@@ -58,7 +62,8 @@ const Door doors[] = {
 };
 
 // A program that makes no window may link the internal objects, for the rules alone.
-struct RuleHeader {
+struct RuleHeader
+{
     const char *program;
     const char *header;
 };
@@ -75,13 +80,15 @@ QString subsystemOf(const QString &publicHeader)
     for (const Rule &rule : rules()) {
         const QString folder = QString::fromLatin1(rule.folder);
         if (folder.startsWith(QLatin1String("src/"))
-            && QFile::exists(sourceDir + QLatin1Char('/') + folder + QLatin1Char('/') + source + QStringLiteral(".cpp")))
+            && QFile::exists(sourceDir + QLatin1Char('/') + folder + QLatin1Char('/') + source
+                             + QStringLiteral(".cpp")))
             return folder;
     }
     return QString();
 }
 
-struct Include {
+struct Include
+{
     QString file; // of ours, relative to the source folder; empty for what is not ours
     QString written;
     int line;
@@ -95,8 +102,8 @@ QString relative(const QString &path)
 // The file of ours that an include names, tried in the order in which the compiler would.
 QString resolve(const QString &includer, const QString &written)
 {
-    QStringList candidates {QFileInfo(includer).absolutePath(), sourceDir + QStringLiteral("/src"),
-                            sourceDir + QStringLiteral("/include"), sourceDir + QStringLiteral("/apps")};
+    QStringList candidates{QFileInfo(includer).absolutePath(), sourceDir + QStringLiteral("/src"),
+                           sourceDir + QStringLiteral("/include"), sourceDir + QStringLiteral("/apps")};
     for (const char *library : {"velcore", "veluiaux", "velintegration"}) {
         candidates << sourceDir + QStringLiteral("/platform/%1/include").arg(QLatin1String(library))
                    << sourceDir + QStringLiteral("/platform/%1").arg(QLatin1String(library));
@@ -130,8 +137,8 @@ QStringList sourcesBelow(const QString &folder)
 {
     QStringList files;
     QDirIterator iterator(sourceDir + QLatin1Char('/') + folder,
-                          {QStringLiteral("*.h"), QStringLiteral("*.cpp"), QStringLiteral("*.c")}, QDir::Files,
-                          QDirIterator::Subdirectories);
+                          {QStringLiteral("*.h"), QStringLiteral("*.cpp"), QStringLiteral("*.c")},
+                          QDir::Files, QDirIterator::Subdirectories);
     while (iterator.hasNext())
         files.append(iterator.next());
     files.sort();
@@ -145,7 +152,8 @@ bool isBelow(const QString &file, const QString &folder)
 
 bool isPlatformHeader(const QString &file)
 {
-    return file.startsWith(QLatin1String("platform/")) && file.section(QLatin1Char('/'), 2, 2) == QLatin1String("include");
+    return file.startsWith(QLatin1String("platform/"))
+        && file.section(QLatin1Char('/'), 2, 2) == QLatin1String("include");
 }
 
 bool isAllowedFolder(const Rule &rule, const QString &file)
@@ -166,7 +174,8 @@ bool isOpenDoor(const QString &folder, const QString &includer, const QString &h
     if (!includer.endsWith(QLatin1String(".cpp")))
         return false;
     for (const Door &door : doors) {
-        if (folder == QLatin1String(door.from) && header == QLatin1String("include/") + QLatin1String(door.header))
+        if (folder == QLatin1String(door.from)
+            && header == QLatin1String("include/") + QLatin1String(door.header))
             return true;
     }
     return false;
@@ -216,10 +225,12 @@ void tst_IncludeRules::everyArrowIsAllowed()
             if (include.file.isEmpty())
                 continue;
             bool allowed = isAllowedFolder(rule, include.file) || isRuleHeader(includer, include.file);
-            if (allowed && isBelow(include.file, QStringLiteral("include")) && folder.startsWith(QLatin1String("src/")))
+            if (allowed && isBelow(include.file, QStringLiteral("include"))
+                && folder.startsWith(QLatin1String("src/")))
                 allowed = isOpenDoor(folder, includer, include.file);
             if (!allowed)
-                wrong.append(QStringLiteral("%1:%2 includes %3").arg(includer).arg(include.line).arg(include.file));
+                wrong.append(
+                    QStringLiteral("%1:%2 includes %3").arg(includer).arg(include.line).arg(include.file));
         }
     }
     QVERIFY2(wrong.isEmpty(), qPrintable(wrong.join(QLatin1Char('\n'))));
@@ -228,13 +239,16 @@ void tst_IncludeRules::everyArrowIsAllowed()
 void tst_IncludeRules::everySourceFolderHasARule()
 {
     for (const QString &parent : {QStringLiteral("src"), QStringLiteral("platform")}) {
-        const QStringList folders = QDir(sourceDir + QLatin1Char('/') + parent).entryList(QDir::Dirs | QDir::NoDotAndDotDot);
+        const QStringList folders =
+            QDir(sourceDir + QLatin1Char('/') + parent).entryList(QDir::Dirs | QDir::NoDotAndDotDot);
         QVERIFY(!folders.isEmpty());
         for (const QString &name : folders) {
             const QString folder = parent + QLatin1Char('/') + name;
             if (sourcesBelow(folder).isEmpty())
                 continue;
-            const auto isThisFolder = [&folder](const Rule &rule) { return folder == QLatin1String(rule.folder); };
+            const auto isThisFolder = [&folder](const Rule &rule) {
+                return folder == QLatin1String(rule.folder);
+            };
             QVERIFY2(std::any_of(rules().begin(), rules().end(), isThisFolder), qPrintable(folder));
         }
     }
@@ -246,7 +260,8 @@ void tst_IncludeRules::platformCoreKnowsNoQt()
     QVERIFY(!files.isEmpty());
     for (const QString &path : files) {
         for (const Include &include : includesOf(path))
-            QVERIFY2(!include.written.startsWith(QLatin1Char('Q')), qPrintable(relative(path) + include.written));
+            QVERIFY2(!include.written.startsWith(QLatin1Char('Q')),
+                     qPrintable(relative(path) + include.written));
     }
 }
 
@@ -256,7 +271,8 @@ void tst_IncludeRules::recordsAreReachedThroughTheirInterface()
         if (isBelow(relative(path), QStringLiteral("src/frame")))
             continue;
         for (const Include &include : includesOf(path))
-            QVERIFY2(!include.written.startsWith(QLatin1String("veluiaux/VelUIDesktop")), qPrintable(relative(path)));
+            QVERIFY2(!include.written.startsWith(QLatin1String("veluiaux/VelUIDesktop")),
+                     qPrintable(relative(path)));
     }
 }
 

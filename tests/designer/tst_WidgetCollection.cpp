@@ -49,8 +49,9 @@ void tst_WidgetCollection::offersTheThreeWidgets()
     QStringList names;
     for (const QDesignerCustomWidgetInterface *widget : widgets())
         names.append(widget->name());
-    QCOMPARE(names, QStringList({QStringLiteral("VelMenuView"), QStringLiteral("VelRadioGroupBox"),
-                                 QStringLiteral("VelDesktopEntryPropsWidget")}));
+    QCOMPARE(names,
+             QStringList({QStringLiteral("VelMenuView"), QStringLiteral("VelRadioGroupBox"),
+                          QStringLiteral("VelDesktopEntryPropsWidget")}));
 }
 
 void tst_WidgetCollection::describesEveryWidget()
@@ -70,7 +71,8 @@ void tst_WidgetCollection::newWidgetsAreWellFormed()
         QXmlStreamReader reader(widget->domXml());
         bool named = false;
         while (!reader.atEnd()) {
-            if (reader.readNext() == QXmlStreamReader::StartElement && reader.name() == QLatin1String("widget"))
+            if (reader.readNext() == QXmlStreamReader::StartElement
+                && reader.name() == QLatin1String("widget"))
                 named = reader.attributes().value(QLatin1String("class")) == widget->name();
         }
         QVERIFY2(!reader.hasError(), qPrintable(widget->name() + reader.errorString()));

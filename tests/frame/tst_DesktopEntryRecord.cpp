@@ -34,7 +34,8 @@ void tst_DesktopEntryRecord::bringsInBothRecordClasses()
 
 void tst_DesktopEntryRecord::copyHeaders()
 {
-    const QStringList includes = QStringLiteral(VEL_RECORD_INCLUDES).split(QLatin1Char(':'), Qt::SkipEmptyParts);
+    const QStringList includes =
+        QStringLiteral(VEL_RECORD_INCLUDES).split(QLatin1Char(':'), Qt::SkipEmptyParts);
     for (const QString &include : includes) {
         const QDir headers(include + QStringLiteral("/veluiaux"));
         for (const QString &name : headers.entryList({QStringLiteral("*.h")}))
@@ -44,8 +45,9 @@ void tst_DesktopEntryRecord::copyHeaders()
 
 bool tst_DesktopEntryRecord::compile(QByteArray *messages)
 {
-    QStringList arguments {QStringLiteral("-std=c++17"), QStringLiteral("-fPIC"), QStringLiteral("-fsyntax-only"),
-                           QStringLiteral("-I") + path(QStringLiteral("platform"))};
+    QStringList arguments{QStringLiteral("-std=c++17"), QStringLiteral("-fPIC"),
+                          QStringLiteral("-fsyntax-only"),
+                          QStringLiteral("-I") + path(QStringLiteral("platform"))};
     const QStringList includes = QStringLiteral(VEL_QT_INCLUDES).split(QLatin1Char(':'), Qt::SkipEmptyParts);
     for (const QString &include : includes)
         arguments << QStringLiteral("-isystem") << include;
@@ -74,16 +76,16 @@ void tst_DesktopEntryRecord::namesTheOperationThatIsLacking_data()
 
     const QString entry = QStringLiteral("VelUIDesktopEntry.h");
     const QString action = QStringLiteral("VelUIDesktopAction.h");
-    QTest::newRow("a getter is gone")
-        << entry << QByteArray("QString getURL() const;") << QByteArray() << QByteArray("lacks the operation QString getURL()");
+    QTest::newRow("a getter is gone") << entry << QByteArray("QString getURL() const;") << QByteArray()
+                                      << QByteArray("lacks the operation QString getURL()");
     QTest::newRow("a getter changes the record")
         << entry << QByteArray("QString getURL() const;") << QByteArray("QString getURL();")
         << QByteArray("lacks the operation QString getURL()");
-    QTest::newRow("a list is a text")
-        << entry << QByteArray("QStringList getSortOrder() const;") << QByteArray("QString getSortOrder() const;")
-        << QByteArray("lacks the operation QStringList getSortOrder()");
-    QTest::newRow("saving tells nothing")
-        << entry << QByteArray("bool save();") << QByteArray("void save();") << QByteArray("lacks the operation bool save()");
+    QTest::newRow("a list is a text") << entry << QByteArray("QStringList getSortOrder() const;")
+                                      << QByteArray("QString getSortOrder() const;")
+                                      << QByteArray("lacks the operation QStringList getSortOrder()");
+    QTest::newRow("saving tells nothing") << entry << QByteArray("bool save();") << QByteArray("void save();")
+                                          << QByteArray("lacks the operation bool save()");
     QTest::newRow("a setter of the action is gone")
         << action << QByteArray("void setExec(const QString &value);") << QByteArray()
         << QByteArray("lacks the operation void setExec");

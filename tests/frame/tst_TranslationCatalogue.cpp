@@ -62,7 +62,8 @@ QByteArray tst_TranslationCatalogue::probe(const QString &program, const QString
     environment.insert(QStringLiteral("VEL_REDIRECT_TO"), QStringLiteral(VEL_CATALOGUE_DIR));
     if (arguments.contains(QStringLiteral(VEL_LIBRARY))) {
         environment.insert(QStringLiteral("LD_PRELOAD"), QStringLiteral(VEL_REDIRECT));
-        environment.insert(QStringLiteral("ASAN_OPTIONS"), QStringLiteral("verify_asan_link_order=0:detect_leaks=0"));
+        environment.insert(QStringLiteral("ASAN_OPTIONS"),
+                           QStringLiteral("verify_asan_link_order=0:detect_leaks=0"));
     }
     process.setProcessEnvironment(environment);
     process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
@@ -104,8 +105,10 @@ void tst_TranslationCatalogue::loadsTheCatalogueOfTheSystemLanguage_data()
     QTest::addColumn<QString>("language");
 
     QTest::newRow("language") << QStringLiteral("libveluiextra_de.qm") << QStringLiteral("de");
-    QTest::newRow("language and country") << QStringLiteral("libveluiextra_de_DE.qm") << QStringLiteral("de_DE.UTF-8");
-    QTest::newRow("language for a country") << QStringLiteral("libveluiextra_de.qm") << QStringLiteral("de_AT.UTF-8");
+    QTest::newRow("language and country")
+        << QStringLiteral("libveluiextra_de_DE.qm") << QStringLiteral("de_DE.UTF-8");
+    QTest::newRow("language for a country")
+        << QStringLiteral("libveluiextra_de.qm") << QStringLiteral("de_AT.UTF-8");
 }
 
 void tst_TranslationCatalogue::loadsTheCatalogueOfTheSystemLanguage()
@@ -150,8 +153,8 @@ void tst_TranslationCatalogue::doesNothingWithoutADirectory()
     addCatalogue(QStringLiteral("libveluiextra_de.qm"));
     QVERIFY(QDir::setCurrent(QStringLiteral(VEL_CATALOGUE_DIR)));
 
-    QCOMPARE(probe(QStringLiteral(VEL_PROBE), {QStringLiteral("after"), QStringLiteral(VEL_WITHOUT_DIRECTORY)},
-                   QStringLiteral("de")),
+    QCOMPARE(probe(QStringLiteral(VEL_PROBE),
+                   {QStringLiteral("after"), QStringLiteral(VEL_WITHOUT_DIRECTORY)}, QStringLiteral("de")),
              QByteArray("started: ") + english + "running: " + english);
 }
 

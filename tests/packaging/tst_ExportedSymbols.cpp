@@ -33,8 +33,9 @@ void tst_ExportedSymbols::initTestCase()
         static const QRegularExpression pattern(QStringLiteral("^(.*) ([A-Za-z]) [0-9a-f]+( [0-9a-f]+)?$"));
         const QRegularExpressionMatch match = pattern.match(QString::fromUtf8(line));
         // Weak symbols are inline functions and templates of other libraries.
-        if (match.hasMatch() && match.captured(2) != QLatin1String("W") && match.captured(2) != QLatin1String("w")
-            && match.captured(2) != QLatin1String("u") && !match.captured(1).startsWith(QLatin1String("__")))
+        if (match.hasMatch() && match.captured(2) != QLatin1String("W")
+            && match.captured(2) != QLatin1String("w") && match.captured(2) != QLatin1String("u")
+            && !match.captured(1).startsWith(QLatin1String("__")))
             m_symbols.append(match.captured(1));
     }
     m_symbols.sort();
@@ -64,9 +65,11 @@ void tst_ExportedSymbols::areThoseOfTheList()
 
 void tst_ExportedSymbols::belongToDocumentedClassesOnly()
 {
-    static const QRegularExpression owner(QStringLiteral(
-        "(?:^|\\s)(VelSettings|VelKeyServer|IShortcutObject|ShortcutsModel|EditShortcutsDialog|VelMenuView|VelMenuDialog"
-        "|VelMimeTypeIconProvider|VelDesktopEntryPropsWidget|VelDesktopEntryEditDialog|VelRadioGroupBox)(?:::|$)"));
+    static const QRegularExpression owner(
+        QStringLiteral("(?:^|\\s)(VelSettings|VelKeyServer|IShortcutObject|ShortcutsModel|"
+                       "EditShortcutsDialog|VelMenuView|VelMenuDialog"
+                       "|VelMimeTypeIconProvider|VelDesktopEntryPropsWidget|VelDesktopEntryEditDialog|"
+                       "VelRadioGroupBox)(?:::|$)"));
     for (const QString &symbol : qAsConst(m_symbols))
         QVERIFY2(owner.match(symbol).hasMatch(), qPrintable(symbol));
 }

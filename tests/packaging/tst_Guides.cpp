@@ -31,14 +31,16 @@ private Q_SLOTS:
 void tst_Guides::showEveryExample_data()
 {
     QTest::addColumn<QString>("example");
-    for (const QString &name : QDir(sourceDir + QStringLiteral("/examples")).entryList({QStringLiteral("*.cpp")}))
+    for (const QString &name :
+         QDir(sourceDir + QStringLiteral("/examples")).entryList({QStringLiteral("*.cpp")}))
         QTest::newRow(qPrintable(name)) << name;
 }
 
 void tst_Guides::showEveryExample()
 {
     QFETCH(QString, example);
-    const QByteArray block = "```cpp\n" + programOf(read(sourceDir + QStringLiteral("/examples/") + example)) + "```\n";
+    const QByteArray block =
+        "```cpp\n" + programOf(read(sourceDir + QStringLiteral("/examples/") + example)) + "```\n";
     const QDir guides(sourceDir + QStringLiteral("/docs/guides"));
     int shown = 0;
     for (const QString &guide : guides.entryList({QStringLiteral("*.md")}))
@@ -50,7 +52,8 @@ void tst_Guides::showNothingElse()
 {
     const QDir guides(sourceDir + QStringLiteral("/docs/guides"));
     const QStringList names = guides.entryList({QStringLiteral("*.md")});
-    QCOMPARE(names.size(), QDir(sourceDir + QStringLiteral("/examples")).entryList({QStringLiteral("*.cpp")}).size());
+    QCOMPARE(names.size(),
+             QDir(sourceDir + QStringLiteral("/examples")).entryList({QStringLiteral("*.cpp")}).size());
     for (const QString &name : names)
         QCOMPARE(read(guides.filePath(name)).count("```cpp\n"), 1);
 }

@@ -56,9 +56,10 @@ bool ModalDriver::finished() const
 void ModalDriver::look()
 {
     // A window that was closed may come back later as the same object.
-    m_handled.erase(std::remove_if(m_handled.begin(), m_handled.end(),
-                                   [](const QPointer<QWidget> &window) { return !window || !window->isVisible(); }),
-                    m_handled.end());
+    m_handled.erase(
+        std::remove_if(m_handled.begin(), m_handled.end(),
+                       [](const QPointer<QWidget> &window) { return !window || !window->isVisible(); }),
+        m_handled.end());
 
     QWidget *window = QApplication::activePopupWidget();
     if (!window)
@@ -69,7 +70,8 @@ void ModalDriver::look()
 
     if (m_steps.isEmpty()) {
         m_failed = true;
-        QTest::qFail(qPrintable(QStringLiteral("unannounced window: ") + window->windowTitle()), __FILE__, __LINE__);
+        QTest::qFail(qPrintable(QStringLiteral("unannounced window: ") + window->windowTitle()), __FILE__,
+                     __LINE__);
         window->close();
         return;
     }
@@ -87,7 +89,8 @@ bool ModalDriver::compare(const Box &expected, QWidget *window)
 {
     auto *box = qobject_cast<QMessageBox *>(window);
     if (!box) {
-        QTest::qFail(qPrintable(QStringLiteral("not a message box: ") + window->windowTitle()), __FILE__, __LINE__);
+        QTest::qFail(qPrintable(QStringLiteral("not a message box: ") + window->windowTitle()), __FILE__,
+                     __LINE__);
         return false;
     }
     QMessageBox::StandardButton defaultButton = QMessageBox::NoButton;

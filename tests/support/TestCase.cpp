@@ -12,7 +12,8 @@
 namespace {
 
 // What the running test function logged and announced. Messages may come from any thread.
-struct MessageLog {
+struct MessageLog
+{
     QMutex mutex;
     QtMessageHandler previous = nullptr;
     QStringList unexpected;
@@ -155,6 +156,7 @@ void TestCase::closeModalWindows()
             window->hide();
     }
     if (!left.isEmpty() && !QTest::currentTestFailed())
-        QTest::qFail(qPrintable(QStringLiteral("modal windows left open: ") + left.join(QStringLiteral(", "))),
-                     __FILE__, __LINE__);
+        QTest::qFail(
+            qPrintable(QStringLiteral("modal windows left open: ") + left.join(QStringLiteral(", "))),
+            __FILE__, __LINE__);
 }

@@ -16,7 +16,8 @@ TestEnvironment::TestEnvironment()
         qFatal("TestEnvironment: no temporary folder: %s", qPrintable(m_root.errorString()));
     s_instance = this;
 
-    const struct {
+    const struct
+    {
         const char *variable;
         const char *folder;
     } folders[] = {
@@ -34,7 +35,8 @@ TestEnvironment::TestEnvironment()
         QDir().mkpath(path);
         qputenv(folder.variable, QFile::encodeName(path));
     }
-    QFile::setPermissions(root() + QStringLiteral("/run"), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    QFile::setPermissions(root() + QStringLiteral("/run"),
+                          QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
 
     qputenv("XDG_DATA_DIRS", "/usr/local/share:/usr/share");
     qputenv("LANG", "C.UTF-8");
