@@ -71,6 +71,7 @@ class tst_VelMenuDialog : public MenuTestCase
 private Q_SLOTS:
     void choosesTheCommandByTheDirectory_data();
     void choosesTheCommandByTheDirectory();
+    void takesTheFirstKindThatADirectoryIs();
     void picksFromTheStartMenuByDefault();
     void showsTheDirectoryGiven();
     void hasTheButtonsAskedFor_data();
@@ -127,6 +128,24 @@ void tst_VelMenuDialog::choosesTheCommandByTheDirectory()
         asked = QString::fromStdString(GetVelDir(VelDir::Desktop));
     QCOMPARE(WmCommand::kindOf(asked), kind);
     QCOMPARE(WmCommand::forKind(kind), command);
+}
+
+void tst_VelMenuDialog::takesTheFirstKindThatADirectoryIs()
+{
+    const QString config = QString::fromLocal8Bit(qgetenv("XDG_CONFIG_HOME"));
+    QVERIFY(QDir().mkpath(config));
+    const auto desktopAt = [&](const QString &dir) {
+        QFile file(config + QLatin1String("/user-dirs.dirs"));
+        QVERIFY(file.open(QIODevice::WriteOnly));
+        file.write("XDG_DESKTOP_DIR=\"" + QFile::encodeName(dir) + "\"\n");
+    };
+    desktopAt(startMenu());
+    QCOMPARE(WmCommand::kindOf(startMenu()), 4);
+    const QString toolBar = path(QStringLiteral("config/toolbar"));
+    desktopAt(toolBar);
+    QCOMPARE(WmCommand::kindOf(toolBar), 6);
+    QVERIFY(QFile::remove(config + QLatin1String("/user-dirs.dirs")));
+    QCOMPARE(WmCommand::kindOf(toolBar), 17);
 }
 
 void tst_VelMenuDialog::picksFromTheStartMenuByDefault()
