@@ -3,6 +3,7 @@
 
 #include "TestCase.h"
 
+#include <EntryDocument.h>
 #include <SharedTexts.h>
 
 #include <fcntl.h>
@@ -23,6 +24,7 @@ private Q_SLOTS:
     void readsAnewWhatHasChanged();
     void staysWithinItsLimit();
     void forgetsTheLeastRecentlyUsed();
+    void forgetsWhatIsSaved();
 
 private:
     QByteArray settled(const QString &name, const QByteArray &bytes);
@@ -144,6 +146,18 @@ void tst_SharedTexts::forgetsTheLeastRecentlyUsed()
         QVERIFY(texts.find(used));
     }
     QVERIFY(!texts.find(unused));
+}
+
+void tst_SharedTexts::forgetsWhatIsSaved()
+{
+    const QByteArray file = settled(QStringLiteral("x"), "[Desktop Entry]\n");
+    EntryDocument document;
+    document.setPath(file);
+    QVERIFY(document.load());
+    QVERIFY(SharedTexts::instance().cost() > 0);
+    document.setText("Desktop Entry", "Name", QStringLiteral("A"));
+    QVERIFY(document.save());
+    QCOMPARE(SharedTexts::instance().cost(), std::size_t(0));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_SharedTexts)

@@ -45,7 +45,7 @@ void DesktopEntryText::index()
         const auto *const feed = static_cast<const char *>(std::memchr(data + begin, '\n', size - begin));
         const std::size_t end = feed ? std::size_t(feed - data) : size;
         addLine(std::uint32_t(begin), std::uint32_t(end));
-        begin = end + 1;
+        begin = addVariants(std::min(end + 1, size));
     }
     endGroup();
     indexGroups();
@@ -54,8 +54,6 @@ void DesktopEntryText::index()
 
 void DesktopEntryText::addLine(std::uint32_t begin, std::uint32_t end)
 {
-    if (addVariant(begin, end))
-        return;
     const char *const data = m_bytes.constData();
     std::uint32_t first = begin;
     while (first < end && isBlank(data[first]))
@@ -69,26 +67,32 @@ void DesktopEntryText::addLine(std::uint32_t begin, std::uint32_t end)
         addKey(key);
 }
 
-// The short way for most lines of most files: the key of the line above in another language.
-bool DesktopEntryText::addVariant(std::uint32_t begin, std::uint32_t end)
+// The short way for most lines of most files: the key of the line above in other languages.
+// Returns the begin of the first line that is not so, or not surely so.
+std::size_t DesktopEntryText::addVariants(std::size_t begin)
 {
     if (m_groups.empty() || m_runs.size() == m_groups.back().firstRun || !m_runs.back().isPlain)
-        return false;
-    Run &run = m_runs.back();
+        return begin;
     const char *const data = m_bytes.constData();
-    if (end - begin <= run.nameLength || data[begin + run.nameLength] != '['
-        || std::memcmp(data + begin, data + run.name, run.nameLength) != 0)
-        return false;
-    const char *const locale = data + begin + run.nameLength + 1;
-    const char *const stop = data + end;
-    const char *at = locale;
-    while (at < stop && *at != ']' && *at != '=')
-        ++at;
-    if (at == locale || stop - at < 2 || at[0] != ']' || at[1] != '=')
-        return false;
-    m_lines.push_back({begin, tag({locale, std::size_t(at - locale)})});
-    ++run.endKey;
-    return true;
+    const auto size = std::size_t(m_bytes.size());
+    const char *const name = data + m_runs.back().name;
+    const std::size_t length = m_runs.back().nameLength;
+    while (size - begin > length && data[begin + length] == '['
+           && std::memcmp(data + begin, name, length) == 0) {
+        // The bytes end with a zero, which ends this, too.
+        const char *const locale = data + begin + length + 1;
+        const char *end = locale;
+        while (*end > ' ' && *end != ']' && *end != '=')
+            ++end;
+        if (end == locale || end[0] != ']' || end[1] != '=')
+            break;
+        m_lines.push_back({std::uint32_t(begin), tag({locale, std::size_t(end - locale)})});
+        const auto *const feed =
+            static_cast<const char *>(std::memchr(end, '\n', std::size_t(data + size - end)));
+        begin = feed ? std::size_t(feed + 1 - data) : size;
+    }
+    m_runs.back().endKey = std::uint32_t(m_lines.size());
+    return begin;
 }
 
 void DesktopEntryText::addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end)

@@ -172,7 +172,7 @@ private:
     }
     void index();
     void addLine(std::uint32_t begin, std::uint32_t end);
-    bool addVariant(std::uint32_t begin, std::uint32_t end);
+    std::size_t addVariants(std::size_t begin);
     void addHeader(std::uint32_t begin, std::uint32_t open, std::uint32_t end);
     bool parse(std::uint32_t begin, std::uint32_t end, Key *key) const;
     void addKey(const Key &key);

@@ -6,6 +6,7 @@
 #include "DesktopEntryNames.h"
 #include "DesktopEntryValue.h"
 #include "DesktopEntryWriter.h"
+#include "SharedTexts.h"
 
 #include <velcore/language.h>
 
@@ -282,6 +283,7 @@ bool EntryDocument::replace(const AtomicFile::Target &target, const DesktopEntry
     if (bytes.size() > EntryFile::LargestSize
         || !AtomicFile::replace(target, {bytes.constData(), std::size_t(bytes.size())}))
         return false;
+    SharedTexts::instance().remove(m_path);
     m_text = std::make_shared<DesktopEntryText>(bytes);
     // So young a file could change without getting another stamp.
     m_settled = false;

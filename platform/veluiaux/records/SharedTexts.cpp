@@ -53,6 +53,14 @@ void SharedTexts::insert(const QByteArray &path, const EntryFile &file)
         forget(std::prev(m_items.end()));
 }
 
+void SharedTexts::remove(const QByteArray &path)
+{
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    const auto known = m_index.constFind(path);
+    if (known != m_index.constEnd())
+        forget(*known);
+}
+
 std::size_t SharedTexts::cost() const
 {
     const std::lock_guard<std::mutex> lock(m_mutex);

@@ -31,6 +31,8 @@ public:
     /// The text of \a path if it is known and the file still as it was.
     std::optional<EntryFile> find(const QByteArray &path);
     void insert(const QByteArray &path, const EntryFile &file);
+    /// Forgets the text of \a path, which was just replaced.
+    void remove(const QByteArray &path);
 
     /// The memory taken now, in bytes.
     std::size_t cost() const;
