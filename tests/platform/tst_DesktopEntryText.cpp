@@ -23,6 +23,8 @@ private Q_SLOTS:
     void findsTheSameAsAPlainWalkOverTheLines();
     void findsAGroupAmongThousands();
     void tellsVariantsOfOneKeyApart();
+    void takesOddLinesAmongVariantsForWhatTheyAre_data();
+    void takesOddLinesAmongVariantsForWhatTheyAre();
     void forgetsChangesOfRemovedGroups();
     void keepsTheOrderOfTheFirstSetting();
     void ranksLocales();
@@ -91,6 +93,51 @@ void tst_DesktopEntryText::tellsVariantsOfOneKeyApart()
     text.forEachVariant(0, "Name", note(&german), "de");
     QCOMPARE(all.join(QLatin1Char(' ')), QStringLiteral("de de_AT fr"));
     QCOMPARE(german.join(QLatin1Char(' ')), QStringLiteral("de de_AT"));
+}
+
+void tst_DesktopEntryText::takesOddLinesAmongVariantsForWhatTheyAre_data()
+{
+    QTest::addColumn<QByteArray>("text");
+    QTest::addColumn<QByteArray>("key");
+    QTest::addColumn<QByteArray>("locale");
+    QTest::addColumn<QByteArray>("value");
+    const QByteArray none("(none)");
+    const auto row = [](const char *name, const QByteArray &lines, const char *key, const char *locale,
+                        const QByteArray &value) {
+        QTest::newRow(name) << lines << QByteArray(key) << QByteArray(locale) << value;
+    };
+    row("no end of line", "K=0\nK[de]=1", "K", "de", "1");
+    row("nothing behind the sign", "K=0\nK[de]=", "K", "de", "");
+    row("another line end", "K=0\r\nK[de]=1\r\n", "K", "de", "1");
+    row("blanks around the sign", "K=0\nK[de] = 1\n", "K", "de", "1");
+    row("blanks before the key", "K=0\n K[de]=1\n", "K", "de", "1");
+    row("a comment between", "K=0\n#\nK[de]=1\n", "K", "de", "1");
+    row("another key between", "K=0\nL=2\nK[de]=1\n", "K", "de", "1");
+    row("no closing bracket", "K=0\nK[de=1\n", "K[de", "", "1");
+    row("no language", "K=0\nK[]=1\n", "K[]", "", "1");
+    row("no sign", "K=0\nK[de]\nK[fr]=1\n", "K", "de", none);
+    row("behind one without a sign", "K=0\nK[de]\nK[fr]=1\n", "K", "fr", "1");
+    row("a blank in the language", "K=0\nK[d e]=1\n", "K", "d e", "1");
+    row("bytes in the language", "K=0\nK[\xC3\xBC]=1\n", "K", "\xC3\xBC", "1");
+    row("a bracket in the language", "K=0\nK[d[e]=1\n", "K", "d[e", "1");
+    row("two closing brackets", "K=0\nK[de]]=1\n", "K", "de]", "1");
+    row("a bracket in the key above", "K[d=0\nK[d[e]=1\n", "K", "d[e", "1");
+    row("a longer key", "K=0\nKK[de]=1\n", "KK", "de", "1");
+    row("the group above", "K=0\n[H]\nK[de]=1\n", "K", "de", none);
+}
+
+void tst_DesktopEntryText::takesOddLinesAmongVariantsForWhatTheyAre()
+{
+    QFETCH(QByteArray, text);
+    QFETCH(QByteArray, key);
+    QFETCH(QByteArray, locale);
+    QFETCH(QByteArray, value);
+    const DesktopEntryText entry("[G]\n" + text);
+    const auto found = entry.key(entry.group("G"), view(key), view(locale));
+    QCOMPARE(found ? QByteArray::fromStdString(std::string(entry.value(*found))) : QByteArray("(none)"),
+             value);
+    if (text.contains("[H]"))
+        QVERIFY(entry.key(entry.group("H"), view(key), view(locale)));
 }
 
 void tst_DesktopEntryText::forgetsChangesOfRemovedGroups()
