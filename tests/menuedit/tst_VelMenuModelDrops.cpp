@@ -7,7 +7,9 @@
 #include <VelMenuView.h>
 #include <menuedit/VelMenuModel.h>
 
+#include <QMessageBox>
 #include <QMimeData>
+#include <QPushButton>
 #include <QSignalSpy>
 #include <QSortFilterProxyModel>
 #include <QToolTip>
@@ -37,6 +39,7 @@ private Q_SLOTS:
     void putsTheDirectoryFileBack();
     void takesAwayADirectoryFileThatWasNotThere();
     void tellsAtTheItemThatItWasLeft();
+    void keepsThePlaceWhenRowsGoWhileItAsks();
     void tellsWhyAFolderIsRefused();
 
 private:
@@ -234,6 +237,25 @@ void tst_VelMenuModelDrops::tellsAtTheItemThatItWasLeft()
     QCOMPARE(read(path(QStringLiteral("menu/from/x"))), QByteArray("menu/from/x"));
     QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
     QCOMPARE(QToolTip::text(), QStringLiteral("%1 exists and was left as it is.").arg(target));
+}
+
+void tst_VelMenuModelDrops::keepsThePlaceWhenRowsGoWhileItAsks()
+{
+    const QString target = write(QStringLiteral("menu/to/x"), "old");
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("cbax"));
+    ModalDriver modal;
+    modal.handle([&](QWidget *box) {
+        QVERIFY(QFile::remove(target));
+        QVERIFY(QFile::remove(path(QStringLiteral("menu/to/a"))));
+        QTRY_COMPARE(m_model->rowCount(source(QStringLiteral("menu/to"))), 2);
+        qobject_cast<QMessageBox *>(box)->button(QMessageBox::Yes)->click();
+    });
+
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::MoveAction, rowOf(QStringLiteral("menu/to/b"))));
+
+    QVERIFY(modal.finished());
+    QCOMPARE(read(target), QByteArray("menu/from/x"));
+    QCOMPARE(list(), QByteArray("*;c;x;b;"));
 }
 
 void tst_VelMenuModelDrops::tellsWhyAFolderIsRefused()
