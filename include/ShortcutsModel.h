@@ -128,8 +128,11 @@ public:
      */
     IShortcutObject *hasKeySequence(const QKeySequence &key) const;
 
+    /// Returns a group (no parent) or a row of a group; an invalid index when there is none.
     QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
+    /// Returns the group of a row, in column 0; an invalid index for a group.
     QModelIndex parent(const QModelIndex &index) const override;
+    /// Returns the number of groups, or of the rows of a group; a row of a group has none.
     int rowCount(const QModelIndex &parent = QModelIndex()) const override;
     /// Two: text and key.
     int columnCount(const QModelIndex &parent = QModelIndex()) const override;
@@ -139,7 +142,9 @@ public:
      * Qt::EditRole), the default key (column 1, Qt::UserRole); for a group its name.
      */
     QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
+    /// Returns the titles of the columns, "Action" and "Shortcut", translated (Qt::DisplayRole).
     QVariant headerData(int section, Qt::Orientation orientation, int role = Qt::DisplayRole) const override;
+    /// Column 1 of a shortcut can be edited; everything can be selected.
     Qt::ItemFlags flags(const QModelIndex &index) const override;
     /**
      * Sets the pending key of a shortcut, of the first one where several share the row.
