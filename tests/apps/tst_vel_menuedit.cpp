@@ -73,6 +73,7 @@ private Q_SLOTS:
     void refusesDirectoriesThatItCannotShow_data();
     void refusesDirectoriesThatItCannotShow();
     void createsTheStartMenuOnFirstUse();
+    void failsWhenTheStartMenuCannotBeCreated();
     void leavesAStartMenuThatIsThere();
     void tellsTheWindowManagerWhenItCloses_data();
     void tellsTheWindowManagerWhenItCloses();
@@ -263,6 +264,17 @@ void tst_vel_menuedit::createsTheStartMenuOnFirstUse()
     QVERIFY(finish(program));
     QCOMPARE(program.exitCode(), 0);
     QCOMPARE(program.readAllStandardError(), QByteArray());
+}
+
+void tst_vel_menuedit::failsWhenTheStartMenuCannotBeCreated()
+{
+    write(QStringLiteral("config"), "a file in the way");
+    const Outcome outcome = run({});
+    QCOMPARE(outcome.status, 2);
+    QCOMPARE(outcome.errors,
+             "vel-menuedit: cannot create the start menu " + QFile::encodeName(standardDir("startmenu"))
+                 + '\n');
+    QCOMPARE(read(path(QStringLiteral("config"))), QByteArray("a file in the way"));
 }
 
 void tst_vel_menuedit::leavesAStartMenuThatIsThere()
