@@ -7,6 +7,7 @@
 
 #include <QDir>
 #include <QProcess>
+#include <QRegularExpression>
 
 // The checks hold against a copy of the platform's headers, and stop the build against a copy
 // that lacks an operation.
@@ -19,6 +20,8 @@ private Q_SLOTS:
     void acceptsThePlatformsRecords();
     void namesTheOperationThatIsLacking_data();
     void namesTheOperationThatIsLacking();
+    void reliesOnNothingThatItDoesNotCheck_data();
+    void reliesOnNothingThatItDoesNotCheck();
 
 private:
     void copyHeaders();
@@ -109,6 +112,56 @@ void tst_DesktopEntryRecord::namesTheOperationThatIsLacking()
     QByteArray messages;
     QVERIFY(!compile(&messages));
     QVERIFY2(messages.contains(message), messages);
+}
+
+void tst_DesktopEntryRecord::reliesOnNothingThatItDoesNotCheck_data()
+{
+    QTest::addColumn<QString>("header");
+    QTest::addColumn<QString>("operations");
+    QTest::addColumn<QString>("values"); // with a getter and a setter each
+
+    QTest::newRow("entry") << QStringLiteral("VelUIDesktopEntry.h")
+                           << QStringLiteral(
+                                  "setFilePath load save isValid inheritFrom isSuitable isDisplayable")
+                           << QStringLiteral(
+                                  "Type Name LocalName GenericName LocalGenericName Comment "
+                                  "LocalComment Icon LocalIcon Exec TryExec Path URL "
+                                  "StartupWMClass Version Terminal NoDisplay Hidden StartupNotify "
+                                  "OnlyShowIn NotShowIn MimeType Categories Keywords LocalKeywords "
+                                  "SortOrder Actions");
+    QTest::newRow("command line") << QStringLiteral("VelUIDesktopEntry.h")
+                                  << QStringLiteral(
+                                         "filePath url appName icon desktopFilePath filePathList urlList")
+                                  << QString();
+    QTest::newRow("action") << QStringLiteral("VelUIDesktopAction.h") << QStringLiteral("getId")
+                            << QStringLiteral("Name LocalName Icon LocalIcon Exec OnlyShowIn NotShowIn");
+}
+
+void tst_DesktopEntryRecord::reliesOnNothingThatItDoesNotCheck()
+{
+    QFETCH(QString, header);
+    QFETCH(QString, operations);
+    QFETCH(QString, values);
+    QStringList names = operations.split(QLatin1Char(' '));
+    for (const QString &value : values.split(QLatin1Char(' '), Qt::SkipEmptyParts))
+        names << QStringLiteral("get") + value << QStringLiteral("set") + value;
+    copyHeaders();
+    const QString file = QStringLiteral("platform/veluiaux/") + header;
+    QString text = QString::fromUtf8(read(path(file)));
+    for (const QString &name : qAsConst(names)) {
+        const int before = text.size();
+        text.remove(QRegularExpression(QStringLiteral("^ +[\\w<>:& ]+[ &]%1\\([^\\n]*;$").arg(name),
+                                       QRegularExpression::MultilineOption));
+        QVERIFY2(text.size() < before, qPrintable(name));
+    }
+    write(file, text.toUtf8());
+
+    QByteArray messages;
+    QVERIFY(!compile(&messages));
+    for (const QString &name : qAsConst(names)) {
+        const QRegularExpression message(QStringLiteral("lacks the operation [^(]*\\b%1\\(").arg(name));
+        QVERIFY2(message.match(QString::fromUtf8(messages)).hasMatch(), qPrintable(name));
+    }
 }
 
 VEL_TEST_GUILESS_MAIN(tst_DesktopEntryRecord)
