@@ -63,6 +63,14 @@ private:
     struct stat m_status = {};
 };
 
+template <typename Value>
+void forgetBelow(QMap<QString, Value> &known, const QString &folder)
+{
+    const QString first = folder + QLatin1Char('/');
+    for (auto it = known.lowerBound(first); it != known.end() && it.key().startsWith(first);)
+        it = known.erase(it);
+}
+
 } // namespace
 
 /// Gives the icons of the menu, and lets the model read the rest of an entry with it: the base
@@ -189,6 +197,11 @@ void VelMenuModel::forgetItemInfo(const QString &path)
     m_readAlong.remove(path);
     hiddenItems.remove(path);
     itemNames.remove(path);
+    // Of a folder that went, nothing may be remembered when others come to stand in its place.
+    if (!QFileInfo::exists(path)) {
+        forgetBelow(hiddenItems, path);
+        forgetBelow(itemNames, path);
+    }
     refreshRow(path);
 }
 

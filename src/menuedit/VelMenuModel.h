@@ -76,6 +76,9 @@ private:
     bool mayOverwrite(const QString &target);
     bool fixSortOrder(const Drop &drop);
     bool carryOut(const Drop &drop);
+    QStringList releaseFolders(const QStringList &sources);
+    void collectWatched(const QModelIndex &folder, QStringList &paths) const;
+    void watchAgain(const QStringList &folders);
     bool link(const Drop &drop);
     void finish(const Drop &drop, bool sortAnew);
     void tellAtItem(const QString &path, const QString &text);

@@ -124,6 +124,13 @@ bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, in
 
 bool VelMenuModel::dropIntoOwnFolder(const Drop &drop)
 {
+    // What is gone must not be listed.
+    const QFileInfo source(drop.sources.constFirst());
+    if (!source.exists() && !source.isSymLink()) {
+        tellAtItem(drop.target,
+                   failureText({FileTransfer::Failure::SourceGone, drop.target, QString()}, drop.action));
+        return false;
+    }
     if (drop.action == Qt::MoveAction && !fixSortOrder(drop))
         return false;
     finish(drop, true);
@@ -181,8 +188,11 @@ bool VelMenuModel::carryOut(const Drop &drop)
         return false;
     }
     if (drop.action != Qt::LinkAction) {
+        const QStringList released =
+            drop.action == Qt::MoveAction ? releaseFolders(drop.sources) : QStringList();
         const FileTransfer::Result result =
             FileTransfer::transfer(drop.sources, drop.targetDir, transferAction(drop.action));
+        watchAgain(released);
         if (!result.succeeded()) {
             directoryFile.restore();
             tellAtItem(drop.target, failureText(result, drop.action));
@@ -191,6 +201,41 @@ bool VelMenuModel::carryOut(const Drop &drop)
     }
     finish(drop, drop.row != -1);
     return true;
+}
+
+// The base class does not notice when a folder that it watches moves: it would take what
+// happens at the new place for news of the old one and never show it. It lets go of a folder
+// that was its root.
+QStringList VelMenuModel::releaseFolders(const QStringList &sources)
+{
+    QStringList watched;
+    for (const QString &source : sources) {
+        if (QFileInfo(source).isDir() && source.startsWith(rootDir))
+            collectWatched(index(source), watched);
+    }
+    const QString root = rootPath();
+    for (const QString &folder : qAsConst(watched))
+        setRootPath(folder);
+    setRootPath(root);
+    return watched;
+}
+
+void VelMenuModel::collectWatched(const QModelIndex &folder, QStringList &paths) const
+{
+    if (!folder.isValid() || !isDir(folder) || canFetchMore(folder))
+        return;
+    paths.append(filePath(folder));
+    for (int row = 0; row < rowCount(folder); ++row)
+        collectWatched(index(row, 0, folder), paths);
+}
+
+// What could not be moved is still there.
+void VelMenuModel::watchAgain(const QStringList &folders)
+{
+    for (const QString &folder : folders) {
+        if (QFileInfo::exists(folder))
+            fetchMore(index(folder));
+    }
 }
 
 bool VelMenuModel::link(const Drop &drop)
@@ -210,6 +255,12 @@ void VelMenuModel::finish(const Drop &drop, bool sortAnew)
     if (drop.action == Qt::MoveAction) {
         for (const QString &source : drop.sources)
             forgetItemInfo(source);
+    }
+    // Every file has its row at once, whether or not its folder is being watched already.
+    for (const QString &source : drop.sources) {
+        const QString target = QDir(drop.targetDir).filePath(QFileInfo(source).fileName());
+        if (QFileInfo::exists(target))
+            index(target);
     }
     if (view) {
         view->showAndSelect(drop.target);

@@ -150,8 +150,11 @@ bool VelMenuViewPrivate::offerNew(const QString &path, bool folder)
     } else {
         QFile::remove(path);
     }
-    if (self)
-        leaveItem(path);
+    if (!self)
+        return false;
+    model->forgetItemInfo(folder ? recordFileOf(path) : path);
+    model->forgetItemInfo(path);
+    leaveItem(path);
     return false;
 }
 
