@@ -136,8 +136,9 @@ bool isAscii(const char *bytes, int size)
     return !(all & Q_UINT64_C(0x8080808080808080));
 }
 
-// Whether ASCII bytes stand for themselves in the encoding of the locale, whatever comes before.
-bool keepsAscii()
+// Whether the encoding of the locale is UTF-8: ASCII bytes stand for themselves there, whatever
+// comes before, and texts can be converted together.
+bool isUtf8()
 {
     constexpr int utf8 = 106; // IANA's number
     return QTextCodec::codecForLocale()->mibEnum() == utf8;
@@ -157,18 +158,23 @@ void readBytes(const char *begin, const char *end, bool asciiAsIs, QSettings::Se
         readLine(QStringView(QString::fromLocal8Bit(begin, size)), map);
 }
 
-QByteArray sectionLine(const QVariant &name)
+QString sectionLine(const QVariant &name)
 {
-    return (QLatin1Char('[') + name.toString() + QLatin1String("]\n")).toLocal8Bit();
+    return QLatin1Char('[') + name.toString() + QLatin1String("]\n");
 }
 
-QByteArray entryLine(const QString &key, const QVariant &value)
+void appendEntry(QString &lines, const QString &key, const QVariant &value)
 {
-    QString text = value.toString();
+    const QString text = value.toString();
     const bool hasBlank = text.contains(QLatin1Char(' ')) || text.contains(QLatin1Char('\t'));
-    if (hasBlank && !isQuoted(QStringView(text)))
-        text = QLatin1Char('"') + text + QLatin1Char('"');
-    return QString(key + QLatin1Char('=') + text + QLatin1Char('\n')).toLocal8Bit();
+    const bool needsQuotes = hasBlank && !isQuoted(QStringView(text));
+    lines.append(key).append(QLatin1Char('='));
+    if (needsQuotes)
+        lines.append(QLatin1Char('"'));
+    lines.append(text);
+    if (needsQuotes)
+        lines.append(QLatin1Char('"'));
+    lines.append(QLatin1Char('\n'));
 }
 
 } // namespace
@@ -188,7 +194,7 @@ bool read(QIODevice &device, QSettings::SettingsMap &map)
     if (!device.atEnd())
         return false;
 
-    const bool asciiAsIs = keepsAscii();
+    const bool asciiAsIs = isUtf8();
     const char *line = bytes.constData();
     const char *const end = line + bytes.size();
     while (line != end) {
@@ -210,15 +216,23 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
         std::fputs("VelSettings: file isn't writable\n", stderr);
         return false;
     }
-    // Each line is converted by itself: some encodings begin or end every text with marks.
+    // Some encodings begin or end every text with marks: there each line is converted by itself.
+    const bool allAtOnce = isUtf8();
     QByteArray bytes;
+    QString lines;
     const auto section = map.constFind(sectionKey());
     if (section != map.constEnd())
-        bytes += sectionLine(section.value());
+        lines = sectionLine(section.value());
     for (auto entry = map.constBegin(); entry != map.constEnd(); ++entry) {
-        if (entry != section)
-            bytes += entryLine(entry.key(), entry.value());
+        if (entry == section)
+            continue;
+        if (!allAtOnce) {
+            bytes += lines.toLocal8Bit();
+            lines.clear();
+        }
+        appendEntry(lines, entry.key(), entry.value());
     }
+    bytes += lines.toLocal8Bit();
     return writeThrough(device, bytes);
 }
 

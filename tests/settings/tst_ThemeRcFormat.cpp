@@ -370,6 +370,9 @@ void tst_ThemeRcFormat::writesEntries_data()
     QTest::newRow("list of one") << Map{{s("a"), QStringList{s("x y")}}} << QByteArray("a=\"x y\"\n");
     QTest::newRow("list of two") << Map{{s("a"), QStringList{s("x"), s("y")}}} << QByteArray("a=\n");
     QTest::newRow("binary data") << Map{{s("a"), QByteArray("xy")}} << QByteArray("a=xy\n");
+    const QString half(QChar(0xd83d)); // of a character
+    QTest::newRow("half a character") << Map{{s("a"), half}, {s("b"), half}}
+                                      << QByteArray("a=" + half.toUtf8() + "\nb=" + half.toUtf8() + '\n');
     QTest::newRow("key with blanks") << Map{{s("a b"), 1}} << QByteArray("a b=1\n");
 }
 
