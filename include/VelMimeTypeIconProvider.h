@@ -10,6 +10,8 @@
 #include <QMap>
 #include <QString>
 
+class VelUIDesktopEntry;
+
 /**
  * Gives files and folders the desktop's own icons.
  *
@@ -59,14 +61,25 @@ public:
      */
     QString type(const QFileInfo &info) const override;
 
+protected:
+    /// The names of the emblems to lay on an icon.
+    using Emblems = QMap<Qt::Corner, QString>;
+
+    /**
+     * The icon of a desktop entry that was read already, for providers that need more of it
+     * than its icon and would read it twice.
+     *
+     * @param entry the record of a file whose name ends in ".desktop"
+     * @param emblems laid on every icon but that of a separator
+     * @return the same as icon() for that file
+     */
+    QIcon desktopEntryIcon(const VelUIDesktopEntry &entry, const Emblems &emblems) const;
+
 private:
     Q_DISABLE_COPY(VelMimeTypeIconProvider)
 
-    using Emblems = QMap<Qt::Corner, QString>;
-
     QIcon directoryIcon(const QFileInfo &info, const Emblems &emblems) const;
     QIcon regularFileIcon(const QFileInfo &info, const Emblems &emblems) const;
-    QIcon desktopEntryIcon(const QFileInfo &info, const Emblems &emblems) const;
 
     QIcon folderIcon;
     QIcon fileIcon;

@@ -49,8 +49,11 @@ void ShownTree::paintEvent(QPaintEvent *event)
 
 void ShownTree::turn()
 {
+    const double lastChange = m_lastChange;
     QCoreApplication::processEvents(QEventLoop::AllEvents, 1);
     const double time = now();
+    if (m_lastChange > lastChange)
+        m_lastBusyTurn = time;
     m_longestFreeze = std::max(m_longestFreeze, time - m_lastTurn);
     m_lastTurn = time;
     if (time > GiveUp)
@@ -67,6 +70,7 @@ double ShownTree::settle(const std::function<bool()> &isComplete)
 {
     do {
         turn();
-    } while (now() - m_lastChange < Quiet || !isComplete());
+        // What a change has set going may wait for the next turn: quiet begins behind its own.
+    } while (now() - m_lastBusyTurn < Quiet || !isComplete());
     return m_lastChange;
 }

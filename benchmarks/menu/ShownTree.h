@@ -44,6 +44,7 @@ private:
 
     QElapsedTimer m_clock;
     double m_lastChange = 0;
+    double m_lastBusyTurn = 0;
     double m_lastTurn = 0;
     double m_longestFreeze = 0;
 };

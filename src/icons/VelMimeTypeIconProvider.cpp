@@ -107,7 +107,7 @@ QIcon VelMimeTypeIconProvider::icon(const QFileInfo &info) const
     if (!info.isFile())
         return VelIcon::withEmblems(fileIcon, emblems);
     if (info.fileName().endsWith(QLatin1String(".desktop")))
-        return desktopEntryIcon(info, emblems);
+        return desktopEntryIcon(VelUIDesktopEntry(info.absoluteFilePath()), emblems);
     return regularFileIcon(info, emblems);
 }
 
@@ -131,9 +131,8 @@ QIcon VelMimeTypeIconProvider::regularFileIcon(const QFileInfo &info, const Embl
                           : VelIcon::withEmblems(fileIcon, emblems);
 }
 
-QIcon VelMimeTypeIconProvider::desktopEntryIcon(const QFileInfo &info, const Emblems &emblems) const
+QIcon VelMimeTypeIconProvider::desktopEntryIcon(const VelUIDesktopEntry &entry, const Emblems &emblems) const
 {
-    const VelUIDesktopEntry entry(info.absoluteFilePath());
     const QString name = entry.getIcon();
     if (!name.isEmpty())
         return VelIcon::fromTheme(name, emblems, fileIcon);

@@ -43,6 +43,7 @@ Index::Index(const QStringList &list)
             m_patterns.append({text, i});
         }
     }
+    m_isPlain = m_exact.size() == list.size() && m_patterns.size() <= 1;
 }
 
 Mention Index::mention(const QString &name) const

@@ -48,6 +48,9 @@ public:
 
     /// Whether the list has no elements at all.
     bool isEmpty() const { return m_isEmpty; }
+    /// Whether no element stands twice and at most one is a pattern. What the list says about
+    /// two names then never contradicts what it says about either of them and a third one.
+    bool isPlain() const { return m_isPlain; }
     /// What the list says about \a name. Tries the patterns in turn: keep the answer.
     Mention mention(const QString &name) const;
 
@@ -61,6 +64,7 @@ private:
     QHash<QString, QVector<int>> m_exact;
     QVector<Pattern> m_patterns;
     bool m_isEmpty;
+    bool m_isPlain;
 };
 
 /**

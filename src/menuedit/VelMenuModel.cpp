@@ -23,6 +23,9 @@ namespace {
 const QLatin1String DirectorySuffix("/.directory");
 const QLatin1String EntrySuffix(".desktop");
 
+// The filter that the base class begins with.
+const QDir::Filters DefaultFilter = QDir::AllEntries | QDir::NoDotAndDotDot | QDir::AllDirs;
+
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
 
@@ -93,8 +96,9 @@ public:
         const auto known = m_icons.constFind(path);
         if (known != m_icons.constEnd() && known->stamp == stamp)
             return known->icon;
-        m_model->readAlong(path);
-        const QIcon icon = VelMimeTypeIconProvider::icon(info);
+        const VelUIDesktopEntry entry(path);
+        m_model->readAlong(path, entry);
+        const QIcon icon = desktopEntryIcon(entry, {});
         if (stamp.isSettled())
             m_icons.insert(path, {stamp, icon});
         else
@@ -138,6 +142,7 @@ VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *menuView, 
 {
     setIconProvider(m_keeper->provider());
     connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);
+    connect(this, &QFileSystemModel::fileRenamed, this, [this] { m_wasRenamed = true; });
     setRootPath(rootDir);
 }
 
@@ -168,7 +173,7 @@ QVariant VelMenuModel::data(const QModelIndex &index, int role) const
             return displayName(index);
         if (role == Qt::UserRole)
             return isHidden(index);
-        if (role == Qt::DecorationRole && !m_editedRows.isEmpty() && m_editedRows.contains(filePath(index)))
+        if (role == Qt::DecorationRole && !m_editedRows.isEmpty() && m_editedRows.contains(pathOf(index)))
             return iconProvider()->icon(QFileInfo(filePath(index)));
     }
     return QFileSystemModel::data(index, role);
@@ -182,6 +187,23 @@ bool VelMenuModel::setData(const QModelIndex &index, const QVariant &value, int 
 Qt::ItemFlags VelMenuModel::flags(const QModelIndex &index) const
 {
     return QFileSystemModel::flags(index) & ~Qt::ItemIsEditable;
+}
+
+// What the base class sorts with is also what takes rows away that no longer pass its filters.
+void VelMenuModel::sort(int column, Qt::SortOrder order)
+{
+    const bool isOwnCall = column == 0 && order == Qt::AscendingOrder;
+    m_isFiltered = m_isFiltered || filter() != DefaultFilter || !nameFilters().isEmpty();
+    m_isOrderLost = isOwnCall && !m_keepsOrder && !m_isFiltered;
+    if (!m_isOrderLost)
+        QFileSystemModel::sort(column, order);
+}
+
+void VelMenuModel::setKeepsOrder(bool keeps)
+{
+    m_keepsOrder = keeps;
+    if (keeps && m_isOrderLost)
+        QTimer::singleShot(0, this, [this] { sort(0, Qt::AscendingOrder); });
 }
 
 QString VelMenuModel::menuDirectory() const
@@ -213,14 +235,15 @@ void VelMenuModel::setItemName(const QString &path, const QString &name)
 
 bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 {
-    const QString directoryFile = path + DirectorySuffix;
-    const QString file = isFolder && QFileInfo::exists(directoryFile) ? directoryFile : path;
+    QString file = path;
+    if (isFolder && QFileInfo::exists(path + DirectorySuffix))
+        file += DirectorySuffix;
     if (!file.endsWith(EntrySuffix) && !file.endsWith(DirectorySuffix))
         return false;
 
     const auto known = m_readAlong.find(file);
     const bool wasRead = known != m_readAlong.end();
-    const ItemInfo info = wasRead ? *known : readItemInfo(file);
+    const ItemInfo info = wasRead ? *known : itemInfo(VelUIDesktopEntry(file), file);
     if (wasRead)
         m_readAlong.erase(known);
     itemNames.insert(path, info.name);
@@ -229,9 +252,8 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
     return true;
 }
 
-VelMenuModel::ItemInfo VelMenuModel::readItemInfo(const QString &file)
+VelMenuModel::ItemInfo VelMenuModel::itemInfo(const VelUIDesktopEntry &entry, const QString &file)
 {
-    const VelUIDesktopEntry entry(file);
     ItemInfo info{EntryName::of(entry), false};
     // Codes 1 and 3 hide; an entry that is left out of menus for another reason can be edited.
     VelUIDesktopEntry::DisplayableError reason = 0;
@@ -240,19 +262,33 @@ VelMenuModel::ItemInfo VelMenuModel::readItemInfo(const QString &file)
     return info;
 }
 
-// Reads an entry together with its icon, to be kept no longer than until the event loop turns.
-void VelMenuModel::readAlong(const QString &path)
+// Keeps what an entry says beside its icon, no longer than until the event loop turns.
+void VelMenuModel::readAlong(const QString &path, const VelUIDesktopEntry &entry)
 {
     if (itemNames.contains(path))
         return;
     if (m_readAlong.isEmpty())
         QTimer::singleShot(0, this, [this] { m_readAlong.clear(); });
-    m_readAlong.insert(path, readItemInfo(path));
+    m_readAlong.insert(path, itemInfo(entry, path));
+}
+
+// The same as filePath(), which puts the path together anew from its elements. The node of
+// a link, and one that was made from a path, may remember another spelling.
+QString VelMenuModel::pathOf(const QModelIndex &index) const
+{
+    if (m_wasRenamed)
+        return filePath(index);
+    const QFileInfo info = fileInfo(index);
+    const QString path = info.filePath();
+    if (path.isEmpty() || path.startsWith(QLatin1String("//")) || info.isSymLink())
+        return filePath(index);
+    Q_ASSERT(path == filePath(index));
+    return path;
 }
 
 QVariant VelMenuModel::displayName(const QModelIndex &index) const
 {
-    const QString path = filePath(index);
+    const QString path = pathOf(index);
     const QString known = itemNames.value(path);
     if (!known.isEmpty())
         return known;
@@ -263,7 +299,7 @@ QVariant VelMenuModel::displayName(const QModelIndex &index) const
 
 bool VelMenuModel::isHidden(const QModelIndex &index) const
 {
-    const QString path = filePath(index);
+    const QString path = pathOf(index);
     if (!itemNames.contains(path) && !loadItemInfo(path, isDir(index)))
         return false;
     return hiddenItems.value(path, false);

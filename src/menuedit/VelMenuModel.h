@@ -12,6 +12,7 @@
 #include <QStringList>
 
 class VelMenuView;
+class VelUIDesktopEntry;
 
 /**
  * The files and folders of a menu directory, under the names that the menu shows.
@@ -36,6 +37,7 @@ public:
     bool dropMimeData(const QMimeData *data, Qt::DropAction action, int row, int column,
                       const QModelIndex &parent) override;
     Qt::ItemFlags flags(const QModelIndex &index) const override;
+    void sort(int column, Qt::SortOrder order = Qt::AscendingOrder) override;
 
     /// The menu directory, clean and absolute, with a "/" at the end if it was given with one;
     /// empty if none was given.
@@ -45,6 +47,13 @@ public:
     void forgetItemInfo(const QString &path);
     /// Shows \a path as \a name, without reading the file.
     void setItemName(const QString &path, const QString &name);
+
+    /**
+     * Whether the rows have to be in the order of their file names. They are from the outset;
+     * who puts all of them into an order of their own can do without: whenever files come, the
+     * base class sorts the whole tree anew.
+     */
+    void setKeepsOrder(bool keeps);
 
 Q_SIGNALS:
     /// Files were dropped and are there.
@@ -61,9 +70,10 @@ private:
         bool isHidden;
     };
 
-    static ItemInfo readItemInfo(const QString &file);
+    static ItemInfo itemInfo(const VelUIDesktopEntry &entry, const QString &file);
     bool loadItemInfo(const QString &path, bool isFolder) const;
-    void readAlong(const QString &path);
+    void readAlong(const QString &path, const VelUIDesktopEntry &entry);
+    QString pathOf(const QModelIndex &index) const;
     QVariant displayName(const QModelIndex &index) const;
     bool isHidden(const QModelIndex &index) const;
 
@@ -92,5 +102,10 @@ private:
     // What was read while the base class asked for icons, until it has told of the rows.
     mutable QHash<QString, ItemInfo> m_readAlong;
     bool m_isCompleting = false;
+    bool m_keepsOrder = true;
+    bool m_isFiltered = false;
+    bool m_isOrderLost = false;
+    // The base class forgets to tell the files in a renamed folder where they are now.
+    bool m_wasRenamed = false;
     QPointer<IconProviderKeeper> m_keeper;
 };

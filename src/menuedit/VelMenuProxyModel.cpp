@@ -54,6 +54,8 @@ void VelMenuProxyModel::setSourceModel(QAbstractItemModel *model)
         sourceModel()->disconnect(this);
     dropAll();
     sortOrders.clear();
+    m_isOrdering = false;
+    m_needsFileOrder = false;
     m_files = qobject_cast<VelMenuModel *>(model);
     m_menuDirectory = m_files ? m_files->menuDirectory() : QString();
     // Before the base class connects: its slots sort.
@@ -98,16 +100,23 @@ bool VelMenuProxyModel::lessThan(const QModelIndex &left, const QModelIndex &rig
 {
     if (!m_files)
         return QSortFilterProxyModel::lessThan(left, right);
+    if (!m_isOrdering)
+        beginOrdering();
     Row &leftRow = rowOf(left);
     Row &rightRow = rowOf(right);
     if (!leftRow.isInMenu)
         return false;
-    if (leftRow.folder->isRecents)
-        return modifiedOf(leftRow, left) < modifiedOf(rightRow, right);
+    if (leftRow.folder->isRecents) {
+        const qint64 leftTime = modifiedOf(leftRow, left);
+        const qint64 rightTime = modifiedOf(rightRow, right);
+        if (leftTime == rightTime)
+            needFileOrder();
+        return leftTime < rightTime;
+    }
 
     Folder &folder = *leftRow.folder;
     if (!folder.order)
-        folder.order.emplace(sortOrderOf(folder.path));
+        readOrder(folder);
     if (!folder.order->isEmpty()) {
         // A sort compares siblings only; for others the list of the left one's folder counts.
         const SortOrder::Places places = rightRow.folder == &folder
@@ -118,7 +127,34 @@ bool VelMenuProxyModel::lessThan(const QModelIndex &left, const QModelIndex &rig
     }
     if (leftRow.isFolder != rightRow.isFolder)
         return rightRow.isFolder;
-    return QString::localeAwareCompare(displayNameOf(leftRow, left), displayNameOf(rightRow, right)) >= 0;
+    const int order =
+        QString::localeAwareCompare(displayNameOf(leftRow, left), displayNameOf(rightRow, right));
+    if (order == 0)
+        needFileOrder();
+    return order >= 0;
+}
+
+// As long as no two rows of a folder are equal, it does not matter in which order they come.
+void VelMenuProxyModel::beginOrdering() const
+{
+    m_isOrdering = true;
+    m_files->setKeepsOrder(m_needsFileOrder);
+}
+
+// Equal rows stand in the reversed order of the files.
+void VelMenuProxyModel::needFileOrder() const
+{
+    if (m_needsFileOrder)
+        return;
+    m_needsFileOrder = true;
+    m_files->setKeepsOrder(true);
+}
+
+void VelMenuProxyModel::readOrder(Folder &folder) const
+{
+    folder.order.emplace(sortOrderOf(folder.path));
+    if (!folder.order->isPlain())
+        needFileOrder();
 }
 
 bool VelMenuProxyModel::isInMenu(const QString &path) const
@@ -205,12 +241,11 @@ void VelMenuProxyModel::dropAll()
     m_folders.clear();
 }
 
-// Sorted in one by one, many new rows of a folder make the base class renumber all of its
+// Sorted in one by one, many new rows among many make the base class renumber all of its
 // rows again and again. They are put at the end instead and sorted at once.
 void VelMenuProxyModel::beginManyRows(const QModelIndex &parent, int first, int last)
 {
-    Q_UNUSED(parent)
-    if (!dynamicSortFilter() || last - first < ManyRows)
+    if (!dynamicSortFilter() || last - first < ManyRows || sourceModel()->rowCount(parent) < ManyRows)
         return;
     m_isTakingMany = true;
     setDynamicSortFilter(false);

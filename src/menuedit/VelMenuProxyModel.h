@@ -53,6 +53,9 @@ private:
     void beginManyRows(const QModelIndex &parent, int first, int last);
     void endManyRows();
 
+    void beginOrdering() const;
+    void needFileOrder() const;
+    void readOrder(Folder &folder) const;
     bool isInMenu(const QString &path) const;
     Row &rowOf(const QModelIndex &index) const;
     Folder &folderOf(const QModelIndex &index) const;
@@ -66,6 +69,8 @@ private:
     VelMenuModel *m_files = nullptr;
     QString m_menuDirectory;
     bool m_isTakingMany = false;
+    mutable bool m_isOrdering = false;
+    mutable bool m_needsFileOrder = false;
     mutable std::unordered_map<quintptr, Folder> m_folders;
     mutable std::unordered_map<quintptr, Row> m_rows;
 };
