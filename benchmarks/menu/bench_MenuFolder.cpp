@@ -17,8 +17,8 @@
 
 #include <QApplication>
 #include <QDirIterator>
+#include <QElapsedTimer>
 #include <QFileSystemModel>
-#include <QThread>
 
 #include <algorithm>
 #include <cstdio>
@@ -37,6 +37,14 @@ struct Directory
 
 std::vector<double> freezes;
 
+// KDE's lister goes on watching what it has shown, and looks at what changed half a second later.
+void letWatchersFinish()
+{
+    QElapsedTimer timer;
+    for (timer.start(); timer.elapsed() < 700;)
+        QCoreApplication::processEvents(QEventLoop::AllEvents, 10);
+}
+
 // Marks every file as changed: nobody may know it from the round before.
 void changeAll(const QString &path)
 {
@@ -47,7 +55,7 @@ void changeAll(const QString &path)
         if (stat(name.constData(), &status) == 0)
             chmod(name.constData(), status.st_mode & 07777);
     }
-    QThread::msleep(80);
+    letWatchersFinish();
 }
 
 bool isComplete(const QAbstractItemModel &model, const QModelIndex &root, const Directory &directory)
