@@ -141,7 +141,7 @@ void VelMenuProxyModel::beginOrdering() const
     m_files->setKeepsOrder(m_needsFileOrder);
 }
 
-// Equal rows stand in the reversed order of the files.
+// Equal rows stand in the order of the files or, where they are equal by name, in its reverse.
 void VelMenuProxyModel::needFileOrder() const
 {
     if (m_needsFileOrder)

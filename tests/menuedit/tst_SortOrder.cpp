@@ -19,6 +19,9 @@ private Q_SLOTS:
     void placesTwoNames_data();
     void placesTwoNames();
     void agreesWithTheWalkOverRandomLists();
+    void tellsListsThatNeverContradictThemselves_data();
+    void tellsListsThatNeverContradictThemselves();
+    void ordersAnyThreeNamesByAPlainList();
     void answersForALongListOfPatterns();
     void rewritesTheList_data();
     void rewritesTheList();
@@ -169,6 +172,43 @@ void tst_SortOrder::agreesWithTheWalkOverRandomLists()
         if (places.left != expected.left || places.right != expected.right)
             QFAIL(qPrintable(list.join(QLatin1Char(' ')) + QStringLiteral(" : ") + left + QLatin1Char(' ')
                              + right));
+    }
+}
+
+void tst_SortOrder::tellsListsThatNeverContradictThemselves_data()
+{
+    QTest::addColumn<QStringList>("list");
+    QTest::addColumn<bool>("plain");
+    QTest::newRow("empty") << QStringList() << true;
+    QTest::newRow("names") << words("a b c") << true;
+    QTest::newRow("names and a pattern") << words("a * b") << true;
+    QTest::newRow("a name twice") << words("a b a") << false;
+    QTest::newRow("a pattern twice") << words("* a *") << false;
+    QTest::newRow("two patterns") << words("a* b*") << false;
+}
+
+void tst_SortOrder::tellsListsThatNeverContradictThemselves()
+{
+    QFETCH(QStringList, list);
+    QTEST(SortOrder::Index(list).isPlain(), "plain");
+}
+
+void tst_SortOrder::ordersAnyThreeNamesByAPlainList()
+{
+    const QStringList names = words("a b ab ba a* *b a.desktop");
+    const QStringList elements = names + words("* *.desktop [ab]* *a* x");
+    const auto isBefore = [](const QStringList &list, const QString &left, const QString &right) {
+        const SortOrder::Places places = SortOrder::places(list, left, right);
+        return places.left < places.right;
+    };
+    for (int n = 0; n < 100000; ++n) {
+        QStringList list;
+        for (int i = QRandomGenerator::global()->bounded(7); i > 0; --i)
+            list.append(pick(elements));
+        const QString a = pick(names), b = pick(names), c = pick(names);
+        if (SortOrder::Index(list).isPlain() && !isBefore(list, b, a) && !isBefore(list, c, b))
+            QVERIFY2(!isBefore(list, c, a),
+                     qPrintable(list.join(QLatin1Char(' ')) + QStringLiteral(" : ") + a + b + c));
     }
 }
 

@@ -35,6 +35,11 @@ private Q_SLOTS:
     void comparesByFileNameNotByWhatIsShown();
     void putsANewFileInItsPlace();
     void sortsManyRowsThatComeAtOnce();
+    void keepsEqualRowsInTheOrderOfTheFiles_data();
+    void keepsEqualRowsInTheOrderOfTheFiles();
+    void keepsRowsThatBecomeEqualInTheOrderOfTheFiles();
+    void sortsTheFilesOnlyWhereItMatters();
+    void followsTheFilterOfTheFiles();
     void followsAnEditedName();
     void followsARenamedFile();
     void followsAChangedTime();
@@ -303,6 +308,100 @@ void tst_VelMenuProxyModel::sortsManyRowsThatComeAtOnce()
     QVERIFY(isSorted);
     QCOMPARE(order(), expected);
     QVERIFY(m_proxy->dynamicSortFilter());
+}
+
+void tst_VelMenuProxyModel::keepsEqualRowsInTheOrderOfTheFiles_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QByteArray>("list");
+    QTest::addColumn<bool>("reversed");
+    QTest::newRow("no list") << QStringLiteral("d") << QByteArray() << true;
+    QTest::newRow("a pattern") << QStringLiteral("d") << QByteArray("*;") << true;
+    QTest::newRow("by time") << QStringLiteral("recents") << QByteArray() << false;
+}
+
+// The file system gives the files in no order.
+void tst_VelMenuProxyModel::keepsEqualRowsInTheOrderOfTheFiles()
+{
+    QFETCH(QString, name);
+    QFETCH(QByteArray, list);
+    QFETCH(bool, reversed);
+    write(name + QStringLiteral("/.directory"), "[Desktop Entry]\nType=Directory\nSortOrder=" + list + '\n');
+    const QDateTime time = QDateTime::currentDateTime().addDays(-1);
+    QStringList expected;
+    for (int i = 0; i < 300; ++i) {
+        expected.append(QStringLiteral("f%1.desktop").arg(reversed ? 999 - i : 100 + i));
+        setTime(write(name + QLatin1Char('/') + expected.last(), entry("Name=Same\n")), time);
+    }
+    show(folder());
+    QVERIFY(wait(QString(), 1));
+
+    QVERIFY(wait(name, expected.size()));
+
+    QTRY_COMPARE(order(name), expected);
+    m_proxy->invalidateSortOrder(path(name));
+    QCOMPARE(order(name), expected);
+}
+
+void tst_VelMenuProxyModel::keepsRowsThatBecomeEqualInTheOrderOfTheFiles()
+{
+    QStringList expected;
+    for (int i = 0; i < 50; ++i) {
+        expected.append(QStringLiteral("f%1.desktop").arg(99 - i));
+        write(expected.last(), entry("Name=N" + QByteArray::number(i) + '\n'));
+    }
+    show(folder());
+    QVERIFY(wait(QString(), expected.size()));
+    QCoreApplication::processEvents();
+
+    for (const QString &name : qAsConst(expected))
+        m_model->setItemName(path(name), QStringLiteral("Same"));
+    QCoreApplication::processEvents();
+    m_proxy->invalidate();
+
+    QTRY_COMPARE(order(), expected);
+}
+
+void tst_VelMenuProxyModel::sortsTheFilesOnlyWhereItMatters()
+{
+    for (int i = 0; i < 300; ++i)
+        write(QStringLiteral("f%1.desktop").arg(i), entry("Name=N" + QByteArray::number(i) + '\n'));
+    write(QStringLiteral("d/a.desktop"), entry("Name=Same\n"));
+    write(QStringLiteral("d/b.desktop"), entry("Name=Same\n"));
+    show(folder());
+    int sorts = 0;
+    connect(m_model.get(), &QAbstractItemModel::rowsInserted, this, [&sorts] { sorts = 0; });
+    connect(m_model.get(), &QAbstractItemModel::layoutChanged, this, [&sorts] { ++sorts; });
+    QVERIFY(wait(QString(), 301));
+    QCoreApplication::processEvents();
+    QCoreApplication::processEvents();
+    QCOMPARE(sorts, 0);
+
+    QVERIFY(wait(QStringLiteral("d"), 2));
+
+    QTRY_VERIFY(sorts > 0);
+    QCOMPARE(order(QStringLiteral("d")), words("b.desktop a.desktop"));
+}
+
+void tst_VelMenuProxyModel::followsTheFilterOfTheFiles()
+{
+    write(QStringLiteral("a"), "a");
+    write(QStringLiteral("b"), "b");
+    write(QStringLiteral("d/x"), "x");
+    show(folder());
+    QVERIFY(wait(QString(), 3));
+    QCoreApplication::processEvents();
+
+    const QDir::Filters filter = m_model->filter();
+    m_model->setFilter(QDir::Files);
+    QTRY_COMPARE(order(), words("a b"));
+    m_model->setFilter(filter);
+    QTRY_COMPARE(order(), words("d a b"));
+    m_model->setNameFilterDisables(false);
+    m_model->setNameFilters({QStringLiteral("b")});
+    QTRY_COMPARE(order(), words("d b"));
+    m_model->setNameFilters({});
+    QTRY_COMPARE(order(), words("d a b"));
 }
 
 void tst_VelMenuProxyModel::followsAnEditedName()
