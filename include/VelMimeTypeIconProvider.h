@@ -75,6 +75,14 @@ protected:
      */
     QIcon desktopEntryIcon(const VelUIDesktopEntry &entry, const Emblems &emblems) const;
 
+    /**
+     * The name of the MIME type of a file that the caller has just looked at.
+     *
+     * @param info a regular file, or a link to one
+     * @return the same as type() for that file
+     */
+    QString regularFileType(const QFileInfo &info) const;
+
 private:
     Q_DISABLE_COPY(VelMimeTypeIconProvider)
 

@@ -5,15 +5,48 @@
 
 #include "MimeCacheReader.h"
 
+#include <algorithm>
+
 namespace {
+
+bool isWildcard(QChar character)
+{
+    return character == QLatin1Char('*') || character == QLatin1Char('?') || character == QLatin1Char('[');
+}
 
 bool hasWildcard(const QString &text)
 {
-    for (const QChar character : text) {
-        if (character == QLatin1Char('*') || character == QLatin1Char('?') || character == QLatin1Char('['))
-            return true;
+    return std::any_of(text.cbegin(), text.cend(), isWildcard);
+}
+
+/// The characters that a "[...]" at the end of \a pattern stands for; empty when that is not plain.
+QString lastSetOf(const QString &pattern)
+{
+    const int begin = pattern.lastIndexOf(QLatin1Char('['));
+    const QString set = pattern.mid(begin + 1, pattern.size() - begin - 2);
+    if (begin < 0 || set.contains(QRegularExpression(QStringLiteral("[^a-z0-9-]|^-|-$|-.?-"))))
+        return QString();
+    QString characters = set;
+    for (int i = 1; i + 1 < set.size(); ++i) {
+        for (ushort c = set.at(i - 1).unicode(); set.at(i) == QLatin1Char('-') && c < set.at(i + 1); ++c)
+            characters += QChar(c);
     }
-    return false;
+    return characters;
+}
+
+/// The longest part of \a pattern that stands for itself.
+QString longestPartOf(const QString &pattern)
+{
+    static const QRegularExpression wildcards(QStringLiteral("\\[[^]]*\\]|[*?]"));
+    static const QRegularExpression odd(QStringLiteral("[][\\\\]"));
+    QString longest;
+    const QStringList parts = pattern.split(wildcards);
+    for (const QString &part : parts) {
+        // What is left of an odd set does not stand for itself.
+        if (part.size() > longest.size() && !part.contains(odd))
+            longest = part;
+    }
+    return longest;
 }
 
 } // namespace
@@ -31,8 +64,37 @@ void MimePatterns::addPattern(const QString &pattern)
         addEnd(end);
     else if (!hasWildcard(lower))
         m_literals.insert(lower);
-    else
+    else {
         m_otherPatterns.append(QRegularExpression::wildcardToRegularExpression(pattern));
+        m_otherTraits.append(traitOf(lower));
+    }
+}
+
+MimePatterns::Trait MimePatterns::traitOf(const QString &pattern)
+{
+    const QChar last = pattern.back();
+    Trait trait;
+    if (last == QLatin1Char(']'))
+        trait.lastCharacters = lastSetOf(pattern);
+    else if (last != QLatin1Char('*') && last != QLatin1Char('?'))
+        trait.lastCharacters = last;
+    const auto wildcard = std::find_if(pattern.cbegin(), pattern.cend(), isWildcard);
+    trait.begin = pattern.left(int(wildcard - pattern.cbegin()));
+    trait.part = longestPartOf(pattern);
+    return trait;
+}
+
+bool MimePatterns::Trait::isOf(const QString &name) const
+{
+    if (!lastCharacters.isEmpty())
+        return lastCharacters.contains(name.back());
+    return begin.isEmpty() ? name.contains(part) : name.startsWith(begin);
+}
+
+bool MimePatterns::hasTraitOfOther(const QString &name) const
+{
+    return std::any_of(m_otherTraits.cbegin(), m_otherTraits.cend(),
+                       [&name](const Trait &trait) { return trait.isOf(name); });
 }
 
 void MimePatterns::addEnd(const QString &end)
@@ -76,6 +138,9 @@ bool MimePatterns::mayMatchOtherPattern(const QString &name) const
         return false;
     if (!m_other.isValid())
         return true;
+    const auto isHalf = [](QChar character) { return character.isSurrogate(); };
+    if (!hasTraitOfOther(name) && std::none_of(name.cbegin(), name.cend(), isHalf))
+        return false;
     const QRegularExpressionMatch match = m_other.match(name);
     return !match.isValid() || match.hasMatch(); // a name that is no valid UTF-16 cannot be told
 }

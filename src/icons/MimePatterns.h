@@ -48,7 +48,21 @@ private:
         bool isEnd = false; // a pattern begins here
     };
 
+    // What every name has that a pattern of another kind matches, and that is cheap to look for:
+    // one of the last characters, else the begin, else the part in the middle. What is empty
+    // tells nothing.
+    struct Trait
+    {
+        QString lastCharacters;
+        QString begin;
+        QString part;
+
+        bool isOf(const QString &name) const;
+    };
+
     void addPattern(const QString &pattern);
+    static Trait traitOf(const QString &pattern);
+    bool hasTraitOfOther(const QString &name) const;
     void addEnd(const QString &end);
     int childOf(int node, QChar character) const;
     bool mayMatchOtherPattern(const QString &name) const;
@@ -56,5 +70,6 @@ private:
     QVector<Node> m_nodes{Node()}; // the ends, read backwards, in lower case
     QSet<QString> m_literals; // in lower case
     QStringList m_otherPatterns;
+    QVector<Trait> m_otherTraits; // in lower case
     QRegularExpression m_other;
 };

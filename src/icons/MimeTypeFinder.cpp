@@ -84,8 +84,13 @@ QMimeType MimeTypeFinder::typeOf(const QFileInfo &info)
             m_directoryType = QMimeDatabase().mimeTypeForFile(info);
         return m_directoryType;
     }
-    const QString path = info.filePath();
-    if (m_patterns && !path.startsWith(QLatin1Char(':')) && isRegular(path)) {
+    return isRegular(info.filePath()) ? typeOfRegularFile(info) : QMimeDatabase().mimeTypeForFile(info);
+}
+
+QMimeType MimeTypeFinder::typeOfRegularFile(const QFileInfo &info)
+{
+    refresh();
+    if (m_patterns && !info.filePath().startsWith(QLatin1Char(':'))) {
         const QMimeType type = typeByName(info.fileName());
         if (type.isValid())
             return type;

@@ -31,6 +31,8 @@ public:
     static MimeTypeFinder &instance();
 
     QMimeType typeOf(const QFileInfo &info);
+    /// The same for what is known to be a regular file right now, or a link to one.
+    QMimeType typeOfRegularFile(const QFileInfo &info);
 
 private:
     MimeTypeFinder() = default;

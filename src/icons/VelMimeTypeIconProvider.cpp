@@ -116,6 +116,11 @@ QString VelMimeTypeIconProvider::type(const QFileInfo &info) const
     return MimeTypeFinder::instance().typeOf(info).name();
 }
 
+QString VelMimeTypeIconProvider::regularFileType(const QFileInfo &info) const
+{
+    return MimeTypeFinder::instance().typeOfRegularFile(info).name();
+}
+
 QIcon VelMimeTypeIconProvider::directoryIcon(const QFileInfo &info, const Emblems &emblems) const
 {
     const QString path = info.absoluteFilePath() + QStringLiteral("/.directory");

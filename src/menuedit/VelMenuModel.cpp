@@ -15,6 +15,7 @@
 #include <QTimer>
 
 #include <ctime>
+#include <utility>
 
 #include <sys/stat.h>
 
@@ -45,6 +46,8 @@ public:
             && m_status.st_size == other.m_status.st_size && isEqual(m_status.st_mtim, other.m_status.st_mtim)
             && isEqual(m_status.st_ctim, other.m_status.st_ctim);
     }
+
+    bool isRegular() const { return S_ISREG(m_status.st_mode); }
 
     // Whether the last change is long enough ago that another would have another time.
     bool isSettled() const
@@ -93,6 +96,7 @@ public:
             return VelMimeTypeIconProvider::icon(info);
         const QString path = info.filePath();
         const FileStamp stamp(path);
+        m_regularFile = stamp.isRegular() ? path : QString();
         const auto known = m_icons.constFind(path);
         if (known != m_icons.constEnd() && known->stamp == stamp)
             return known->icon;
@@ -106,6 +110,14 @@ public:
         return icon;
     }
 
+    // The base class asks for the icon and at once for the type.
+    QString type(const QFileInfo &info) const override
+    {
+        const QString regularFile = std::exchange(m_regularFile, QString());
+        return !regularFile.isEmpty() && regularFile == info.filePath() ? regularFileType(info)
+                                                                        : VelMimeTypeIconProvider::type(info);
+    }
+
 private:
     struct Known
     {
@@ -116,6 +128,7 @@ private:
     QPointer<VelMenuModel> m_model;
     // After any change in a folder the base class asks for all its icons again.
     mutable QHash<QString, Known> m_icons;
+    mutable QString m_regularFile;
 };
 
 /// Keeps the icon provider, which the model uses but never deletes.

@@ -71,7 +71,9 @@ private:
 QByteArray sampleCache()
 {
     CacheWriter writer;
-    writer.setLists({"makefile", "core"}, {"readme*", "*.so.[0-9]*", "[0-9][0-9].vdr"});
+    writer.setLists({"makefile", "core"},
+                    {"readme*", "sc*on*", "*.so.[0-9]*", "[0-9][0-9].vdr", "*xx.deskto[o-q]",
+                     "*yy.deskto[n-o]", "[]b]zz*", "*vv.d?sktop", "*ww.deskto?", "*uu.deskto[!a-o]"});
     writer.setEnd("potksed.");
     return writer.bytes();
 }
@@ -184,6 +186,15 @@ void tst_MimePatterns::findsTheEndThatDecides_data()
     QTest::newRow("prefix too") << QStringLiteral("README.desktop") << 0;
     QTest::newRow("pattern in the middle too") << QStringLiteral("a.so.1.desktop") << 0;
     QTest::newRow("not quite that pattern") << QStringLiteral("a.so.x.desktop") << 8;
+    QTest::newRow("begin and middle too") << QStringLiteral("scion.desktop") << 0;
+    QTest::newRow("begin only") << QStringLiteral("scio.desktop") << 8;
+    QTest::newRow("pattern ending in a set") << QStringLiteral("axx.desktop") << 0;
+    QTest::newRow("another set at the end") << QStringLiteral("ayy.desktop") << 8;
+    QTest::newRow("bracket in a set") << QStringLiteral("bzz.desktop") << 0;
+    QTest::newRow("not in that set") << QStringLiteral("czz.desktop") << 8;
+    QTest::newRow("pattern ending in a letter") << QStringLiteral("avv.Desktop") << 0;
+    QTest::newRow("pattern ending in any letter") << QStringLiteral("aww.desktop") << 0;
+    QTest::newRow("pattern ending in an odd set") << QStringLiteral("auu.desktop") << 0;
     QTest::newRow("line feed") << QStringLiteral("a\nb.desktop") << 8;
     QTest::newRow("letter that grows when small") << QStringLiteral("\u0130.desktop") << 0;
     QTest::newRow("half a character") << QString(QChar(0xd800)) + QStringLiteral(".desktop") << 0;
