@@ -3,15 +3,14 @@
 
 #pragma once
 
-#include "IShortcutObject.h"
+#include "WrappedObject.h"
 
 #include <QAction>
-#include <QPointer>
 
 /**
  * A QAction of the application; text and icon are the action's own.
  */
-class ActionObject : public IShortcutObject
+class ActionObject : public WrappedObject<QAction>
 {
     Q_OBJECT
 
@@ -28,15 +27,6 @@ public:
 
     QKeySequence objectKeySequence() const override;
     void setObjectKeySequence(const QKeySequence &key) override;
-    void setKeySequence(const QKeySequence &key) override;
-    void reset() override;
-    QKeySequence keySequence() const override;
-    void apply() override;
-    QString group() const override;
     QString text() const override;
     QIcon icon() const override;
-
-private:
-    const QPointer<QAction> m_action;
-    const QString m_group;
 };

@@ -3,15 +3,14 @@
 
 #pragma once
 
-#include "IShortcutObject.h"
+#include "WrappedObject.h"
 
-#include <QPointer>
 #include <QShortcut>
 
 /**
  * A QShortcut of the application.
  */
-class ShortcutObject : public IShortcutObject
+class ShortcutObject : public WrappedObject<QShortcut>
 {
     Q_OBJECT
 
@@ -29,16 +28,9 @@ public:
 
     QKeySequence objectKeySequence() const override;
     void setObjectKeySequence(const QKeySequence &key) override;
-    void setKeySequence(const QKeySequence &key) override;
-    void reset() override;
-    QKeySequence keySequence() const override;
-    void apply() override;
-    QString group() const override;
     QString text() const override;
     QIcon icon() const override;
 
 private:
-    const QPointer<QShortcut> m_shortcut;
-    const QString m_group;
     const QString m_text;
 };
