@@ -68,7 +68,9 @@ public:
 
 void VelDesktopEntryEditDialogPrivate::warn(const QString &text)
 {
-    QMessageBox::warning(q, tr("Warning"), text, QMessageBox::Ok, QMessageBox::NoButton);
+    // Not the ready-made box, which would not survive that the dialog goes meanwhile.
+    VelUI::GuardedDialog<QMessageBox> box(QMessageBox::Warning, tr("Warning"), text, QMessageBox::Ok, q);
+    box.exec();
 }
 
 void VelDesktopEntryEditDialogPrivate::markModified()
@@ -170,10 +172,13 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     if (!pattern.isEmpty()) {
         VelUIDesktopEntry source{QString()};
         source.setFilePath(pattern);
+        const QPointer<VelDesktopEntryEditDialog> alive(this);
         if (source.load())
             entry.inheritFrom(source);
         else
             d->warn(tr("Can't load file %1").arg(pattern));
+        if (!alive)
+            return false;
     }
     d->props->loadFrom(entry);
     d->path = path;
@@ -209,11 +214,14 @@ void VelDesktopEntryEditDialog::accept()
     VelUIDesktopEntry entry = d->loaded;
     entry.setFilePath(d->path);
     d->props->saveTo(&entry);
+    const QPointer<VelDesktopEntryEditDialog> alive(this);
     if (!d->checkSuitable(entry))
         return;
     VelUIDesktopEntry::DisplayableError displayError = 0;
     if (!entry.isDisplayable(&displayError))
         d->warn(tr("You create hidden desktop entry"));
+    if (!alive)
+        return;
     if (!entry.save()) {
         d->warn(tr("Can't save file %1").arg(d->path));
         return;
@@ -221,7 +229,8 @@ void VelDesktopEntryEditDialog::accept()
     d->loaded = entry;
     if (d->posSet)
         d->savePosition();
-    QDialog::accept();
+    if (alive)
+        QDialog::accept();
 }
 
 void VelDesktopEntryEditDialog::copyFrom()

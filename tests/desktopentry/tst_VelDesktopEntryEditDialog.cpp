@@ -99,6 +99,8 @@ private Q_SLOTS:
     void helpsOnF1();
     void doesNothingWithoutTheForm();
     void survivesItsDeletionBehindThePicker();
+    void survivesItsDeletionBehindAWarning_data();
+    void survivesItsDeletionBehindAWarning();
 
 private:
     void copyFrom(VelDesktopEntryEditDialog &dialog, const QString &menuEntry);
@@ -385,18 +387,30 @@ void tst_VelDesktopEntryEditDialog::staysOpenWhenTheFileCannotBeSaved()
     const QString file = path(QStringLiteral("missing folder/new.desktop"));
     VelDesktopEntryEditDialog dialog;
     QVERIFY(dialog.setDesktopEntryPath(file, true, write(QStringLiteral("pattern"), plainApplication)));
+    dialog.setDesktopEntryCoords(1, 2);
     ModalDriver modal;
     modal.handle([&](QWidget *window) {
         modal.answer(warning(QStringLiteral("Can't save file ") + file), QMessageBox::Ok);
         click(okButton(window));
         QVERIFY(window->isVisible());
         QCOMPARE(line(window, "nameEdit")->text(), QStringLiteral("Plain"));
+
+        // All that there is to tell, in its order.
+        child<QCheckBox>(window, "noDisplayCheckBox")->click();
+        const auto hidden = warning(QStringLiteral("You create hidden desktop entry"));
+        modal.answer(hidden, QMessageBox::Ok);
+        modal.answer(warning(QStringLiteral("Can't save file ") + file), QMessageBox::Ok);
+        click(okButton(window));
+        QVERIFY(window->isVisible());
+
         QVERIFY(QDir().mkpath(path(QStringLiteral("missing folder"))));
+        modal.answer(hidden, QMessageBox::Ok);
+        modal.answer(warning(QStringLiteral("Can't save position on desktop for ") + file), QMessageBox::Ok);
         click(okButton(window));
     });
     QCOMPARE(dialog.exec(), int(QDialog::Accepted));
     QVERIFY(modal.finished());
-    QCOMPARE(read(file), plainApplication);
+    QCOMPARE(read(file), plainApplication + "NoDisplay=true\n");
 }
 
 void tst_VelDesktopEntryEditDialog::leavesAnUntouchedFileAlone_data()
@@ -714,6 +728,35 @@ void tst_VelDesktopEntryEditDialog::survivesItsDeletionBehindThePicker()
     click(child<QPushButton>(dialog, "copyButton"));
     QVERIFY(modal.finished());
     QVERIFY(!alive);
+}
+
+void tst_VelDesktopEntryEditDialog::survivesItsDeletionBehindAWarning_data()
+{
+    QTest::addColumn<QByteArray>("bytes");
+    QTest::addColumn<QString>("text");
+    const QByteArray link = "[Desktop Entry]\nType=Link\nName=a\n";
+    QTest::newRow("unsuitable") << link << QStringLiteral("can't find URL");
+    QTest::newRow("hidden") << plainApplication + "Hidden=true\n"
+                            << QStringLiteral("You create hidden desktop entry");
+    QTest::newRow("position") << plainApplication << QStringLiteral("Can't save position on desktop for ");
+}
+
+void tst_VelDesktopEntryEditDialog::survivesItsDeletionBehindAWarning()
+{
+    QFETCH(QByteArray, bytes);
+    QFETCH(QString, text);
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    auto *dialog = new VelDesktopEntryEditDialog;
+    const QPointer<VelDesktopEntryEditDialog> alive(dialog);
+    QVERIFY(dialog->setDesktopEntryPath(file));
+    dialog->setDesktopEntryCoords(1, 2);
+    ModalDriver modal;
+    modal.answerWith(warning(text.endsWith(QLatin1Char(' ')) ? text + file : text),
+                     [dialog](QMessageBox *) { delete dialog; });
+    dialog->accept();
+    QVERIFY(modal.finished());
+    QVERIFY(!alive);
+    QCOMPARE(read(file), bytes);
 }
 
 VEL_TEST_MAIN(tst_VelDesktopEntryEditDialog)
