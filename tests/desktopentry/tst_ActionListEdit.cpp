@@ -133,9 +133,12 @@ void tst_ActionListEdit::givesItsTextsToTheDialogs()
     run();
     edit.setTexts(QStringLiteral("Actions"), QStringLiteral("plus"), QStringLiteral("change"));
     run();
+    // One alone makes the other of the dialog give way too.
+    edit.setTexts(QStringLiteral("Actions"), QString(), QStringLiteral("change"));
+    run();
     QCOMPARE(titles,
              QStringList({QString(), QStringLiteral("Add action"), QStringLiteral("Actions"),
-                          QStringLiteral("plus")}));
+                          QStringLiteral("plus"), QStringLiteral("Actions"), QString()}));
 }
 
 VEL_TEST_MAIN(tst_ActionListEdit)

@@ -219,6 +219,11 @@ void tst_ActionPropsDialog::keepsOnlyTheChosenList()
     child<StringListEdit>(&dialog, "notShowInEdit")->setStrings({QStringLiteral("Y")});
     QCOMPARE(dialog.action().getNotShowIn(), QStringList({QStringLiteral("Y")}));
     QCOMPARE(dialog.action().getOnlyShowIn(), QStringList());
+
+    child<QRadioButton>(&dialog, "onlyShowInButton")->click();
+    QCOMPARE(dialog.action().getOnlyShowIn(), fullAction().getOnlyShowIn());
+    QVERIFY(!fullAction().getOnlyShowIn().isEmpty());
+    QCOMPARE(dialog.action().getNotShowIn(), QStringList());
 }
 
 void tst_ActionPropsDialog::givesBackWhatItWasGiven()

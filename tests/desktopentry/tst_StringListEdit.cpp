@@ -44,6 +44,7 @@ private Q_SLOTS:
     void takesTheAcceptedList();
     void keepsTheListWhenCancelled();
     void namesTheDialogByTheTitle();
+    void givesItsTextsToTheDialog_data();
     void givesItsTextsToTheDialog();
     void leavesTheTextsOfTheDialogWithoutOwn();
     void givesItsFunctionToTheDialog();
@@ -188,22 +189,40 @@ void tst_StringListEdit::namesTheDialogByTheTitle()
     QCOMPARE(titles, QStringList({QString(), QStringLiteral("Categories")}));
 }
 
+void tst_StringListEdit::givesItsTextsToTheDialog_data()
+{
+    QTest::addColumn<QStringList>("texts");
+    const QStringList all{QStringLiteral("add title"), QStringLiteral("add label"),
+                          QStringLiteral("edit title"), QStringLiteral("edit label")};
+    QTest::newRow("all") << all;
+    // One alone makes the others of the dialog give way too.
+    for (int i = 0; i < all.size(); ++i) {
+        QStringList texts{QString(), QString(), QString(), QString()};
+        texts[i] = all.at(i);
+        QTest::newRow(qPrintable(all.at(i))) << texts;
+    }
+}
+
 void tst_StringListEdit::givesItsTextsToTheDialog()
 {
+    QFETCH(QStringList, texts);
     StringListEdit edit;
-    edit.setTexts(QStringLiteral("title"), QStringLiteral("add title"), QStringLiteral("add label"),
-                  QString(), QString());
-    Prompt prompt;
+    edit.setStrings({QStringLiteral("a")});
+    edit.setTexts(QStringLiteral("title"), texts.at(0), texts.at(1), texts.at(2), texts.at(3));
+    Prompt add;
+    Prompt change;
     ModalDriver modal;
-    modal.handle([&modal, &prompt](QWidget *window) {
-        answerPrompt(modal, QString(), &prompt);
+    modal.handle([&](QWidget *window) {
+        answerPrompt(modal, QString(), &add);
         click(child<QPushButton>(window, "addButton"));
+        window->findChild<QListWidget *>()->setCurrentRow(0);
+        answerPrompt(modal, QString(), &change);
+        click(child<QPushButton>(window, "editButton"));
         window->close();
     });
     edit.editStrings();
     QVERIFY(modal.finished());
-    QCOMPARE(prompt.title, QStringLiteral("add title"));
-    QCOMPARE(prompt.label, QStringLiteral("add label"));
+    QCOMPARE(QStringList({add.title, add.label, change.title, change.label}), texts);
 }
 
 void tst_StringListEdit::leavesTheTextsOfTheDialogWithoutOwn()

@@ -484,6 +484,10 @@ void tst_VelDesktopEntryPropsWidget::asksBeforeTheTypeChanges()
 {
     VelDesktopEntryPropsWidget form;
     QSignalSpy changed(&form, &VelDesktopEntryPropsWidget::changed);
+    // The new type is in place when the change is told.
+    VelUIDesktopEntry toldRecord;
+    connect(&form, &VelDesktopEntryPropsWidget::changed, &form,
+            [&form, &toldRecord] { form.saveTo(&toldRecord); });
     ModalDriver modal;
     modal.answerWith(typeQuestion, [&form](QMessageBox *box) {
         QCOMPARE(box->parentWidget(), &form);
@@ -497,9 +501,7 @@ void tst_VelDesktopEntryPropsWidget::asksBeforeTheTypeChanges()
     QCOMPARE(typeBox(form)->currentData().toString(), link);
     QVERIFY(shownRows(form).contains(QStringLiteral("Url:*")));
     QCOMPARE(changed.count(), 1);
-    VelUIDesktopEntry record;
-    form.saveTo(&record);
-    QCOMPARE(record.getType(), link);
+    QCOMPARE(toldRecord.getType(), link);
 }
 
 void tst_VelDesktopEntryPropsWidget::takesClosingAndEscapingForYes_data()

@@ -138,6 +138,20 @@ void tst_ShortcutsTreeView::saysNothingWhenTheCurrentItemStays()
     QSignalSpy spy(m_view.get(), &ShortcutsTreeView::currentShortcutChanged);
     m_view->setCurrentIndex(row(0, 0));
     QCOMPARE(spy.count(), 0);
+
+    // Not even when the selection tells of it.
+    struct View : ShortcutsTreeView
+    {
+        using ShortcutsTreeView::currentChanged;
+    } view;
+    view.setModel(m_model.get());
+    QSignalSpy shortcutSpy(&view, &ShortcutsTreeView::currentShortcutChanged);
+    QSignalSpy groupSpy(&view, &ShortcutsTreeView::currentItemIsNotShortcut);
+    view.currentChanged(row(0, 0), row(0, 0));
+    view.currentChanged(m_model->index(0, 0), m_model->index(0, 0));
+    QCOMPARE(shortcutSpy.count() + groupSpy.count(), 0);
+    view.currentChanged(row(0, 0), QModelIndex());
+    QCOMPARE(shortcutSpy.count(), 1);
 }
 
 void tst_ShortcutsTreeView::setsTheKeyOfTheCurrentShortcut()
