@@ -81,6 +81,8 @@ private:
     void clickRow(QWidget *dialog, const QString &text);
     void clickButton(QWidget *dialog, QDialogButtonBox::StandardButton button);
     void record(QWidget *dialog, const char *key);
+    void reassign();
+    void restoreDefaults();
     // Presses a key in a fresh text, whose first word tells whether it was put into capitals.
     QString textAfter(const char *key);
     QString savedKey() const;
@@ -177,13 +179,9 @@ QString tst_vel_gallery_shortcuts::savedKey() const
     return settings.value(str("Shortcuts/word-upper"), str("(not saved)")).toString();
 }
 
-void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain()
+// Tries two keys that are taken, then a free one.
+void tst_vel_gallery_shortcuts::reassign()
 {
-    QCOMPARE(textAfter("F7"), str("SOME text"));
-    QCOMPARE(textAfter("ctrl+shift+F8"), str("some text"));
-    QCOMPARE(savedKey(), str("(not saved)"));
-
-    // Two keys that are taken, then a free one.
     ModalDriver modal;
     int boxes = 0;
     const auto count = [&boxes](QMessageBox *box) {
@@ -218,14 +216,11 @@ void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain()
                      count);
     press("ctrl+F12");
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished() && !QApplication::activeModalWidget(), 30000);
-    QCOMPARE(textAfter("ctrl+shift+F8"), str("SOME text"));
-    QCOMPARE(textAfter("F7"), str("some text"));
-    QCOMPARE(savedKey(), str("Ctrl+Shift+F8"));
+}
 
-    start();
-    QCOMPARE(textAfter("ctrl+shift+F8"), str("SOME text"));
-    QCOMPARE(textAfter("F7"), str("some text"));
-
+void tst_vel_gallery_shortcuts::restoreDefaults()
+{
+    ModalDriver modal;
     modal.handle([&](QWidget *dialog) {
         const DialogEnd end(dialog);
         waitUntilSettled(dialog);
@@ -237,6 +232,24 @@ void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain()
     });
     press("ctrl+F12");
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished() && !QApplication::activeModalWidget(), 30000);
+}
+
+void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain()
+{
+    QCOMPARE(textAfter("F7"), str("SOME text"));
+    QCOMPARE(textAfter("ctrl+shift+F8"), str("some text"));
+    QCOMPARE(savedKey(), str("(not saved)"));
+
+    reassign();
+    QCOMPARE(textAfter("ctrl+shift+F8"), str("SOME text"));
+    QCOMPARE(textAfter("F7"), str("some text"));
+    QCOMPARE(savedKey(), str("Ctrl+Shift+F8"));
+
+    start();
+    QCOMPARE(textAfter("ctrl+shift+F8"), str("SOME text"));
+    QCOMPARE(textAfter("F7"), str("some text"));
+
+    restoreDefaults();
     QCOMPARE(savedKey(), str("F7"));
     start();
     QCOMPARE(textAfter("F7"), str("SOME text"));
