@@ -9,6 +9,7 @@
 #include <QDateTime>
 #include <QImage>
 #include <QPainter>
+#include <QPalette>
 #include <QPixmapCache>
 
 #include <memory>
@@ -41,6 +42,7 @@ private Q_SLOTS:
     void givesTheIconItselfWithoutEmblems();
     void leavesAnEmblemOutThatTheThemeLacks();
     void greysEmblemsOutWithTheirIcon();
+    void followsAChangeOfThePalette();
     void looksTheThemeUpWhenItIsPainted_data();
     void looksTheThemeUpWhenItIsPainted();
     void followsAChangeOfTheTheme();
@@ -331,6 +333,24 @@ void tst_VelIcon::greysEmblemsOutWithTheirIcon()
     QVERIFY(image.pixelColor(15, 15) != QColor(Qt::red));
     QCOMPARE(image.pixelColor(0, 0),
              themeIcon(QStringLiteral("emblem-blue")).pixmap(8, QIcon::Disabled).toImage().pixelColor(0, 0));
+}
+
+void tst_VelIcon::followsAChangeOfThePalette()
+{
+    const QPalette before = QGuiApplication::palette();
+    QVector<QColor> colors;
+    for (const Qt::GlobalColor highlight : {Qt::black, Qt::white}) {
+        QPalette palette = before;
+        palette.setColor(QPalette::Highlight, highlight);
+        QApplication::setPalette(palette);
+        const auto color = [](const QIcon &icon) {
+            return icon.pixmap(16, QIcon::Selected).toImage().pixelColor(8, 8);
+        };
+        colors.append(color(themeIcon(QStringLiteral("red"))));
+        QCOMPARE(colors.last(), color(QIcon::fromTheme(QStringLiteral("red"))));
+    }
+    QApplication::setPalette(before);
+    QVERIFY(colors.first() != colors.last());
 }
 
 void tst_VelIcon::looksTheThemeUpWhenItIsPainted_data()
