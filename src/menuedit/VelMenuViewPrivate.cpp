@@ -57,8 +57,8 @@ void VelMenuViewPrivate::buildModel()
 
 void VelMenuViewPrivate::showRoot()
 {
-    hideTopLevel();
     q->setRootIndex(proxy->mapFromSource(model->index(menuDir)));
+    hideTopLevel();
 }
 
 void VelMenuViewPrivate::watchRows()
@@ -66,6 +66,8 @@ void VelMenuViewPrivate::watchRows()
     QObject::connect(
         proxy, &QAbstractItemModel::rowsAboutToBeRemoved, q,
         [this](const QModelIndex &parent, int first, int last) { leaveRows(parent, first, last); });
+    QObject::connect(proxy, &QAbstractItemModel::rowsRemoved, q, [this] { hideTopLevel(); });
+    QObject::connect(proxy, &QAbstractItemModel::modelReset, q, [this] { hideTopLevel(); });
     QObject::connect(proxy, &QAbstractItemModel::rowsInserted, q, [this](const QModelIndex &parent) {
         if (!parent.isValid())
             hideTopLevel();
@@ -102,10 +104,15 @@ void VelMenuViewPrivate::selectAwaited()
     awaited.clear();
 }
 
+// Without its root the tree would show the file system instead of nothing. While there is a root,
+// nothing is hidden: a view starts no drag from below a hidden row.
 void VelMenuViewPrivate::hideTopLevel()
 {
-    for (int row = 0; row < proxy->rowCount(); ++row)
-        q->setRowHidden(row, QModelIndex(), true);
+    const bool isRootless = !q->rootIndex().isValid();
+    for (int row = 0; row < proxy->rowCount(); ++row) {
+        if (q->isRowHidden(row, QModelIndex()) != isRootless)
+            q->setRowHidden(row, QModelIndex(), isRootless);
+    }
 }
 
 QModelIndex VelMenuViewPrivate::proxyIndex(const QString &path) const
