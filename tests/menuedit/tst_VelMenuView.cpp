@@ -10,6 +10,7 @@
 #include <QContextMenuEvent>
 #include <QFileSystemModel>
 #include <QMenu>
+#include <QMouseEvent>
 #include <QPointer>
 #include <QProcess>
 #include <QPushButton>
@@ -38,6 +39,7 @@ private Q_SLOTS:
     void looksAsAMenuDoes();
     void setsTheIconSize();
     void editsOnlyWhenTold();
+    void beginsADragOfARowOnlyWhenEditable();
     void opensTheEditorOnADoubleClickOnlyWhenEditable();
     void sortsAsTheMenuDoes();
     void tellsWhatIsSelected();
@@ -223,6 +225,36 @@ void tst_VelMenuView::editsOnlyWhenTold()
     QVERIFY(editor.showDropIndicator());
     QCOMPARE(editor.dragDropMode(), QAbstractItemView::DragDrop);
     QVERIFY(!(files(editor)->index(menu() + QLatin1String("/a.desktop")).flags() & Qt::ItemIsEditable));
+}
+
+void tst_VelMenuView::beginsADragOfARowOnlyWhenEditable()
+{
+    class CountingView : public VelMenuView
+    {
+    public:
+        using VelMenuView::VelMenuView;
+        int drags = 0;
+
+    protected:
+        void startDrag(Qt::DropActions) override { ++drags; }
+    };
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    for (const bool editable : {true, false}) {
+        CountingView view(menu(), -1, editable);
+        view.resize(300, 300);
+        view.show();
+        QVERIFY(open(view, menu(), 1));
+        const QPoint from = view.visualRect(shown(view, a)).center();
+        QTest::mousePress(view.viewport(), Qt::LeftButton, Qt::NoModifier, from);
+        for (int step = 1; step <= 3; ++step) {
+            const QPoint to = from + QPoint(0, step * QApplication::startDragDistance());
+            QMouseEvent move(QEvent::MouseMove, to, view.viewport()->mapToGlobal(to), Qt::NoButton,
+                             Qt::LeftButton, Qt::NoModifier);
+            QApplication::sendEvent(view.viewport(), &move);
+        }
+        QTest::mouseRelease(view.viewport(), Qt::LeftButton, Qt::NoModifier, from);
+        QCOMPARE(view.drags, editable ? 1 : 0);
+    }
 }
 
 void tst_VelMenuView::opensTheEditorOnADoubleClickOnlyWhenEditable()
