@@ -52,7 +52,7 @@ private:
 // A window manager moves a window a moment after it appeared; clicks would miss it.
 void waitUntilSettled(QWidget *window)
 {
-    QVERIFY(QTest::qWaitForWindowActive(window));
+    QTRY_VERIFY_WITH_TIMEOUT((window->activateWindow(), window->isActiveWindow()), 10000);
     QPoint place;
     do {
         place = window->mapToGlobal(QPoint());
@@ -150,7 +150,8 @@ void tst_vel_gallery_shortcuts::clickButton(QWidget *dialog, QDialogButtonBox::S
 void tst_vel_gallery_shortcuts::record(QWidget *dialog, const char *key)
 {
     auto *keyWidget = dialog->findChild<QKeySequenceEdit *>(str("keyWidget"));
-    QTRY_VERIFY(dialog->isActiveWindow());
+    // A busy window manager may leave the keyboard with the message box that has just gone.
+    QTRY_VERIFY((dialog->activateWindow(), dialog->isActiveWindow()));
     click(keyWidget);
     QTRY_VERIFY(keyWidget->hasFocus());
     press(key);
