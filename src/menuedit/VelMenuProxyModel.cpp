@@ -71,7 +71,7 @@ void VelMenuProxyModel::watch(QAbstractItemModel *model)
 {
     connect(model, &QAbstractItemModel::dataChanged, this, &VelMenuProxyModel::dropRows);
     connect(model, &QAbstractItemModel::rowsAboutToBeInserted, this, &VelMenuProxyModel::beginManyRows);
-    connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuProxyModel::dropAll);
+    connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuProxyModel::dropFolders);
     connect(model, &QAbstractItemModel::rowsRemoved, this, &VelMenuProxyModel::dropAll);
     connect(model, &QAbstractItemModel::modelAboutToBeReset, this, &VelMenuProxyModel::dropAll);
     connect(model, &QAbstractItemModel::modelReset, this, &VelMenuProxyModel::dropAll);
@@ -233,6 +233,19 @@ void VelMenuProxyModel::dropUnnamedRows()
 {
     for (auto it = m_rows.begin(); it != m_rows.end();)
         it = it->second.displayName && it->second.displayName->isEmpty() ? m_rows.erase(it) : std::next(it);
+}
+
+// Another folder may come to the path of one that goes, with a list of its own.
+void VelMenuProxyModel::dropFolders(const QModelIndex &parent, int first, int last)
+{
+    for (int row = first; row <= last && !sortOrders.isEmpty(); ++row) {
+        const QString path = m_files->filePath(m_files->index(row, 0, parent));
+        sortOrders.remove(path);
+        const QString below = path + QLatin1Char('/');
+        for (auto it = sortOrders.lowerBound(below); it != sortOrders.end() && it.key().startsWith(below);)
+            it = sortOrders.erase(it);
+    }
+    dropAll();
 }
 
 void VelMenuProxyModel::dropAll()

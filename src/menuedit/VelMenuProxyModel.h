@@ -49,6 +49,7 @@ private:
     void watch(QAbstractItemModel *model);
     void dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight);
     void dropUnnamedRows();
+    void dropFolders(const QModelIndex &parent, int first, int last);
     void dropAll();
     void beginManyRows(const QModelIndex &parent, int first, int last);
     void endManyRows();
