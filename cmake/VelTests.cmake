@@ -32,6 +32,8 @@ function(vel_add_test name)
     if(ARG_X11)
         add_test(NAME ${name} COMMAND "${PROJECT_SOURCE_DIR}/tests/support/with-x-server" $<TARGET_FILE:${name}>)
         list(APPEND ARG_LABELS x11)
+        # Window managers that compete for the machine lose keys and clicks.
+        set_tests_properties(${name} PROPERTIES RESOURCE_LOCK window_manager)
     else()
         add_test(NAME ${name} COMMAND ${name})
         set_tests_properties(${name} PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen")
