@@ -8,6 +8,7 @@
 #include <VelDesktopEntryPropsWidget.h>
 #include <VelMenuDialog.h>
 #include <frame/DesktopEntryRecord.h>
+#include <frame/DialogSize.h>
 #include <velcore/dirs.h>
 #include <velintegration/desktopitems.h>
 
@@ -17,20 +18,14 @@
 #include <QMessageBox>
 #include <QPointer>
 #include <QPushButton>
-#include <QSettings>
 #include <QVBoxLayout>
 
 namespace {
 
-// The name of another dialog; sizes are kept under it.
-QString widthKey()
+// The name of another dialog; the size is kept under it.
+QString sizeGroup()
 {
-    return QStringLiteral("/VelMimeTypesSelectDialog/Width");
-}
-
-QString heightKey()
-{
-    return QStringLiteral("/VelMimeTypesSelectDialog/Height");
+    return QStringLiteral("/VelMimeTypesSelectDialog");
 }
 
 QString standardDirectory(VelDir kind)
@@ -144,17 +139,12 @@ VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
     layout->addWidget(d->props);
     layout->addWidget(buttonBox);
 
-    const QSettings settings;
-    const int height = settings.value(heightKey(), 440).toInt();
-    const int width = settings.value(widthKey(), 560).toInt();
-    resize(width, height);
+    DialogSize::restore(*this, sizeGroup(), QSize(560, 440));
 }
 
 VelDesktopEntryEditDialog::~VelDesktopEntryEditDialog()
 {
-    QSettings settings;
-    settings.setValue(widthKey(), width());
-    settings.setValue(heightKey(), height());
+    DialogSize::remember(*this, sizeGroup());
 }
 
 bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool create, const QString &pattern)

@@ -8,6 +8,7 @@
 #include "WmCommand.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/DialogSize.h>
 
 #include <velcore/dirs.h>
 #include <velintegration/help.h>
@@ -19,7 +20,6 @@
 #include <QFileSystemModel>
 #include <QIcon>
 #include <QPushButton>
-#include <QSettings>
 #include <QToolBar>
 #include <QVBoxLayout>
 
@@ -27,8 +27,10 @@
 
 namespace {
 
-const char *const WidthKey = "VelMenuDialog/Width";
-const char *const HeightKey = "VelMenuDialog/Height";
+QString sizeGroup()
+{
+    return QStringLiteral("VelMenuDialog");
+}
 
 QString startMenuDir()
 {
@@ -57,7 +59,6 @@ public:
     void addAction(const char *name);
     void connectButtons();
     QString title(const QString &dir) const;
-    void restoreSize();
     QPushButton *button(QDialogButtonBox::StandardButton which) const { return buttonBox->button(which); }
     QString pathOf(const QModelIndex &shown) const;
 };
@@ -119,14 +120,6 @@ QString VelMenuDialogPrivate::title(const QString &dir) const
     return text + QLatin1Char(' ') + dir;
 }
 
-void VelMenuDialogPrivate::restoreSize()
-{
-    const QSettings settings;
-    const int height = settings.value(QLatin1String(HeightKey), 480).toInt();
-    const int width = settings.value(QLatin1String(WidthKey), 400).toInt();
-    q->resize(width, height);
-}
-
 QString VelMenuDialogPrivate::pathOf(const QModelIndex &shown) const
 {
     const auto *proxy = qobject_cast<const QAbstractProxyModel *>(shown.model());
@@ -160,7 +153,7 @@ VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bo
     d->connectButtons();
     setWindowTitle(d->title(shownDir));
     setWindowIcon(QIcon::fromTheme(QStringLiteral("velmenuedit")));
-    d->restoreSize();
+    DialogSize::restore(*this, sizeGroup(), QSize(400, 480));
 }
 
 VelMenuDialog::VelMenuDialog(QWidget *parent)
@@ -170,11 +163,7 @@ VelMenuDialog::VelMenuDialog(QWidget *parent)
 
 VelMenuDialog::~VelMenuDialog()
 {
-    {
-        QSettings settings;
-        settings.setValue(QLatin1String(WidthKey), width());
-        settings.setValue(QLatin1String(HeightKey), height());
-    }
+    DialogSize::remember(*this, sizeGroup());
     updateWM();
 }
 

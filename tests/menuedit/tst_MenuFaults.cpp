@@ -35,6 +35,8 @@ private:
     static QString faultBetween(const MenuMirror &before, const MenuMirror &after, MenuMirror &found);
     static QSet<QByteArray> contentsOf(MenuMirror &mirror);
     void buildMenu();
+
+    int m_editors = 0;
 };
 
 void tst_MenuFaults::init()
@@ -67,6 +69,11 @@ void tst_MenuFaults::buildMenu()
 
 void tst_MenuFaults::start(QProcess &editor, const QStringList &arguments)
 {
+    // Settings of its own: a killed one may have left the lock of its settings behind.
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.insert(QStringLiteral("XDG_CONFIG_HOME"),
+                       path(QStringLiteral("settings%1").arg(++m_editors)));
+    editor.setProcessEnvironment(environment);
     editor.setProcessChannelMode(QProcess::ForwardedErrorChannel);
     editor.start(QStringLiteral(VEL_EDITOR_CHILD), QStringList{menu()} + arguments);
     QVERIFY(editor.waitForStarted());
@@ -246,10 +253,6 @@ void tst_MenuFaults::changesNothingWithoutPermission()
     }
     MenuMirror before = MenuMirror::ofDisk(menu());
     QProcess editor;
-    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-    environment.insert(QStringLiteral("HOME"), QStringLiteral("/nonexistent"));
-    environment.insert(QStringLiteral("XDG_CONFIG_HOME"), QStringLiteral("/nonexistent"));
-    editor.setProcessEnvironment(environment);
     start(editor, {QStringLiteral("nobody")});
     QVERIFY(finish(editor));
     MenuMirror found = MenuMirror::ofDisk(menu());
