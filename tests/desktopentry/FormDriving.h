@@ -41,6 +41,14 @@ inline void click(QWidget *button)
     QTest::mouseClick(button, Qt::LeftButton);
 }
 
+/// Runs a dialog and presses one of its buttons; the result of its loop.
+inline int runAndPress(QDialog &dialog, QPushButton *(*button)(const QWidget *))
+{
+    ModalDriver modal;
+    modal.handle([button](QWidget *window) { click(button(window)); });
+    return dialog.exec();
+}
+
 /// Replaces the text of a line as a user does.
 inline void retype(QLineEdit *line, const QString &text)
 {

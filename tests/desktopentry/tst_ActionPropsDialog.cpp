@@ -287,13 +287,8 @@ void tst_ActionPropsDialog::acceptsAndRejectsByItsButtons()
 {
     ActionPropsDialog dialog(fullAction());
     dialog.setChanged(true);
-    const auto resultOf = [&dialog](QPushButton *(*button)(const QWidget *)) {
-        ModalDriver modal;
-        modal.handle([button](QWidget *window) { click(button(window)); });
-        return dialog.exec();
-    };
-    QCOMPARE(resultOf(okButton), int(QDialog::Accepted));
-    QCOMPARE(resultOf(cancelButton), int(QDialog::Rejected));
+    QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
+    QCOMPARE(runAndPress(dialog, cancelButton), int(QDialog::Rejected));
 }
 
 VEL_TEST_MAIN(tst_ActionPropsDialog)

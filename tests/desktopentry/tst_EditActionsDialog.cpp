@@ -3,14 +3,13 @@
 
 #include "ActionSamples.h"
 #include "FormDriving.h"
+#include "ListDialogChecks.h"
 #include "TestCase.h"
 
 #include <desktopentry/EditActionsDialog.h>
 #include <desktopentry/EditActionsWidget.h>
 
-#include <QFrame>
 #include <QListWidget>
-#include <QVBoxLayout>
 
 using namespace FormDriving;
 using namespace VelUI;
@@ -31,21 +30,8 @@ private Q_SLOTS:
 void tst_EditActionsDialog::looksLikeItsForm()
 {
     EditActionsDialog dialog({});
-    QCOMPARE(dialog.objectName(), QStringLiteral("EditActionsDialog"));
-    QCOMPARE(dialog.windowTitle(), QStringLiteral("Actions"));
-    QCOMPARE(dialog.size(), QSize(400, 300));
-    auto *layout = qobject_cast<QVBoxLayout *>(dialog.layout());
-    QVERIFY(layout);
-    QCOMPARE(layout->objectName(), QStringLiteral("verticalLayout"));
-    QCOMPARE(layout->itemAt(0)->widget(), child<EditActionsWidget>(&dialog, "listWidget"));
-    auto *line = child<QFrame>(&dialog, "line");
-    QCOMPARE(layout->itemAt(1)->widget(), line);
-    QCOMPARE(line->frameShape(), QFrame::HLine);
-    QCOMPARE(line->frameShadow(), QFrame::Sunken);
-    auto *box = child<QDialogButtonBox>(&dialog, "buttonBox");
-    QCOMPARE(layout->itemAt(2)->widget(), box);
-    QCOMPARE(box->orientation(), Qt::Horizontal);
-    QCOMPARE(box->standardButtons(), QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
+    verifyListDialogForm(dialog, "EditActionsDialog", "Actions",
+                         child<EditActionsWidget>(&dialog, "listWidget"));
 }
 
 void tst_EditActionsDialog::waitsForAChange()
@@ -78,13 +64,8 @@ void tst_EditActionsDialog::acceptsAndRejectsByItsButtons()
 {
     EditActionsDialog dialog({});
     dialog.setChanged(true);
-    const auto resultOf = [&dialog](QPushButton *(*button)(const QWidget *)) {
-        ModalDriver modal;
-        modal.handle([button](QWidget *window) { click(button(window)); });
-        return dialog.exec();
-    };
-    QCOMPARE(resultOf(okButton), int(QDialog::Accepted));
-    QCOMPARE(resultOf(cancelButton), int(QDialog::Rejected));
+    QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
+    QCOMPARE(runAndPress(dialog, cancelButton), int(QDialog::Rejected));
 }
 
 VEL_TEST_MAIN(tst_EditActionsDialog)

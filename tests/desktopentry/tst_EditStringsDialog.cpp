@@ -2,14 +2,13 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "FormDriving.h"
+#include "ListDialogChecks.h"
 #include "TestCase.h"
 
 #include <desktopentry/EditStringsDialog.h>
 #include <desktopentry/EditableListWidget.h>
 
-#include <QFrame>
 #include <QListWidget>
-#include <QVBoxLayout>
 
 using namespace FormDriving;
 using VelUI::EditableListWidget;
@@ -52,21 +51,8 @@ private Q_SLOTS:
 void tst_EditStringsDialog::looksLikeItsForm()
 {
     EditStringsDialog dialog({});
-    QCOMPARE(dialog.objectName(), QStringLiteral("EditStringsDialog"));
-    QCOMPARE(dialog.windowTitle(), QStringLiteral("Strings"));
-    QCOMPARE(dialog.size(), QSize(400, 300));
-    auto *layout = qobject_cast<QVBoxLayout *>(dialog.layout());
-    QVERIFY(layout);
-    QCOMPARE(layout->objectName(), QStringLiteral("verticalLayout"));
-    QCOMPARE(layout->itemAt(0)->widget(), child<EditableListWidget>(&dialog, "listWidget"));
-    auto *line = child<QFrame>(&dialog, "line");
-    QCOMPARE(layout->itemAt(1)->widget(), line);
-    QCOMPARE(line->frameShape(), QFrame::HLine);
-    QCOMPARE(line->frameShadow(), QFrame::Sunken);
-    auto *box = child<QDialogButtonBox>(&dialog, "buttonBox");
-    QCOMPARE(layout->itemAt(2)->widget(), box);
-    QCOMPARE(box->orientation(), Qt::Horizontal);
-    QCOMPARE(box->standardButtons(), QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
+    verifyListDialogForm(dialog, "EditStringsDialog", "Strings",
+                         child<EditableListWidget>(&dialog, "listWidget"));
 }
 
 void tst_EditStringsDialog::showsTheStringsAndWaitsForAChange()
@@ -143,13 +129,8 @@ void tst_EditStringsDialog::acceptsAndRejectsByItsButtons()
 {
     EditStringsDialog dialog(abc);
     dialog.setChanged(true);
-    const auto resultOf = [&dialog](QPushButton *(*button)(const QWidget *)) {
-        ModalDriver modal;
-        modal.handle([button](QWidget *window) { click(button(window)); });
-        return dialog.exec();
-    };
-    QCOMPARE(resultOf(okButton), int(QDialog::Accepted));
-    QCOMPARE(resultOf(cancelButton), int(QDialog::Rejected));
+    QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
+    QCOMPARE(runAndPress(dialog, cancelButton), int(QDialog::Rejected));
 }
 
 VEL_TEST_MAIN(tst_EditStringsDialog)
