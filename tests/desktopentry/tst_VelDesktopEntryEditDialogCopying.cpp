@@ -1,0 +1,140 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "EntryDialogTestCase.h"
+#include "EntrySamples.h"
+#include "FormDriving.h"
+
+#include <VelDesktopEntryEditDialog.h>
+#include <VelMenuDialog.h>
+#include <VelMenuView.h>
+#include <velcore/dirs.h>
+
+#include <QDir>
+#include <QPointer>
+
+using namespace FormDriving;
+
+/// Copying from an entry that is picked in the start menu.
+class tst_VelDesktopEntryEditDialogCopying : public EntryDialogTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void copiesFromAnEntryOfTheMenu();
+    void keepsTheTargetsOwnKeysWhenCopying();
+    void switchesTheListsWhenCopying();
+    void copiesNothingWhenThePickerIsCancelled();
+    void survivesItsDeletionBehindThePicker();
+
+private:
+    static QString writeToMenu(const QString &name, const QByteArray &bytes);
+    void copyFrom(VelDesktopEntryEditDialog &dialog, const QString &menuEntry);
+};
+
+QString tst_VelDesktopEntryEditDialogCopying::writeToMenu(const QString &name, const QByteArray &bytes)
+{
+    const QString menu = QString::fromStdString(GetVelDir(VelDir::StartMenu));
+    const QString path = menu + QLatin1Char('/') + name;
+    QFile file(path);
+    if (!QDir().mkpath(menu) || !file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size())
+        qFatal("the menu cannot be written");
+    return path;
+}
+
+void tst_VelDesktopEntryEditDialogCopying::copyFrom(VelDesktopEntryEditDialog &dialog,
+                                                    const QString &menuEntry)
+{
+    ModalDriver modal;
+    modal.handle([&](QWidget *window) {
+        auto *picker = qobject_cast<VelMenuDialog *>(window);
+        QVERIFY(picker);
+        QCOMPARE(picker->parentWidget(), &dialog);
+        QCOMPARE(picker->menuDir(), QString::fromStdString(GetVelDir(VelDir::StartMenu)));
+        // It tells the window manager when it goes; nobody takes the command here.
+        modal.answer(warning(QStringLiteral("Can't send command to vel-wm")), QMessageBox::Ok);
+        if (menuEntry.isEmpty()) {
+            click(cancelButton(picker));
+            return;
+        }
+        auto *view = picker->findChild<VelMenuView *>();
+        view->showAndSelect(menuEntry);
+        QTRY_VERIFY(okButton(picker)->isEnabled());
+        click(okButton(picker));
+    });
+    click(child<QPushButton>(&dialog, "copyButton"));
+    QVERIFY(modal.finished());
+}
+
+void tst_VelDesktopEntryEditDialogCopying::copiesFromAnEntryOfTheMenu()
+{
+    const QString source = writeToMenu(QStringLiteral("full.desktop"), EntrySamples::fullApplication());
+
+    const QString file = path(QStringLiteral("new.desktop"));
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file, true));
+    copyFrom(dialog, source);
+    QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Full"));
+    QVERIFY(dialog.isWindowModified());
+    QVERIFY(dialog.windowTitle().contains(file));
+    QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
+    QVERIFY(read(file).contains("Exec=/bin/sh -c true %u\n"));
+    QCOMPARE(read(source), EntrySamples::fullApplication());
+}
+
+void tst_VelDesktopEntryEditDialogCopying::keepsTheTargetsOwnKeysWhenCopying()
+{
+    const QString source = writeToMenu(QStringLiteral("other.desktop"),
+                                       QByteArray(EntrySamples::fullApplication())
+                                           .replace("Does all", "Does more")
+                                           .replace("X-", "X-Their"));
+
+    const QByteArray bytes = EntrySamples::fullApplication() + "SortOrder=a;b;\n";
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    copyFrom(dialog, source);
+    QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
+    QCOMPARE(read(file), QByteArray(bytes).replace("Does all", "Does more"));
+}
+
+void tst_VelDesktopEntryEditDialogCopying::switchesTheListsWhenCopying()
+{
+    const QString source =
+        writeToMenu(QStringLiteral("other.desktop"), plainApplication + "NotShowIn=Elsewhere;\n");
+
+    const QString file = write(QStringLiteral("a.desktop"), plainApplication + "OnlyShowIn=VEL;\n");
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    copyFrom(dialog, source);
+    QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
+    QCOMPARE(read(file), plainApplication + "NotShowIn=Elsewhere;\n");
+}
+
+void tst_VelDesktopEntryEditDialogCopying::copiesNothingWhenThePickerIsCancelled()
+{
+    const QString file = write(QStringLiteral("a.desktop"), plainApplication);
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    copyFrom(dialog, QString());
+    QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Plain"));
+    QVERIFY(!dialog.isWindowModified());
+}
+
+void tst_VelDesktopEntryEditDialogCopying::survivesItsDeletionBehindThePicker()
+{
+    auto *dialog = new VelDesktopEntryEditDialog;
+    const QPointer<VelDesktopEntryEditDialog> alive(dialog);
+    ModalDriver modal;
+    modal.handle([&modal, dialog](QWidget *) {
+        modal.answer(warning(QStringLiteral("Can't send command to vel-wm")), QMessageBox::Ok);
+        delete dialog;
+    });
+    click(child<QPushButton>(dialog, "copyButton"));
+    QVERIFY(modal.finished());
+    QVERIFY(!alive);
+}
+
+VEL_TEST_MAIN(tst_VelDesktopEntryEditDialogCopying)
+
+#include "tst_VelDesktopEntryEditDialogCopying.moc"

@@ -1,0 +1,93 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FormDriving.h"
+#include "PropsFormTestCase.h"
+
+#include <VelDesktopEntryPropsWidget.h>
+#include <desktopentry/StringListEdit.h>
+#include <frame/DesktopEntryRecord.h>
+
+#include <QRadioButton>
+
+using namespace FormDriving;
+using namespace VelUI;
+
+/// The choice between the two lists of desktop environments.
+class tst_VelDesktopEntryPropsWidgetShowIn : public PropsFormTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void enablesTheListOfTheChosenButton();
+    void choosesTheButtonByTheLists();
+    void keepsBothListsWithoutASwitch();
+    void emptiesTheOtherListAfterASwitch();
+    void emptiesTheOtherListOfAnotherRecord();
+};
+
+void tst_VelDesktopEntryPropsWidgetShowIn::enablesTheListOfTheChosenButton()
+{
+    VelDesktopEntryPropsWidget form;
+    auto *only = child<StringListEdit>(&form, "onlyShowInEdit");
+    auto *no = child<StringListEdit>(&form, "notShowInEdit");
+    child<QRadioButton>(&form, "notShowInButton")->click();
+    QVERIFY(!only->isEnabled() && no->isEnabled());
+    QVERIFY(!child<QRadioButton>(&form, "onlyShowInButton")->isChecked());
+    child<QRadioButton>(&form, "onlyShowInButton")->click();
+    QVERIFY(only->isEnabled() && !no->isEnabled());
+}
+
+void tst_VelDesktopEntryPropsWidgetShowIn::choosesTheButtonByTheLists()
+{
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(entry("[Desktop Entry]\nType=Directory\nName=a\nNotShowIn=X;\n"));
+    QVERIFY(child<QRadioButton>(&form, "notShowInButton")->isChecked());
+    QVERIFY(child<StringListEdit>(&form, "notShowInEdit")->isEnabled());
+    form.loadFrom(entry("[Desktop Entry]\nType=Directory\nName=a\n"));
+    QVERIFY(child<QRadioButton>(&form, "onlyShowInButton")->isChecked());
+    QVERIFY(!child<StringListEdit>(&form, "notShowInEdit")->isEnabled());
+}
+
+void tst_VelDesktopEntryPropsWidgetShowIn::keepsBothListsWithoutASwitch()
+{
+    const QByteArray bytes = "[Desktop Entry]\nType=Directory\nName=a\nOnlyShowIn=X;\nNotShowIn=Y;\n";
+    VelUIDesktopEntry record = entry(bytes);
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(record);
+    child<QLineEdit>(&form, "nameEdit")->setText(QStringLiteral("b"));
+    form.saveTo(&record);
+    QVERIFY(record.save());
+    QCOMPARE(read(path(QStringLiteral("entry.desktop"))), QByteArray(bytes).replace("Name=a", "Name=b"));
+}
+
+void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListAfterASwitch()
+{
+    VelUIDesktopEntry record =
+        entry("[Desktop Entry]\nType=Directory\nName=a\nOnlyShowIn=X;\nNotShowIn=Y;\n");
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(record);
+    child<QRadioButton>(&form, "onlyShowInButton")->click();
+    form.saveTo(&record);
+    QCOMPARE(record.getOnlyShowIn(), QStringList({QStringLiteral("X")}));
+    QCOMPARE(record.getNotShowIn(), QStringList());
+    child<QRadioButton>(&form, "notShowInButton")->click();
+    form.saveTo(&record);
+    QCOMPARE(record.getOnlyShowIn(), QStringList());
+    QCOMPARE(record.getNotShowIn(), QStringList({QStringLiteral("Y")}));
+}
+
+void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListOfAnotherRecord()
+{
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(entry("[Desktop Entry]\nType=Directory\nName=a\nNotShowIn=Y;\n"));
+    VelUIDesktopEntry target =
+        entry("[Desktop Entry]\nType=Directory\nName=b\nOnlyShowIn=X;\n", QStringLiteral("b"));
+    form.saveTo(&target);
+    QCOMPARE(target.getNotShowIn(), QStringList({QStringLiteral("Y")}));
+    QCOMPARE(target.getOnlyShowIn(), QStringList());
+}
+
+VEL_TEST_MAIN(tst_VelDesktopEntryPropsWidgetShowIn)
+
+#include "tst_VelDesktopEntryPropsWidgetShowIn.moc"
