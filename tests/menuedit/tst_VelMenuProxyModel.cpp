@@ -52,6 +52,8 @@ private Q_SLOTS:
     void keepsSelectionAndExpansion();
     void livesWithALongList();
     void survivesAFolderThatVanishes();
+    void forgetsTheListOfAFolderThatGoes_data();
+    void forgetsTheListOfAFolderThatGoes();
 
 private:
     void show(const QString &rootDir);
@@ -709,6 +711,46 @@ void tst_VelMenuProxyModel::survivesAFolderThatVanishes()
     m_proxy->invalidateSortOrder(path(QStringLiteral("d")));
 
     QTRY_COMPARE(order(), words("e"));
+}
+
+void tst_VelMenuProxyModel::forgetsTheListOfAFolderThatGoes_data()
+{
+    QTest::addColumn<QString>("listed");
+    QTest::newRow("the folder itself") << "d";
+    QTest::newRow("a folder in it") << "d/sub";
+}
+
+void tst_VelMenuProxyModel::forgetsTheListOfAFolderThatGoes()
+{
+    QFETCH(QString, listed);
+    const auto fill = [this](const QString &folder, const char *list) {
+        for (const char *name : {"/a", "/b", "/c"})
+            write(folder + QLatin1String(name), "x");
+        order(words(list), folder);
+    };
+    const QString other = QStringLiteral("d2");
+    fill(listed, "c b a");
+    fill(other, "c b a");
+    show(folder());
+    QVERIFY(wait(QString(), 2));
+    QVERIFY(wait(other, 3));
+    if (listed != QLatin1String("d"))
+        QVERIFY(wait(QStringLiteral("d"), 1));
+    QVERIFY(wait(listed, 3));
+    QCOMPARE(order(listed), words("c b a"));
+
+    QVERIFY(QDir(path(QStringLiteral("d"))).removeRecursively());
+    QTRY_COMPARE(order(), QStringList{other});
+    fill(listed, "b c a");
+    order(words("b c a"), other);
+
+    QVERIFY(wait(QString(), 2));
+    if (listed != QLatin1String("d"))
+        QVERIFY(wait(QStringLiteral("d"), 1));
+    QVERIFY(wait(listed, 3));
+    QCOMPARE(order(listed), words("b c a"));
+    m_proxy->invalidate();
+    QCOMPARE(order(other), words("c b a"));
 }
 
 VEL_TEST_MAIN(tst_VelMenuProxyModel)
