@@ -83,6 +83,8 @@ private Q_SLOTS:
     void showsTheDirectoryGivenUnderItsName();
     void editsUnlessToldToLookOnly_data();
     void editsUnlessToldToLookOnly();
+    void hasOneButtonToCloseUnlessItPicks_data();
+    void hasOneButtonToCloseUnlessItPicks();
     void opensTheHelpOnF1();
     void hasAValidDesktopEntry();
 
@@ -423,6 +425,45 @@ void tst_vel_menuedit::editsUnlessToldToLookOnly()
     press(windowNamed(path(QStringLiteral("menu"))), QStringLiteral("Escape"));
     QVERIFY(finish(program));
     QCOMPARE(QDir(path(QStringLiteral("menu"))).entryList(QDir::Files).size(), readOnly ? 2 : 1);
+}
+
+void tst_vel_menuedit::hasOneButtonToCloseUnlessItPicks_data()
+{
+    QTest::addColumn<bool>("pick");
+    QTest::newRow("edit") << false;
+    QTest::newRow("pick") << true;
+}
+
+// Two steps of the focus lead from the tree past one button back to it, or to the second button.
+void tst_vel_menuedit::hasOneButtonToCloseUnlessItPicks()
+{
+    QFETCH(bool, pick);
+    for (const char *name : {"a", "b"})
+        write(QStringLiteral("menu/%1.desktop").arg(QLatin1String(name)),
+              "[Desktop Entry]\nType=Application\nName=N\nExec=true\n");
+    QStringList arguments{QStringLiteral("--dir"), path(QStringLiteral("menu"))};
+    if (pick)
+        arguments.append(QStringLiteral("--pick"));
+    QProcess program;
+    start(program, arguments);
+    const QByteArray window = windowNamed(path(QStringLiteral("menu")));
+    const QStringList editor{QStringLiteral("search"), QStringLiteral("--onlyvisible"),
+                             QStringLiteral("--name"), QStringLiteral("^Desktop Entry ")};
+    const auto isEdited = [&editor] { return !tool(QStringLiteral("xdotool"), editor).isEmpty(); };
+    // The keys may come before the rows.
+    for (int attempt = 0; attempt < 20; ++attempt) {
+        press(window, QStringLiteral("Down Up Tab Tab space"));
+        if (QTest::qWaitFor([&] { return isEdited() || program.state() == QProcess::NotRunning; }, 1000))
+            break;
+    }
+    QCOMPARE(isEdited(), !pick);
+    if (!pick) {
+        press(windowNamed(editor.constLast()), QStringLiteral("Escape"));
+        press(windowNamed(path(QStringLiteral("menu"))), QStringLiteral("Tab space"));
+    }
+    QVERIFY(finish(program));
+    QCOMPARE(program.exitCode(), pick ? 1 : 0);
+    QCOMPARE(program.readAllStandardOutput(), QByteArray());
 }
 
 void tst_vel_menuedit::opensTheHelpOnF1()
