@@ -3,6 +3,7 @@
 
 #include "FileTransfer.h"
 
+#include "OnDisk.h"
 #include "TreeCopy.h"
 
 #include <QDir>
@@ -29,12 +30,6 @@ struct Pair
 TreeCopy::Path native(const QString &path)
 {
     return TreeCopy::Path(QFile::encodeName(path).toStdString());
-}
-
-bool existsOnDisk(const QString &path)
-{
-    const QFileInfo info(path);
-    return info.isSymLink() || info.exists();
 }
 
 QString targetOf(const QString &source, const QString &directory)
@@ -98,14 +93,14 @@ Result check(const QStringList &sources, const QString &targetDirectory)
     QSet<QString> targets;
     for (const QString &source : sources) {
         const QFileInfo info(source);
-        if (source.isEmpty() || !existsOnDisk(source) || info.fileName().isEmpty())
+        if (source.isEmpty() || !OnDisk::exists(source) || info.fileName().isEmpty())
             return {Failure::SourceGone, source, QString()};
         if (wouldContainItself(info, canonical))
             return {Failure::IntoItself, source, QString()};
         if (liesIn(source, targetDirectory))
             continue;
         const QString target = targetOf(source, targetDirectory);
-        if (existsOnDisk(target) || targets.contains(target))
+        if (OnDisk::exists(target) || targets.contains(target))
             return {Failure::TargetExists, target, QString()};
         targets.insert(target);
     }

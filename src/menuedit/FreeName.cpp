@@ -3,7 +3,7 @@
 
 #include "FreeName.h"
 
-#include <QFileInfo>
+#include "OnDisk.h"
 
 namespace FreeName {
 
@@ -22,8 +22,7 @@ Name first(Kind kind, const std::function<bool(const QString &)> &taken)
 Name firstIn(const QString &folder, Kind kind)
 {
     return first(kind, [&folder](const QString &fileName) {
-        const QFileInfo info(folder + QLatin1Char('/') + fileName);
-        return info.isSymLink() || info.exists();
+        return OnDisk::exists(folder + QLatin1Char('/') + fileName);
     });
 }
 

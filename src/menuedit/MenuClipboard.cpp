@@ -3,10 +3,11 @@
 
 #include "MenuClipboard.h"
 
+#include "OnDisk.h"
+
 #include <velcore/text.h>
 
 #include <QDir>
-#include <QFileInfo>
 
 #include <cstdio>
 
@@ -27,12 +28,6 @@ QString cutMarkFormat()
     return QStringLiteral("application/x-kde-cutselection");
 }
 
-bool existsOnDisk(const QString &path)
-{
-    const QFileInfo info(path);
-    return info.isSymLink() || info.exists();
-}
-
 // A clean absolute path, a leading double slash being the root; empty when \a path is not one.
 QString cleaned(const QString &path)
 {
@@ -50,16 +45,16 @@ QString pathInLine(const QByteArray &line)
         return QString();
     const QByteArray rest = '/' + line.mid(int(sizeof UriPrefix) - 1);
     const QString literal = cleaned(QString::fromLocal8Bit(rest));
-    if (existsOnDisk(literal))
+    if (OnDisk::exists(literal))
         return literal;
     const QString decoded = cleaned(QString::fromLocal8Bit(QByteArray::fromPercentEncoding(rest)));
-    return existsOnDisk(decoded) ? decoded : QString();
+    return OnDisk::exists(decoded) ? decoded : QString();
 }
 
 QString pathOf(const QUrl &url, const QByteArray &line)
 {
     const QString path = cleaned(url.toLocalFile());
-    if (url.isValid() && existsOnDisk(path))
+    if (url.isValid() && OnDisk::exists(path))
         return path;
     const QString fromLine = pathInLine(line);
     return fromLine.isEmpty() ? path : fromLine;
@@ -88,7 +83,7 @@ QStringList pathsOfCopiedFiles(const QMimeData *data)
     lines.removeFirst();
     for (const QByteArray &line : qAsConst(lines)) {
         const QString path = cleaned(QUrl::fromEncoded(line, QUrl::StrictMode).toLocalFile());
-        if (!existsOnDisk(path))
+        if (!OnDisk::exists(path))
             return QStringList();
         paths.append(path);
     }

@@ -3,6 +3,7 @@
 
 #include "FileTransfer.h"
 #include "MenuClipboard.h"
+#include "OnDisk.h"
 #include "VelMenuModel.h"
 #include "VelMenuView.h"
 
@@ -125,8 +126,7 @@ bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, in
 bool VelMenuModel::dropIntoOwnFolder(const Drop &drop)
 {
     // What is gone must not be listed.
-    const QFileInfo source(drop.sources.constFirst());
-    if (!source.exists() && !source.isSymLink()) {
+    if (!OnDisk::exists(drop.sources.constFirst())) {
         tellAtItem(drop.target,
                    failureText({FileTransfer::Failure::SourceGone, drop.target, QString()}, drop.action));
         return false;
