@@ -4,6 +4,7 @@
 #include "EntryName.h"
 #include "FreeName.h"
 #include "MessageBox.h"
+#include "OnDisk.h"
 #include "SortOrder.h"
 #include "VelDesktopEntryEditDialog.h"
 #include "VelMenuModel.h"
@@ -40,19 +41,29 @@ bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelI
         record.setLocalName(tr("Group"));
     }
 
-    const QModelIndex shown = d->proxy->mapFromSource(folder);
-    const int count = d->proxy->rowCount(shown);
     QStringList children;
-    int place = row == d->model->rowCount(folder) ? count : -1;
-    for (int i = 0; i < count; ++i) {
-        const QModelIndex child = d->proxy->mapToSource(d->proxy->index(i, 0, shown));
-        if (child.row() == row)
-            place = i;
-        children.append(child.data(QFileSystemModel::FileNameRole).toString());
-    }
+    const int place = d->listChildren(folder, row, &children);
     record.setSortOrder(SortOrder::rewritten(children, name, place));
     record.save();
     return true;
+}
+
+int VelMenuViewPrivate::listChildren(const QModelIndex &folder, int row, QStringList *names) const
+{
+    // The row of a file that went stands for a moment longer.
+    const std::optional<QSet<QString>> present = OnDisk::namesIn(model->filePath(folder));
+    const QModelIndex shown = proxy->mapFromSource(folder);
+    const int count = proxy->rowCount(shown);
+    int place = -1;
+    for (int i = 0; i < count; ++i) {
+        const QModelIndex child = proxy->mapToSource(proxy->index(i, 0, shown));
+        if (child.row() == row)
+            place = names->size();
+        const QString name = child.data(QFileSystemModel::FileNameRole).toString();
+        if (!present || present->contains(name))
+            names->append(name);
+    }
+    return row == model->rowCount(folder) ? names->size() : place;
 }
 
 void VelMenuView::fixSortOrderInDir(const QModelIndex &item, bool up)

@@ -20,6 +20,8 @@ private Q_SLOTS:
     void deletesAfterAsking();
     void forgetsWhatItDeletes();
     void leavesADeletedNameInTheListUntilItIsRewritten();
+    void listsADeletedItemNoMoreWhileItsRowStands_data();
+    void listsADeletedItemNoMoreWhileItsRowStands();
     void deletesALinkAndNotWhatItLeadsTo_data();
     void deletesALinkAndNotWhatItLeadsTo();
     void selectsNothingWhenTheDeletedRowGoes_data();
@@ -102,6 +104,35 @@ void tst_VelMenuViewDelete::leavesADeletedNameInTheListUntilItIsRewritten()
     select(view, menu() + QLatin1String("/a.desktop"));
     view.slotUp();
     QCOMPARE(sortOrderOf(menu()), QByteArray("*;a.desktop;c.desktop;"));
+}
+
+void tst_VelMenuViewDelete::listsADeletedItemNoMoreWhileItsRowStands_data()
+{
+    QTest::addColumn<QString>("item");
+    QTest::newRow("file") << "b.desktop";
+    QTest::newRow("folder") << "sub";
+}
+
+void tst_VelMenuViewDelete::listsADeletedItemNoMoreWhileItsRowStands()
+{
+    QFETCH(QString, item);
+    writeFolder(QString(), QStringLiteral("Menu"), "c.desktop;b.desktop;sub;a.desktop;");
+    writeLetters("abc");
+    writeLetters("d", QStringLiteral("sub/"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 4));
+    select(view, menu() + QLatin1Char('/') + item);
+    ModalDriver modal;
+    announceDeleteQuestion(modal, QMessageBox::Yes);
+    view.slotDel();
+    QVERIFY(modal.finished());
+    select(view, menu() + QLatin1String("/a.desktop"));
+    view.slotUp();
+    QCOMPARE(names(view, menu()).size(), 4);
+    QVERIFY(!sortOrderOf(menu()).contains(item.toUtf8()));
+    // What was selected meanwhile stays so when the row goes.
+    QTRY_COMPARE(names(view, menu()).size(), 3);
+    QCOMPARE(view.selectedPath(), menu() + QLatin1String("/a.desktop"));
 }
 
 void tst_VelMenuViewDelete::deletesALinkAndNotWhatItLeadsTo_data()

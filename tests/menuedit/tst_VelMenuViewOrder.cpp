@@ -22,6 +22,9 @@ private Q_SLOTS:
     void listsChildrenInTheOrderShownWithTheNewOneInItsPlace();
     void makesARecordForAFolderWithoutOne();
     void listsOnlyWhatIsShown();
+    void listsNoChildThatIsGone_data();
+    void listsNoChildThatIsGone();
+    void listsALinkWhoseTargetIsGone();
     void keepsTheRestOfAFoldersRecord();
     void leavesARecordThatCannotBeRead_data();
     void leavesARecordThatCannotBeRead();
@@ -104,6 +107,65 @@ void tst_VelMenuViewOrder::listsOnlyWhatIsShown()
     // Before a row that is not shown is nowhere.
     QVERIFY(view.fixSortOrderForNew(QStringLiteral("x.desktop"), files(view)->index(hidden).row(), folder));
     QCOMPARE(sortOrderOf(menu()), QByteArray("*;b.desktop;a.desktop;"));
+}
+
+void tst_VelMenuViewOrder::listsNoChildThatIsGone_data()
+{
+    QTest::addColumn<QString>("gone");
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QString>("before");
+    QTest::addColumn<QByteArray>("order");
+    // Shown are c, a, b.
+    const auto row = [](const char *title, const char *gone, const char *name, const char *before,
+                        const char *order) {
+        const auto entry = [](const char *letter) {
+            return QLatin1String(letter) + QStringLiteral(".desktop");
+        };
+        QTest::newRow(title) << entry(gone) << entry(name) << entry(before) << QByteArray(order);
+    };
+    row("before one behind it", "a", "x", "b", "*;c.desktop;x.desktop;b.desktop;");
+    row("before itself", "a", "x", "a", "*;c.desktop;x.desktop;b.desktop;");
+    row("before itself, the last", "b", "x", "b", "*;c.desktop;a.desktop;x.desktop;");
+    row("at the end", "a", "x", "end", "*;c.desktop;b.desktop;x.desktop;");
+    row("a child upwards", "a", "b", "a", "*;c.desktop;b.desktop;");
+    row("comes back", "a", "a", "c", "*;a.desktop;c.desktop;b.desktop;");
+}
+
+void tst_VelMenuViewOrder::listsNoChildThatIsGone()
+{
+    QFETCH(QString, gone);
+    QFETCH(QString, name);
+    QFETCH(QString, before);
+    QFETCH(QByteArray, order);
+    writeFolder(QString(), QStringLiteral("Menu"), "c.desktop;a.desktop;b.desktop;");
+    writeLetters("abc");
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 3));
+    const QModelIndex folder = files(view)->index(menu());
+    int row = files(view)->rowCount(folder);
+    for (int i = 0; i < files(view)->rowCount(folder); ++i) {
+        if (files(view)->index(i, 0, folder).data(QFileSystemModel::FileNameRole) == before)
+            row = i;
+    }
+
+    QVERIFY(QFile::remove(menu() + QLatin1Char('/') + gone));
+    QVERIFY(view.fixSortOrderForNew(name, row, folder));
+
+    // Nobody has noticed yet.
+    QCOMPARE(files(view)->rowCount(folder), 3);
+    QCOMPARE(sortOrderOf(menu()), order);
+}
+
+void tst_VelMenuViewOrder::listsALinkWhoseTargetIsGone()
+{
+    const QString target = write(QStringLiteral("outside/t.desktop"), entryText(QStringLiteral("T")));
+    QVERIFY(QFile::link(target, menu() + QLatin1String("/l.desktop")));
+    writeLetters("a");
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 2));
+    QVERIFY(QFile::remove(target));
+    QVERIFY(view.fixSortOrderForNew(QStringLiteral("x.desktop"), 2, files(view)->index(menu())));
+    QCOMPARE(sortOrderOf(menu()), QByteArray("*;a.desktop;l.desktop;x.desktop;"));
 }
 
 void tst_VelMenuViewOrder::keepsTheRestOfAFoldersRecord()
