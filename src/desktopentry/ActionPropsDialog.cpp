@@ -3,6 +3,7 @@
 
 #include "ActionPropsDialog.h"
 
+#include "FieldValue.h"
 #include "FormLayout.h"
 #include "IconEdit.h"
 #include "LocalisedLabel.h"
@@ -89,12 +90,12 @@ void ActionPropsDialog::addShowInRows(FormLayout *layout)
 
 void ActionPropsDialog::load(const VelUIDesktopAction &action)
 {
-    m_id->setText(action.getId());
-    m_name->setText(action.getName());
-    m_localName->setText(action.getLocalName());
-    m_icon->setIcon(action.getIcon());
-    m_localIcon->setIcon(action.getLocalIcon());
-    m_exec->setText(action.getExec());
+    setFieldValue(m_id, action.getId());
+    setFieldValue(m_name, action.getName());
+    setFieldValue(m_localName, action.getLocalName());
+    setFieldValue(m_icon, action.getIcon());
+    setFieldValue(m_localIcon, action.getLocalIcon());
+    setFieldValue(m_exec, action.getExec());
     ShowInChoice{m_onlyShowInButton, m_onlyShowIn, m_notShowInButton, m_notShowIn}.load(
         action.getOnlyShowIn(), action.getNotShowIn());
 }

@@ -18,7 +18,8 @@ class IconEdit;
 class PathEdit;
 class StringListEdit;
 
-// One way to read and to write a field, whatever its kind. An empty value clears the field.
+// One way to read and to write a field, whatever its kind. An empty value clears the field; of a
+// value longer than its line the beginning is shown.
 
 QString fieldValue(const QLineEdit *field);
 QString fieldValue(const IconEdit *field);

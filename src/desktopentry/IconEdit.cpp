@@ -35,6 +35,7 @@ IconEdit::IconEdit(QWidget *parent)
 void IconEdit::setIcon(const QString &icon)
 {
     m_lineEdit->setText(icon);
+    m_lineEdit->setCursorPosition(0);
     m_button->setIcon(icon);
 }
 

@@ -53,6 +53,7 @@ void PathEdit::clear()
 void PathEdit::setText(const QString &text)
 {
     m_lineEdit->setText(text);
+    m_lineEdit->setCursorPosition(0); // the program is what matters
 }
 
 void PathEdit::selectPathButtonClicked()

@@ -54,6 +54,7 @@ private Q_SLOTS:
     void enablesOkForAChangeInAnyField_data();
     void enablesOkForAChangeInAnyField();
     void enablesOkForAChosenIcon();
+    void enablesOkForAnEditedList_data();
     void enablesOkForAnEditedList();
     void togglingTheRadioButtonsIsNoChange();
     void needsIdNameAndCommand_data();
@@ -64,6 +65,7 @@ private Q_SLOTS:
     void givesBackWhatItWasGiven();
     void namesTheListDialogs();
     void reachesEveryRowByTab();
+    void showsTheBeginningOfLongValues();
     void acceptsAndRejectsByItsButtons();
 };
 
@@ -147,19 +149,32 @@ void tst_ActionPropsDialog::enablesOkForAChosenIcon()
     QCOMPARE(dialog.action().getLocalIcon(), QStringLiteral("folder"));
 }
 
+void tst_ActionPropsDialog::enablesOkForAnEditedList_data()
+{
+    QTest::addColumn<QString>("button");
+    QTest::addColumn<QString>("list");
+    QTest::newRow("only show in") << QStringLiteral("onlyShowInButton") << QStringLiteral("onlyShowInEdit");
+    QTest::newRow("not show in") << QStringLiteral("notShowInButton") << QStringLiteral("notShowInEdit");
+}
+
 void tst_ActionPropsDialog::enablesOkForAnEditedList()
 {
+    QFETCH(QString, button);
+    QFETCH(QString, list);
     ActionPropsDialog dialog(fullAction());
+    auto *edit = dialog.findChild<StringListEdit *>(list);
+    edit->setStrings({QStringLiteral("gone"), QStringLiteral("a;b")});
+    dialog.findChild<QRadioButton *>(button)->click();
     ModalDriver modal;
     modal.handle([](QWidget *window) {
         window->findChild<QListWidget *>()->setCurrentRow(0);
         click(child<QPushButton>(window, "deleteButton"));
         click(okButton(window));
     });
-    click(child<StringListEdit>(&dialog, "onlyShowInEdit")->findChild<QToolButton *>());
+    click(edit->findChild<QToolButton *>());
     QVERIFY(modal.finished());
     QVERIFY(okButton(&dialog)->isEnabled());
-    QCOMPARE(dialog.action().getOnlyShowIn(), QStringList({QStringLiteral("a;b")}));
+    QCOMPARE(edit->strings(), QStringList({QStringLiteral("a;b")}));
 }
 
 void tst_ActionPropsDialog::togglingTheRadioButtonsIsNoChange()
@@ -281,6 +296,13 @@ void tst_ActionPropsDialog::reachesEveryRowByTab()
         names.join(QLatin1Char('|')),
         QStringLiteral("Id|Name|Name [de]|Icon|Edit Icon|Icon [de]|Edit Icon [de]|Only show in|Only show in|"
                        "Edit Only show in|Not show in|Exec|Edit Exec"));
+}
+
+void tst_ActionPropsDialog::showsTheBeginningOfLongValues()
+{
+    ActionPropsDialog dialog(fullAction());
+    for (const QLineEdit *line : dialog.findChildren<QLineEdit *>())
+        QCOMPARE(line->cursorPosition(), 0);
 }
 
 void tst_ActionPropsDialog::acceptsAndRejectsByItsButtons()

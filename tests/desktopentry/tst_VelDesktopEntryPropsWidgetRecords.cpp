@@ -25,6 +25,7 @@ class tst_VelDesktopEntryPropsWidgetRecords : public PropsFormTestCase
 
 private Q_SLOTS:
     void loadsEveryKey();
+    void showsTheBeginningOfLongValues();
     void savesEveryKey();
     void writesNothingForNull();
     void changesNothingInARecordThatItLoaded();
@@ -74,6 +75,16 @@ void tst_VelDesktopEntryPropsWidgetRecords::loadsEveryKey()
     QCOMPARE(typeBox(form)->currentData().toString(), link);
     QCOMPARE(line("urlEdit"), QStringLiteral("https://www.freedesktop.org"));
     QCOMPARE(line("execEdit"), QString());
+}
+
+void tst_VelDesktopEntryPropsWidgetRecords::showsTheBeginningOfLongValues()
+{
+    VelDesktopEntryPropsWidget form;
+    for (const QByteArray &bytes : {EntrySamples::fullApplication(), EntrySamples::link()}) {
+        form.loadFrom(entry(bytes));
+        for (const QLineEdit *line : form.findChildren<QLineEdit *>())
+            QCOMPARE(line->cursorPosition(), 0);
+    }
 }
 
 void tst_VelDesktopEntryPropsWidgetRecords::savesEveryKey()
