@@ -352,19 +352,18 @@ void VelDesktopEntryPropsWidgetPrivate::loadShowIn(const VelUIDesktopEntry &entr
 
 void VelDesktopEntryPropsWidgetPrivate::saveShowIn(VelUIDesktopEntry *entry) const
 {
-    const bool only = onlyShowInButton->isChecked();
+    if (onlyShowInButton->isChecked()) {
+        entry->setOnlyShowIn(onlyShowIn->strings());
+        entry->setNotShowIn({});
+        return;
+    }
     // An entry that holds both lists keeps them, unless something else was chosen: here, or
     // in the other entry that the form was filled from.
-    const bool switched = showInSwitched || only != entry->getNotShowIn().isEmpty();
-    if (only) {
-        entry->setOnlyShowIn(onlyShowIn->strings());
-        if (switched || notShowIn->strings() != entry->getNotShowIn())
-            entry->setNotShowIn({});
-    } else {
-        entry->setNotShowIn(notShowIn->strings());
-        if (switched || onlyShowIn->strings() != entry->getOnlyShowIn())
-            entry->setOnlyShowIn({});
-    }
+    const bool keepsBoth = !showInSwitched && !entry->getNotShowIn().isEmpty()
+        && onlyShowIn->strings() == entry->getOnlyShowIn();
+    entry->setNotShowIn(notShowIn->strings());
+    if (!keepsBoth)
+        entry->setOnlyShowIn({});
 }
 
 void VelDesktopEntryPropsWidgetPrivate::setReadOnly(bool on)

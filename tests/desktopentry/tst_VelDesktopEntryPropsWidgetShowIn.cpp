@@ -23,6 +23,7 @@ private Q_SLOTS:
     void choosesTheButtonByTheLists();
     void keepsBothListsWithoutASwitch();
     void emptiesTheOtherListAfterASwitch();
+    void emptiesTheOtherListOfAnotherRecord_data();
     void emptiesTheOtherListOfAnotherRecord();
 };
 
@@ -77,12 +78,20 @@ void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListAfterASwitch()
     QCOMPARE(record.getNotShowIn(), QStringList({QStringLiteral("Y")}));
 }
 
+void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListOfAnotherRecord_data()
+{
+    QTest::addColumn<QByteArray>("lists");
+    QTest::newRow("the other one") << QByteArray("OnlyShowIn=X;\n");
+    QTest::newRow("both") << QByteArray("OnlyShowIn=X;\nNotShowIn=Z;\n");
+}
+
 void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListOfAnotherRecord()
 {
+    QFETCH(QByteArray, lists);
     VelDesktopEntryPropsWidget form;
     form.loadFrom(entry("[Desktop Entry]\nType=Directory\nName=a\nNotShowIn=Y;\n"));
     VelUIDesktopEntry target =
-        entry("[Desktop Entry]\nType=Directory\nName=b\nOnlyShowIn=X;\n", QStringLiteral("b"));
+        entry("[Desktop Entry]\nType=Directory\nName=b\n" + lists, QStringLiteral("b"));
     form.saveTo(&target);
     QCOMPARE(target.getNotShowIn(), QStringList({QStringLiteral("Y")}));
     QCOMPARE(target.getOnlyShowIn(), QStringList());
