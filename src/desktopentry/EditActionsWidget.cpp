@@ -50,7 +50,6 @@ void EditActionsWidget::setActions(const QList<VelUIDesktopAction> &actions)
     m_ui.listWidget->clear();
     for (const VelUIDesktopAction &action : actions)
         appendItem(action);
-    updateButtonsAvailability();
 }
 
 QList<VelUIDesktopAction> EditActionsWidget::actions() const

@@ -44,7 +44,6 @@ void EditableListWidget::setStrings(const QStringList &strings)
 {
     m_ui.listWidget->clear();
     m_ui.listWidget->addItems(strings);
-    updateButtonsAvailability();
 }
 
 QStringList EditableListWidget::strings() const

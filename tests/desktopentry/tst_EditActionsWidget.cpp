@@ -34,6 +34,7 @@ private Q_SLOTS:
     void editsNothingWithoutACurrentItem();
     void namesTheDialogsByTheTextsGiven();
     void enablesTheButtonsByTheSelection();
+    void keepsTheButtonsRightWhenActionsComeAndGo();
     void deletesAndMoves();
     void survivesItsDeletionBehindTheDialog();
 };
@@ -235,6 +236,28 @@ void tst_EditActionsWidget::enablesTheButtonsByTheSelection()
     list->setSelectionMode(QAbstractItemView::MultiSelection);
     list->selectAll();
     QCOMPARE(enabled(), QStringLiteral("Add... Delete"));
+}
+
+void tst_EditActionsWidget::keepsTheButtonsRightWhenActionsComeAndGo()
+{
+    EditActionsWidget widget;
+    widget.setActions(actions({"a"}));
+    child<QListWidget>(&widget, "listWidget")->setCurrentRow(0);
+    auto *down = child<QPushButton>(&widget, "downButton");
+    QVERIFY(!down->isEnabled());
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        retype(child<QLineEdit>(window, "nameEdit"), QStringLiteral("New"));
+        retype(child<PathEdit>(window, "execEdit")->findChild<QLineEdit *>(), QStringLiteral("/bin/true"));
+        click(okButton(window));
+    });
+    widget.addAction();
+    QVERIFY(modal.finished());
+    QVERIFY(down->isEnabled());
+
+    widget.setActions(actions({"b", "c"}));
+    for (const QPushButton *button : widget.findChildren<QPushButton *>())
+        QCOMPARE(button->isEnabled(), button->objectName() == QLatin1String("addButton"));
 }
 
 void tst_EditActionsWidget::deletesAndMoves()
