@@ -201,6 +201,7 @@ void tst_StringListEdit::givesItsTextsToTheDialog_data()
         texts[i] = all.at(i);
         QTest::newRow(qPrintable(all.at(i))) << texts;
     }
+    QTest::newRow("set to nothing") << QStringList{QStringLiteral(""), QString(), QString(), QString()};
 }
 
 void tst_StringListEdit::givesItsTextsToTheDialog()

@@ -38,6 +38,7 @@ private Q_SLOTS:
     void namesTheActionDialogs();
     void asksForMimeTypesByExtension();
     void switchesToReadOnlyAndBack();
+    void leavesTheFieldsWhenTheSwitchStandsThereAlready();
     void showsTheUrlButtonOnlyWhenAskedFor();
     void requestsInformationAboutTheUrl();
     void passesTheFrameStyleOn();
@@ -232,6 +233,20 @@ void tst_VelDesktopEntryPropsWidget::switchesToReadOnlyAndBack()
     }
     QVERIFY(!child<StringListEdit>(&form, "notShowInEdit")->isEnabled());
     QCOMPARE(child<QLineEdit>(&form, "nameEdit")->text(), QStringLiteral("Full"));
+}
+
+void tst_VelDesktopEntryPropsWidget::leavesTheFieldsWhenTheSwitchStandsThereAlready()
+{
+    VelDesktopEntryPropsWidget form;
+    form.setType(link, {});
+    auto *name = child<QLineEdit>(&form, "nameEdit");
+    name->setReadOnly(true);
+    form.setReadOnly(false);
+    QVERIFY(name->isReadOnly());
+    auto *button = child<QToolButton>(&form, "urlInfoButton");
+    button->setVisible(true);
+    form.setShowURLInfoButton(false);
+    QVERIFY(!button->isHidden());
 }
 
 void tst_VelDesktopEntryPropsWidget::showsTheUrlButtonOnlyWhenAskedFor()

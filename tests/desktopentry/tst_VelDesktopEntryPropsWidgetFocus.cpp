@@ -39,22 +39,33 @@ QStringList namesReachedByTab(QWidget *form)
     return names;
 }
 
-// Every text twice as long.
-class Doubler : public QTranslator
+// Repeats the texts of the form: all of them, or the one that it is told.
+class Repeater : public QTranslator
 {
 public:
+    explicit Repeater(int times, const QString &only = QString())
+        : m_times(times)
+        , m_only(only)
+    {
+    }
     QString translate(const char *context, const char *source, const char *, int) const override
     {
-        if (QLatin1String(context) != QLatin1String("VelDesktopEntryPropsWidgetPrivate"))
+        const QString text = QString::fromLatin1(source);
+        if (QLatin1String(context) != QLatin1String("VelDesktopEntryPropsWidgetPrivate")
+            || (!m_only.isEmpty() && text != m_only))
             return {};
-        return QString::fromLatin1(source) + QLatin1Char(' ') + QString::fromLatin1(source);
+        return QString(text + QLatin1Char(' ')).repeated(m_times);
     }
     bool isEmpty() const override { return false; }
+
+private:
+    const int m_times;
+    const QString m_only;
 };
 
 } // namespace
 
-/// The way of the keyboard through the form, and what is in view on it.
+/// The way of the keyboard through the form, and what is in view.
 class tst_VelDesktopEntryPropsWidgetFocus : public PropsFormTestCase
 {
     Q_OBJECT
@@ -65,6 +76,8 @@ private Q_SLOTS:
     void scrollsToTheFocusedField_data();
     void scrollsToTheFocusedField();
     void staysWhereItIsUnderThePressedMouse();
+    void fitsIntoItsWindowWithLongNamesOfTypes();
+    void keepsTheRowsTogetherInATallWindow();
 };
 
 void tst_VelDesktopEntryPropsWidgetFocus::reachesEveryRowByTab_data()
@@ -115,7 +128,7 @@ void tst_VelDesktopEntryPropsWidgetFocus::scrollsToTheFocusedField_data()
 void tst_VelDesktopEntryPropsWidgetFocus::scrollsToTheFocusedField()
 {
     QFETCH(bool, longLabels);
-    Doubler doubler;
+    Repeater doubler(2);
     if (longLabels)
         QCoreApplication::installTranslator(&doubler);
     VelDesktopEntryPropsWidget form;
@@ -158,6 +171,28 @@ void tst_VelDesktopEntryPropsWidgetFocus::staysWhereItIsUnderThePressedMouse()
     QVERIFY(name->hasFocus());
     QCOMPARE(bar->value(), before);
     QTest::mouseRelease(name, Qt::LeftButton, Qt::NoModifier, QPoint(5, name->height() - 3));
+}
+
+void tst_VelDesktopEntryPropsWidgetFocus::fitsIntoItsWindowWithLongNamesOfTypes()
+{
+    Repeater repeater(20, application);
+    QCoreApplication::installTranslator(&repeater);
+    VelDesktopEntryPropsWidget form;
+    QCoreApplication::removeTranslator(&repeater);
+    form.resize(560, 380);
+    form.show();
+    QVERIFY(typeBox(form)->currentText().size() > 200);
+    QCOMPARE(form.findChild<QScrollArea *>()->horizontalScrollBar()->maximum(), 0);
+}
+
+void tst_VelDesktopEntryPropsWidgetFocus::keepsTheRowsTogetherInATallWindow()
+{
+    VelDesktopEntryPropsWidget form;
+    form.setType(directory, {});
+    form.resize(560, 2000);
+    form.show();
+    const auto *name = child<QLineEdit>(&form, "nameEdit");
+    QVERIFY(child<QLineEdit>(&form, "localNameEdit")->y() - name->y() < 2 * name->height());
 }
 
 VEL_TEST_MAIN(tst_VelDesktopEntryPropsWidgetFocus)
