@@ -24,6 +24,8 @@ private Q_SLOTS:
     void copiesFromAnEntryOfTheMenu();
     void keepsTheTargetsOwnKeysWhenCopying();
     void switchesTheListsWhenCopying();
+    void marksACopyAsAChange();
+    void copiesNothingFromAFileThatDoesNotLoad();
     void copiesNothingWhenThePickerIsCancelled();
     void survivesItsDeletionBehindThePicker();
 
@@ -109,6 +111,26 @@ void tst_VelDesktopEntryEditDialogCopying::switchesTheListsWhenCopying()
     copyFrom(dialog, source);
     QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
     QCOMPARE(read(file), plainApplication + "NotShowIn=Elsewhere;\n");
+}
+
+void tst_VelDesktopEntryEditDialogCopying::marksACopyAsAChange()
+{
+    const QString source = writeToMenu(QStringLiteral("page.desktop"), EntrySamples::link());
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(path(QStringLiteral("new.desktop")), true));
+    copyFrom(dialog, source);
+    QCOMPARE(type(&dialog), QStringLiteral("Link"));
+    QVERIFY(dialog.isWindowModified());
+}
+
+void tst_VelDesktopEntryEditDialogCopying::copiesNothingFromAFileThatDoesNotLoad()
+{
+    const QString source = writeToMenu(QStringLiteral("a.desktop"), QByteArray(2 << 20, '#'));
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(write(QStringLiteral("b.desktop"), plainApplication)));
+    copyFrom(dialog, source);
+    QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Plain"));
+    QVERIFY(!dialog.isWindowModified());
 }
 
 void tst_VelDesktopEntryEditDialogCopying::copiesNothingWhenThePickerIsCancelled()

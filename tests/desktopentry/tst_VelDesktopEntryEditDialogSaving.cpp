@@ -38,7 +38,9 @@ private Q_SLOTS:
     void savesAgainAfterAnAcceptedChange();
     void keepsPermissionsAndLinks();
     void dropsTheKeysOfTheOldType();
+    void savesThePositionOnTheDesktop_data();
     void savesThePositionOnTheDesktop();
+    void warnsOfAPositionElsewhereAfterSaving_data();
     void warnsOfAPositionElsewhereAfterSaving();
     void savesNoPositionWithoutOne();
     void survivesItsDeletionBehindAWarning_data();
@@ -273,25 +275,47 @@ void tst_VelDesktopEntryEditDialogSaving::dropsTheKeysOfTheOldType()
     QVERIFY(bytes.contains("X-Vendor-Key=keep me\n"));
 }
 
+void tst_VelDesktopEntryEditDialogSaving::savesThePositionOnTheDesktop_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QPoint>("place");
+    QTest::newRow("blank in the name") << QStringLiteral("my entry.desktop") << QPoint(120, 34);
+    QTest::newRow("another script") << QString::fromUtf8("Ж.desktop") << QPoint(0, 0);
+    QTest::newRow("another screen") << QStringLiteral("a.desktop") << QPoint(-1, -700);
+}
+
 void tst_VelDesktopEntryEditDialogSaving::savesThePositionOnTheDesktop()
 {
+    QFETCH(QString, name);
+    QFETCH(QPoint, place);
     const QString desktop = QString::fromStdString(GetVelDir(VelDir::Desktop));
     QVERIFY(QDir().mkpath(desktop));
-    const QString file = desktop + QStringLiteral("/my entry.desktop");
     VelDesktopEntryEditDialog dialog;
-    QVERIFY(dialog.setDesktopEntryPath(file, true, write(QStringLiteral("pattern"), plainApplication)));
-    dialog.setDesktopEntryCoords(120, 34);
+    QVERIFY(dialog.setDesktopEntryPath(desktop + QLatin1Char('/') + name, true,
+                                       write(QStringLiteral("pattern"), plainApplication)));
+    dialog.setDesktopEntryCoords(place.x(), place.y());
     QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
     int x = 0;
     int y = 0;
-    QVERIFY(ReadDesktopItemPosition("my entry.desktop", &x, &y));
-    QCOMPARE(x, 120);
-    QCOMPARE(y, 34);
+    QVERIFY(ReadDesktopItemPosition(QFile::encodeName(name).constData(), &x, &y));
+    QCOMPARE(QPoint(x, y), place);
+}
+
+void tst_VelDesktopEntryEditDialogSaving::warnsOfAPositionElsewhereAfterSaving_data()
+{
+    QTest::addColumn<bool>("belowTheDesktop");
+    QTest::newRow("elsewhere") << false;
+    QTest::newRow("below the desktop") << true;
 }
 
 void tst_VelDesktopEntryEditDialogSaving::warnsOfAPositionElsewhereAfterSaving()
 {
-    const QString file = path(QStringLiteral("a.desktop"));
+    QFETCH(bool, belowTheDesktop);
+    const QString desktop = QString::fromStdString(GetVelDir(VelDir::Desktop));
+    const QString folder =
+        belowTheDesktop ? desktop + QStringLiteral("/below") : path(QStringLiteral("elsewhere"));
+    QVERIFY(QDir().mkpath(folder));
+    const QString file = folder + QStringLiteral("/elsewhere.desktop");
     VelDesktopEntryEditDialog dialog;
     QVERIFY(dialog.setDesktopEntryPath(file, true, write(QStringLiteral("pattern"), plainApplication)));
     dialog.setDesktopEntryCoords(1, 2);
@@ -306,6 +330,9 @@ void tst_VelDesktopEntryEditDialogSaving::warnsOfAPositionElsewhereAfterSaving()
     });
     QCOMPARE(dialog.exec(), int(QDialog::Accepted));
     QVERIFY(modal.finished());
+    int x = 0;
+    int y = 0;
+    QVERIFY(!ReadDesktopItemPosition("elsewhere.desktop", &x, &y));
 }
 
 void tst_VelDesktopEntryEditDialogSaving::savesNoPositionWithoutOne()
