@@ -19,53 +19,12 @@
 #include <QPushButton>
 #include <QToolBar>
 
-#include <functional>
 #include <memory>
 
 // Last: the macros of Xlib's header hide names of Qt.
-#include <X11/Xlib.h>
+#include "CommandChannel.h"
 
 namespace {
-
-/// Owns the selection of the window manager and collects the raw bytes that arrive.
-class CommandChannel
-{
-public:
-    CommandChannel()
-        : m_display(XOpenDisplay(nullptr))
-        , m_window(XCreateSimpleWindow(m_display, DefaultRootWindow(m_display), 0, 0, 1, 1, 0, 0, 0))
-        , m_property(XInternAtom(m_display, "_VELWM_COMMAND", 0))
-    {
-        const QByteArray selection = "_VELWM_COMMAND_S" + QByteArray::number(DefaultScreen(m_display));
-        XSelectInput(m_display, m_window, PropertyChangeMask);
-        XSetSelectionOwner(m_display, XInternAtom(m_display, selection.constData(), 0), m_window,
-                           CurrentTime);
-        XSync(m_display, 0);
-    }
-    ~CommandChannel() { XCloseDisplay(m_display); }
-    Q_DISABLE_COPY_MOVE(CommandChannel)
-
-    QByteArray bytes()
-    {
-        Atom type = 0;
-        int format = 0;
-        unsigned long count = 0;
-        unsigned long rest = 0;
-        unsigned char *data = nullptr;
-        XGetWindowProperty(m_display, m_window, m_property, 0, 1024, 1, AnyPropertyType, &type, &format,
-                           &count, &rest, &data);
-        if (data)
-            m_bytes += QByteArray(reinterpret_cast<const char *>(data), int(count));
-        XFree(data);
-        return m_bytes;
-    }
-
-private:
-    Display *m_display;
-    Window m_window;
-    Atom m_property;
-    QByteArray m_bytes;
-};
 
 /// A place for xdotool, from the window's corner: Qt may not have heard yet where that is.
 QString at(const QWidget *widget, const QPoint &place)
@@ -73,17 +32,6 @@ QString at(const QWidget *widget, const QPoint &place)
     const QWidget *window = widget->window();
     const QPoint inside = widget->mapTo(window, place);
     return QStringLiteral("--window %1 %2 %3").arg(window->winId()).arg(inside.x()).arg(inside.y());
-}
-
-/// The next modal window is handed to \a act, and closed when that fails.
-void handle(ModalDriver &modal, const std::function<void(QWidget *)> &act)
-{
-    modal.handle([act](QWidget *window) {
-        const QPointer<QWidget> guarded(window);
-        act(window);
-        if (guarded && QTest::currentTestFailed())
-            guarded->close();
-    });
 }
 
 } // namespace
@@ -192,7 +140,7 @@ void tst_MenuEndToEnd::fillIn(QWidget *editor, const char *field, const QString 
 void tst_MenuEndToEnd::createEntry()
 {
     ModalDriver modal;
-    handle(modal, [](QWidget *editor) {
+    modal.handle([](QWidget *editor) {
         QVERIFY(qobject_cast<VelDesktopEntryEditDialog *>(editor));
         QVERIFY(QTest::qWaitForWindowActive(editor));
         fillIn(editor, "nameEdit", QStringLiteral("Zeta"));
@@ -209,7 +157,7 @@ void tst_MenuEndToEnd::createEntry()
 void tst_MenuEndToEnd::dragIntoGames()
 {
     ModalDriver modal;
-    handle(modal, [](QWidget *window) {
+    modal.handle([](QWidget *window) {
         auto *menu = qobject_cast<QMenu *>(window);
         QVERIFY(menu);
         QAction *move = menu->actions().constFirst();
@@ -230,7 +178,7 @@ void tst_MenuEndToEnd::dragIntoGames()
 void tst_MenuEndToEnd::deleteSelected()
 {
     ModalDriver modal;
-    handle(modal, [](QWidget *window) {
+    modal.handle([](QWidget *window) {
         auto *box = qobject_cast<QMessageBox *>(window);
         QVERIFY(box);
         QVERIFY(QTest::qWaitForWindowActive(box));

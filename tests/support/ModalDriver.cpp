@@ -82,7 +82,13 @@ void ModalDriver::look()
         return;
     }
     // Not from here: what it does may open the next window, and this timer has to see that one.
-    QTimer::singleShot(0, window, [step, window] { step.act(window); });
+    const QPointer<QWidget> guarded(window);
+    QTimer::singleShot(0, window, [step, guarded] {
+        step.act(guarded);
+        // A check that failed may have left it open, and its loop would go on for ever.
+        if (guarded && guarded->isVisible() && QTest::currentTestFailed())
+            guarded->close();
+    });
 }
 
 bool ModalDriver::compare(const Box &expected, QWidget *window)

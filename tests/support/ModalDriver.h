@@ -19,7 +19,8 @@ class QDialog;
  *
  * Every window that opens is matched with the next step: a message box is compared with the
  * announced title, text and buttons and then answered; any other dialog or pop-up is handed
- * to a function. A window that no step waits for fails the test and is closed.
+ * to a function, and closed when a check fails in it. A window that no step waits for fails the
+ * test and is closed.
  *
  * \code
  * ModalDriver modal;
