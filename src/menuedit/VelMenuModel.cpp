@@ -259,6 +259,10 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
     const ItemInfo info = wasRead ? *known : itemInfo(VelUIDesktopEntry(file), file);
     if (wasRead)
         m_readAlong.erase(known);
+    // The row of a file that is gone stands until the base class sees it. What is asked for then
+    // must not be remembered of the next file that comes to this path.
+    if (info.name.isEmpty() && !QFileInfo::exists(file))
+        return true;
     itemNames.insert(path, info.name);
     if (info.isHidden)
         hiddenItems.insert(path, true);

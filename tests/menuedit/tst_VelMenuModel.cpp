@@ -34,6 +34,7 @@ private Q_SLOTS:
     void marksHiddenEntries_data();
     void marksHiddenEntries();
     void keepsANameUntilItIsForgotten();
+    void remembersNothingOfAFileThatIsGone();
     void readsAnEmptyNameAtEveryRequest();
     void showsANameThatWasSet();
     void announcesTheRowOfAForgottenName();
@@ -245,6 +246,24 @@ void tst_VelMenuModel::keepsANameUntilItIsForgotten()
     m_model->forgetItemInfo(file);
     QCOMPARE(shown(QStringLiteral("a.desktop")), QStringLiteral("New"));
     QCOMPARE(indexOf(QStringLiteral("a.desktop")).data(Qt::UserRole), QVariant(false));
+}
+
+// Rows outlive their files until the watcher has seen it.
+void tst_VelMenuModel::remembersNothingOfAFileThatIsGone()
+{
+    const QString file = write(QStringLiteral("a.desktop"), entry("Name=A\n"));
+    m_model = modelOf(folder(), 1);
+    const QPersistentModelIndex index = indexOf(QStringLiteral("a.desktop"));
+    QCOMPARE(index.data().toString(), QStringLiteral("A"));
+
+    QVERIFY(QFile::remove(file));
+    m_model->forgetItemInfo(file);
+    QCOMPARE(index.data().toString(), QString());
+    QCOMPARE(index.data(Qt::UserRole).toBool(), false);
+
+    write(QStringLiteral("a.desktop"), entry("Name=B\nHidden=true\n"));
+    QCOMPARE(index.data(Qt::UserRole).toBool(), true);
+    QCOMPARE(index.data().toString(), QStringLiteral("B"));
 }
 
 void tst_VelMenuModel::readsAnEmptyNameAtEveryRequest()
