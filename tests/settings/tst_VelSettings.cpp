@@ -60,6 +60,7 @@ private Q_SLOTS:
     void touchesAnUnchangedFileOnSync();
     void touchesNothingWithoutBeingAsked();
     void touchesAFileWhoseNameIsNotAscii();
+    void touchesBeforeItLooksForChanges();
     void renamesTheSection();
     void dropsTheHeaderWithTheSectionName();
     void removesAKey();
@@ -71,6 +72,7 @@ private Q_SLOTS:
     void keepsItsFileNameWhenTheOtherFileGivesAnError();
     void opensAnEmptyFile();
     void opensADirectoryWithoutACrash();
+    void syncsNothingThatGaveAnErrorWhenItWasOpened();
     void sharesChangesBetweenObjectsOnOneFile();
     void opensAgainAfterTheLastKeyWasRemoved_data();
     void opensAgainAfterTheLastKeyWasRemoved();
@@ -78,7 +80,7 @@ private Q_SLOTS:
     void writesAKeyThatIsSetAfterTheLastOneWasRemoved();
     void keepsEverySlashedKeyWhenAllWereRemoved();
     void sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved();
-    void registersItsFormatOnce();
+    void registersItsFormatOnceUnderItsExtension();
 };
 
 void tst_VelSettings::doesNothingWithoutAFile()
@@ -226,6 +228,20 @@ void tst_VelSettings::touchesAFileWhoseNameIsNotAscii()
     QVERIFY(qAbs(statusOf(file).st_atime - time(nullptr)) < 60);
 }
 
+void tst_VelSettings::touchesBeforeItLooksForChanges()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    makeOld(file);
+    VelSettings settings(file);
+    // A change that neither the size nor the time of the file gives away.
+    write(s("rc"), "a=2\n");
+    makeOld(file);
+    settings.sync();
+    QCOMPARE(settings.value(s("a")), QVariant(1));
+    settings.sync(true);
+    QCOMPARE(settings.value(s("a")), QVariant(2));
+}
+
 void tst_VelSettings::renamesTheSection()
 {
     const QString file = write(s("rc"), "[Old]\na=1\n");
@@ -343,6 +359,19 @@ void tst_VelSettings::opensADirectoryWithoutACrash()
     QVERIFY(!settings.isParsed());
     QCOMPARE(settings.value(s("a"), 1), QVariant(1));
     settings.sync(true);
+}
+
+void tst_VelSettings::syncsNothingThatGaveAnErrorWhenItWasOpened()
+{
+    const QString file = path(s("rc"));
+    QVERIFY(QDir().mkdir(file));
+    expectWarning(s("Cant register format!"));
+    VelSettings settings(file);
+    QVERIFY(QDir().rmdir(file));
+    write(s("rc"), "a=1\n");
+    settings.setValue(s("a"), 2);
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=1\n"));
 }
 
 void tst_VelSettings::sharesChangesBetweenObjectsOnOneFile()
@@ -465,11 +494,14 @@ void tst_VelSettings::sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved(
 }
 
 // The last one: it takes all the formats that are left.
-void tst_VelSettings::registersItsFormatOnce()
+void tst_VelSettings::registersItsFormatOnceUnderItsExtension()
 {
     const VelSettings one(write(s("one"), "a=1\n"));
     const VelSettings other(write(s("other"), "a=1\n"));
     QVERIFY(one.isParsed() && other.isParsed());
+    const QSettings first(QSettings::CustomFormat1, QSettings::UserScope, s("organization"), s("program"));
+    QVERIFY(first.fileName().endsWith(s("/program.themerc")));
+
     int left = 0;
     const auto read = [](QIODevice &, QSettings::SettingsMap &) { return false; };
     const auto write = [](QIODevice &, const QSettings::SettingsMap &) { return false; };
