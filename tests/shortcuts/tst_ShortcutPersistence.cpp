@@ -9,6 +9,7 @@
 #include <QSettings>
 #include <QShortcut>
 #include <QSignalSpy>
+#include <QTranslator>
 #include <QWidget>
 
 #include <memory>
@@ -25,6 +26,22 @@ QString str(const char *text)
     return QString::fromLatin1(text);
 }
 
+// The German name of a key, in force while it lives.
+class GermanKeys : public QTranslator
+{
+    Q_OBJECT
+
+public:
+    GermanKeys() { QCoreApplication::installTranslator(this); }
+    ~GermanKeys() override { QCoreApplication::removeTranslator(this); }
+
+    QString translate(const char *context, const char *source, const char *, int) const override
+    {
+        return qstrcmp(context, "QShortcut") == 0 && qstrcmp(source, "Ctrl") == 0 ? str("Strg") : QString();
+    }
+    bool isEmpty() const override { return false; }
+};
+
 } // namespace
 
 class tst_ShortcutPersistence : public TestCase
@@ -38,6 +55,8 @@ private Q_SLOTS:
     void putsSavedKeysOnWhatIsRegistered();
     void readsSavedTexts_data();
     void readsSavedTexts();
+    void readsSavedTextsInTheLanguageOfTheDesktop_data();
+    void readsSavedTextsInTheLanguageOfTheDesktop();
     void readsOnlyItsOwnGroup_data();
     void readsOnlyItsOwnGroup();
     void leavesWhatIsRegisteredAlone();
@@ -56,6 +75,7 @@ private Q_SLOTS:
 
     void commitsEveryObjectSilently();
     void announcesResetAndRestorePerGroup();
+    void announcesAGroupThatLostItsShortcuts();
     void restoresDefaultsOnlyOnCommit();
 
 private:
@@ -135,6 +155,24 @@ void tst_ShortcutPersistence::readsSavedTexts()
     const QKeySequence shortcut = addAction(&model, "a", f1)->shortcut();
     QTEST(shortcut, "key");
     QCOMPARE(shortcut.isEmpty(), shortcut.count() == 0);
+}
+
+void tst_ShortcutPersistence::readsSavedTextsInTheLanguageOfTheDesktop_data()
+{
+    QTest::addColumn<QString>("saved");
+    QTest::newRow("translated") << str("Strg+F2");
+    QTest::newRow("portable") << str("Ctrl+F2");
+}
+
+void tst_ShortcutPersistence::readsSavedTextsInTheLanguageOfTheDesktop()
+{
+    QFETCH(QString, saved);
+    const GermanKeys german;
+    m_settings->setValue(str("a"), saved);
+    ShortcutsModel model(m_settings.get(), QString());
+    QCOMPARE(addAction(&model, "a", f1)->shortcut(), QKeySequence(Qt::CTRL | Qt::Key_F2));
+    model.saveKeys(m_settings.get(), QString());
+    QCOMPARE(m_settings->value(str("a")), QVariant(str("Ctrl+F2")));
 }
 
 void tst_ShortcutPersistence::readsOnlyItsOwnGroup_data()
@@ -361,6 +399,17 @@ void tst_ShortcutPersistence::announcesResetAndRestorePerGroup()
     verify();
     model.restoreDefaults();
     verify();
+}
+
+void tst_ShortcutPersistence::announcesAGroupThatLostItsShortcuts()
+{
+    ShortcutsModel model(m_settings.get(), QString());
+    delete addAction(&model, "a", f1);
+    QSignalSpy spy(&model, &QAbstractItemModel::dataChanged);
+    model.resetShortcuts();
+    model.restoreDefaults();
+    QCOMPARE(spy.count(), 2);
+    QCOMPARE(spy.at(0).at(1).toModelIndex(), model.index(0, 1, model.index(0, 0)));
 }
 
 void tst_ShortcutPersistence::restoresDefaultsOnlyOnCommit()
