@@ -283,6 +283,7 @@ void tst_VelKeyServer::findsTheGlobalAction_data()
     row("Ctrl+PgUp=act", "Ctrl+PgUp", "act");
     row("Ctrl|Del=act", "Ctrl+Del", "act");
     row("Meta+Esc=act", "Meta+Esc", "act");
+    row("None|Ctrl|Esc=act", "Ctrl+Esc", "act");
     row("Ctrl+K, Ctrl+Del=act", "Ctrl+K, Ctrl+Del", "act");
     row("\"Ctrl|K, Ctrl|Del\"=act", "Ctrl+K, Ctrl+Del", "act");
     // One that ends in the name of a symbol is a key string with a part that names no modifier.
@@ -314,7 +315,7 @@ void tst_VelKeyServer::findsNothing_data()
     QTest::newRow("other section") << QByteArray("[Else]\nF1=act") << QStringLiteral("F1");
     QTest::newRow("other key") << QByteArray("F2=act") << QStringLiteral("F1");
     QTest::newRow("fewer modifiers") << QByteArray("Ctrl|F1=act") << QStringLiteral("Ctrl+Alt+F1");
-    QTest::newRow("lower-case none") << QByteArray("none,Ctrl|F1=act") << QStringLiteral("Ctrl+F1");
+    QTest::newRow("lower-case none") << QByteArray("none|Ctrl|Esc=act") << QStringLiteral("Ctrl+Esc");
     QTest::newRow("unparsable") << QByteArray("Gibberish=act") << QStringLiteral("F1");
     QTest::newRow("unparsable on both sides") << QByteArray("Gibberish=act") << QStringLiteral("Nonsense");
     QTest::newRow("a lone quote") << QByteArray("\"=act") << QStringLiteral("F1");
