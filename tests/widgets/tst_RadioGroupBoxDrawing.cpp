@@ -32,6 +32,7 @@ public:
         State state;
         bool isButton;
         QRegion clip;
+        QStyleOptionFrame frame; // for frames alone
     };
     struct Text
     {
@@ -51,16 +52,21 @@ public:
     void drawPrimitive(PrimitiveElement element, const QStyleOption *option, QPainter *painter,
                        const QWidget *widget) const override
     {
-        if (qobject_cast<const VelRadioGroupBox *>(widget))
+        const auto *frame = qstyleoption_cast<const QStyleOptionFrame *>(option);
+        if (qobject_cast<const VelRadioGroupBox *>(widget)) {
+            order.append(element);
             primitives.append({element, option->rect, option->state,
                                qstyleoption_cast<const QStyleOptionButton *>(option) != nullptr,
-                               painter->hasClipping() ? painter->clipRegion() : QRegion()});
+                               painter->hasClipping() ? painter->clipRegion() : QRegion(),
+                               frame ? *frame : QStyleOptionFrame()});
+        }
         QProxyStyle::drawPrimitive(element, option, painter, widget);
     }
 
     void drawItemText(QPainter *painter, const QRect &rect, int flags, const QPalette &palette, bool enabled,
                       const QString &text, QPalette::ColorRole role) const override
     {
+        order.append(text);
         texts.append({rect, flags, enabled, text, role, painter->pen().color()});
         QProxyStyle::drawItemText(painter, rect, flags, palette, enabled, text, role);
     }
@@ -89,10 +95,12 @@ public:
     {
         primitives.clear();
         texts.clear();
+        order.clear();
     }
 
     mutable QVector<Primitive> primitives;
     mutable QVector<Text> texts;
+    mutable QVariantList order; // primitives by number, texts
     bool underlines = true;
     QColor labelColor;
 };
@@ -159,6 +167,8 @@ private Q_SLOTS:
     void cutsTheTitleOutOfTheFrame_data();
     void cutsTheTitleOutOfTheFrame();
     void drawsTheWholeFrameWithoutATitle();
+    void tellsTheStyleTheKindOfTheFrame();
+    void drawsInTheOrderOfTheCommonStyle();
     void drawsAFocusFrameAroundTitleAndIndicator();
     void underlinesTheMnemonicAsTheStyleSays();
     void drawsTheTitleInTheColorOfTheStyle();
@@ -261,6 +271,32 @@ void tst_RadioGroupBoxDrawing::drawsTheWholeFrameWithoutATitle()
     QCOMPARE(form.style.all(QStyle::PE_FrameGroupBox).constFirst().clip, QRegion(form.one->rect()));
     QVERIFY(form.style.texts.isEmpty());
     QCOMPARE(form.style.all(QStyle::PE_IndicatorRadioButton).size(), 1);
+}
+
+void tst_RadioGroupBoxDrawing::tellsTheStyleTheKindOfTheFrame()
+{
+    Form form(s("Fusion"));
+    for (const bool isFlat : {false, true}) {
+        form.one->setFlat(isFlat);
+        form.draw();
+        const QStyleOptionFrame frame = form.style.all(QStyle::PE_FrameGroupBox).constFirst().frame;
+        QCOMPARE(bool(frame.features & QStyleOptionFrame::Flat), isFlat);
+        QCOMPARE(frame.lineWidth, 1);
+        QCOMPARE(frame.midLineWidth, 0);
+    }
+}
+
+void tst_RadioGroupBoxDrawing::drawsInTheOrderOfTheCommonStyle()
+{
+    Form form(s("Windows"));
+    form.window.show();
+    form.window.activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(&form.window));
+    form.one->setFocus(Qt::TabFocusReason);
+    form.draw();
+    QCOMPARE(form.style.order,
+             QVariantList({int(QStyle::PE_FrameGroupBox), s("&Title of the box"),
+                           int(QStyle::PE_FrameFocusRect), int(QStyle::PE_IndicatorRadioButton)}));
 }
 
 void tst_RadioGroupBoxDrawing::drawsAFocusFrameAroundTitleAndIndicator()
