@@ -89,7 +89,7 @@ QWidget *createPage(const GalleryContext &context, QWidget *parent)
                                    ->addMenu(PageTexts::tr("Settings"))
                                    ->addAction(PageTexts::tr("Configure shortcuts..."));
     configureAction->setObjectName(QStringLiteral("configure-shortcuts"));
-    configureAction->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_F12));
+    configureAction->setShortcut(QKeySequence(QStringLiteral("Ctrl+F12"), QKeySequence::PortableText));
     QObject::connect(configureAction, &QAction::triggered, page, [page, model] { configure(page, model); });
     model->registerAction(configureAction->objectName(), configureAction, PageTexts::tr("Settings"));
     return page;
