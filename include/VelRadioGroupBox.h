@@ -43,14 +43,14 @@ class VELUIEXTRA_EXPORT VelRadioGroupBox : public QGroupBox
 public:
     /**
      * Makes an unchecked box without a title.
-     * \param parent owns the box and gathers its group; null leaves the caller the owner.
+     * @param parent owns the box and gathers its group; null leaves the caller the owner.
      */
     explicit VelRadioGroupBox(QWidget *parent = nullptr);
 
     /**
      * Makes an unchecked box.
-     * \param title the text beside the radio button; a letter after "&" is underlined.
-     * \param parent owns the box and gathers its group; null leaves the caller the owner.
+     * @param title the text beside the radio button; a letter after "&" is underlined.
+     * @param parent owns the box and gathers its group; null leaves the caller the owner.
      */
     explicit VelRadioGroupBox(const QString &title, QWidget *parent = nullptr);
 
@@ -61,14 +61,14 @@ public:
      *
      * Checking it unchecks all other boxes below the same parent first. It does nothing when the
      * box has no parent or is the only one below it. Unchecking leaves the others as they are.
-     * \param on whether the box is to be checked.
+     * @param on whether the box is to be checked.
      */
     void setChecked(bool on);
 
 protected:
     /**
      * Hands \a event to QWidget::event(): the base class never toggles the box by itself.
-     * \return whether the event was recognised.
+     * @return whether the event was recognised.
      */
     bool event(QEvent *event) override;
 
@@ -92,13 +92,13 @@ protected:
 
     /**
      * Fills \a option with what the style has to know, the held-down radio button included.
-     * \param option the option to fill; the caller's, not null.
+     * @param option the option to fill; the caller's, not null.
      */
     void initStyleOption(QStyleOptionGroupBox *option) const;
 
     /**
      * Tells whether \a point lies on the radio button or on the title.
-     * \param point a position in pixels, relative to the box.
+     * @param point a position in pixels, relative to the box.
      */
     bool hitButtonOrLabel(const QPoint &point) const;
 

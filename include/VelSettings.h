@@ -57,7 +57,7 @@ public:
      * Opens the file \a path.
      *
      * Whether that worked is told by isParsed(). A file that does not exist is not made.
-     * \param path path of an existing file.
+     * @param path path of an existing file.
      */
     explicit VelSettings(const QString &path);
 
@@ -73,8 +73,8 @@ public:
      * A file that does not exist or cannot be read leaves the object as it was. When reading
      * fails for another reason, the new file is in place all the same. Does not change what
      * isParsed() returns.
-     * \param path path of an existing file.
-     * \return whether the file was opened without an error; if not, a critical message is logged
+     * @param path path of an existing file.
+     * @return whether the file was opened without an error; if not, a critical message is logged
      * unless the file just does not exist.
      */
     bool ParseConfigFile(const QString &path);
@@ -86,21 +86,21 @@ public:
      * The value of \a key, or \a defaultValue where there is none.
      *
      * Always \a defaultValue when isParsed() is false.
-     * \param key the key; "/" at its ends and doubled ones are dropped.
-     * \param defaultValue what to return for a key that is not there.
+     * @param key the key; "/" at its ends and doubled ones are dropped.
+     * @param defaultValue what to return for a key that is not there.
      */
     QVariant value(const QString &key, const QVariant &defaultValue = QVariant()) const;
 
     /**
      * Sets \a key to \a value; without an open file, does nothing.
-     * \param key the key, not empty.
-     * \param value written as its QVariant::toString() says.
+     * @param key the key, not empty.
+     * @param value written as its QVariant::toString() says.
      */
     void setValue(const QString &key, const QVariant &value);
 
     /**
      * Removes \a key and all keys that begin with it and "/"; without an open file, does nothing.
-     * \param key the key; the empty string stands for all keys.
+     * @param key the key; the empty string stands for all keys.
      */
     void remove(const QString &key);
 
@@ -108,7 +108,7 @@ public:
      * Writes the changes to the file and takes over what others changed in it.
      *
      * Does nothing without a file that was opened without an error.
-     * \param touch whether to give the file the current time first, so that programs that watch
+     * @param touch whether to give the file the current time first, so that programs that watch
      * it read it anew.
      */
     void sync(bool touch = false);

@@ -27,7 +27,7 @@ bool isLeft(const QSettings &settings);
  *
  * The cache gives up its edits for a successful write alone, so the file is replaced by a copy
  * of itself.
- * \return false when that cannot be written; the edit then stays in the cache.
+ * @return false when that cannot be written; the edit then stays in the cache.
  */
 bool drop(QSettings &settings);
 

@@ -17,13 +17,13 @@ namespace ThemeRcFormat {
 /**
  * Fills \a map with the entries of \a device, under their bare keys and with their types, and
  * with the last section header under "SectionName".
- * \return false when the device is not open or gives an error before its end.
+ * @return false when the device is not open or gives an error before its end.
  */
 bool read(QIODevice &device, QSettings::SettingsMap &map);
 
 /**
  * Writes \a map to \a device: the section header, then the entries in the order of the map.
- * \return false, after a line on standard error, when the device is closed or read-only or when
+ * @return false, after a line on standard error, when the device is closed or read-only or when
  * the map is empty; false when the device does not take all of it.
  */
 bool write(QIODevice &device, const QSettings::SettingsMap &map);
@@ -31,7 +31,7 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map);
 /**
  * Writes \a bytes to \a device, past its buffer too: QSaveFile puts half a file in the place of
  * the old one when the disk fills up only as the buffer is emptied.
- * \return whether all bytes were taken.
+ * @return whether all bytes were taken.
  */
 bool writeThrough(QIODevice &device, const QByteArray &bytes);
 
