@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Zum &amp;Ende blättern</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Text</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>D&amp;esplazar al final</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Texto</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Défiler jusqu&apos;à la f&amp;in</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Texte</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Scorri alla fin&amp;e</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Testo</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

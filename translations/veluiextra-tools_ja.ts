@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>末尾までスクロール(&amp;M)</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>テキスト</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Przewiń na koni&amp;ec</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Tekst</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Rolar até o fi&amp;m</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Texto</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Прокрутить в &amp;конец</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Текст</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

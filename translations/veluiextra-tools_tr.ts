@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>&amp;En sona kaydır</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Metin</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>Прокрутити в &amp;кінець</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>Текст</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

@@ -314,6 +314,10 @@
         <source>Scroll to botto&amp;m</source>
         <translation>滚动到底部(&amp;M)</translation>
     </message>
+    <message>
+        <source>Text</source>
+        <translation>文本</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>

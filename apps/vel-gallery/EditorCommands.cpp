@@ -210,7 +210,7 @@ QVector<EditorCommand> basicEditCommands()
 
 QVector<EditorCommand> changeCommands()
 {
-    const QString menu = EditorTexts::tr("Edit");
+    const QString menu = EditorTexts::tr("Text");
     const auto lines = [](const std::function<void(QStringList &)> &change) {
         return [change](QPlainTextEdit *editor) { changeLines(editor, change); };
     };

@@ -15,7 +15,7 @@ struct EditorCommand
 {
     /// The name under which its key is saved.
     QString name;
-    /// The menu that it stands in: "File", "Edit" or "View".
+    /// The menu that it stands in: "File", "Edit", "Text" or "View", in the language of the desktop.
     QString menu;
     /// The text, with a mnemonic.
     QString text;
