@@ -7,6 +7,7 @@
 #include <QGridLayout>
 #include <QSignalSpy>
 #include <QTimer>
+#include <QTranslator>
 #include <QVBoxLayout>
 
 namespace {
@@ -14,6 +15,23 @@ namespace {
 const QKeySequence f1(Qt::Key_F1);
 const QKeySequence f2(Qt::Key_F2);
 const QKeySequence f9(Qt::Key_F9);
+
+// The Chinese word for no key, in force while it lives.
+class ChineseNone : public QTranslator
+{
+    Q_OBJECT
+
+public:
+    ChineseNone() { QCoreApplication::installTranslator(this); }
+    ~ChineseNone() override { QCoreApplication::removeTranslator(this); }
+
+    QString translate(const char *context, const char *source, const char *, int) const override
+    {
+        const bool isNone = qstrcmp(context, "EditShortcutsDialog") == 0 && qstrcmp(source, "None") == 0;
+        return isNone ? QString(QChar(0x65e0)) : QString();
+    }
+    bool isEmpty() const override { return false; }
+};
 
 } // namespace
 
@@ -45,6 +63,7 @@ private Q_SLOTS:
 
     void goesBackToTheDefaultKey();
     void goesBackToNoKey();
+    void goesBackToNoKeyWhereTheWordForNoneIsAKey();
     void restoresAllDefaults();
     void resetsAllEdits();
     void ignoresOtherButtons();
@@ -370,6 +389,16 @@ void tst_EditShortcutsDialog::goesBackToNoKey()
     QCOMPARE(pendingKey("print").count(), 0);
     QCOMPARE(defaultLabel()->text(), str("None"));
     QVERIFY(defaultButton()->isChecked());
+}
+
+void tst_EditShortcutsDialog::goesBackToNoKeyWhereTheWordForNoneIsAKey()
+{
+    const ChineseNone chinese;
+    select("print");
+    m_dialog->checkEnteredKeySequence(f9);
+    QCOMPARE(QKeySequence(defaultLabel()->text()), QKeySequence(0x65e0));
+    defaultButton()->click();
+    QCOMPARE(pendingKey("print").count(), 0);
 }
 
 void tst_EditShortcutsDialog::restoresAllDefaults()
