@@ -146,12 +146,10 @@ void EditShortcutsDialog::slotReject()
 
 void EditShortcutsDialog::reject()
 {
-    if (d->isChanged()) {
-        if (d->model)
-            d->model->resetShortcuts();
-        setChanged(false);
-    }
-    QDialog::reject();
+    if (d->isChanged())
+        slotReject(); // which comes back here, unchanged
+    else
+        QDialog::reject();
 }
 
 void EditShortcutsDialog::closeEvent(QCloseEvent *event)
