@@ -86,7 +86,7 @@ QIcon VelMimeTypeIconProvider::icon(IconType type) const
 {
     // QIcon::fromTheme() with a fallback decides in the same way, but has the style draw the
     // fallback even where the theme has the icon.
-    const QIcon icon = QIcon::fromTheme(themeName(type));
+    QIcon icon = QIcon::fromTheme(themeName(type));
     if (icon.isNull() || icon.availableSizes().isEmpty())
         return QFileIconProvider::icon(type);
     return icon;

@@ -49,6 +49,7 @@ void EditShortcutsDialog::setChanged(bool changed)
     d->buttonBox->button(QDialogButtonBox::Reset)->setEnabled(changed);
 }
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param)
 void EditShortcutsDialog::checkCurrentShortcut(QKeySequence defKS, QKeySequence currentKS)
 {
     d->groupBox->setEnabled(true);
@@ -69,6 +70,7 @@ void EditShortcutsDialog::disableShortcutEdit()
     d->groupBox->setEnabled(false);
 }
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param)
 void EditShortcutsDialog::checkEnteredKeySequence(QKeySequence key)
 {
     if ((key.isEmpty() && d->isRecording) || key == d->treeView->currentKeySequence() || !d->model)

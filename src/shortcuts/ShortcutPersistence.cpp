@@ -36,6 +36,7 @@ private:
 
 } // namespace
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param)
 void ShortcutsModel::loadKeys(QSettings *settings, QString settingsGroup)
 {
     if (!settings)
@@ -48,6 +49,7 @@ void ShortcutsModel::loadKeys(QSettings *settings, QString settingsGroup)
     }
 }
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param)
 void ShortcutsModel::saveKeys(QSettings *settings, QString settingsGroup)
 {
     if (!settings)

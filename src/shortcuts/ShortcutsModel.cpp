@@ -11,6 +11,7 @@
 #include <QSet>
 
 #include <iterator>
+#include <utility>
 
 namespace {
 
@@ -22,7 +23,7 @@ constexpr quintptr groupId = ~quintptr(0);
 ShortcutsModel::ShortcutsModel(QSettings *settings, QString settingsGroup, QObject *parent)
     : QAbstractItemModel(parent)
 {
-    loadKeys(settings, settingsGroup);
+    loadKeys(settings, std::move(settingsGroup));
 }
 
 ShortcutsModel::~ShortcutsModel()

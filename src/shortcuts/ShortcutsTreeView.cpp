@@ -42,9 +42,9 @@ void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
     }
     m_hidden.clear();
     QTreeView::setModel(newModel);
-    if (const ShortcutsModel *shortcuts = shortcutsModel()) {
-        newModel->installEventFilter(this);
-        connect(newModel, &QObject::destroyed, this, [this] { setModel(nullptr); });
+    if (ShortcutsModel *shortcuts = shortcutsModel()) {
+        shortcuts->installEventFilter(this);
+        connect(shortcuts, &QObject::destroyed, this, [this] { setModel(nullptr); });
         hideEmptyRows(*shortcuts);
     }
 }
@@ -60,6 +60,7 @@ QKeySequence ShortcutsTreeView::currentKeySequence() const
     return isShortcutCurrent() ? shortcutsModel()->keySequence(currentIndex()) : QKeySequence();
 }
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param)
 void ShortcutsTreeView::setKeySequence(QKeySequence key)
 {
     if (ShortcutsModel *shortcuts = shortcutsModel())

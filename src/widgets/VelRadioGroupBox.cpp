@@ -75,7 +75,7 @@ public:
     {
         if (m_option.text.isEmpty())
             return;
-        int flags = Qt::TextShowMnemonic | Qt::AlignHCenter | int(m_option.textAlignment);
+        int flags = int(Qt::TextShowMnemonic) | int(Qt::AlignHCenter) | int(m_option.textAlignment);
         if (!m_style->styleHint(QStyle::SH_UnderlineShortcut, &m_option, m_widget))
             flags |= Qt::TextHideMnemonic;
         const bool ownColor = m_option.textColor.isValid();
