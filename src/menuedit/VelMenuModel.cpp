@@ -4,6 +4,7 @@
 #include "VelMenuModel.h"
 
 #include "EntryName.h"
+#include "FolderWatch.h"
 #include "VelMimeTypeIconProvider.h"
 
 #include <frame/DesktopEntryRecord.h>
@@ -151,6 +152,7 @@ VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *menuView, 
     : QFileSystemModel(parent)
     , view(menuView)
     , rootDir(rootDirectory)
+    , m_watch(new FolderWatch(this))
     , m_keeper(new IconProviderKeeper(this, QCoreApplication::instance()))
 {
     setIconProvider(m_keeper->provider());

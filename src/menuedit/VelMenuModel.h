@@ -11,6 +11,7 @@
 #include <QString>
 #include <QStringList>
 
+class FolderWatch;
 class VelMenuView;
 class VelUIDesktopEntry;
 
@@ -86,15 +87,13 @@ private:
     bool mayOverwrite(const QString &target);
     bool fixSortOrder(const Drop &drop);
     bool carryOut(const Drop &drop);
-    QStringList releaseFolders(const QStringList &sources);
-    void collectWatched(const QModelIndex &folder, QStringList &paths) const;
-    void watchAgain(const QStringList &folders);
     bool link(const Drop &drop);
     void finish(const Drop &drop, bool sortAnew);
     void tellAtItem(const QString &path, const QString &text);
 
     VelMenuView *view;
     QString rootDir;
+    FolderWatch *m_watch;
     mutable QMap<QString, QString> itemNames;
     mutable QMap<QString, bool> hiddenItems;
     // Rows that were edited here: the base class keeps the icon it has, this model asks anew.

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "FileTransfer.h"
+#include "FolderWatch.h"
 #include "MenuClipboard.h"
 #include "OnDisk.h"
 #include "VelMenuModel.h"
@@ -189,10 +190,11 @@ bool VelMenuModel::carryOut(const Drop &drop)
     }
     if (drop.action != Qt::LinkAction) {
         const QStringList released =
-            drop.action == Qt::MoveAction ? releaseFolders(drop.sources) : QStringList();
+            drop.action == Qt::MoveAction ? m_watch->release(drop.sources) : QStringList();
         const FileTransfer::Result result =
             FileTransfer::transfer(drop.sources, drop.targetDir, transferAction(drop.action));
-        watchAgain(released);
+        // What could not be moved is still there.
+        m_watch->watchAgain(released);
         if (!result.succeeded()) {
             directoryFile.restore();
             tellAtItem(drop.target, failureText(result, drop.action));
@@ -201,41 +203,6 @@ bool VelMenuModel::carryOut(const Drop &drop)
     }
     finish(drop, drop.row != -1);
     return true;
-}
-
-// The base class does not notice when a folder that it watches moves: it would take what
-// happens at the new place for news of the old one and never show it. It lets go of a folder
-// that was its root.
-QStringList VelMenuModel::releaseFolders(const QStringList &sources)
-{
-    QStringList watched;
-    for (const QString &source : sources) {
-        if (QFileInfo(source).isDir() && source.startsWith(rootDir))
-            collectWatched(index(source), watched);
-    }
-    const QString root = rootPath();
-    for (const QString &folder : qAsConst(watched))
-        setRootPath(folder);
-    setRootPath(root);
-    return watched;
-}
-
-void VelMenuModel::collectWatched(const QModelIndex &folder, QStringList &paths) const
-{
-    if (!folder.isValid() || !isDir(folder) || canFetchMore(folder))
-        return;
-    paths.append(filePath(folder));
-    for (int row = 0; row < rowCount(folder); ++row)
-        collectWatched(index(row, 0, folder), paths);
-}
-
-// What could not be moved is still there.
-void VelMenuModel::watchAgain(const QStringList &folders)
-{
-    for (const QString &folder : folders) {
-        if (QFileInfo::exists(folder))
-            fetchMore(index(folder));
-    }
 }
 
 bool VelMenuModel::link(const Drop &drop)

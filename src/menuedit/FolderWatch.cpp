@@ -1,0 +1,92 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FolderWatch.h"
+
+#include <QFileInfo>
+#include <QFileSystemModel>
+
+namespace {
+
+// Long enough that a tree which is moved or deleted folder by folder counts once.
+constexpr int Milliseconds = 200;
+
+} // namespace
+
+FolderWatch::FolderWatch(QFileSystemModel *model)
+    : QObject(model)
+    , m_model(model)
+{
+    m_timer.setSingleShot(true);
+    m_timer.setInterval(Milliseconds);
+    connect(&m_timer, &QTimer::timeout, this, &FolderWatch::renew);
+    connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &FolderWatch::noticeRemoval);
+}
+
+FolderWatch::~FolderWatch() = default;
+
+QStringList FolderWatch::release(const QStringList &paths)
+{
+    QStringList watched;
+    for (const QString &path : paths) {
+        if (QFileInfo(path).isDir() && path.startsWith(m_model->rootPath()))
+            collect(m_model->index(path), watched);
+    }
+    forget(watched);
+    return watched;
+}
+
+void FolderWatch::watchAgain(const QStringList &folders)
+{
+    for (const QString &folder : folders) {
+        if (QFileInfo::exists(folder))
+            m_model->fetchMore(m_model->index(folder));
+    }
+}
+
+// Whether a folder was moved or deleted cannot be told when its row goes.
+void FolderWatch::noticeRemoval(const QModelIndex &parent, int first, int last)
+{
+    QStringList gone;
+    for (int row = first; row <= last && gone.isEmpty(); ++row)
+        collect(m_model->index(row, 0, parent), gone);
+    if (!gone.isEmpty())
+        m_timer.start();
+}
+
+// The model does not let go of a single folder that is no longer where it was; it does let go
+// of all.
+void FolderWatch::renew()
+{
+    QStringList watched;
+    collect(m_model->index(m_model->rootPath()), watched);
+    m_model->setOption(QFileSystemModel::DontWatchForChanges, true);
+    m_model->setOption(QFileSystemModel::DontWatchForChanges, false);
+    forget(watched);
+    watchAgain(watched);
+}
+
+// All that were read, by their rows being known in full.
+void FolderWatch::collect(const QModelIndex &folder, QStringList &paths) const
+{
+    if (!folder.isValid())
+        return;
+    if (!m_model->canFetchMore(folder))
+        paths.append(m_model->filePath(folder));
+    for (int row = 0; row < m_model->rowCount(folder); ++row)
+        collect(m_model->index(row, 0, folder), paths);
+}
+
+// The model lets go of a folder that was its root, and reads it anew when asked to.
+void FolderWatch::forget(const QStringList &folders)
+{
+    if (folders.isEmpty())
+        return;
+    const QString root = m_model->rootPath();
+    for (const QString &folder : folders)
+        m_model->setRootPath(folder);
+    // Where the root is all there is, it still has to be left.
+    if (m_model->rootPath() == root)
+        m_model->setRootPath(QString());
+    m_model->setRootPath(root);
+}

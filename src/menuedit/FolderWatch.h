@@ -1,0 +1,43 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QObject>
+#include <QStringList>
+#include <QTimer>
+
+class QFileSystemModel;
+class QModelIndex;
+
+/**
+ * Lets a file-system model hear of what happens in folders that were moved or renamed.
+ *
+ * The model watches every folder that it has read, and the watch goes along with a folder that
+ * moves. The model does not notice: it would take what happens at the new place for news of the
+ * old one, and never show it.
+ */
+class FolderWatch : public QObject
+{
+    Q_OBJECT
+
+public:
+    /// Belongs to \a model; folders that others move are seen to from now on.
+    explicit FolderWatch(QFileSystemModel *model);
+    ~FolderWatch() override;
+
+    /// Stops watching those \a paths in the menu that are about to move, and all folders below
+    /// them; returns what was being watched.
+    QStringList release(const QStringList &paths);
+    /// Watches those of the \a folders again that are still there.
+    void watchAgain(const QStringList &folders);
+
+private:
+    void noticeRemoval(const QModelIndex &parent, int first, int last);
+    void renew();
+    void collect(const QModelIndex &folder, QStringList &paths) const;
+    void forget(const QStringList &folders);
+
+    QFileSystemModel *m_model;
+    QTimer m_timer;
+};
