@@ -117,7 +117,6 @@ int VelDesktopEntryPropsWidgetPrivate::addTypeRow(const QString &label)
     // The wheel scrolls the form; on its way over the box it must not change the type.
     typeBox->setFocusPolicy(Qt::StrongFocus);
     // Long names of the types must not make the form wider than its window.
-    typeBox->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     typeBox->setMinimumContentsLength(8);
     typeBox->installEventFilter(this);
     return layout->addRow(label, typeBox);

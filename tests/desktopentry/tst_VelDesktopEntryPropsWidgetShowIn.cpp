@@ -23,6 +23,7 @@ private Q_SLOTS:
     void choosesTheButtonByTheLists();
     void keepsBothListsWithoutASwitch();
     void emptiesTheOtherListAfterASwitch();
+    void emptiesTheOtherListAfterASwitchThereAndBack();
     void emptiesTheOtherListOfAnotherRecord_data();
     void emptiesTheOtherListOfAnotherRecord();
 };
@@ -78,18 +79,36 @@ void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListAfterASwitch()
     QCOMPARE(record.getNotShowIn(), QStringList({QStringLiteral("Y")}));
 }
 
+void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListAfterASwitchThereAndBack()
+{
+    VelUIDesktopEntry record =
+        entry("[Desktop Entry]\nType=Directory\nName=a\nOnlyShowIn=X;\nNotShowIn=Y;\n");
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(record);
+    child<QRadioButton>(&form, "onlyShowInButton")->click();
+    child<QRadioButton>(&form, "notShowInButton")->click();
+    form.saveTo(&record);
+    QCOMPARE(record.getOnlyShowIn(), QStringList());
+    QCOMPARE(record.getNotShowIn(), QStringList({QStringLiteral("Y")}));
+}
+
 void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListOfAnotherRecord_data()
 {
+    QTest::addColumn<QByteArray>("shown");
     QTest::addColumn<QByteArray>("lists");
-    QTest::newRow("the other one") << QByteArray("OnlyShowIn=X;\n");
-    QTest::newRow("both") << QByteArray("OnlyShowIn=X;\nNotShowIn=Z;\n");
+    const QByteArray only = "OnlyShowIn=X;\n";
+    const QByteArray no = "NotShowIn=Y;\n";
+    QTest::newRow("the other one") << no << only;
+    QTest::newRow("the other one, shown too") << only + no << only;
+    QTest::newRow("both") << no << only + "NotShowIn=Z;\n";
 }
 
 void tst_VelDesktopEntryPropsWidgetShowIn::emptiesTheOtherListOfAnotherRecord()
 {
+    QFETCH(QByteArray, shown);
     QFETCH(QByteArray, lists);
     VelDesktopEntryPropsWidget form;
-    form.loadFrom(entry("[Desktop Entry]\nType=Directory\nName=a\nNotShowIn=Y;\n"));
+    form.loadFrom(entry("[Desktop Entry]\nType=Directory\nName=a\n" + shown));
     VelUIDesktopEntry target =
         entry("[Desktop Entry]\nType=Directory\nName=b\n" + lists, QStringLiteral("b"));
     form.saveTo(&target);
