@@ -3,11 +3,13 @@
 
 #include "Program.h"
 
+#include <QCommandLineParser>
 #include <QCoreApplication>
 #include <QLibraryInfo>
 #include <QLocale>
 #include <QTranslator>
 
+#include <algorithm>
 #include <cstdio>
 #include <memory>
 
@@ -44,6 +46,26 @@ void Program::loadCatalogues()
         QCoreApplication::applicationDirPath() + QLatin1String("/../share/vel/translations");
     if (!loadCatalogue(name, besideProgram))
         loadCatalogue(name, QStringLiteral(VEL_TRANSLATIONS_DIR));
+}
+
+bool Program::mayWantNoWindow(int argc, char **argv)
+{
+    return std::any_of(argv + 1, argv + argc, [](const char *argument) {
+        const QByteArray text(argument);
+        return text == "--help" || text == "--help-all" || text == "-h" || text == "--version"
+            || text == "-v";
+    });
+}
+
+QString Program::parse(QCommandLineParser &parser)
+{
+    if (!parser.parse(QCoreApplication::arguments()))
+        return parser.errorText();
+    if (parser.isSet(QStringLiteral("help")) || parser.isSet(QStringLiteral("help-all")))
+        parser.showHelp();
+    if (parser.isSet(QStringLiteral("version")))
+        parser.showVersion();
+    return {};
 }
 
 void Program::printError(const QString &text)

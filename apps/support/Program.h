@@ -5,6 +5,8 @@
 
 #include <QString>
 
+class QCommandLineParser;
+
 /// What the programs have in common.
 namespace Program {
 
@@ -20,6 +22,18 @@ void describe(const QString &name);
  * catalogue the texts stay English.
  */
 void loadCatalogues();
+
+/// Whether help or the version may be asked for, which are to be had without a display.
+bool mayWantNoWindow(int argc, char **argv);
+
+/**
+ * Reads the application's command line; prints help or the version and ends the program when it
+ * asks for them.
+ *
+ * @param parser knows all options, --help and --version among them
+ * @return what is wrong with the command line; empty when nothing is
+ */
+QString parse(QCommandLineParser &parser);
 
 /// Prints \a text on standard error as one line, after the program's name.
 void printError(const QString &text);

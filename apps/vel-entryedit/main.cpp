@@ -35,12 +35,12 @@ QString absolute(const QString &path)
     return path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
 }
 
-Options parse(const QStringList &arguments)
+Options parse()
 {
     QCommandLineParser parser;
     parser.setApplicationDescription(text(QT_TRANSLATE_NOOP("vel-entryedit", "Edits a desktop entry.")));
-    const QCommandLineOption help = parser.addHelpOption();
-    const QCommandLineOption version = parser.addVersionOption();
+    parser.addHelpOption();
+    parser.addVersionOption();
     const QCommandLineOption create(
         QStringLiteral("create"),
         text(QT_TRANSLATE_NOOP("vel-entryedit", "Make a new entry when there is no such file.")));
@@ -55,16 +55,12 @@ Options parse(const QStringList &arguments)
                                  text(QT_TRANSLATE_NOOP("vel-entryedit", "The entry to edit.")));
 
     Options options;
-    if (!parser.parse(arguments))
-        options.error = parser.errorText();
-    else if (parser.isSet(help))
-        parser.showHelp(0);
-    else if (parser.isSet(version))
-        parser.showVersion();
-    else if (parser.positionalArguments().size() != 1 || parser.positionalArguments().constFirst().isEmpty())
+    options.error = Program::parse(parser);
+    if (!options.error.isEmpty())
+        return options;
+    options.file = absolute(parser.positionalArguments().value(0));
+    if (parser.positionalArguments().size() != 1 || options.file.isEmpty())
         options.error = text(QT_TRANSLATE_NOOP("vel-entryedit", "one file has to be named"));
-    else
-        options.file = absolute(parser.positionalArguments().constFirst());
     options.pattern = absolute(parser.value(pattern));
     options.create = parser.isSet(create);
     options.readOnly = parser.isSet(readOnly);
@@ -92,14 +88,23 @@ void makeReadOnly(VelDesktopEntryEditDialog *dialog)
 
 int main(int argc, char **argv)
 {
-    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     Program::describe(QStringLiteral("vel-entryedit"));
+    if (Program::mayWantNoWindow(argc, argv)) {
+        QCoreApplication application(argc, argv);
+        Program::loadCatalogues();
+        const Options options = parse();
+        if (!options.error.isEmpty())
+            return fail(options.error);
+        // What looked like it was the value of another option.
+    }
+
+    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     QApplication application(argc, argv);
     Program::loadCatalogues();
     QApplication::setDesktopFileName(QStringLiteral("vel-entryedit"));
     QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
 
-    const Options options = parse(QApplication::arguments());
+    const Options options = parse();
     if (!options.error.isEmpty())
         return fail(options.error);
 

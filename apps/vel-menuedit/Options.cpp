@@ -3,6 +3,7 @@
 
 #include "Options.h"
 
+#include <support/Program.h>
 #include <velcore/dirs.h>
 
 #include <QCommandLineParser>
@@ -18,7 +19,7 @@ QString standardDir(VelDir kind)
 
 } // namespace
 
-Options Options::parse(const QStringList &arguments)
+Options Options::parse()
 {
     QCommandLineParser parser;
     parser.setApplicationDescription(
@@ -43,14 +44,9 @@ Options Options::parse(const QStringList &arguments)
     });
 
     Options options;
-    if (!parser.parse(arguments)) {
-        options.error = parser.errorText();
+    options.error = Program::parse(parser);
+    if (!options.error.isEmpty())
         return options;
-    }
-    if (parser.isSet(QStringLiteral("help")) || parser.isSet(QStringLiteral("help-all")))
-        parser.showHelp();
-    if (parser.isSet(QStringLiteral("version")))
-        parser.showVersion();
     if (!parser.positionalArguments().isEmpty())
         options.error = QCoreApplication::translate("vel-menuedit", "unexpected argument: %1")
                             .arg(parser.positionalArguments().constFirst());

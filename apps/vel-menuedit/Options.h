@@ -4,7 +4,6 @@
 #pragma once
 
 #include <QString>
-#include <QStringList>
 
 class QCommandLineParser;
 
@@ -21,8 +20,8 @@ struct Options
     /// Why the command line cannot be followed; empty when it can.
     QString error;
 
-    /// Reads \a arguments, the program's name first; ends the program for --help and --version.
-    static Options parse(const QStringList &arguments);
+    /// Reads the command line; ends the program for --help and --version.
+    static Options parse();
 
 private:
     void chooseDir(const QCommandLineParser &parser);

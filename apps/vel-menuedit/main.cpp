@@ -16,7 +16,6 @@
 #include <QShortcut>
 #include <QStandardPaths>
 
-#include <algorithm>
 #include <cstdio>
 
 namespace {
@@ -80,26 +79,16 @@ int run(const Options &options)
     return Done;
 }
 
-// Help and version are to be had without a display.
-bool wantsNoWindow(int argc, char **argv)
-{
-    return std::any_of(argv + 1, argv + argc, [](const char *argument) {
-        const QByteArray text(argument);
-        return text == "--help" || text == "--help-all" || text == "-h" || text == "--version"
-            || text == "-v";
-    });
-}
-
 } // namespace
 
 int main(int argc, char **argv)
 {
     Program::describe(QStringLiteral("vel-menuedit"));
     QGuiApplication::setDesktopFileName(QStringLiteral("vel-menuedit"));
-    if (wantsNoWindow(argc, argv)) {
+    if (Program::mayWantNoWindow(argc, argv)) {
         QCoreApplication application(argc, argv);
         Program::loadCatalogues();
-        const Options options = Options::parse(QCoreApplication::arguments());
+        const Options options = Options::parse();
         if (!options.error.isEmpty())
             return fail(options.error);
         // What looked like it was the value of another option.
@@ -110,7 +99,7 @@ int main(int argc, char **argv)
     Program::loadCatalogues();
     // The message box that may follow the dialog would end before it is seen.
     QGuiApplication::setQuitOnLastWindowClosed(false);
-    const Options options = Options::parse(QCoreApplication::arguments());
+    const Options options = Options::parse();
     if (!options.error.isEmpty())
         return fail(options.error);
     const QString why = obstacle(options);

@@ -60,7 +60,9 @@ int main(int argc, char **argv)
         QCoreApplication::translate("vel-menuprint",
                                     "The menu directory; the start menu when none is given."),
         QStringLiteral("[DIR]"));
-    parser.process(application);
+    const QString error = Program::parse(parser);
+    if (!error.isEmpty())
+        return fail(error);
 
     const QString format = parser.value(formatOption);
     if (!QStringList({QStringLiteral("openbox"), QStringLiteral("json"), QStringLiteral("text")})

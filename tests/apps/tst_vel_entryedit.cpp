@@ -17,6 +17,8 @@ class tst_vel_entryedit : public TestCase
 private Q_SLOTS:
     void refusesACommandLineThatNamesNoFile_data();
     void refusesACommandLineThatNamesNoFile();
+    void showsHelpAndVersionWithoutADisplay_data();
+    void showsHelpAndVersionWithoutADisplay();
     void saysThatItCannotOpenAMissingFile();
     void endsWithOneWhenCancelled();
     void leavesTheFileWhenNothingWasChanged();
@@ -102,6 +104,29 @@ void tst_vel_entryedit::refusesACommandLineThatNamesNoFile()
     const QByteArray error = program.readAllStandardError();
     QVERIFY2(error.startsWith("vel-entryedit: "), error.constData());
     QCOMPARE(error.count('\n'), 1);
+}
+
+void tst_vel_entryedit::showsHelpAndVersionWithoutADisplay_data()
+{
+    QTest::addColumn<QString>("option");
+    QTest::addColumn<QByteArray>("text");
+    QTest::newRow("help") << QStringLiteral("--help") << QByteArray("--template");
+    QTest::newRow("version") << QStringLiteral("--version") << QByteArray("vel-entryedit " VEL_VERSION "\n");
+}
+
+void tst_vel_entryedit::showsHelpAndVersionWithoutADisplay()
+{
+    QFETCH(QString, option);
+    QFETCH(QByteArray, text);
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.remove(QStringLiteral("DISPLAY"));
+    QProcess program;
+    program.setProcessEnvironment(environment);
+    start(program, {option});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 0);
+    QCOMPARE(program.readAllStandardError(), QByteArray());
+    QVERIFY(program.readAllStandardOutput().contains(text));
 }
 
 void tst_vel_entryedit::saysThatItCannotOpenAMissingFile()

@@ -83,6 +83,8 @@ void tst_vel_menuprint::refusesWhatItCannotPrint_data()
     QTest::newRow("unknown format") << QStringList{QStringLiteral("--format"), QStringLiteral("yaml"),
                                                    QStringLiteral("/")}
                                     << QByteArray("vel-menuprint: unknown format: yaml\n");
+    QTest::newRow("unknown option") << QStringList{QStringLiteral("--nonsense")}
+                                    << QByteArray("vel-menuprint: Unknown option 'nonsense'.\n");
     QTest::newRow("two directories") << QStringList{QStringLiteral("/etc"), QStringLiteral("/usr")}
                                      << QByteArray("vel-menuprint: more than one directory\n");
 }
