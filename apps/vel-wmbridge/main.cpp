@@ -12,6 +12,8 @@
 #include <QSocketNotifier>
 
 #include <csignal>
+
+#include <fcntl.h>
 #include <unistd.h>
 
 namespace {
@@ -25,12 +27,13 @@ void handleSignal(int)
 {
     const char byte = 0;
     const ssize_t written = write(signalPipe[1], &byte, 1);
-    (void)written; // a full pipe wakes it up as well
+    (void)written; // a full pipe does not block and wakes it up as well
 }
 
 void quitOnSignals()
 {
-    if (pipe(signalPipe) != 0)
+    // Not for the commands that the bridge runs, and no signal handler may wait.
+    if (pipe2(signalPipe, O_CLOEXEC | O_NONBLOCK) != 0)
         return; // ended by the signal itself, then; the X server gives the channel up
     auto *notifier = new QSocketNotifier(signalPipe[0], QSocketNotifier::Read, qApp);
     QObject::connect(notifier, &QSocketNotifier::activated, qApp, &QCoreApplication::quit);
@@ -38,14 +41,15 @@ void quitOnSignals()
     std::signal(SIGINT, handleSignal);
 }
 
-} // namespace
-
-int main(int argc, char **argv)
+struct Options
 {
-    Program::describe(QStringLiteral("vel-wmbridge"));
-    QCoreApplication application(argc, argv);
-    Program::loadCatalogues();
+    BridgeCommands commands;
+    bool replace = false;
+    QString error; ///< what is wrong with the command line; empty when nothing is
+};
 
+Options parse()
+{
     QCommandLineParser parser;
     parser.setApplicationDescription(QCoreApplication::translate(
         "vel-wmbridge",
@@ -70,25 +74,46 @@ int main(int argc, char **argv)
         QStringLiteral("replace"),
         QCoreApplication::translate("vel-wmbridge", "Take the channel from the program that has it."));
     parser.addOptions({startMenu, toolBar, shortcut, other, replace});
-    parser.process(application);
-    if (!parser.positionalArguments().isEmpty()) {
-        Program::printError(QCoreApplication::translate("vel-wmbridge", "unexpected argument: %1")
-                                .arg(parser.positionalArguments().constFirst()));
-        return CannotStart;
-    }
 
-    Bridge bridge(
-        {parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)});
-    QObject::connect(&bridge, &Bridge::failed, &application, [](const QString &line) {
+    QString error = Program::parse(parser);
+    if (error.isEmpty() && !parser.positionalArguments().isEmpty())
+        error = QCoreApplication::translate("vel-wmbridge", "unexpected argument: %1")
+                    .arg(parser.positionalArguments().constFirst());
+    return {{parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)},
+            parser.isSet(replace),
+            error};
+}
+
+// Tells of what goes wrong while the bridge runs.
+void report(const Bridge *bridge)
+{
+    QObject::connect(bridge, &Bridge::failed, qApp, [](const QString &line) {
         Program::printError(
             QCoreApplication::translate("vel-wmbridge", "cannot run the command for %1").arg(line));
     });
-    QObject::connect(&bridge, &Bridge::lost, &application, [] {
+    QObject::connect(bridge, &Bridge::lost, qApp, [] {
         Program::printError(
             QCoreApplication::translate("vel-wmbridge", "another program has taken the channel"));
         QCoreApplication::exit(ChannelTaken);
     });
-    if (!bridge.start(parser.isSet(replace))) {
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    Program::describe(QStringLiteral("vel-wmbridge"));
+    QCoreApplication application(argc, argv);
+    Program::loadCatalogues();
+    const Options options = parse();
+    if (!options.error.isEmpty()) {
+        Program::printError(options.error);
+        return CannotStart;
+    }
+
+    Bridge bridge(options.commands);
+    report(&bridge);
+    if (!bridge.start(options.replace)) {
         Program::printError(QCoreApplication::translate(
             "vel-wmbridge", "cannot take the channel: there is no display, or another program has it"));
         return ChannelTaken;

@@ -42,6 +42,8 @@ private Q_SLOTS:
     void endsWhenTheChannelIsTaken();
     void givesTheChannelUpOnTermination();
     void endsWithoutADisplay();
+    void runsCommandsWithoutItsOwnFiles();
+    void refusesUnknownArguments_data();
     void refusesUnknownArguments();
 
 private:
@@ -172,12 +174,41 @@ void tst_vel_wmbridge::endsWithoutADisplay()
     QVERIFY(bridge.readAllStandardError().startsWith("vel-wmbridge: cannot take the channel"));
 }
 
+void tst_vel_wmbridge::runsCommandsWithoutItsOwnFiles()
+{
+    // What a shell has open besides its streams. Some of it may come from whoever runs the tests.
+    const QString listing = QStringLiteral("exec > '%1.new'; cd /proc/$$/fd; for file in ?*; do "
+                                           "case $file in [012]) ;; *) readlink $file ;; esac; done; "
+                                           "mv '%1.new' '%1'");
+    const QString usual = path(QStringLiteral("usual"));
+    QProcess::execute(QStringLiteral("/bin/sh"), {QStringLiteral("-c"), listing.arg(usual)});
+
+    start({QStringLiteral("--startmenu"), listing.arg(log())});
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_VERIFY(QFile::exists(log()));
+    const QByteArrayList known = read(usual).split('\n');
+    for (const QByteArray &file : read(log()).split('\n'))
+        QVERIFY2(known.contains(file), file.constData());
+}
+
+void tst_vel_wmbridge::refusesUnknownArguments_data()
+{
+    QTest::addColumn<QString>("argument");
+    QTest::addColumn<QByteArray>("message");
+    QTest::newRow("word") << QStringLiteral("now") << QByteArray("vel-wmbridge: unexpected argument: now\n");
+    QTest::newRow("option") << QStringLiteral("--now") << QByteArray("vel-wmbridge: Unknown option 'now'.\n");
+    QTest::newRow("no command") << QStringLiteral("--other")
+                                << QByteArray("vel-wmbridge: Missing value after '--other'.\n");
+}
+
 void tst_vel_wmbridge::refusesUnknownArguments()
 {
-    m_bridge.start(QStringLiteral(VEL_PROGRAM), {QStringLiteral("now")});
+    QFETCH(QString, argument);
+    QFETCH(QByteArray, message);
+    m_bridge.start(QStringLiteral(VEL_PROGRAM), {argument});
     QVERIFY(m_bridge.waitForFinished());
     QCOMPARE(m_bridge.exitCode(), 2);
-    QCOMPARE(m_bridge.readAllStandardError(), QByteArray("vel-wmbridge: unexpected argument: now\n"));
+    QCOMPARE(m_bridge.readAllStandardError(), message);
 }
 
 VEL_TEST_GUILESS_MAIN(tst_vel_wmbridge)
