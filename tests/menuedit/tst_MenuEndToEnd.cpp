@@ -14,7 +14,6 @@
 #include <QMenu>
 #include <QMessageBox>
 #include <QMimeData>
-#include <QPointer>
 #include <QProcess>
 #include <QPushButton>
 #include <QToolBar>
