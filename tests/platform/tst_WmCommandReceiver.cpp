@@ -8,6 +8,7 @@
 
 #include <QSocketNotifier>
 
+#include <atomic>
 #include <memory>
 #include <thread>
 
@@ -33,7 +34,11 @@ private:
     {
         return XCreateSimpleWindow(m_client.get(), DefaultRootWindow(m_client.get()), 0, 0, 1, 1, 0, 0, 0);
     }
-    bool ask(WmCommandReceiver &receiver, Window window, Atom target, XSelectionEvent *answer);
+    bool ask(WmCommandReceiver &receiver, Window window, Atom target, XSelectionEvent *answer)
+    {
+        return ask(receiver, window, target, atom("ANSWER"), answer);
+    }
+    bool ask(WmCommandReceiver &receiver, Window window, Atom target, Atom property, XSelectionEvent *answer);
     QVector<unsigned long> numbers(Window window, Atom property, Atom *type);
 
     std::unique_ptr<Display, CloseDisplay> m_client;
@@ -49,13 +54,18 @@ private Q_SLOTS:
     void callsBackWithEachLine();
     void waitsForTheEndOfALine();
     void deletesThePropertyThatItHasRead();
+    void ignoresPropertiesOfAnotherType_data();
     void ignoresPropertiesOfAnotherType();
     void leavesTheSelectionToItsOwner();
     void replacesTheOwnerWhenAsked();
+    void waitsUntilTheOldOwnerIsGone();
     void takesTheSelectionAgainAfterARelease();
     void handsOutWhatArrivedBeforeItLostTheSelection();
+    void handsOutWhatArrivedBeforeItNoticedTheLoss();
+    void forgetsHalfALineWhenItLosesTheSelection();
     void givesTheSelectionUpWhenDestroyed();
     void answersQuestionsAboutTheSelection();
+    void answersWhoNamesNoProperty();
     void outlivesARequestorThatIsGone();
 };
 
@@ -153,13 +163,24 @@ void WmCommandReceiverTest::deletesThePropertyThatItHasRead()
     QCOMPARE(m_lines, QStringList(QStringLiteral("VELWM_QUIT")));
 }
 
+void WmCommandReceiverTest::ignoresPropertiesOfAnotherType_data()
+{
+    QTest::addColumn<QByteArray>("type");
+    QTest::addColumn<int>("format");
+    QTest::newRow("numbers") << QByteArray("INTEGER") << 32;
+    QTest::newRow("wide characters") << QByteArray("STRING") << 16;
+    QTest::newRow("another text") << QByteArray("UTF8_STRING") << 8;
+}
+
 void WmCommandReceiverTest::ignoresPropertiesOfAnotherType()
 {
+    QFETCH(QByteArray, type);
+    QFETCH(int, format);
     WmCommandReceiver receiver(collect());
     QVERIFY(receiver.acquire());
-    const long number = '\n';
-    XChangeProperty(m_client.get(), receiver.windowId(), atom("_VELWM_COMMAND"), XA_INTEGER, 32,
-                    PropModeReplace, reinterpret_cast<const unsigned char *>(&number), 1);
+    const long lineFeed = '\n';
+    XChangeProperty(m_client.get(), receiver.windowId(), atom("_VELWM_COMMAND"), atom(type), format,
+                    PropModeReplace, reinterpret_cast<const unsigned char *>(&lineFeed), 1);
     XSync(m_client.get(), False);
     receiver.processEvents();
     QCOMPARE(m_lines, QStringList());
@@ -205,6 +226,23 @@ void WmCommandReceiverTest::replacesTheOwnerWhenAsked()
     QCOMPARE(m_lines, QStringList(QStringLiteral("VELWM_QUIT")));
 }
 
+void WmCommandReceiverTest::waitsUntilTheOldOwnerIsGone()
+{
+    WmCommandReceiver first(nullptr);
+    QVERIFY(first.acquire());
+    std::atomic<bool> isDone(false);
+    std::thread newOwner([&isDone] {
+        WmCommandReceiver second(nullptr);
+        second.acquire(true);
+        isDone = true;
+    });
+    const bool wasEarly = QTest::qWaitFor([&isDone] { return isDone.load(); }, 300);
+    first.processEvents();
+    newOwner.join();
+    QVERIFY(!wasEarly);
+    QVERIFY(!first.isOwner());
+}
+
 void WmCommandReceiverTest::takesTheSelectionAgainAfterARelease()
 {
     WmCommandReceiver receiver(collect());
@@ -231,6 +269,36 @@ void WmCommandReceiverTest::handsOutWhatArrivedBeforeItLostTheSelection()
     QCOMPARE(m_lines, QStringList(QStringLiteral("VELWM_QUIT")));
 }
 
+void WmCommandReceiverTest::handsOutWhatArrivedBeforeItNoticedTheLoss()
+{
+    WmCommandReceiver receiver(collect());
+    QVERIFY(receiver.acquire());
+    const Window window = receiver.windowId();
+    XSetSelectionOwner(m_client.get(), atom("_VELWM_COMMAND_S0"), makeWindow(), CurrentTime);
+    // Somebody had asked for the owner just before.
+    XChangeProperty(m_client.get(), window, atom("_VELWM_COMMAND"), XA_STRING, 8, PropModeAppend,
+                    reinterpret_cast<const unsigned char *>("VELWM_QUIT\n"), 11);
+    XSync(m_client.get(), False);
+    receiver.processEvents();
+    QVERIFY(!receiver.isOwner());
+    QCOMPARE(m_lines, QStringList(QStringLiteral("VELWM_QUIT")));
+}
+
+void WmCommandReceiverTest::forgetsHalfALineWhenItLosesTheSelection()
+{
+    WmCommandReceiver receiver(collect());
+    QVERIFY(receiver.acquire());
+    QVERIFY(SendCommandToWM(m_client.get(), "VELWM_"));
+    XSetSelectionOwner(m_client.get(), atom("_VELWM_COMMAND_S0"), None, CurrentTime);
+    XSync(m_client.get(), False);
+    receiver.processEvents();
+    QVERIFY(!receiver.isOwner());
+    QVERIFY(receiver.acquire());
+    QVERIFY(SendCommandToWM(m_client.get(), "QUIT\n"));
+    receiver.processEvents();
+    QCOMPARE(m_lines, QStringList(QStringLiteral("QUIT")));
+}
+
 void WmCommandReceiverTest::givesTheSelectionUpWhenDestroyed()
 {
     {
@@ -240,10 +308,10 @@ void WmCommandReceiverTest::givesTheSelectionUpWhenDestroyed()
     QTRY_COMPARE(XGetSelectionOwner(m_client.get(), atom("_VELWM_COMMAND_S0")), static_cast<Window>(None));
 }
 
-bool WmCommandReceiverTest::ask(WmCommandReceiver &receiver, Window window, Atom target,
+bool WmCommandReceiverTest::ask(WmCommandReceiver &receiver, Window window, Atom target, Atom property,
                                 XSelectionEvent *answer)
 {
-    XConvertSelection(m_client.get(), atom("_VELWM_COMMAND_S0"), target, atom("ANSWER"), window, CurrentTime);
+    XConvertSelection(m_client.get(), atom("_VELWM_COMMAND_S0"), target, property, window, CurrentTime);
     XSync(m_client.get(), False);
     receiver.processEvents();
     XSync(m_client.get(), False);
@@ -301,6 +369,18 @@ void WmCommandReceiverTest::answersQuestionsAboutTheSelection()
     QCOMPARE(numbers(window, atom("ANSWER"), &type),
              QVector<unsigned long>({atom("TIMESTAMP"), atom("FIRST"), atom("STRING"), None}));
     QCOMPARE(numbers(window, atom("FIRST"), &type), time);
+}
+
+void WmCommandReceiverTest::answersWhoNamesNoProperty()
+{
+    WmCommandReceiver receiver(collect());
+    QVERIFY(receiver.acquire());
+    const Window window = makeWindow();
+    XSelectionEvent answer;
+    QVERIFY(ask(receiver, window, atom("TIMESTAMP"), None, &answer));
+    QCOMPARE(answer.property, atom("TIMESTAMP"));
+    Atom type = None;
+    QCOMPARE(numbers(window, answer.property, &type).size(), 1);
 }
 
 void WmCommandReceiverTest::outlivesARequestorThatIsGone()

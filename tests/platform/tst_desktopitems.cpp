@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OrdinaryUser.h"
 #include "TestCase.h"
 
 #include <velintegration/desktopitems.h>
@@ -122,6 +123,17 @@ private Q_SLOTS:
         QCOMPARE(QDir(path(QStringLiteral("config")))
                      .entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
                  QStringList(QStringLiteral("desktopitems")));
+    }
+
+    void leavesAFileThatItCannotRead()
+    {
+        write(QStringLiteral("config/desktopitems"), "1 1 a\n");
+        const OrdinaryUser user(folder());
+        QVERIFY(QFile::setPermissions(file(), QFile::WriteOwner));
+        QVERIFY(!SaveDesktopItemPosition("b", 2, 2));
+        QCOMPARE(position("a"), unknown());
+        QVERIFY(QFile::setPermissions(file(), QFile::ReadOwner));
+        QCOMPARE(read(file()), QByteArray("1 1 a\n"));
     }
 
     void failsWhenTheRootCannotBeMade()

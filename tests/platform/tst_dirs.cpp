@@ -26,6 +26,7 @@ private Q_SLOTS:
     void variablesThatHoldNoAbsolutePathCountAsNotSet();
     void menuAndToolBarLieBelowTheRoot();
     void everyCallReadsTheEnvironmentAnew();
+    void theHomeMayBeTheRoot();
     void trailingSlashesAreDropped();
     void nothingIsCreatedByAsking();
     void unknownKindsAreEmpty_data();
@@ -92,6 +93,14 @@ void DirsTest::everyCallReadsTheEnvironmentAnew()
     QCOMPARE(dir(VelDir::StartMenu), path(QStringLiteral("one/startmenu")));
     setPath("VEL_CONFIG_HOME", path(QStringLiteral("two")));
     QCOMPARE(dir(VelDir::StartMenu), path(QStringLiteral("two/startmenu")));
+}
+
+void DirsTest::theHomeMayBeTheRoot()
+{
+    qputenv("HOME", "/");
+    qunsetenv("XDG_CONFIG_HOME");
+    QCOMPARE(dir(VelDir::Desktop), QStringLiteral("/Desktop"));
+    QCOMPARE(dir(VelDir::StartMenu), QStringLiteral("/.config/vel/startmenu"));
 }
 
 void DirsTest::trailingSlashesAreDropped()

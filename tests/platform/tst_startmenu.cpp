@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OrdinaryUser.h"
 #include "TestCase.h"
 
 #include <velintegration/startmenu.h>
@@ -54,7 +55,8 @@ private Q_SLOTS:
     void namesEveryFolderInAllLanguages();
     void givesEveryFolderAnIconOfItsOwn();
     void ordersTheEntriesByTheirShownNames();
-    void listsNamesWithSemicolons();
+    void ordersEntriesOfOneNameByTheirFiles();
+    void listsOddFileNames();
     void leavesOutWhatIsNotDisplayable_data();
     void leavesOutWhatIsNotDisplayable();
     void hidesAnIdThatWasSeenEarlier();
@@ -145,6 +147,7 @@ void StartMenuTest::groupsByTheFirstMainCategory_data()
         {"WebBrowser;", "Other"},
         {"X-Own;Player;", "Other"},
         {"Other;", "Other"},
+        {"Other;Game;", "Game"},
         {"office;", "Other"},
         {"Office;", "Office"},
         {"Office", "Office"},
@@ -281,13 +284,26 @@ void StartMenuTest::ordersTheEntriesByTheirShownNames()
     QCOMPARE(sortOrder(inMenu(QStringLiteral("Game"))), list("2.desktop 3.desktop 1.desktop"));
 }
 
-void StartMenuTest::listsNamesWithSemicolons()
+void StartMenuTest::ordersEntriesOfOneNameByTheirFiles()
 {
-    const QStringList names = {QStringLiteral("a;b.desktop"), QStringLiteral("c\\d.desktop"),
-                               QStringLiteral("e f.desktop"), QStringLiteral("g\nh.desktop")};
-    for (const QString &name : names)
-        write(QStringLiteral("home/applications/") + name,
-              "[Desktop Entry]\nType=Application\nName=" + name.left(1).toUtf8()
+    const QByteArray entry = "[Desktop Entry]\nType=Application\nName=Same\nExec=true\nCategories=Game;\n";
+    write(QStringLiteral("home/applications/z.desktop"), entry);
+    write(QStringLiteral("system/applications/a.desktop"), QByteArray(entry).replace("Same", "same"));
+    write(QStringLiteral("system/applications/b.desktop"), entry);
+    QVERIFY(create());
+    QCOMPARE(
+        sortOrder(inMenu(QStringLiteral("Game"))),
+        QStringList({QStringLiteral("a.desktop"), QStringLiteral("b.desktop"), QStringLiteral("z.desktop")}));
+}
+
+void StartMenuTest::listsOddFileNames()
+{
+    const QStringList names = {QStringLiteral(" a.desktop"), QStringLiteral("a;b.desktop"),
+                               QStringLiteral("c\\d.desktop"), QStringLiteral("e f.desktop"),
+                               QStringLiteral("g\nh.desktop")};
+    for (int i = 0; i < names.size(); ++i)
+        write(QStringLiteral("home/applications/") + names.at(i),
+              "[Desktop Entry]\nType=Application\nName=" + QByteArray::number(i)
                   + "\nExec=true\nCategories=Game;\n");
     QVERIFY(create());
     QCOMPARE(sortOrder(inMenu(QStringLiteral("Game"))), names);
@@ -548,6 +564,7 @@ void StartMenuTest::removesReadOnlyFoldersOfTheOldMenu()
     write(QStringLiteral("config/vel/startmenu/a/b/c.desktop"), "[Desktop Entry]\n");
     for (const char *name : {"a/b", "a"})
         QVERIFY(QFile::setPermissions(inMenu(QString::fromLatin1(name)), QFile::ReadOwner | QFile::ExeOwner));
+    const OrdinaryUser user(folder());
     QVERIFY(create());
     QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
 }
