@@ -33,7 +33,7 @@ using MenuItems = std::vector<MenuItem>;
 
 bool isShownApplication(const VelUIDesktopEntry &entry)
 {
-    return entry.isValid() && entry.getType() == QLatin1String("Application") && entry.isDisplayable(nullptr);
+    return entry.getType() == QLatin1String("Application") && entry.isDisplayable(nullptr);
 }
 
 // The applications by the place of their category.
