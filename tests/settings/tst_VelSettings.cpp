@@ -74,12 +74,6 @@ private Q_SLOTS:
     void opensADirectoryWithoutACrash();
     void syncsNothingThatGaveAnErrorWhenItWasOpened();
     void sharesChangesBetweenObjectsOnOneFile();
-    void opensAgainAfterTheLastKeyWasRemoved_data();
-    void opensAgainAfterTheLastKeyWasRemoved();
-    void opensAgainWhileAnObjectThatRemovedTheLastKeyLives();
-    void writesAKeyThatIsSetAfterTheLastOneWasRemoved();
-    void keepsEverySlashedKeyWhenAllWereRemoved();
-    void sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved();
     void registersItsFormatOnceUnderItsExtension();
 };
 
@@ -381,116 +375,6 @@ void tst_VelSettings::sharesChangesBetweenObjectsOnOneFile()
     VelSettings other(file);
     one.setValue(s("a"), 2);
     QCOMPARE(other.value(s("a")), QVariant(2));
-}
-
-void tst_VelSettings::opensAgainAfterTheLastKeyWasRemoved_data()
-{
-    QTest::addColumn<QByteArray>("bytes");
-    QTest::addColumn<QString>("removed");
-    QTest::addColumn<bool>("syncs");
-    QTest::newRow("one key, written at the end") << QByteArray("# kept\nonly=1\n") << s("only") << false;
-    QTest::newRow("one key, synced") << QByteArray("# kept\nonly=1\n") << s("only") << true;
-    QTest::newRow("header alone") << QByteArray("[Main]\n") << s("SectionName") << true;
-    QTest::newRow("all keys") << QByteArray("[Main]\nonly=1\nb=2\n\n;c\n") << s("") << true;
-}
-
-void tst_VelSettings::opensAgainAfterTheLastKeyWasRemoved()
-{
-    QFETCH(QByteArray, bytes);
-    QFETCH(QString, removed);
-    QFETCH(bool, syncs);
-    const QString file = write(s("rc"), bytes);
-    StderrCapture capture;
-    {
-        VelSettings settings(file);
-        settings.remove(removed);
-        if (syncs) {
-            settings.sync();
-            QCOMPARE(read(file), bytes);
-        }
-        if (!removed.isEmpty())
-            QCOMPARE(settings.value(removed), QVariant());
-    }
-    const QByteArray refusal("VelSettings: file isn't open or settings are empty\n");
-    QVERIFY(capture.take().startsWith(refusal));
-    QCOMPARE(read(file), bytes);
-
-    const QByteArray lastOfAll = bytes.contains("[Main]") ? "[Main]\n" : "";
-    const bool hadKey = bytes.contains("only");
-    {
-        VelSettings settings(file);
-        QVERIFY(settings.isParsed());
-        if (hadKey)
-            QCOMPARE(settings.value(s("only")), QVariant(1));
-        settings.setValue(s("new"), 3);
-    }
-    const QByteArray written = read(file);
-    QVERIFY(written.startsWith(lastOfAll));
-    QCOMPARE(written.contains("only=1\n"), hadKey);
-    QCOMPARE(written.contains("b=2\n"), bytes.contains("b=2\n"));
-    QVERIFY(written.contains("new=3\n"));
-    QCOMPARE(QDir(folder()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
-             QStringList{s("rc")});
-}
-
-void tst_VelSettings::opensAgainWhileAnObjectThatRemovedTheLastKeyLives()
-{
-    const QByteArray bytes("# kept\nonly=1\n");
-    const QString file = write(s("rc"), bytes);
-    StderrCapture capture;
-    VelSettings first(file);
-    first.remove(s("only"));
-    VelSettings second(file);
-    capture.take();
-    QVERIFY(second.isParsed());
-    QCOMPARE(second.value(s("only")), QVariant(1));
-    QCOMPARE(read(file), bytes);
-    second.setValue(s("new"), 2);
-    second.sync();
-    QCOMPARE(read(file), QByteArray("new=2\nonly=1\n"));
-}
-
-void tst_VelSettings::writesAKeyThatIsSetAfterTheLastOneWasRemoved()
-{
-    const QString file = write(s("rc"), "old=1\n");
-    StderrCapture capture;
-    VelSettings settings(file);
-    settings.remove(s("old"));
-    settings.sync();
-    capture.take();
-    settings.setValue(s("new"), 2);
-    settings.sync();
-    QCOMPARE(read(file), QByteArray("new=2\n"));
-}
-
-void tst_VelSettings::keepsEverySlashedKeyWhenAllWereRemoved()
-{
-    const QString file = write(s("rc"), "//dbl=1\n/lead=2\nonly=3\ntrail/=4\n");
-    StderrCapture capture;
-    {
-        VelSettings settings(file);
-        settings.remove(QString());
-    }
-    capture.take();
-    {
-        VelSettings settings(file);
-        settings.setValue(s("only"), 5);
-    }
-    QCOMPARE(read(file), QByteArray("//dbl=1\n/lead=2\nonly=5\ntrail/=4\n"));
-}
-
-void tst_VelSettings::sparesAKeyThatComesFromElsewhereAfterTheLastOneWasRemoved()
-{
-    const QString file = write(s("rc"), "only=1\n");
-    StderrCapture capture;
-    VelSettings settings(file);
-    settings.remove(s("only"));
-    settings.sync();
-    capture.take();
-    write(s("rc"), "from=elsewhere\nonly=1\n");
-    settings.sync();
-    QCOMPARE(read(file), QByteArray("from=elsewhere\n"));
-    QCOMPARE(settings.value(s("from")), QVariant(s("elsewhere")));
 }
 
 // The last one: it takes all the formats that are left.
