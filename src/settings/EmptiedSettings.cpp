@@ -58,8 +58,7 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
 
 bool isLeft(const QSettings &settings)
 {
-    return settings.format() != QSettings::InvalidFormat && settings.status() == QSettings::AccessError
-        && settings.allKeys().isEmpty();
+    return settings.status() == QSettings::AccessError && settings.allKeys().isEmpty();
 }
 
 bool drop(QSettings &settings)
