@@ -52,6 +52,8 @@ private Q_SLOTS:
     void leavesTheCurrentShortcutWhenItGoes();
     void staysOnTheCurrentShortcutWhenRowsComeBeforeIt();
     void showsARowAgainThatIsUsedAgain();
+    void showsARowThatIsRegisteredLater();
+    void keepsItsModelWhenTheOneBeforeGoes();
     void outlivesItsModel();
 
 private:
@@ -326,6 +328,26 @@ void tst_ShortcutsTreeView::showsARowAgainThatIsUsedAgain()
     addAction("copy", "Edit", f2);
     QTRY_COMPARE(shownTexts(),
                  QStringList({str("File"), str("open"), str("save"), str("Edit"), str("copy")}));
+}
+
+void tst_ShortcutsTreeView::showsARowThatIsRegisteredLater()
+{
+    m_view->show();
+    QVERIFY(QTest::qWaitForWindowExposed(m_view.get()));
+    QCOMPARE(shownTexts().size(), 5);
+    addAction("paste", "Edit", QKeySequence(Qt::Key_F4));
+    QTRY_COMPARE(
+        shownTexts(),
+        QStringList({str("File"), str("open"), str("save"), str("Edit"), str("copy"), str("paste")}));
+}
+
+void tst_ShortcutsTreeView::keepsItsModelWhenTheOneBeforeGoes()
+{
+    ShortcutsModel other(nullptr, QString());
+    m_view->setModel(&other);
+    m_model.reset();
+    QCOMPARE(m_view->model(), &other);
+    m_view->setModel(nullptr);
 }
 
 void tst_ShortcutsTreeView::outlivesItsModel()
