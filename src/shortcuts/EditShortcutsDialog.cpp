@@ -186,10 +186,7 @@ void EditShortcutsDialog::keyPressEvent(QKeyEvent *event)
 bool EditShortcutsDialog::eventFilter(QObject *watched, QEvent *event)
 {
     if (watched == d->keyWidget && event->type() == QEvent::KeyPress) {
-        const int key = static_cast<QKeyEvent *>(event)->key();
-        // These two move the focus and record nothing.
-        if (key != Qt::Key_Tab && key != Qt::Key_Backtab)
-            d->isRecording = true;
+        d->isRecording = true;
     } else if (watched == d->keyWidget && event->type() == QEvent::FocusOut
                && static_cast<QFocusEvent *>(event)->reason() != Qt::PopupFocusReason) {
         // The editor itself would wait a second for one more chord, while the user goes on to

@@ -71,6 +71,7 @@ private Q_SLOTS:
 
     void commitsOnOk();
     void throwsTheEditsAwayOnCancel();
+    void throwsTheEditsAwayOnEscape_data();
     void throwsTheEditsAwayOnEscape();
     void throwsTheEditsAwayWhenTheHostRejectsIt();
     void closesUnaskedWhileNothingIsChanged();
@@ -484,11 +485,22 @@ void tst_EditShortcutsDialog::throwsTheEditsAwayOnCancel()
     QVERIFY(!m_dialog->isVisible());
 }
 
+void tst_EditShortcutsDialog::throwsTheEditsAwayOnEscape_data()
+{
+    QTest::addColumn<bool>("byDialog");
+    QTest::newRow("made in the dialog") << true;
+    QTest::newRow("made in the model") << false;
+}
+
 void tst_EditShortcutsDialog::throwsTheEditsAwayOnEscape()
 {
+    QFETCH(bool, byDialog);
     m_dialog->show();
     select("open");
-    m_dialog->checkEnteredKeySequence(f9);
+    if (byDialog)
+        m_dialog->checkEnteredKeySequence(f9);
+    else
+        m_model->setKeySequence(row("open"), f9);
     QSignalSpy spy(m_dialog.get(), &QDialog::rejected);
     QTest::keyClick(tree(), Qt::Key_Escape);
     QCOMPARE(spy.count(), 1);

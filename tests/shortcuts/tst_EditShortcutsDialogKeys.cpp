@@ -30,6 +30,7 @@ private Q_SLOTS:
     void asksNothingWhenARecordingBegins();
     void refusesATakenKeyAfterTheRecording();
     void endsTheRecordingWhenTheFocusLeaves();
+    void goesOnRecordingBesideAMenu();
     void ignoresARecordingWhoseRowIsGone();
     void takesAnEmptyKeyAfterARecording();
     void goesFromFieldToFieldWithTab();
@@ -144,7 +145,11 @@ void tst_EditShortcutsDialogKeys::refusesATakenKeyAfterTheRecording()
     m_model->setKeySequence(row("open"), f9);
     record("open");
     ModalDriver modal;
-    modal.answer(localConflict("F2", "Text of save"), QMessageBox::Ok);
+    modal.answerWith(localConflict("F2", "Text of save"), [this](QMessageBox *box) {
+        // That the message takes the focus is no second reason for one.
+        QTRY_VERIFY(!keyWidget()->hasFocus());
+        box->button(QMessageBox::Ok)->click();
+    });
     press(Qt::Key_F2);
     QTRY_VERIFY(modal.finished() && !QApplication::activeModalWidget());
     QCOMPARE(pendingKey("open"), f9);
@@ -183,6 +188,20 @@ void tst_EditShortcutsDialogKeys::endsTheRecordingWhenTheFocusLeaves()
     tree()->setFocus();
     QCOMPARE(keyWidget()->keySequence(), f9);
     QCOMPARE(pendingKey("save"), f9);
+}
+
+void tst_EditShortcutsDialogKeys::goesOnRecordingBesideAMenu()
+{
+    record("open");
+    press(Qt::Key_F2);
+    // A message about the taken key would lie below the menu, where no click reaches it.
+    ModalDriver modal;
+    QFocusEvent menu(QEvent::FocusOut, Qt::PopupFocusReason);
+    QCoreApplication::sendEvent(keyWidget(), &menu);
+    QVERIFY(!QApplication::activeModalWidget());
+    QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::Key_F2));
+    modal.answer(localConflict("F2", "Text of save"), QMessageBox::Ok);
+    QTRY_VERIFY(modal.finished() && !QApplication::activeModalWidget());
 }
 
 void tst_EditShortcutsDialogKeys::ignoresARecordingWhoseRowIsGone()
