@@ -55,6 +55,7 @@ void EditShortcutsDialog::checkCurrentShortcut(QKeySequence defKS, QKeySequence 
     d->groupBox->setEnabled(true);
     const QString defaultText = defKS.toString(QKeySequence::PortableText);
     d->defaultKeyLabel->setText(defaultText.isEmpty() ? tr("None") : defaultText);
+    d->defaultKeyRB->setAccessibleDescription(d->defaultKeyLabel->text());
     d->showKey(currentKS);
     if (defKS == currentKS) {
         const QSignalBlocker blocker(d->defaultKeyRB);

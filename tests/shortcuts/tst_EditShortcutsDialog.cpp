@@ -4,6 +4,7 @@
 #include "DialogTestCase.h"
 #include "MetaMethods.h"
 
+#include <QAccessible>
 #include <QGridLayout>
 #include <QSignalSpy>
 #include <QTimer>
@@ -42,6 +43,7 @@ class tst_EditShortcutsDialog : public DialogTestCase
 private Q_SLOTS:
     void hasTheFormThatIsDesigned();
     void hasTheSlotsThatAreDesigned();
+    void tellsScreenReadersWhatItsFieldsAre();
     void beginsUnchangedWithNothingToEdit();
     void showsAllGroupsOpenWithReadableColumns();
     void showsADefaultKey();
@@ -115,6 +117,7 @@ void tst_EditShortcutsDialog::hasTheFormThatIsDesigned()
     QCOMPARE(position(keyWidget()), QVector<int>({2, 1, 1, 2}));
     QCOMPARE(defaultButton()->text(), str("Default key:"));
     QCOMPARE(customButton()->text(), str("Assign key:"));
+    QCOMPARE(int(defaultLabel()->textFormat()), int(Qt::PlainText)); // a key may be "<"
     QCOMPARE(int(child<QDialogButtonBox>("buttonBox")->standardButtons()),
              int(QDialogButtonBox::Ok | QDialogButtonBox::Cancel | QDialogButtonBox::Reset
                  | QDialogButtonBox::RestoreDefaults));
@@ -137,6 +140,21 @@ void tst_EditShortcutsDialog::hasTheSlotsThatAreDesigned()
         metaMethodsOf(ShortcutsModel::staticMetaObject),
         QStringList({str("public slot restoreDefaults()"), str("public slot resetShortcuts()"),
                      str("public slot commitChanges()"), str("public slot saveKeys(QSettings*,QString)")}));
+}
+
+void tst_EditShortcutsDialog::tellsScreenReadersWhatItsFieldsAre()
+{
+    const auto textOf = [](QWidget *widget, QAccessible::Text kind) {
+        return QAccessible::queryAccessibleInterface(widget)->text(kind);
+    };
+    QCOMPARE(textOf(tree(), QAccessible::Name), str("Configure shortcuts"));
+    QCOMPARE(textOf(keyWidget(), QAccessible::Name), str("Assign key:"));
+    // The label beside the button is not reached by the keyboard.
+    select("open");
+    QCOMPARE(textOf(defaultButton(), QAccessible::Name), str("Default key:"));
+    QCOMPARE(textOf(defaultButton(), QAccessible::Description), str("F1"));
+    select("print");
+    QCOMPARE(textOf(defaultButton(), QAccessible::Description), str("None"));
 }
 
 void tst_EditShortcutsDialog::beginsUnchangedWithNothingToEdit()
