@@ -31,8 +31,10 @@ private Q_SLOTS:
     void refusesATakenKeyAfterTheRecording();
     void endsTheRecordingWhenTheFocusLeaves();
     void goesOnRecordingBesideAMenu();
+    void ignoresARecordingWhoseRowIsGone_data();
     void ignoresARecordingWhoseRowIsGone();
     void takesAnEmptyKeyAfterARecording();
+    void takesAnEmptyKeyAfterTheHostChangedTheKey();
     void goesFromFieldToFieldWithTab();
     void confirmsWithReturn();
 
@@ -204,14 +206,24 @@ void tst_EditShortcutsDialogKeys::goesOnRecordingBesideAMenu()
     QTRY_VERIFY(modal.finished() && !QApplication::activeModalWidget());
 }
 
+void tst_EditShortcutsDialogKeys::ignoresARecordingWhoseRowIsGone_data()
+{
+    QTest::addColumn<int>("key");
+    QTest::newRow("free") << int(Qt::Key_F8);
+    QTest::newRow("taken") << int(Qt::Key_F2);
+}
+
 void tst_EditShortcutsDialogKeys::ignoresARecordingWhoseRowIsGone()
 {
+    QFETCH(int, key);
+    const ModalDriver modal;
     record("open");
-    press(Qt::Key_F8);
+    press(key);
     QSignalSpy spy(keyWidget(), &QKeySequenceEdit::editingFinished);
     delete open;
     QTRY_VERIFY(!groupBox()->isEnabled());
     QVERIFY(!spy.wait(1500));
+    QVERIFY(modal.finished());
     QVERIFY(!m_model->hasKeySequence(QKeySequence(Qt::Key_F8)));
     QVERIFY(!isChanged());
 }
@@ -221,6 +233,17 @@ void tst_EditShortcutsDialogKeys::takesAnEmptyKeyAfterARecording()
     record("open");
     press(Qt::Key_F8);
     QTRY_COMPARE(pendingKey("open"), QKeySequence(Qt::Key_F8));
+    keyWidget()->clear();
+    QVERIFY(pendingKey("open").isEmpty());
+}
+
+void tst_EditShortcutsDialogKeys::takesAnEmptyKeyAfterTheHostChangedTheKey()
+{
+    m_model->setKeySequence(row("open"), f9);
+    record("open");
+    press(Qt::Key_F8);
+    m_model->setKeySequence(row("open"), QKeySequence(Qt::Key_F7));
+    QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::Key_F7));
     keyWidget()->clear();
     QVERIFY(pendingKey("open").isEmpty());
 }
