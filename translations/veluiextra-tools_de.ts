@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Ganze Zeile löschen</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Verwendet: %1</translation>
     </message>

@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Eliminar la línea completa</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Usado: %1</translation>
     </message>

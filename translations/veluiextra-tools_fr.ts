@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Supprimer toute la ligne</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Utilisé : %1</translation>
     </message>

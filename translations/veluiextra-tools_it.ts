@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Elimina l&apos;intera riga</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Usato: %1</translation>
     </message>

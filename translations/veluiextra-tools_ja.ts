@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>行全体を削除</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>使用: %1</translation>
     </message>

@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Usuń cały wiersz</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Użyto: %1</translation>
     </message>

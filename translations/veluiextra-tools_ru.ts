@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Удалить всю строку</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Использовано: %1</translation>
     </message>

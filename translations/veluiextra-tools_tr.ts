@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Tüm satırı sil</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Kullanıldı: %1</translation>
     </message>

@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>Вилучити весь рядок</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>Використано: %1</translation>
     </message>

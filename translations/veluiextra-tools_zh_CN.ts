@@ -488,6 +488,10 @@
 <context>
     <name>ShortcutsPage</name>
     <message>
+        <source>Delete the whole line</source>
+        <translation>删除整行</translation>
+    </message>
+    <message>
         <source>Used: %1</source>
         <translation>已使用：%1</translation>
     </message>

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "EditorCommands.h"
+#include "EditorKey.h"
 #include "GalleryPage.h"
 
 #include <EditShortcutsDialog.h>
@@ -18,6 +19,7 @@
 #include <QSettings>
 #include <QShortcut>
 #include <QStatusBar>
+#include <QTextCursor>
 
 namespace {
 
@@ -63,6 +65,30 @@ void addCommands(QMainWindow *page, QPlainTextEdit *editor, QLabel *last, Shortc
     }
 }
 
+// A key that is no action's; its saved key is not the model's business.
+void addEditorKey(QPlainTextEdit *editor, QLabel *last, ShortcutsModel *model, const QSettings &settings)
+{
+    const QString text = PageTexts::tr("Delete the whole line");
+    const auto deleteLine = [last, text](QPlainTextEdit *e) {
+        QTextCursor cursor = e->textCursor();
+        cursor.movePosition(QTextCursor::StartOfBlock);
+        if (!cursor.movePosition(QTextCursor::NextBlock, QTextCursor::KeepAnchor))
+            cursor.movePosition(QTextCursor::EndOfBlock, QTextCursor::KeepAnchor);
+        cursor.removeSelectedText();
+        last->setText(PageTexts::tr("Used: %1").arg(text));
+    };
+    auto *key = new EditorKey(
+        editor,
+        {QStringLiteral("delete-line"), QCoreApplication::translate("EditorCommands", "Text"), text,
+         QKeySequence(QStringLiteral("Ctrl+Shift+K"), QKeySequence::PortableText), deleteLine});
+    const QVariant saved = settings.value(settingsGroup + QLatin1Char('/') + key->name());
+    if (saved.isValid()) {
+        key->setObjectKeySequence(QKeySequence(saved.toString(), QKeySequence::PortableText));
+        key->reset();
+    }
+    model->registerShortcutObject(key);
+}
+
 QWidget *createPage(const GalleryContext &context, QWidget *parent)
 {
     Q_UNUSED(context)
@@ -79,6 +105,7 @@ QWidget *createPage(const GalleryContext &context, QWidget *parent)
     page->statusBar()->addWidget(last);
     page->statusBar()->setSizeGripEnabled(false);
     addCommands(page, editor, last, model);
+    addEditorKey(editor, last, model, settings);
 
     auto *focusShortcut = new QShortcut(QKeySequence(Qt::Key_F6), page);
     QObject::connect(focusShortcut, &QShortcut::activated, editor, [editor] { editor->setFocus(); });
@@ -107,6 +134,8 @@ GalleryPage shortcutsPage()
 auto *model = new ShortcutsModel(&settings, "Shortcuts", this);
 model->registerAction("file-save", saveAction, tr("File"));
 model->registerShortcut("focus", focusShortcut, tr("Go to the editor"), tr("View"));
+// What is neither: a class of your own, from IShortcutObject.
+model->registerShortcutObject(new EditorKey(editor, deleteLine));
 
 EditShortcutsDialog dialog(model, this);
 if (dialog.exec() == QDialog::Accepted)

@@ -5,6 +5,7 @@
 #include "GalleryWindow.h"
 #include "TestCase.h"
 
+#include <ShortcutsModel.h>
 #include <VelRadioGroupBox.h>
 
 #include <QCheckBox>
@@ -18,6 +19,7 @@
 #include <QProcess>
 #include <QPushButton>
 #include <QSet>
+#include <QSettings>
 #include <QSpinBox>
 
 #include <memory>
@@ -71,6 +73,7 @@ private Q_SLOTS:
     void takesBackEditsOnReset();
     void saysThatNoSettingsFileWasNamed();
     void saysThatTheSettingsFileCannotBeOpened();
+    void givesAKeyThatIsNoActionsToTheUser();
     void writesPicturesInEveryCombination();
     void failsForAPageThatDoesNotExist();
     void failsWhenPicturesCannotBeWritten();
@@ -203,6 +206,35 @@ void tst_vel_gallery::saysThatTheSettingsFileCannotBeOpened()
     const auto window = openPage(s("settings"), path(s("none")));
     QCOMPARE(child<QLabel>(*window, "stateLabel")->text(), path(s("none")) + s(" cannot be opened."));
     QVERIFY(!child<QDialogButtonBox>(*window, "buttonBox")->isEnabled());
+}
+
+void tst_vel_gallery::givesAKeyThatIsNoActionsToTheUser()
+{
+    const auto textAfter = [](const GalleryWindow &window, Qt::Key key, Qt::KeyboardModifiers modifiers) {
+        auto *editor = child<QPlainTextEdit>(window, "editor");
+        editor->setPlainText(s("one\ntwo\n"));
+        QTest::keyClick(editor, key, modifiers);
+        return editor->toPlainText();
+    };
+    const Qt::KeyboardModifiers controlShift = Qt::ControlModifier | Qt::ShiftModifier;
+    auto window = openPage(s("shortcuts"));
+    QCOMPARE(textAfter(*window, Qt::Key_K, controlShift), s("two\n"));
+    QCOMPARE(textAfter(*window, Qt::Key_F8, Qt::ShiftModifier), s("one\ntwo\n"));
+
+    auto *model = child<ShortcutsModel>(*window, "shortcutsModel");
+    IShortcutObject *key = model->hasKeySequence(QKeySequence(s("Ctrl+Shift+K")));
+    QVERIFY(key);
+    QCOMPARE(key->text(), s("Delete the whole line"));
+    key->setKeySequence(QKeySequence(s("Shift+F8")));
+    model->commitChanges();
+    QCOMPARE(textAfter(*window, Qt::Key_F8, Qt::ShiftModifier), s("two\n"));
+    QSettings settings(s("vel-gallery"), s("vel-gallery"));
+    model->saveKeys(&settings, s("Shortcuts"));
+
+    window = openPage(s("shortcuts"));
+    QCOMPARE(textAfter(*window, Qt::Key_F8, Qt::ShiftModifier), s("two\n"));
+    QCOMPARE(textAfter(*window, Qt::Key_K, controlShift), s("one\ntwo\n"));
+    settings.clear();
 }
 
 void tst_vel_gallery::writesPicturesInEveryCombination()
