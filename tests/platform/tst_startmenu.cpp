@@ -288,8 +288,8 @@ void StartMenuTest::ordersEntriesOfOneNameByTheirFiles()
 {
     const QByteArray entry = "[Desktop Entry]\nType=Application\nName=Same\nExec=true\nCategories=Game;\n";
     write(QStringLiteral("home/applications/z.desktop"), entry);
-    write(QStringLiteral("system/applications/a.desktop"), QByteArray(entry).replace("Same", "same"));
-    write(QStringLiteral("system/applications/b.desktop"), entry);
+    write(QStringLiteral("system/applications/a.desktop"), entry);
+    write(QStringLiteral("system/applications/b.desktop"), QByteArray(entry).replace("Same", "same"));
     QVERIFY(create());
     QCOMPARE(
         sortOrder(inMenu(QStringLiteral("Game"))),
