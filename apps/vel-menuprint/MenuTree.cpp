@@ -13,13 +13,13 @@
 #include <QSet>
 
 #include <algorithm>
+#include <optional>
 
 namespace {
 
 struct Child
 {
     MenuItem item;
-    QString fileName;
     QDateTime modified;
     SortOrder::Mention mention;
 };
@@ -47,14 +47,18 @@ bool isLater(const Child &left, const Child &right)
     return left.modified > right.modified;
 }
 
-MenuItem describe(const QFileInfo &info)
+MenuItem plainFile(const QFileInfo &info)
 {
     MenuItem item;
     item.path = info.absoluteFilePath();
     item.name = info.fileName();
-    if (!info.fileName().endsWith(QLatin1String(".desktop")))
-        return item;
-    const VelUIDesktopEntry record(item.path);
+    return item;
+}
+
+MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
+{
+    MenuItem item;
+    item.path = info.absoluteFilePath();
     item.name = EntryName::of(record);
     item.icon = record.getIcon();
     item.exec = record.getExec();
@@ -64,25 +68,29 @@ MenuItem describe(const QFileInfo &info)
 
 MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above);
 
+// Nothing for what the menu does not show, and for a folder that is being read already.
+std::optional<MenuItem> itemOf(const QFileInfo &info, QSet<QString> *above)
+{
+    if (info.isDir()) {
+        if (above->contains(info.canonicalFilePath()))
+            return {};
+        return readFolder(info, above);
+    }
+    if (!info.fileName().endsWith(QLatin1String(".desktop")))
+        return plainFile(info);
+    const VelUIDesktopEntry record(info.absoluteFilePath());
+    if (isHidden(record))
+        return {};
+    return entry(info, record);
+}
+
 QVector<Child> childrenOf(const QString &path, const SortOrder::Index &order, QSet<QString> *above)
 {
     QVector<Child> children;
     for (const QFileInfo &info : QDir(path).entryInfoList(QDir::AllEntries | QDir::NoDotAndDotDot)) {
-        Child child;
-        if (info.isDir()) {
-            if (above->contains(info.canonicalFilePath()))
-                continue;
-            child.item = readFolder(info, above);
-        } else {
-            if (info.fileName().endsWith(QLatin1String(".desktop"))
-                && isHidden(VelUIDesktopEntry(info.absoluteFilePath())))
-                continue;
-            child.item = describe(info);
-        }
-        child.fileName = info.fileName();
-        child.modified = info.lastModified();
-        child.mention = order.mention(child.fileName);
-        children.append(child);
+        const std::optional<MenuItem> item = itemOf(info, above);
+        if (item)
+            children.append({*item, info.lastModified(), order.mention(info.fileName())});
     }
     return children;
 }
