@@ -19,10 +19,27 @@ QString quoted(const QString &word)
         + QLatin1Char('\'');
 }
 
+// XML has no way to write some characters, and one of them would cost the whole menu.
+QString writable(QString text)
+{
+    const QString allowed = QStringLiteral("\t\n\r");
+    for (QChar &c : text) {
+        if ((c < QLatin1Char(' ') && !allowed.contains(c)) || c == QChar(0xfffe) || c == QChar(0xffff))
+            c = QChar::ReplacementCharacter;
+    }
+    return text;
+}
+
+// A name may hold anything; what shows it has one line.
+QString oneLine(QString name)
+{
+    return name.replace(QLatin1Char('\n'), QLatin1Char(' ')).replace(QLatin1Char('\r'), QLatin1Char(' '));
+}
+
 // In a label an underscore marks the letter to press; two of them are one to show.
 QString label(const QString &name)
 {
-    return QString(name).replace(QLatin1Char('_'), QStringLiteral("__"));
+    return writable(oneLine(name)).replace(QLatin1Char('_'), QStringLiteral("__"));
 }
 
 void writeOpenbox(QXmlStreamWriter *xml, const QVector<MenuItem> &items)
@@ -35,17 +52,17 @@ void writeOpenbox(QXmlStreamWriter *xml, const QVector<MenuItem> &items)
         const bool isFolder = item.kind == MenuItem::Folder;
         xml->writeStartElement(isFolder ? QStringLiteral("menu") : QStringLiteral("item"));
         if (isFolder)
-            xml->writeAttribute(QStringLiteral("id"), item.path); // unique, as Openbox asks for
+            xml->writeAttribute(QStringLiteral("id"), writable(item.path)); // unique, as Openbox asks for
         xml->writeAttribute(QStringLiteral("label"), label(item.name));
         if (item.icon.startsWith(QLatin1Char('/')))
-            xml->writeAttribute(QStringLiteral("icon"), item.icon);
+            xml->writeAttribute(QStringLiteral("icon"), writable(item.icon));
         if (isFolder) {
             writeOpenbox(xml, item.children);
         } else {
             xml->writeStartElement(QStringLiteral("action"));
             xml->writeAttribute(QStringLiteral("name"), QStringLiteral("Execute"));
             xml->writeTextElement(QStringLiteral("command"),
-                                  QStringLiteral("vel-open --exec ") + quoted(item.path));
+                                  writable(QStringLiteral("vel-open --exec ") + quoted(item.path)));
             xml->writeEndElement();
         }
         xml->writeEndElement();
@@ -75,9 +92,7 @@ QJsonObject object(const MenuItem &item)
 void writeText(QByteArray *out, const MenuItem &item, int depth)
 {
     out->append(QByteArray(depth * 4, ' '));
-    out->append(item.kind == MenuItem::Separator
-                    ? QByteArray("--")
-                    : QString(item.name).replace(QLatin1Char('\n'), QLatin1Char(' ')).toUtf8());
+    out->append(item.kind == MenuItem::Separator ? QByteArray("--") : oneLine(item.name).toUtf8());
     out->append(item.kind == MenuItem::Folder ? "/\n" : "\n");
     for (const MenuItem &child : item.children)
         writeText(out, child, depth + 1);

@@ -68,6 +68,8 @@ private Q_SLOTS:
     void printsText();
     void printsJson();
     void printsAnOpenboxPipeMenu();
+    void printsNamesThatXmlCannotHold();
+    void quotesPathsForTheShell_data();
     void quotesPathsForTheShell();
 };
 
@@ -242,9 +244,33 @@ void tst_vel_menuprint::printsAnOpenboxPipeMenu()
                                 + "'</command>"));
 }
 
+void tst_vel_menuprint::printsNamesThatXmlCannotHold()
+{
+    write(QStringLiteral("menu/folder\x02/a.desktop"), entry("A\x01\\nB", "Icon=/pictures/\x03.png\n"));
+
+    const MenuItem menu = MenuTree::read(path(QStringLiteral("menu")));
+    QXmlStreamReader xml(MenuFormat::openbox(menu));
+    QStringList labels;
+    while (!xml.atEnd()) {
+        if (xml.readNext() == QXmlStreamReader::StartElement)
+            labels.append(xml.attributes().value(QLatin1String("label")).toString());
+    }
+    QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
+    QVERIFY(labels.contains(QString::fromUtf8("A\xEF\xBF\xBD B")));
+    QVERIFY(MenuFormat::text(menu).endsWith("        A\x01 B\n"));
+}
+
+void tst_vel_menuprint::quotesPathsForTheShell_data()
+{
+    QTest::addColumn<QString>("file");
+    QTest::newRow("quote") << QStringLiteral("menu/it's $HOME.desktop");
+    QTest::newRow("line feed") << QStringLiteral("menu/a\nb.desktop");
+}
+
 void tst_vel_menuprint::quotesPathsForTheShell()
 {
-    write(QStringLiteral("menu/it's $HOME.desktop"), entry("A"));
+    QFETCH(QString, file);
+    write(file, entry("A"));
 
     const QByteArray menu = MenuFormat::openbox(MenuTree::read(path(QStringLiteral("menu"))));
     QXmlStreamReader xml(menu);
@@ -258,8 +284,7 @@ void tst_vel_menuprint::quotesPathsForTheShell()
                 {QStringLiteral("-c"),
                  QString(command).replace(QLatin1String("vel-open --exec"), QLatin1String("printf %s"))});
     QVERIFY(shell.waitForFinished());
-    QCOMPARE(QFile::decodeName(shell.readAllStandardOutput()),
-             path(QStringLiteral("menu/it's $HOME.desktop")));
+    QCOMPARE(QFile::decodeName(shell.readAllStandardOutput()), path(file));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_vel_menuprint)
