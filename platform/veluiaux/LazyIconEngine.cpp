@@ -93,14 +93,11 @@ QPixmap LazyIconEngine::pixmap(const QSize &size, QIcon::Mode mode, QIcon::State
 
 void LazyIconEngine::paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state)
 {
-    // A small picture stays small, but is as large on a device of more pixels.
-    const QSize size = actualSize(rect.size(), mode, state).boundedTo(rect.size());
+    // QIcon has made the rectangle as large as actualSize() says.
     const qreal ratio = painter->device()->devicePixelRatioF();
-    const QPixmap picture = this->picture(size * ratio, ratio, IconDrawing::Fit::Exactly, mode, state);
-    const QSize margin = (rect.size() - size) / 2;
-    const QRect target(rect.topLeft() + QPoint(margin.width(), margin.height()), size);
+    const QPixmap picture = this->picture(rect.size() * ratio, ratio, IconDrawing::Fit::Exactly, mode, state);
     if (!picture.isNull())
-        painter->drawPixmap(target, picture);
+        painter->drawPixmap(rect, picture);
 }
 
 QSize LazyIconEngine::actualSize(const QSize &size, QIcon::Mode mode, QIcon::State state)
