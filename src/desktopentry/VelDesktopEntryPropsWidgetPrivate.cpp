@@ -5,7 +5,6 @@
 
 #include "ActionListEdit.h"
 #include "FormLayout.h"
-#include "GuardedDialog.h"
 #include "IconEdit.h"
 #include "LocalisedLabel.h"
 #include "MimeTypeInput.h"
@@ -19,18 +18,12 @@
 #include <QApplication>
 #include <QCheckBox>
 #include <QComboBox>
-#include <QEvent>
 #include <QHBoxLayout>
 #include <QLineEdit>
-#include <QMessageBox>
-#include <QPointer>
 #include <QScrollArea>
-#include <QSignalBlocker>
 #include <QStyle>
 #include <QToolButton>
 #include <QVBoxLayout>
-
-#include <utility>
 
 using namespace VelUI;
 using Form = VelDesktopEntryPropsWidgetPrivate;
@@ -40,23 +33,10 @@ namespace {
 using Label = PropsRow::Label;
 using ShownFor = PropsRow::ShownFor;
 
-const QLatin1String applicationType("Application");
-const QLatin1String linkType("Link");
-const QLatin1String directoryType("Directory");
-
 bool isListDisplay(const QLineEdit *line)
 {
     return qobject_cast<const StringListEdit *>(line->parentWidget())
         || qobject_cast<const ActionListEdit *>(line->parentWidget());
-}
-
-QIcon typeIcon(const QString &type)
-{
-    if (type == linkType)
-        return QIcon::fromTheme(QStringLiteral("text-html"));
-    if (type == directoryType)
-        return QIcon::fromTheme(QStringLiteral("folder"));
-    return QIcon::fromTheme(QStringLiteral("system-run"));
 }
 
 } // namespace
@@ -66,7 +46,7 @@ VelDesktopEntryPropsWidgetPrivate::VelDesktopEntryPropsWidgetPrivate(VelDesktopE
     , q(widget)
 {
     build();
-    setType(applicationType, {});
+    setType(QStringLiteral("Application"), {});
     connectChanges();
 }
 
@@ -109,17 +89,6 @@ void VelDesktopEntryPropsWidgetPrivate::addRow(const PropsRow &row)
         layout->setRowLabelBold(number);
     if (row.number)
         this->*row.number = number;
-}
-
-int VelDesktopEntryPropsWidgetPrivate::addTypeRow(const QString &label)
-{
-    typeBox = makeField<QComboBox>("typeComboBox", content);
-    // The wheel scrolls the form; on its way over the box it must not change the type.
-    typeBox->setFocusPolicy(Qt::StrongFocus);
-    // Long names of the types must not make the form wider than its window.
-    typeBox->setMinimumContentsLength(8);
-    typeBox->installEventFilter(this);
-    return layout->addRow(label, typeBox);
 }
 
 int VelDesktopEntryPropsWidgetPrivate::addUrlRow(const QString &label)
@@ -195,130 +164,6 @@ void VelDesktopEntryPropsWidgetPrivate::keepInView(QWidget *focused)
     // Moving the form under a pressed mouse would make it miss what it clicks.
     if (focused && content->isAncestorOf(focused) && QApplication::mouseButtons() == Qt::NoButton)
         scrollArea->ensureWidgetVisible(focused);
-}
-
-bool VelDesktopEntryPropsWidgetPrivate::eventFilter(QObject *watched, QEvent *event)
-{
-    if (watched == typeBox && event->type() == QEvent::Wheel && !typeBox->hasFocus()) {
-        event->ignore();
-        return true;
-    }
-    return QObject::eventFilter(watched, event);
-}
-
-void VelDesktopEntryPropsWidgetPrivate::setType(const QString &newType, const QStringList &newAllowedTypes)
-{
-    const QStringList allowed =
-        newAllowedTypes.isEmpty() ? QStringList{applicationType, linkType, directoryType} : newAllowedTypes;
-    if (newType.isEmpty() || !allowed.contains(newType))
-        return;
-    if (newType == type && allowed == allowedTypes)
-        return;
-    if (allowed != allowedTypes) {
-        allowedTypes = allowed;
-        fillTypeBox();
-    }
-    applyType(newType);
-}
-
-QString VelDesktopEntryPropsWidgetPrivate::typeName(const QString &type)
-{
-    if (type == applicationType)
-        return tr("Application");
-    if (type == linkType)
-        return tr("Link");
-    if (type == directoryType)
-        return tr("Directory");
-    return type;
-}
-
-void VelDesktopEntryPropsWidgetPrivate::fillTypeBox()
-{
-    const QSignalBlocker blocker(typeBox);
-    typeBox->clear();
-    for (const QString &allowed : std::as_const(allowedTypes))
-        typeBox->addItem(typeIcon(allowed), typeName(allowed), allowed);
-}
-
-void VelDesktopEntryPropsWidgetPrivate::selectType()
-{
-    const QSignalBlocker blocker(typeBox);
-    typeBox->setCurrentIndex(typeBox->findData(type, Qt::UserRole, Qt::MatchFixedString));
-}
-
-void VelDesktopEntryPropsWidgetPrivate::applyType(const QString &newType)
-{
-    type = newType;
-    selectType();
-    setRowsShown(ShownFor::Application);
-    setRowsShown(ShownFor::Link);
-    layout->setRowVisible(typeRow, allowedTypes.size() > 1 || type != directoryType);
-    urlInfoButton->setVisible(showURLInfoButton && isShown(ShownFor::Link));
-}
-
-bool VelDesktopEntryPropsWidgetPrivate::isShown(ShownFor group) const
-{
-    switch (group) {
-    case ShownFor::Application:
-        return type == applicationType;
-    case ShownFor::Link:
-        return type == linkType;
-    case ShownFor::All:
-        break;
-    }
-    return true;
-}
-
-void VelDesktopEntryPropsWidgetPrivate::setRowsShown(ShownFor group)
-{
-    const bool shown = isShown(group);
-    for (const PropsRow &row : rows()) {
-        if (row.shownFor != group)
-            continue;
-        if (row.number)
-            layout->setRowVisible(this->*row.number, shown);
-        else
-            row.field(*this)->setVisible(shown);
-        if (!shown)
-            row.clear(*this);
-    }
-}
-
-void VelDesktopEntryPropsWidgetPrivate::typeChosen(int index)
-{
-    const QString chosen = typeBox->itemData(index).toString();
-    if (chosen.isEmpty() || chosen == type)
-        return;
-    const QPointer<Form> alive(this);
-    const bool isConfirmed = confirmTypeChange();
-    if (!alive)
-        return;
-    if (!isConfirmed) {
-        selectType();
-        return;
-    }
-    applyType(chosen);
-    Q_EMIT q->changed();
-}
-
-bool VelDesktopEntryPropsWidgetPrivate::confirmTypeChange()
-{
-    // By hand: the ready-made question adds a No button to make No the default.
-    GuardedDialog<QMessageBox> box(
-        QMessageBox::Question, tr("Attention"),
-        tr("Desktop entry type was changed.\nSome field values may be lost...\nContinue?"), QMessageBox::Yes,
-        q);
-    box->setDefaultButton(QMessageBox::No);
-
-    const QPointer<Form> alive(this);
-    QComboBox *const orphan = isAskingForType ? nullptr : typeBox;
-    isAskingForType = true;
-    const int answer = box.exec();
-    if (alive)
-        isAskingForType = !orphan;
-    else if (orphan)
-        orphan->deleteLater();
-    return answer == QMessageBox::Yes;
 }
 
 void VelDesktopEntryPropsWidgetPrivate::loadFrom(const VelUIDesktopEntry &entry)

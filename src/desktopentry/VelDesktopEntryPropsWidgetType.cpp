@@ -1,0 +1,178 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+// The type of the entry: the combo box, what is shown for a type, and the question before a change.
+
+#include "VelDesktopEntryPropsWidgetPrivate.h"
+
+#include "FormLayout.h"
+#include "GuardedDialog.h"
+#include "NamedField.h"
+
+#include <VelDesktopEntryPropsWidget.h>
+
+#include <QComboBox>
+#include <QEvent>
+#include <QMessageBox>
+#include <QPointer>
+#include <QSignalBlocker>
+#include <QToolButton>
+
+#include <utility>
+
+using namespace VelUI;
+using Form = VelDesktopEntryPropsWidgetPrivate;
+
+namespace {
+
+using ShownFor = PropsRow::ShownFor;
+
+const QLatin1String applicationType("Application");
+const QLatin1String linkType("Link");
+const QLatin1String directoryType("Directory");
+
+QIcon typeIcon(const QString &type)
+{
+    if (type == linkType)
+        return QIcon::fromTheme(QStringLiteral("text-html"));
+    if (type == directoryType)
+        return QIcon::fromTheme(QStringLiteral("folder"));
+    return QIcon::fromTheme(QStringLiteral("system-run"));
+}
+
+} // namespace
+
+int VelDesktopEntryPropsWidgetPrivate::addTypeRow(const QString &label)
+{
+    typeBox = makeField<QComboBox>("typeComboBox", content);
+    // The wheel scrolls the form; on its way over the box it must not change the type.
+    typeBox->setFocusPolicy(Qt::StrongFocus);
+    // Long names of the types must not make the form wider than its window.
+    typeBox->setMinimumContentsLength(8);
+    typeBox->installEventFilter(this);
+    return layout->addRow(label, typeBox);
+}
+
+bool VelDesktopEntryPropsWidgetPrivate::eventFilter(QObject *watched, QEvent *event)
+{
+    if (watched == typeBox && event->type() == QEvent::Wheel && !typeBox->hasFocus()) {
+        event->ignore();
+        return true;
+    }
+    return QObject::eventFilter(watched, event);
+}
+
+void VelDesktopEntryPropsWidgetPrivate::setType(const QString &newType, const QStringList &newAllowedTypes)
+{
+    const QStringList allowed =
+        newAllowedTypes.isEmpty() ? QStringList{applicationType, linkType, directoryType} : newAllowedTypes;
+    if (newType.isEmpty() || !allowed.contains(newType))
+        return;
+    if (newType == type && allowed == allowedTypes)
+        return;
+    if (allowed != allowedTypes) {
+        allowedTypes = allowed;
+        fillTypeBox();
+    }
+    applyType(newType);
+}
+
+QString VelDesktopEntryPropsWidgetPrivate::typeName(const QString &type)
+{
+    if (type == applicationType)
+        return tr("Application");
+    if (type == linkType)
+        return tr("Link");
+    if (type == directoryType)
+        return tr("Directory");
+    return type;
+}
+
+void VelDesktopEntryPropsWidgetPrivate::fillTypeBox()
+{
+    const QSignalBlocker blocker(typeBox);
+    typeBox->clear();
+    for (const QString &allowed : std::as_const(allowedTypes))
+        typeBox->addItem(typeIcon(allowed), typeName(allowed), allowed);
+}
+
+void VelDesktopEntryPropsWidgetPrivate::selectType()
+{
+    const QSignalBlocker blocker(typeBox);
+    typeBox->setCurrentIndex(typeBox->findData(type, Qt::UserRole, Qt::MatchFixedString));
+}
+
+void VelDesktopEntryPropsWidgetPrivate::applyType(const QString &newType)
+{
+    type = newType;
+    selectType();
+    setRowsShown(ShownFor::Application);
+    setRowsShown(ShownFor::Link);
+    layout->setRowVisible(typeRow, allowedTypes.size() > 1 || type != directoryType);
+    urlInfoButton->setVisible(showURLInfoButton && isShown(ShownFor::Link));
+}
+
+bool VelDesktopEntryPropsWidgetPrivate::isShown(ShownFor group) const
+{
+    switch (group) {
+    case ShownFor::Application:
+        return type == applicationType;
+    case ShownFor::Link:
+        return type == linkType;
+    case ShownFor::All:
+        break;
+    }
+    return true;
+}
+
+void VelDesktopEntryPropsWidgetPrivate::setRowsShown(ShownFor group)
+{
+    const bool shown = isShown(group);
+    for (const PropsRow &row : rows()) {
+        if (row.shownFor != group)
+            continue;
+        if (row.number)
+            layout->setRowVisible(this->*row.number, shown);
+        else
+            row.field(*this)->setVisible(shown);
+        if (!shown)
+            row.clear(*this);
+    }
+}
+
+void VelDesktopEntryPropsWidgetPrivate::typeChosen(int index)
+{
+    const QString chosen = typeBox->itemData(index).toString();
+    if (chosen.isEmpty() || chosen == type)
+        return;
+    const QPointer<Form> alive(this);
+    const bool isConfirmed = confirmTypeChange();
+    if (!alive)
+        return;
+    if (!isConfirmed) {
+        selectType();
+        return;
+    }
+    applyType(chosen);
+    Q_EMIT q->changed();
+}
+
+bool VelDesktopEntryPropsWidgetPrivate::confirmTypeChange()
+{
+    // By hand: the ready-made question adds a No button to make No the default.
+    GuardedDialog<QMessageBox> box(
+        QMessageBox::Question, tr("Attention"),
+        tr("Desktop entry type was changed.\nSome field values may be lost...\nContinue?"), QMessageBox::Yes,
+        q);
+    box->setDefaultButton(QMessageBox::No);
+
+    const QPointer<Form> alive(this);
+    QComboBox *const orphan = isAskingForType ? nullptr : typeBox;
+    isAskingForType = true;
+    const int answer = box.exec();
+    if (alive)
+        isAskingForType = !orphan;
+    else if (orphan)
+        orphan->deleteLater();
+    return answer == QMessageBox::Yes;
+}
