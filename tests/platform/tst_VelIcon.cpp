@@ -419,10 +419,18 @@ void tst_VelIcon::showsAPictureFileAsItIsNow()
 
     QVERIFY(plainIcon(Qt::cyan).pixmap(32).save(path));
     QFile file(path); // times of files may be coarse
-    QVERIFY(file.open(QIODevice::ReadWrite));
-    QVERIFY(file.setFileTime(QDateTime::currentDateTime().addSecs(7), QFileDevice::FileModificationTime));
+    const QDateTime later = QDateTime::currentDateTime().addSecs(7);
+    const auto setTime = [&file, &later] {
+        return file.open(QIODevice::ReadWrite) && file.setFileTime(later, QFileDevice::FileModificationTime);
+    };
+    QVERIFY(setTime());
     file.close();
     QCOMPARE(painted(themeIcon(path), 16).pixelColor(0, 0), QColor(Qt::cyan));
+
+    QVERIFY(plainIcon(Qt::green).pixmap(32).scaled(300, 300).save(path));
+    QVERIFY(setTime());
+    file.close();
+    QCOMPARE(painted(themeIcon(path), 16).pixelColor(0, 0), QColor(Qt::green));
     QVERIFY(QFile::remove(path));
     QVERIFY(themeIcon(path).isNull());
 }

@@ -11,6 +11,7 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QProcess>
+#include <QTimer>
 
 #include <memory>
 
@@ -25,26 +26,34 @@ class BusApplication : public QObject, protected QDBusContext
     Q_CLASSINFO("D-Bus Interface", "org.freedesktop.Application")
 
 public:
-    enum Manner { Answers, Refuses, Hesitates };
+    enum Manner { Answers, Refuses, Hesitates, Leaves };
     explicit BusApplication(Manner manner)
         : m_manner(manner)
     {
     }
     int activations() const { return m_activations; }
+    QVariantMap platformData() const { return m_platformData; }
 
 public Q_SLOTS:
-    void Activate(const QVariantMap &)
+    void Activate(const QVariantMap &platformData)
     {
         ++m_activations;
+        m_platformData = platformData;
         if (m_manner == Refuses)
             sendErrorReply(QStringLiteral("org.example.Error"), QStringLiteral("no"));
-        else if (m_manner == Hesitates)
+        else if (m_manner != Answers)
             setDelayedReply(true);
+        if (m_manner == Leaves)
+            QTimer::singleShot(0, this, &BusApplication::left);
     }
+
+Q_SIGNALS:
+    void left();
 
 private:
     Manner m_manner;
     int m_activations = 0;
+    QVariantMap m_platformData;
 };
 
 class VelOpenTest : public TestCase
@@ -82,6 +91,7 @@ private Q_SLOTS:
     void failsForAnEntryThatCannotRun_data();
     void failsForAnEntryThatCannotRun();
     void runsTheCommandWithItsArguments();
+    void tellsTheProgramItsNameInTheUsersLanguage();
     void findsAPathThatIsRelative();
     void startsInTheFolderOfTheEntry();
     void givesTheProgramASessionOfItsOwn_data();
@@ -101,6 +111,8 @@ private Q_SLOTS:
     void activatesOverTheBusFirst_data();
     void activatesOverTheBusFirst();
     void runsTheCommandWhenTheBusRefuses();
+    void runsTheCommandWhenTheApplicationGoesAway();
+    void handsTheStartupIdOn();
     void runsTheCommandWhenNobodyIsOnTheBus();
     void runsTheCommandWithoutABus();
     void leavesAnApplicationThatTakesItsTimeAlone();
@@ -243,6 +255,16 @@ void VelOpenTest::runsTheCommandWithItsArguments()
     QCOMPARE(open(path), 0);
     QCOMPARE(m_error, QByteArray());
     QTRY_COMPARE(told(), "a  b|$\"\\|c|%|--icon|my icon|It's|" + bytes(path) + "|end|");
+}
+
+void VelOpenTest::tellsTheProgramItsNameInTheUsersLanguage()
+{
+    probe("probe", "printf '%s|' \"$@\"");
+    const QByteArray before = qgetenv("LC_ALL");
+    qputenv("LC_ALL", "de_DE.UTF-8");
+    QCOMPARE(open(application("Name[de]=Ding\nExec=probe %c\n")), 0);
+    qputenv("LC_ALL", before);
+    QTRY_COMPARE(told(), QByteArray("Ding|"));
 }
 
 void VelOpenTest::findsAPathThatIsRelative()
@@ -455,6 +477,10 @@ void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool 
         QVERIFY(bus.registerService(QStringLiteral("org.example.My-App")));
         QVERIFY(bus.registerObject(QStringLiteral("/org/example/My_App"), &application,
                                    QDBusConnection::ExportAllSlots));
+        connect(&application, &BusApplication::left, this, [&bus] {
+            QDBusConnection::disconnectFromBus(QStringLiteral("test"));
+            bus = QDBusConnection(QString()); // the last one that held it
+        });
         probe("probe", "echo ran");
         // Where the command must not run, to try it would be an error.
         const QByteArray program = execRuns ? "probe" : "no-such-program-here";
@@ -464,6 +490,8 @@ void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool 
         QCOMPARE(open(path), 0);
         QVERIFY2(m_time < 2000, qPrintable(QString::number(m_time)));
         QCOMPARE(application.activations(), activations);
+        QCOMPARE(application.platformData().value(QStringLiteral("desktop-startup-id")).toByteArray(),
+                 qgetenv("DESKTOP_STARTUP_ID"));
     }
     if (execRuns)
         QTRY_COMPARE(told(), QByteArray("ran\n"));
@@ -485,6 +513,18 @@ void VelOpenTest::activatesOverTheBusFirst()
 void VelOpenTest::runsTheCommandWhenTheBusRefuses()
 {
     activate(BusApplication::Refuses, 1, true);
+}
+
+void VelOpenTest::runsTheCommandWhenTheApplicationGoesAway()
+{
+    activate(BusApplication::Leaves, 1, true);
+}
+
+void VelOpenTest::handsTheStartupIdOn()
+{
+    qputenv("DESKTOP_STARTUP_ID", "menu_TIME1234");
+    activate(BusApplication::Answers, 1, false);
+    qunsetenv("DESKTOP_STARTUP_ID");
 }
 
 void VelOpenTest::runsTheCommandWhenNobodyIsOnTheBus()
