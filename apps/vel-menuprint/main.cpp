@@ -14,7 +14,7 @@
 #include <QFileInfo>
 #include <QLocale>
 
-#include <clocale>
+#include <cerrno>
 #include <cstdio>
 
 namespace {
@@ -43,7 +43,6 @@ int main(int argc, char **argv)
     Program::describe(QStringLiteral("vel-menuprint"));
     QCoreApplication application(argc, argv);
     Program::loadCatalogues();
-    std::setlocale(LC_ALL, ""); // names are ordered as the user's language orders them
 
     QCommandLineParser parser;
     parser.setApplicationDescription(
@@ -82,5 +81,7 @@ int main(int argc, char **argv)
     const QByteArray out = printed(format, MenuTree::read(directory.absoluteFilePath()));
     const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
         && std::fflush(stdout) == 0;
+    if (!written)
+        Program::printError(qt_error_string(errno));
     return written ? Done : CannotWrite;
 }

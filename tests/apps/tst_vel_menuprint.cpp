@@ -69,6 +69,7 @@ private Q_SLOTS:
     void printsJson();
     void printsAnOpenboxPipeMenu();
     void printsNamesThatXmlCannotHold();
+    void tellsThatItCannotWrite();
     void quotesPathsForTheShell_data();
     void quotesPathsForTheShell();
 };
@@ -154,9 +155,13 @@ void tst_vel_menuprint::doesNotFollowALinkIntoItself()
     write(QStringLiteral("menu/folder/a.desktop"), entry("A"));
     QVERIFY(QFile::link(path(QStringLiteral("menu")), path(QStringLiteral("menu/folder/again"))));
 
-    const MenuItem menu = MenuTree::read(path(QStringLiteral("menu")));
-    QCOMPARE(names(menu.children), QStringList{QStringLiteral("folder")});
-    QCOMPARE(names(menu.children.constFirst().children), QStringList{QStringLiteral("A")});
+    QVERIFY(QFile::link(path(QStringLiteral("menu")), path(QStringLiteral("another way"))));
+
+    for (const QString &way : {QStringLiteral("menu"), QStringLiteral("another way")}) {
+        const MenuItem menu = MenuTree::read(path(way));
+        QCOMPARE(names(menu.children), QStringList{QStringLiteral("folder")});
+        QCOMPARE(names(menu.children.constFirst().children), QStringList{QStringLiteral("A")});
+    }
 }
 
 void tst_vel_menuprint::namesFoldersAsTheirDirectoryFileSays()
@@ -220,7 +225,9 @@ void tst_vel_menuprint::printsJson()
 
 void tst_vel_menuprint::printsAnOpenboxPipeMenu()
 {
-    write(QStringLiteral("menu/folder/a.desktop"), entry("A & <B>_c"));
+    write(QStringLiteral("menu/folder/a.desktop"), entry("A & <B>_c", "Icon=by-name\n"));
+    write(QStringLiteral("menu/folder/.directory"),
+          "[Desktop Entry]\nType=Directory\nName=folder\nIcon=/pictures/a.png\n");
     write(QStringLiteral("menu/line.desktop"),
           "[Desktop Entry]\nType=Application\nName=Line\nExec=VELWM_SEPARATOR\n");
 
@@ -232,11 +239,12 @@ void tst_vel_menuprint::printsAnOpenboxPipeMenu()
     while (!xml.atEnd()) {
         if (xml.readNext() == QXmlStreamReader::StartElement)
             seen.append(xml.name().toString() + QLatin1Char(' ')
-                        + xml.attributes().value(QLatin1String("label")).toString());
+                        + xml.attributes().value(QLatin1String("label")).toString()
+                        + xml.attributes().value(QLatin1String("icon")).toString());
     }
     QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
     QCOMPARE(seen,
-             QStringList({QStringLiteral("openbox_pipe_menu "), QStringLiteral("menu folder"),
+             QStringList({QStringLiteral("openbox_pipe_menu "), QStringLiteral("menu folder/pictures/a.png"),
                           QStringLiteral("item A & <B>__c"), QStringLiteral("action "),
                           QStringLiteral("command "), QStringLiteral("separator ")}));
     QVERIFY(result.out.contains("<command>vel-open --exec '"
@@ -258,6 +266,17 @@ void tst_vel_menuprint::printsNamesThatXmlCannotHold()
     QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
     QVERIFY(labels.contains(QString::fromUtf8("A\xEF\xBF\xBD B")));
     QVERIFY(MenuFormat::text(menu).endsWith("        A\x01 B\n"));
+}
+
+void tst_vel_menuprint::tellsThatItCannotWrite()
+{
+    QVERIFY(QDir().mkpath(path(QStringLiteral("menu"))));
+    QProcess process;
+    process.setStandardOutputFile(QStringLiteral("/dev/full"));
+    process.start(QStringLiteral(VEL_PROGRAM), {path(QStringLiteral("menu"))});
+    QVERIFY(process.waitForFinished());
+    QCOMPARE(process.exitCode(), 1);
+    QCOMPARE(process.readAllStandardError(), QByteArray("vel-menuprint: No space left on device\n"));
 }
 
 void tst_vel_menuprint::quotesPathsForTheShell_data()
