@@ -29,9 +29,9 @@ private Q_SLOTS:
 
 private:
     void start(QProcess &program, const QStringList &arguments);
-    QString waitForWindow(const QString &title);
-    void pressKeys(const QString &window, const QStringList &keys);
-    void typeText(const QString &window, const QString &text);
+    void waitForWindow(const QString &title);
+    static void pressKeys(const QStringList &keys);
+    static void typeText(const QString &text);
     void waitUntilGone(const QString &title);
     QString findWindow(const QString &title);
     static QByteArray xdotool(const QStringList &arguments);
@@ -58,7 +58,7 @@ QString tst_vel_entryedit::findWindow(const QString &title)
     return QString::fromLatin1(found.split('\n').constLast());
 }
 
-QString tst_vel_entryedit::waitForWindow(const QString &title)
+void tst_vel_entryedit::waitForWindow(const QString &title)
 {
     const auto isActive = [this, &title] {
         const QString window = findWindow(title);
@@ -66,7 +66,6 @@ QString tst_vel_entryedit::waitForWindow(const QString &title)
     };
     if (!QTest::qWaitFor(isActive, 20000))
         QTest::qFail(qPrintable(QStringLiteral("no active window ") + title), __FILE__, __LINE__);
-    return findWindow(title);
 }
 
 void tst_vel_entryedit::waitUntilGone(const QString &title)
@@ -74,15 +73,14 @@ void tst_vel_entryedit::waitUntilGone(const QString &title)
     QVERIFY(QTest::qWaitFor([this, &title] { return findWindow(title).isEmpty(); }, 20000));
 }
 
-void tst_vel_entryedit::pressKeys(const QString &window, const QStringList &keys)
+// What has the keyboard gets the keys: wait for the window first.
+void tst_vel_entryedit::pressKeys(const QStringList &keys)
 {
-    Q_UNUSED(window)
     xdotool(QStringList{QStringLiteral("key"), QStringLiteral("--delay"), QStringLiteral("20")} + keys);
 }
 
-void tst_vel_entryedit::typeText(const QString &window, const QString &text)
+void tst_vel_entryedit::typeText(const QString &text)
 {
-    Q_UNUSED(window)
     xdotool({QStringLiteral("type"), QStringLiteral("--delay"), QStringLiteral("20"), text});
 }
 
@@ -134,7 +132,8 @@ void tst_vel_entryedit::saysThatItCannotOpenAMissingFile()
     const QString missing = path(QStringLiteral("missing.desktop"));
     QProcess program;
     start(program, {missing});
-    pressKeys(waitForWindow(QStringLiteral("Warning")), {QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("Warning"));
+    pressKeys({QStringLiteral("Return")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 2);
     QCOMPARE(program.readAllStandardError(), "vel-entryedit: cannot open " + missing.toLocal8Bit() + '\n');
@@ -146,8 +145,8 @@ void tst_vel_entryedit::endsWithOneWhenCancelled()
     const QString file = write(QStringLiteral("a.desktop"), bytes);
     QProcess program;
     start(program, {file});
-    const QString window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
-    pressKeys(window, {QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Escape")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys({QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Escape")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 1);
     QCOMPARE(read(file), bytes);
@@ -162,7 +161,8 @@ void tst_vel_entryedit::leavesTheFileWhenNothingWasChanged()
     QProcess program;
     program.setWorkingDirectory(folder());
     start(program, {QStringLiteral("a.desktop")});
-    pressKeys(waitForWindow(QStringLiteral("Desktop Entry Editor")), {QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys({QStringLiteral("Return")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 0);
     QCOMPARE(read(file), bytes);
@@ -178,22 +178,23 @@ void tst_vel_entryedit::createsAnEntryThatRuns()
 
     QProcess program;
     start(program, {QStringLiteral("--create"), file});
-    QString window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
     // The type has the keys at first, the name comes next.
-    pressKeys(window, {QStringLiteral("Tab")});
-    typeText(window, QStringLiteral("My program"));
-    pressKeys(window, {QStringLiteral("Return")});
+    pressKeys({QStringLiteral("Tab")});
+    typeText(QStringLiteral("My program"));
+    pressKeys({QStringLiteral("Return")});
 
-    pressKeys(waitForWindow(QStringLiteral("^Warning$")), {QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("^Warning$"));
+    pressKeys({QStringLiteral("Return")});
     waitUntilGone(QStringLiteral("^Warning$"));
     QVERIFY(!QFile::exists(file));
     QCOMPARE(program.state(), QProcess::Running);
 
     // From the name over its localised one and two icons with their buttons to the command.
-    window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
-    pressKeys(window, QStringList(QVector<QString>(6, QStringLiteral("Tab")).toList()));
-    typeText(window, script + QStringLiteral(" started"));
-    pressKeys(window, {QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys(QStringList(QVector<QString>(6, QStringLiteral("Tab")).toList()));
+    typeText(script + QStringLiteral(" started"));
+    pressKeys({QStringLiteral("Return")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 0);
     QCOMPARE(read(file),
@@ -213,7 +214,8 @@ void tst_vel_entryedit::takesATemplate()
     const QString file = path(QStringLiteral("new.desktop"));
     QProcess program;
     start(program, {QStringLiteral("--create"), QStringLiteral("--template"), pattern, file});
-    pressKeys(waitForWindow(QStringLiteral("Desktop Entry Editor")), {QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys({QStringLiteral("Return")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 0);
     QCOMPARE(read(file), QByteArray("[Desktop Entry]\nType=Application\nName=Pattern\nExec=/bin/sh\n"));
@@ -225,19 +227,20 @@ void tst_vel_entryedit::changesNothingReadOnly()
     const QString file = write(QStringLiteral("a.desktop"), bytes);
     QProcess program;
     start(program, {QStringLiteral("--read-only"), file});
-    const QString window = waitForWindow(QStringLiteral("Desktop Entry Editor"));
-    typeText(window, QStringLiteral("xyz"));
-    pressKeys(window, {QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    typeText(QStringLiteral("xyz"));
+    pressKeys({QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Return")});
     QVERIFY(!program.waitForFinished(500));
 
     // Back over Help and Cancel: what comes before them is no button that copies but a field.
-    pressKeys(window, QStringList(QVector<QString>(4, QStringLiteral("shift+Tab")).toList()));
+    pressKeys(QStringList(QVector<QString>(4, QStringLiteral("shift+Tab")).toList()));
     pressKeys(
-        window,
         {QStringLiteral("space"), QStringLiteral("Tab"), QStringLiteral("Tab"), QStringLiteral("space")});
-    pressKeys(waitForWindow(QStringLiteral("^Help$")), {QStringLiteral("Escape")});
+    waitForWindow(QStringLiteral("^Help$"));
+    pressKeys({QStringLiteral("Escape")});
     waitUntilGone(QStringLiteral("^Help$"));
-    pressKeys(waitForWindow(QStringLiteral("Desktop Entry Editor")), {QStringLiteral("Escape")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys({QStringLiteral("Escape")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 1);
     QCOMPARE(read(file), bytes);
