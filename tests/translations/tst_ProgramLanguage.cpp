@@ -20,6 +20,7 @@ private Q_SLOTS:
     void ofTheProgramGoesBeforeTheFixedDirectory();
     void staysEnglishWithoutACatalogue();
     void reachesTheHelp();
+    void reachesTheTextsOfQt();
 
 private:
     /// Copies the compiled catalogue of \a from into \a directory as that of \a to.
@@ -108,6 +109,12 @@ void tst_ProgramLanguage::reachesTheHelp()
     const QString help = run(QStringLiteral("de"), {QStringLiteral("--help")}, false);
     QVERIFY2(help.contains(QStringLiteral("Gibt einen Menüordner in seiner Reihenfolge aus.")),
              qPrintable(help));
+}
+
+void tst_ProgramLanguage::reachesTheTextsOfQt()
+{
+    QCOMPARE(run(QStringLiteral("de"), {QStringLiteral("--nonsense")}, true),
+             QStringLiteral("vel-menuprint: Unbekannte Option 'nonsense'.\n"));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_ProgramLanguage)
