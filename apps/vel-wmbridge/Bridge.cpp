@@ -21,8 +21,6 @@ bool Bridge::start(bool replace)
         return false;
     auto *notifier = new QSocketNotifier(m_receiver.connectionFd(), QSocketNotifier::Read, this);
     connect(notifier, &QSocketNotifier::activated, this, [this] { m_receiver.processEvents(); });
-    // What came while the channel was taken has been read from the connection already.
-    m_receiver.processEvents();
     return true;
 }
 
