@@ -22,9 +22,11 @@ class tst_DesktopEntryText : public TestCase
 private Q_SLOTS:
     void findsTheSameAsAPlainWalkOverTheLines();
     void findsAGroupAmongThousands();
+    void tellsVariantsOfOneKeyApart_data();
     void tellsVariantsOfOneKeyApart();
     void takesOddLinesAmongVariantsForWhatTheyAre_data();
     void takesOddLinesAmongVariantsForWhatTheyAre();
+    void takesNoCommentForAKey();
     void forgetsChangesOfRemovedGroups();
     void keepsTheOrderOfTheFirstSetting();
     void ranksLocales();
@@ -39,6 +41,12 @@ std::string_view view(const QByteArray &bytes)
     return {bytes.constData(), std::size_t(bytes.size())};
 }
 
+// A text is indexed for the user's language: the odd numbers stand for German.
+void setLanguage(int number)
+{
+    qputenv("LANG", number % 2 ? "de_DE.UTF-8" : "fr_FR.UTF-8");
+}
+
 } // namespace
 
 void tst_DesktopEntryText::findsTheSameAsAPlainWalkOverTheLines()
@@ -46,7 +54,8 @@ void tst_DesktopEntryText::findsTheSameAsAPlainWalkOverTheLines()
     std::mt19937 random(7);
     const QByteArrayList names = {"Name",    "Nome", "Nbme", "Name[de]", "Name[df]",
                                   "Name[d]", "Icon", "N",    "Exec"};
-    for (int round = 0; round < 500; ++round) {
+    for (int round = 0; round < 1000; ++round) {
+        setLanguage(round);
         QByteArray bytes = "[G]\n";
         QMap<QByteArray, QByteArray> expected;
         for (int i = 0; i < 20; ++i) {
@@ -79,9 +88,19 @@ void tst_DesktopEntryText::findsAGroupAmongThousands()
     QVERIFY(text.value(*text.key(text.group("g999"), "k")) == "4999");
 }
 
+void tst_DesktopEntryText::tellsVariantsOfOneKeyApart_data()
+{
+    QTest::addColumn<int>("language");
+    QTest::newRow("of another language than the user's") << 0;
+    QTest::newRow("of the user's language") << 1;
+}
+
 void tst_DesktopEntryText::tellsVariantsOfOneKeyApart()
 {
-    const DesktopEntryText text("[G]\nName=0\nName[de]=1\nName[de_AT]=2\nNome[de]=3\nName[fr]=4\n");
+    QFETCH(int, language);
+    setLanguage(language);
+    const DesktopEntryText text("[G]\nName=0\nName[de]=1\nName[fr]=4\nName[de_AT]=2\nNome[de]=3\n"
+                                "Name[it]=5\nName[dE]=6\nName[de@a]=7\nName[d]=8\n");
     QStringList all;
     QStringList german;
     const auto note = [&text](QStringList *to) {
@@ -91,8 +110,8 @@ void tst_DesktopEntryText::tellsVariantsOfOneKeyApart()
     };
     text.forEachVariant(0, "Name", note(&all));
     text.forEachVariant(0, "Name", note(&german), "de");
-    QCOMPARE(all.join(QLatin1Char(' ')), QStringLiteral("de de_AT fr"));
-    QCOMPARE(german.join(QLatin1Char(' ')), QStringLiteral("de de_AT"));
+    QCOMPARE(all.join(QLatin1Char(' ')), QStringLiteral("de fr de_AT it dE de@a d"));
+    QCOMPARE(german.join(QLatin1Char(' ')), QStringLiteral("de de_AT de@a"));
 }
 
 void tst_DesktopEntryText::takesOddLinesAmongVariantsForWhatTheyAre_data()
@@ -132,12 +151,25 @@ void tst_DesktopEntryText::takesOddLinesAmongVariantsForWhatTheyAre()
     QFETCH(QByteArray, key);
     QFETCH(QByteArray, locale);
     QFETCH(QByteArray, value);
-    const DesktopEntryText entry("[G]\n" + text);
-    const auto found = entry.key(entry.group("G"), view(key), view(locale));
-    QCOMPARE(found ? QByteArray::fromStdString(std::string(entry.value(*found))) : QByteArray("(none)"),
-             value);
-    if (text.contains("[H]"))
-        QVERIFY(entry.key(entry.group("H"), view(key), view(locale)));
+    for (int language = 0; language < 2; ++language) {
+        setLanguage(language);
+        const DesktopEntryText entry("[G]\n" + text);
+        const auto found = entry.key(entry.group("G"), view(key), view(locale));
+        QCOMPARE(found ? QByteArray::fromStdString(std::string(entry.value(*found))) : QByteArray("(none)"),
+                 value);
+        if (text.contains("[H]"))
+            QVERIFY(entry.key(entry.group("H"), view(key), view(locale)));
+    }
+}
+
+void tst_DesktopEntryText::takesNoCommentForAKey()
+{
+    for (const char *comment : {"#=0", "#a=0", " #a=0", "#a[de]=0", "#[G]"}) {
+        const DesktopEntryText text("[G]\n" + QByteArray(comment) + "\n");
+        QCOMPARE(text.groups().size(), std::size_t(1));
+        // A new key goes above the comment.
+        QCOMPARE(text.keysEnd(text.groups().front()), 4U);
+    }
 }
 
 void tst_DesktopEntryText::forgetsChangesOfRemovedGroups()

@@ -46,7 +46,9 @@ inline bool isActionGroup(std::string_view group)
 
 inline std::string actionGroup(std::string_view id)
 {
-    return std::string(ActionGroupPrefix).append(id);
+    std::string group;
+    group.reserve(ActionGroupPrefix.size() + id.size());
+    return group.append(ActionGroupPrefix).append(id);
 }
 
 } // namespace DesktopEntryNames

@@ -182,8 +182,7 @@ void Writer::insertNewKeys()
 {
     for (const auto &[index, keys] : m_newKeys) {
         const Text::Group &group = m_text.groups()[std::size_t(index)];
-        const std::size_t after =
-            group.endKey > group.firstKey ? m_text.keyAt(group.endKey - 1).lineEnd : group.lineEnd;
+        const std::size_t after = m_text.keysEnd(group);
         m_splices.push_back({after, 0, Rank::Key, true, keyLines(keys, m_lines.lineEndAt(after))});
     }
 }

@@ -171,21 +171,18 @@ bool EntryDocument::hasGroup(std::string_view group) const
 
 void EntryDocument::removeKey(std::string_view group, std::string_view key)
 {
-    std::unordered_set<std::string> locales{std::string()};
-    const EntryReader reader = this->group(group);
-    m_text->forEachVariant(reader.group(), key, [&](const DesktopEntryText::Key &variant) {
-        locales.emplace(m_text->locale(variant));
-    });
+    std::unordered_set<std::string> inFile;
+    m_text->forEachLine(this->group(group).group(), key,
+                        [&](const DesktopEntryText::Key &line) { inFile.emplace(m_text->locale(line)); });
+    std::vector<std::string> onlyChanged;
     for (const auto &change : m_changes.all()) {
-        if (change.group == group && change.key == key)
-            locales.insert(change.locale);
+        if (change.group == group && change.key == key && inFile.count(change.locale) == 0)
+            onlyChanged.push_back(change.locale);
     }
-    for (const std::string &locale : locales) {
-        if (reader.base(key, locale))
-            m_changes.set({std::string(group), std::string(key), locale, std::nullopt});
-        else
-            m_changes.drop(group, key, locale);
-    }
+    for (const std::string &locale : inFile)
+        m_changes.set({std::string(group), std::string(key), locale, std::nullopt});
+    for (const std::string &locale : onlyChanged)
+        m_changes.drop(group, key, locale);
 }
 
 void EntryDocument::removeGroups(const std::unordered_set<std::string> &groups)
@@ -212,14 +209,13 @@ std::vector<EntryDocument::Entry> EntryDocument::entries() const
         const std::string_view name = m_text->groupName(group);
         if (this->group(name).group() != int(i))
             continue;
-        for (std::uint32_t k = group.firstKey; k < group.endKey; ++k) {
-            const auto key = m_text->keyAt(k);
+        m_text->forEachKey(group, [&](const DesktopEntryText::Key &key) {
             const auto *change = m_changes.find(name, m_text->keyName(key), m_text->locale(key));
             if (!change)
                 add(name, m_text->keyName(key), m_text->locale(key), m_text->value(key));
             else if (change->value)
                 add(name, change->key, change->locale, *change->value);
-        }
+        });
     }
     for (const auto &change : m_changes.all()) {
         if (change.value)
