@@ -35,10 +35,7 @@ EditShortcutsDialog::EditShortcutsDialog(ShortcutsModel *model, QWidget *parent)
 
 EditShortcutsDialog::~EditShortcutsDialog()
 {
-    // The children go after this, and they may still have something to tell.
-    for (QWidget *child : {static_cast<QWidget *>(d->treeView), static_cast<QWidget *>(d->defaultKeyRB),
-                           static_cast<QWidget *>(d->keyWidget), static_cast<QWidget *>(d->buttonBox)})
-        child->disconnect(this);
+    // A model that is a child of the dialog goes after this.
     if (d->model)
         d->model->disconnect(this);
 }
@@ -160,14 +157,12 @@ void EditShortcutsDialog::closeEvent(QCloseEvent *event)
     if (d->isChanged()) {
         const QPointer<EditShortcutsDialog> guard(this);
         const QMessageBox::StandardButton answer = d->askWhetherToApply();
-        if (!guard)
-            return;
         if (answer == QMessageBox::Yes) {
             slotAccept();
         } else if (answer == QMessageBox::No) {
             slotReject();
         } else {
-            event->ignore();
+            event->ignore(); // also when the dialog went with its message
             return;
         }
         if (!guard)

@@ -20,12 +20,7 @@ public:
     void setKeySequence(const QKeySequence &key) override { m_key = key; }
     void reset() override { m_key = objectKeySequence(); }
     QKeySequence keySequence() const override { return m_key; }
-    void apply() override
-    {
-        // A copy: whoever hears of the new key may destroy what is wrapped and so this object.
-        const QKeySequence key = m_key;
-        setObjectKeySequence(key);
-    }
+    void apply() override { setObjectKeySequence(m_key); }
     QString group() const override { return m_group; }
 
 protected:

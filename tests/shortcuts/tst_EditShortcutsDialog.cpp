@@ -85,8 +85,10 @@ private Q_SLOTS:
     void bearsTheConflictingActionGoing();
     void bearsItsOwnEndInsideAMessage();
     void bearsItsOwnEndOnOk();
+    void bearsItsOwnEndOnClosing();
     void outlivesItsModel();
     void goesWithItsParentAndModel();
+    void goesBeforeAModelThatIsItsChild();
 };
 
 void tst_EditShortcutsDialog::hasTheFormThatIsDesigned()
@@ -649,6 +651,20 @@ void tst_EditShortcutsDialog::bearsItsOwnEndOnOk()
     QCOMPARE(open->shortcut(), f9);
 }
 
+void tst_EditShortcutsDialog::bearsItsOwnEndOnClosing()
+{
+    m_dialog->show();
+    select("open");
+    m_dialog->checkEnteredKeySequence(f9);
+    connect(open, &QAction::changed, this, [this] { m_dialog.reset(); });
+    ModalDriver modal;
+    modal.answer(closeQuestion(), QMessageBox::Yes);
+    m_dialog->close();
+    QVERIFY(modal.finished());
+    QVERIFY(!m_dialog);
+    QCOMPARE(open->shortcut(), f9);
+}
+
 void tst_EditShortcutsDialog::outlivesItsModel()
 {
     m_dialog->show();
@@ -676,6 +692,22 @@ void tst_EditShortcutsDialog::goesWithItsParentAndModel()
     dialog->show();
     second->show();
     delete window;
+}
+
+void tst_EditShortcutsDialog::goesBeforeAModelThatIsItsChild()
+{
+    QAction action;
+    auto *model = new ShortcutsModel(nullptr, QString());
+    model->registerAction(str("x"), &action, str("g"));
+    const QPointer<ShortcutsModel> guard(model);
+    {
+        EditShortcutsDialog dialog(model);
+        model->setParent(&dialog);
+        dialog.show();
+        dialog.findChild<QTreeView *>(str("treeView"))
+            ->setCurrentIndex(model->index(0, 0, model->index(0, 0)));
+    }
+    QVERIFY(!guard);
 }
 
 VEL_TEST_MAIN(tst_EditShortcutsDialog)
