@@ -6,6 +6,8 @@
 
 #include <desktopentry/MimeTypeInput.h>
 
+#include <QMimeDatabase>
+
 using namespace FormDriving;
 
 class tst_MimeTypeInput : public TestCase
@@ -15,6 +17,7 @@ class tst_MimeTypeInput : public TestCase
 private Q_SLOTS:
     void turnsAnExtensionIntoItsType_data();
     void turnsAnExtensionIntoItsType();
+    void takesTheFirstTypeOfAnExtension();
     void asksWithTheTextsGiven();
     void givesNothingWhenCancelled();
 };
@@ -44,6 +47,14 @@ void tst_MimeTypeInput::turnsAnExtensionIntoItsType()
     QFETCH(QString, answer);
     QFETCH(QString, type);
     QCOMPARE(VelUI::mimeTypeFor(answer), type);
+}
+
+void tst_MimeTypeInput::takesTheFirstTypeOfAnExtension()
+{
+    // Films and translations share it.
+    const QList<QMimeType> types = QMimeDatabase().mimeTypesForFileName(QStringLiteral("a.ts"));
+    QVERIFY(types.size() > 1);
+    QCOMPARE(VelUI::mimeTypeFor(QStringLiteral("ts")), types.constFirst().name());
 }
 
 void tst_MimeTypeInput::asksWithTheTextsGiven()
