@@ -28,6 +28,16 @@ const ModalDriver::Box typeQuestion{
     QStringLiteral("Desktop entry type was changed.\nSome field values may be lost...\nContinue?"),
     QMessageBox::Yes, QMessageBox::NoButton};
 
+// Turns the wheel towards the user over \a widget; whether it took that.
+bool turnWheel(QWidget *widget)
+{
+    const QPointF at(5, 5);
+    QWheelEvent event(at, widget->mapToGlobal(at.toPoint()), QPoint(), QPoint(0, -120), Qt::NoButton,
+                      Qt::NoModifier, Qt::NoScrollPhase, false);
+    QApplication::sendEvent(widget, &event);
+    return event.isAccepted();
+}
+
 } // namespace
 
 /// The type of the entry: which may be chosen, what it shows, and what a change of it takes away.
@@ -52,6 +62,7 @@ private Q_SLOTS:
     void keepsTheCommonRowsWhenTheTypeChanges();
     void savesNothingOfTheOldType();
     void ignoresTheWheelOverTheTypeWithoutFocus();
+    void asksWhenTheWheelTurnsOverTheFocusedType();
 };
 
 void tst_VelDesktopEntryPropsWidgetTypes::showsTheRowsOfTheType_data()
@@ -283,14 +294,23 @@ void tst_VelDesktopEntryPropsWidgetTypes::ignoresTheWheelOverTheTypeWithoutFocus
     QVERIFY(QTest::qWaitForWindowActive(&form));
     child<QLineEdit>(&form, "nameEdit")->setFocus();
     ModalDriver modal;
-    const QPointF at(5, 5);
-    QWheelEvent event(at, typeBox(form)->mapToGlobal(at.toPoint()), QPoint(), QPoint(0, -120), Qt::NoButton,
-                      Qt::NoModifier, Qt::NoScrollPhase, false);
-    QApplication::sendEvent(typeBox(form), &event);
+    // What the box ignores goes on to the form, which scrolls.
+    QVERIFY(!turnWheel(typeBox(form)));
     QVERIFY(modal.finished());
     QCOMPARE(typeBox(form)->currentData().toString(), application);
-    // What the box ignores goes on to the form, which scrolls.
-    QVERIFY(!event.isAccepted());
+}
+
+void tst_VelDesktopEntryPropsWidgetTypes::asksWhenTheWheelTurnsOverTheFocusedType()
+{
+    VelDesktopEntryPropsWidget form;
+    form.show();
+    QVERIFY(QTest::qWaitForWindowActive(&form));
+    typeBox(form)->setFocus();
+    ModalDriver modal;
+    modal.answer(typeQuestion, QMessageBox::Yes);
+    QVERIFY(turnWheel(typeBox(form)));
+    QVERIFY(modal.finished());
+    QCOMPARE(typeBox(form)->currentData().toString(), link);
 }
 
 VEL_TEST_MAIN(tst_VelDesktopEntryPropsWidgetTypes)
