@@ -9,10 +9,8 @@
 #include <velintegration/startmenu.h>
 
 #include <QApplication>
-#include <QDir>
 #include <QFile>
 #include <QFileInfo>
-#include <QIcon>
 #include <QShortcut>
 #include <QStandardPaths>
 

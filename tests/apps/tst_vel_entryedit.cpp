@@ -3,8 +3,6 @@
 
 #include "TestCase.h"
 
-#include <QDir>
-#include <QElapsedTimer>
 #include <QFile>
 #include <QProcess>
 
