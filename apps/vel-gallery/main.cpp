@@ -20,9 +20,10 @@ struct Options
     QString screenshots;
     int scale = 0; // 0: pictures at every scale
     GalleryContext context;
+    QString error; ///< what is wrong with the command line; empty when nothing is
 };
 
-Options parse(const QApplication &application)
+Options parse()
 {
     QCommandLineParser parser;
     parser.setApplicationDescription(QCoreApplication::translate(
@@ -45,14 +46,20 @@ Options parse(const QApplication &application)
         QStringLiteral("file"),
         QCoreApplication::translate("vel-gallery", "The settings file that the settings page edits."),
         QStringLiteral("[file]"));
-    parser.process(application);
 
     Options options;
+    options.error = Program::parse(parser);
     options.page = parser.value(page);
     options.screenshots = parser.value(screenshots);
     options.scale = parser.value(scale).toInt();
     options.context.settingsFile = parser.positionalArguments().value(0);
     return options;
+}
+
+bool hasPage(const QVector<GalleryPage> &pages, const QString &name)
+{
+    return std::any_of(pages.begin(), pages.end(),
+                       [&name](const GalleryPage &page) { return page.name == name; });
 }
 
 bool writePictures(const QVector<GalleryPage> &pages, const Options &options, const QStringList &arguments)
@@ -75,19 +82,27 @@ int main(int argc, char **argv)
     for (int i = 1; i < argc; ++i)
         arguments.append(QString::fromLocal8Bit(argv[i]));
 
-    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     Program::describe(QStringLiteral("vel-gallery"));
+    if (Program::mayWantNoWindow(argc, argv)) {
+        QCoreApplication application(argc, argv);
+        Program::loadCatalogues();
+        parse();
+        // What looked like it was the value of another option.
+    }
+
+    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     QApplication application(argc, argv);
     Program::loadCatalogues();
     QApplication::setApplicationDisplayName(QCoreApplication::translate("vel-gallery", "Widget gallery"));
     QApplication::setDesktopFileName(QStringLiteral("vel-gallery"));
 
-    const Options options = parse(application);
+    const Options options = parse();
+    if (!options.error.isEmpty()) {
+        Program::printError(options.error);
+        return 2;
+    }
     const QVector<GalleryPage> pages = galleryPages();
-    const bool known = options.page.isEmpty()
-        || std::any_of(pages.begin(), pages.end(),
-                       [&options](const GalleryPage &page) { return page.name == options.page; });
-    if (!known) {
+    if (!options.page.isEmpty() && !hasPage(pages, options.page)) {
         Program::printError(
             QCoreApplication::translate("vel-gallery", "there is no page %1").arg(options.page));
         return 1;

@@ -75,6 +75,8 @@ private Q_SLOTS:
     void saysThatTheSettingsFileCannotBeOpened();
     void givesAKeyThatIsNoActionsToTheUser();
     void writesPicturesInEveryCombination();
+    void showsItsHelpWithoutADisplay();
+    void refusesAnUnknownOption();
     void failsForAPageThatDoesNotExist();
     void failsWhenPicturesCannotBeWritten();
 };
@@ -262,6 +264,28 @@ void tst_vel_gallery::writesPicturesInEveryCombination()
     QVERIFY(dark.pixelColor(2, 2).lightness() < 100);
     QVERIFY(mirrored != light);
     QCOMPARE(large.size(), 2 * light.size());
+}
+
+void tst_vel_gallery::showsItsHelpWithoutADisplay()
+{
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.remove(s("DISPLAY"));
+    QProcess gallery;
+    gallery.setProcessEnvironment(environment);
+    gallery.start(s(VEL_GALLERY), {s("--help")});
+    QVERIFY(gallery.waitForFinished());
+    QCOMPARE(gallery.exitCode(), 0);
+    QCOMPARE(gallery.readAllStandardError(), QByteArray());
+    QVERIFY(gallery.readAllStandardOutput().contains("--screenshots"));
+}
+
+void tst_vel_gallery::refusesAnUnknownOption()
+{
+    QProcess gallery;
+    gallery.start(s(VEL_GALLERY), {s("--nonsense")});
+    QVERIFY(gallery.waitForFinished());
+    QCOMPARE(gallery.exitCode(), 2);
+    QCOMPARE(gallery.readAllStandardError(), QByteArray("vel-gallery: Unknown option 'nonsense'.\n"));
 }
 
 void tst_vel_gallery::failsForAPageThatDoesNotExist()
