@@ -35,7 +35,8 @@ class ModalDriver : public QObject
 
 public:
     /// What a message box has to look like.
-    struct Box {
+    struct Box
+    {
         QMessageBox::Icon icon = QMessageBox::NoIcon;
         QString title;
         QString text;
@@ -58,7 +59,8 @@ public:
     bool finished() const;
 
 private:
-    struct Step {
+    struct Step
+    {
         bool isBox = false;
         Box box;
         std::function<void(QWidget *)> act;
