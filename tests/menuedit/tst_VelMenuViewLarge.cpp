@@ -106,9 +106,13 @@ void tst_VelMenuViewLarge::act(VelMenuView &view, const QString &operation)
 
 void tst_VelMenuViewLarge::writeMenu()
 {
+    // As long as real ones are with their translations, which is too much to be kept in memory.
+    QByteArray more = "Exec=true\n";
+    for (int i = 0; i < 60; ++i)
+        more += "Comment[" + QByteArray::number(i) + "]=What this program is there for, in some language\n";
     for (int i = 0; i < Entries; ++i)
         writeEntry(QStringLiteral("e%1.desktop").arg(i, 4, 10, QLatin1Char('0')),
-                   QStringLiteral("E%1").arg(i, 4, 10, QLatin1Char('0')));
+                   QStringLiteral("E%1").arg(i, 4, 10, QLatin1Char('0')), more);
     for (const char *folder : {"open", "open/inner", "shut"})
         writeEntry(QLatin1String(folder) + QLatin1String("/i.desktop"), QStringLiteral("I"));
 }
