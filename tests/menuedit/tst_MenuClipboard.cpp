@@ -29,6 +29,7 @@ private Q_SLOTS:
     void findsThePathInProperUrls_data() { oddNames(); }
     void findsThePathInProperUrls();
     void prefersTheFormatThatIsClear();
+    void findsALinkThatLeadsNowhere();
     void keepsTheOrderOfSeveralFiles();
     void tellsFilesThatAreNotLocal();
     void foldsSlashesAndDots();
@@ -191,6 +192,21 @@ void tst_MenuClipboard::prefersTheFormatThatIsClear()
              QStringList{file});
     QCOMPARE(localPaths(std::make_unique<ForeignData>(ItemData(twoLines, Qt::MoveAction)).get()),
              QStringList{twoLines});
+}
+
+void tst_MenuClipboard::findsALinkThatLeadsNowhere()
+{
+    const QString clear = path(QStringLiteral("a%20b"));
+    QVERIFY(QFile::link(path(QStringLiteral("missing")), clear));
+    write(QStringLiteral("a b"), "x");
+    QCOMPARE(localPaths(std::make_unique<ForeignData>(ItemData(clear, Qt::CopyAction)).get()),
+             QStringList{clear});
+
+    const QString plain = path(QStringLiteral("c%20d"));
+    QVERIFY(QFile::link(path(QStringLiteral("missing")), plain));
+    ForeignData data(ItemData(plain, Qt::CopyAction));
+    data.drop(QStringLiteral("x-special/gnome-copied-files"));
+    QCOMPARE(localPaths(&data), QStringList{plain});
 }
 
 void tst_MenuClipboard::keepsTheOrderOfSeveralFiles()

@@ -523,15 +523,26 @@ void tst_VelMenuModel::movesADroppedFile()
 
 void tst_VelMenuModel::takesAllFilesOfADrop()
 {
-    const QStringList files{write(QStringLiteral("from/a"), "a"), write(QStringLiteral("from/b"), "b"),
-                            write(QStringLiteral("from/c"), "c")};
+    const QStringList names{QStringLiteral("a.desktop"), QStringLiteral("b.desktop"),
+                            QStringLiteral("c.desktop")};
+    QStringList files;
+    for (const QString &name : names)
+        files.append(write(QLatin1String("from/") + name, entry("Name=Old\n")));
     QDir(folder()).mkdir(QStringLiteral("to"));
     m_model = modelOf(folder(), 2);
+    for (const QString &name : names)
+        QCOMPARE(shown(QLatin1String("from/") + name), QStringLiteral("Old"));
 
     QVERIFY(drop(files, Qt::MoveAction, QStringLiteral("to")));
 
-    QCOMPARE(QDir(path(QStringLiteral("to"))).entryList(QDir::Files).size(), 3);
+    // At once, before the folder is read.
+    QCOMPARE(m_model->rowCount(indexOf(QStringLiteral("to"))), 3);
+    QCOMPARE(QDir(path(QStringLiteral("to"))).entryList(QDir::Files), names);
     QVERIFY(QDir(path(QStringLiteral("from"))).isEmpty());
+    for (const QString &name : names) {
+        write(QLatin1String("from/") + name, entry("Name=New\n"));
+        QCOMPARE(shown(QLatin1String("from/") + name), QStringLiteral("New"));
+    }
 }
 
 void tst_VelMenuModel::copiesADroppedFolderWithEverythingInIt()

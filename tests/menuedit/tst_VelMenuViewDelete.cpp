@@ -26,6 +26,8 @@ private Q_SLOTS:
     void deletesALinkAndNotWhatItLeadsTo();
     void selectsNothingWhenTheDeletedRowGoes_data();
     void selectsNothingWhenTheDeletedRowGoes();
+    void leavesTheKeyboardAtTheFolderOfAnOnlyChild_data();
+    void leavesTheKeyboardAtTheFolderOfAnOnlyChild();
     void goesAwayWhileItAsksToDelete();
 };
 
@@ -191,6 +193,33 @@ void tst_VelMenuViewDelete::selectsNothingWhenTheDeletedRowGoes()
     view.slotDel();
     QVERIFY(modal.finished());
     QCOMPARE(everythingIn(menu()).size(), 2);
+}
+
+void tst_VelMenuViewDelete::leavesTheKeyboardAtTheFolderOfAnOnlyChild_data()
+{
+    QTest::addColumn<QString>("item");
+    QTest::addColumn<QString>("keyboardAt");
+    QTest::newRow("in a folder") << "sub/a.desktop"
+                                 << "/sub";
+    QTest::newRow("in the menu itself") << "sub" << QString();
+}
+
+void tst_VelMenuViewDelete::leavesTheKeyboardAtTheFolderOfAnOnlyChild()
+{
+    QFETCH(QString, item);
+    QFETCH(QString, keyboardAt);
+    writeLetters("a", QStringLiteral("sub/"));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    QVERIFY(open(view, menu() + QLatin1String("/sub"), 1));
+    select(view, menu() + QLatin1Char('/') + item);
+    ModalDriver modal;
+    announceDeleteQuestion(modal, QMessageBox::Yes);
+    view.slotDel();
+    QVERIFY(modal.finished());
+    QVERIFY(!view.selectedItem().isValid());
+    QCOMPARE(view.currentIndex(), keyboardAt.isEmpty() ? QModelIndex() : shown(view, menu() + keyboardAt));
+    QVERIFY(view.currentIndex() != view.rootIndex());
 }
 
 void tst_VelMenuViewDelete::goesAwayWhileItAsksToDelete()

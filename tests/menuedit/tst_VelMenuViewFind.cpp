@@ -34,6 +34,9 @@ private Q_SLOTS:
     void tellsWhenNothingMatches();
     void findsNeitherTheMenuNorItsNeighbours();
     void goesOnWhenMatchesVanished();
+    void goesOnBehindTheMatchShownWhenOneBeforeItVanished();
+    void searchesAnewAfterAnEditingOperation_data();
+    void searchesAnewAfterAnEditingOperation();
     void searchesAnewWhenAllMatchesVanished();
     void followsMatchesThatMove();
     void doesNotFollowLinksInCircles();
@@ -286,6 +289,57 @@ void tst_VelMenuViewFind::goesOnWhenMatchesVanished()
     QTRY_COMPARE(names(view, menu()).size(), 1);
     QVERIFY(view.findAndSelect(true));
     QCOMPARE(view.selectedPath(), a);
+}
+
+void tst_VelMenuViewFind::goesOnBehindTheMatchShownWhenOneBeforeItVanished()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    const QString c = writeEntry(QStringLiteral("c.desktop"), QStringLiteral("hit c"));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), b);
+    QVERIFY(QFile::remove(a));
+    QTRY_COMPARE(names(view, menu()).size(), 2);
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), c);
+}
+
+void tst_VelMenuViewFind::searchesAnewAfterAnEditingOperation_data()
+{
+    QTest::addColumn<QString>("operation");
+    for (const char *operation : {"up", "delete", "cancelled creation"})
+        QTest::newRow(operation) << QString::fromLatin1(operation);
+}
+
+void tst_VelMenuViewFind::searchesAnewAfterAnEditingOperation()
+{
+    QFETCH(QString, operation);
+    QStringList paths;
+    for (const char *letter : {"a", "b", "c", "d"})
+        paths.append(writeEntry(QLatin1String(letter) + QLatin1String(".desktop"),
+                                QLatin1String("hit ") + QLatin1String(letter)));
+    VelMenuView view(menu(), -1, true);
+    find(view, QStringLiteral("hit"));
+    QVERIFY(view.findAndSelect(true));
+    QVERIFY(view.findAndSelect(true));
+    QCOMPARE(view.selectedPath(), paths.at(2));
+    ModalDriver modal;
+    if (operation == QLatin1String("up")) {
+        view.slotUp();
+    } else if (operation == QLatin1String("delete")) {
+        modal.handle([](QWidget *box) { QTest::keyClick(box, Qt::Key_Return); });
+        view.slotDel();
+    } else {
+        modal.handle([](QWidget *editor) { qobject_cast<QDialog *>(editor)->reject(); });
+        QVERIFY(!view.createNew(false));
+    }
+    QVERIFY(modal.finished());
+
+    QVERIFY(view.findAndSelect(true));
+
+    QCOMPARE(view.selectedPath(), paths.constFirst());
 }
 
 void tst_VelMenuViewFind::searchesAnewWhenAllMatchesVanished()
