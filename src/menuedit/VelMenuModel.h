@@ -87,6 +87,7 @@ private:
     bool mayOverwrite(const QString &target);
     bool fixSortOrder(const Drop &drop);
     bool carryOut(const Drop &drop);
+    bool transfer(const Drop &drop);
     bool link(const Drop &drop);
     void finish(const Drop &drop, bool sortAnew);
     void tellAtItem(const QString &path, const QString &text);

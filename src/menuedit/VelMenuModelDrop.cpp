@@ -184,25 +184,25 @@ bool VelMenuModel::carryOut(const Drop &drop)
     const FileSnapshot directoryFile(QDir(drop.targetDir).filePath(QStringLiteral(".directory")));
     if (drop.row != -1 && !fixSortOrder(drop))
         return false;
-    if (drop.action == Qt::LinkAction ? !link(drop) : false) {
+    if (!(drop.action == Qt::LinkAction ? link(drop) : transfer(drop))) {
         directoryFile.restore();
         return false;
     }
-    if (drop.action != Qt::LinkAction) {
-        const QStringList released =
-            drop.action == Qt::MoveAction ? m_watch->release(drop.sources) : QStringList();
-        const FileTransfer::Result result =
-            FileTransfer::transfer(drop.sources, drop.targetDir, transferAction(drop.action));
-        // What could not be moved is still there.
-        m_watch->watchAgain(released);
-        if (!result.succeeded()) {
-            directoryFile.restore();
-            tellAtItem(drop.target, failureText(result, drop.action));
-            return false;
-        }
-    }
     finish(drop, drop.row != -1);
     return true;
+}
+
+bool VelMenuModel::transfer(const Drop &drop)
+{
+    const QStringList released =
+        drop.action == Qt::MoveAction ? m_watch->release(drop.sources) : QStringList();
+    const FileTransfer::Result result =
+        FileTransfer::transfer(drop.sources, drop.targetDir, transferAction(drop.action));
+    // What could not be moved is still there.
+    m_watch->watchAgain(released);
+    if (!result.succeeded())
+        tellAtItem(drop.target, failureText(result, drop.action));
+    return result.succeeded();
 }
 
 bool VelMenuModel::link(const Drop &drop)

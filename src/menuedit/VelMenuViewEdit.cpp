@@ -163,7 +163,6 @@ bool VelMenuViewPrivate::offerNew(const QString &path, bool folder)
     }
     if (!self)
         return false;
-    model->forgetItemInfo(folder ? recordFileOf(path) : path);
     model->forgetItemInfo(path);
     leaveItem(path);
     return false;
