@@ -58,6 +58,9 @@ void FolderWatch::noticeRemoval(const QModelIndex &parent, int first, int last)
 // of all.
 void FolderWatch::renew()
 {
+    // A root that is gone could be left, but not gone back to.
+    if (!QFileInfo::exists(m_model->rootPath()))
+        return;
     QStringList watched;
     collect(m_model->index(m_model->rootPath()), watched);
     m_model->setOption(QFileSystemModel::DontWatchForChanges, true);

@@ -34,6 +34,7 @@ private Q_SLOTS:
     void looksAnewOnceForAllThatGo();
     void seesWhatComesInThePlaceOfAMovedFolder();
     void followsAFolderThatCannotBeMoved();
+    void staysAtARootThatIsGone();
 
 private:
     bool load(const QString &folder, const QString &names);
@@ -210,6 +211,17 @@ void tst_FolderWatch::followsAFolderThatCannotBeMoved()
 
     QVERIFY(shows(QStringLiteral("menu/d"), QStringLiteral("a new sub")));
     QVERIFY(shows(QStringLiteral("menu/d/sub"), QStringLiteral("b new")));
+}
+
+void tst_FolderWatch::staysAtARootThatIsGone()
+{
+    QSignalSpy roots(m_model.get(), &QFileSystemModel::rootPathChanged);
+    connect(m_model.get(), &QAbstractItemModel::rowsRemoved, this,
+            [this] { QVERIFY(QDir(path(QStringLiteral("menu"))).removeRecursively()); });
+    QVERIFY(QDir(path(QStringLiteral("menu/d"))).removeRecursively());
+    QTRY_VERIFY(!QFile::exists(path(QStringLiteral("menu"))));
+    QVERIFY(!roots.wait(500));
+    QCOMPARE(m_model->rootPath(), path(QStringLiteral("menu")));
 }
 
 VEL_TEST_MAIN(tst_FolderWatch)
