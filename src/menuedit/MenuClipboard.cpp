@@ -67,7 +67,7 @@ QList<QByteArray> linesOf(const QByteArray &text)
     for (QByteArray line : parts) {
         if (line.endsWith('\r'))
             line.chop(1);
-        if (!line.isEmpty() && !line.startsWith('#'))
+        if (!line.isEmpty())
             lines.append(line);
     }
     return lines;
@@ -192,8 +192,12 @@ QStringList localPaths(const QMimeData *data)
     const QList<QUrl> urls = data->urls();
     const QList<QByteArray> lines = linesOf(data->data(copyFormat()));
     QStringList paths;
-    for (int i = 0; i < urls.size(); ++i)
-        paths.append(pathOf(urls.at(i), lines.size() == urls.size() ? lines.at(i) : QByteArray()));
+    for (int i = 0; i < urls.size(); ++i) {
+        const QByteArray line = lines.size() == urls.size() ? lines.at(i) : QByteArray();
+        // A comment, which counts as a URL with Qt.
+        if (!line.startsWith('#'))
+            paths.append(pathOf(urls.at(i), line));
+    }
     return paths;
 }
 
