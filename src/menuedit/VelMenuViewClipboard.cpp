@@ -86,11 +86,10 @@ void VelMenuView::dropEvent(QDropEvent *event)
     if (chosen)
         action = chosen == move ? Qt::MoveAction : chosen == copy ? Qt::CopyAction : Qt::IgnoreAction;
     event->setDropAction(action);
-    // What the source offers instead of an action that it does not allow counts from here on.
-    action = event->dropAction();
     QTreeView::dropEvent(event);
     if (event->isAccepted() && self) {
-        // The base tells the source the action that was proposed, not the one carried out.
+        // The base tells the source the action that was proposed, not the one carried out. In place
+        // of one that the source does not allow, the event takes the proposed one both times.
         event->setDropAction(action);
         event->accept();
     }

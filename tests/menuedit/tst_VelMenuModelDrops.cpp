@@ -30,6 +30,7 @@ private Q_SLOTS:
     void listsAFileBeforeTheRowItIsDroppedAt();
     void listsAFileLast();
     void leavesTheListForADropOnTheFolder();
+    void readsTheListAnewOnlyForADropBetweenRows();
     void reordersWithinTheFolder();
     void unlistsAFileThatIsMovedOntoItsOwnFolder();
     void leavesTheListForACopyWithinTheFolder();
@@ -141,6 +142,18 @@ void tst_VelMenuModelDrops::leavesTheListForADropOnTheFolder()
 
     QCOMPARE(read(path(QStringLiteral("menu/to/.directory"))), Directory);
     QTRY_COMPARE(shown().join(QString()), QStringLiteral("cbax"));
+}
+
+void tst_VelMenuModelDrops::readsTheListAnewOnlyForADropBetweenRows()
+{
+    write(QStringLiteral("menu/to/.directory"), "[Desktop Entry]\nType=Directory\nSortOrder=a;b;c;\n");
+
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::CopyAction, -1));
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("cbax"));
+
+    QVERIFY(drop({QStringLiteral("menu/from/y")}, Qt::CopyAction, 0));
+    QTRY_COMPARE(shown().size(), 5);
+    QCOMPARE(shown().join(QString()), QString::fromLatin1(list().replace(';', "").mid(1)));
 }
 
 void tst_VelMenuModelDrops::reordersWithinTheFolder()
