@@ -14,6 +14,7 @@
 #include <QSortFilterProxyModel>
 #include <QToolTip>
 
+#include <algorithm>
 #include <memory>
 
 #include <sys/stat.h>
@@ -40,6 +41,7 @@ private Q_SLOTS:
     void putsTheDirectoryFileBack();
     void takesAwayADirectoryFileThatWasNotThere();
     void tellsAtTheItemThatItWasLeft();
+    void keepsThePlaceWhenRowsGoWhileItAsks_data();
     void keepsThePlaceWhenRowsGoWhileItAsks();
     void tellsWhyAFolderIsRefused();
 
@@ -252,23 +254,40 @@ void tst_VelMenuModelDrops::tellsAtTheItemThatItWasLeft()
     QCOMPARE(QToolTip::text(), QStringLiteral("%1 exists and was left as it is.").arg(target));
 }
 
+void tst_VelMenuModelDrops::keepsThePlaceWhenRowsGoWhileItAsks_data()
+{
+    QTest::addColumn<bool>("atTheEnd");
+    QTest::newRow("between rows") << false;
+    QTest::newRow("at the end") << true;
+}
+
 void tst_VelMenuModelDrops::keepsThePlaceWhenRowsGoWhileItAsks()
 {
+    QFETCH(bool, atTheEnd);
     const QString target = write(QStringLiteral("menu/to/x"), "old");
     QTRY_COMPARE(shown().join(QString()), QStringLiteral("cbax"));
+    // The rows of the files need not be in order: one goes that stands above the place.
+    QStringList files{QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")};
+    std::sort(files.begin(), files.end(), [this](const QString &left, const QString &right) {
+        return rowOf(QLatin1String("menu/to/") + left) < rowOf(QLatin1String("menu/to/") + right);
+    });
+    const QString following = files.constLast();
+    QString expected = QStringLiteral("cba").remove(files.constFirst());
+    expected.insert(atTheEnd ? 2 : expected.indexOf(following), QLatin1Char('x'));
     ModalDriver modal;
     modal.handle([&](QWidget *box) {
         QVERIFY(QFile::remove(target));
-        QVERIFY(QFile::remove(path(QStringLiteral("menu/to/a"))));
+        QVERIFY(QFile::remove(path(QLatin1String("menu/to/") + files.constFirst())));
         QTRY_COMPARE(m_model->rowCount(source(QStringLiteral("menu/to"))), 2);
         qobject_cast<QMessageBox *>(box)->button(QMessageBox::Yes)->click();
     });
 
-    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::MoveAction, rowOf(QStringLiteral("menu/to/b"))));
+    QVERIFY(drop({QStringLiteral("menu/from/x")}, Qt::MoveAction,
+                 atTheEnd ? 4 : rowOf(QLatin1String("menu/to/") + following)));
 
     QVERIFY(modal.finished());
     QCOMPARE(read(target), QByteArray("menu/from/x"));
-    QCOMPARE(list(), QByteArray("*;c;x;b;"));
+    QCOMPARE(QString::fromLatin1(list().replace(';', "")), QLatin1Char('*') + expected);
 }
 
 void tst_VelMenuModelDrops::tellsWhyAFolderIsRefused()
