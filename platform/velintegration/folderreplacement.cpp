@@ -107,7 +107,7 @@ fs::path FolderReplacement::freeName(const char *purpose) const
 {
     const std::string start = "." + m_target.filename().string() + "." + purpose + std::to_string(getpid());
     for (int i = 0;; ++i) {
-        const fs::path path = m_target.parent_path() / (start + "-" + std::to_string(i));
+        fs::path path = m_target.parent_path() / (start + "-" + std::to_string(i));
         if (!pathExists(path))
             return path;
     }

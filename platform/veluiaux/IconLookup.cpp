@@ -24,7 +24,7 @@ QIcon iconOfFile(const QString &path)
     // Opening a pipe would wait for whoever writes into it.
     if (!QFileInfo(path).isFile())
         return QIcon();
-    const QIcon icon(path);
+    QIcon icon(path);
     // What only has the suffix of a picture gives an icon that is not null; a drawing has no
     // sizes of its own, but can be made in any.
     if (icon.availableSizes().isEmpty() && icon.actualSize(QSize(16, 16)).isEmpty())

@@ -109,7 +109,7 @@ Result check(const QStringList &sources, const QString &targetDirectory)
 
 Result transfer(const QStringList &sources, const QString &targetDirectory, Action action)
 {
-    const Result possible = check(sources, targetDirectory);
+    Result possible = check(sources, targetDirectory);
     if (!possible.succeeded())
         return possible;
     QVector<Pair> done;

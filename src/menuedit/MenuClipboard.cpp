@@ -44,7 +44,7 @@ QString pathInLine(const QByteArray &line)
     if (!line.startsWith(UriPrefix))
         return QString();
     const QByteArray rest = '/' + line.mid(int(sizeof UriPrefix) - 1);
-    const QString literal = cleaned(QString::fromLocal8Bit(rest));
+    QString literal = cleaned(QString::fromLocal8Bit(rest));
     if (OnDisk::exists(literal))
         return literal;
     const QString decoded = cleaned(QString::fromLocal8Bit(QByteArray::fromPercentEncoding(rest)));
@@ -53,7 +53,7 @@ QString pathInLine(const QByteArray &line)
 
 QString pathOf(const QUrl &url, const QByteArray &line)
 {
-    const QString path = cleaned(url.toLocalFile());
+    QString path = cleaned(url.toLocalFile());
     if (url.isValid() && OnDisk::exists(path))
         return path;
     const QString fromLine = pathInLine(line);
@@ -185,7 +185,7 @@ QStringList localPaths(const QMimeData *data)
     if (const auto *item = qobject_cast<const ItemData *>(data))
         return QStringList{cleaned(item->path())};
     if (data->hasFormat(copiedFilesFormat())) {
-        const QStringList paths = pathsOfCopiedFiles(data);
+        QStringList paths = pathsOfCopiedFiles(data);
         if (!paths.isEmpty())
             return paths;
     }

@@ -212,6 +212,7 @@ bool VelMenuDialog::updateWM()
     return false;
 }
 
+// NOLINTNEXTLINE(performance-unnecessary-value-param)
 void VelMenuDialog::selChanged(QItemSelection selected, QItemSelection)
 {
     QPushButton *ok = d->button(QDialogButtonBox::Ok);

@@ -103,7 +103,7 @@ public:
             return known->icon;
         const VelUIDesktopEntry entry(path);
         m_model->readAlong(path, entry);
-        const QIcon icon = desktopEntryIcon(entry, {});
+        QIcon icon = desktopEntryIcon(entry, {});
         if (stamp.isSettled())
             m_icons.insert(path, {stamp, icon});
         else
@@ -298,7 +298,7 @@ QString VelMenuModel::pathOf(const QModelIndex &index) const
     if (m_wasRenamed)
         return filePath(index);
     const QFileInfo info = fileInfo(index);
-    const QString path = info.filePath();
+    QString path = info.filePath();
     if (path.isEmpty() || path.startsWith(QLatin1String("//")) || info.isSymLink())
         return filePath(index);
     Q_ASSERT(path == filePath(index));

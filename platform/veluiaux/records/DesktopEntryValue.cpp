@@ -140,7 +140,7 @@ std::optional<QString> DesktopEntryValue::toText(std::string_view bytes)
     std::string plain;
     plain.reserve(bytes.size());
     for (std::size_t i = 0; i < bytes.size(); ++i) {
-        const char meant = bytes[i] == '\\' && i + 1 < bytes.size() ? unescaped(bytes[i + 1]) : 0;
+        const char meant = bytes[i] == '\\' && i + 1 < bytes.size() ? unescaped(bytes[i + 1]) : '\0';
         if (meant) {
             plain += meant;
             ++i;
@@ -166,7 +166,7 @@ std::optional<QStringList> DesktopEntryValue::toList(std::string_view bytes)
         item.clear();
     };
     for (std::size_t i = 0; i < bytes.size() && valid; ++i) {
-        const char next = bytes[i] == '\\' && i + 1 < bytes.size() ? bytes[i + 1] : 0;
+        const char next = bytes[i] == '\\' && i + 1 < bytes.size() ? bytes[i + 1] : '\0';
         const char meant = next == ';' ? ';' : unescaped(next);
         if (meant) {
             item += meant;

@@ -228,7 +228,9 @@ void Writer::insertNewGroups()
         }
         const auto [at, before] = places[kind];
         const std::string lineEnd = m_lines.lineEndAt(at);
-        std::string lines = "[" + name + "]" + lineEnd + keyLines(keys, lineEnd);
+        std::string lines = '[' + name + ']';
+        lines += lineEnd;
+        lines += keyLines(keys, lineEnd);
         if (before)
             lines += lineEnd;
         else if (at > m_lines.begin() || kind != 0)

@@ -36,7 +36,7 @@ struct FileStamp
 struct EntryFile
 {
     /// A larger file is no desktop entry and is not read.
-    static constexpr std::int64_t LargestSize = 1024 * 1024;
+    static constexpr std::int64_t LargestSize = std::int64_t(1024) * 1024;
 
     std::shared_ptr<const DesktopEntryText> text;
     FileStamp stamp;

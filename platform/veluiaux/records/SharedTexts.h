@@ -24,7 +24,7 @@ class SharedTexts
 {
 public:
     /// The memory that texts and their indexes may take, in bytes.
-    static constexpr std::size_t Limit = 8 * 1024 * 1024;
+    static constexpr std::size_t Limit = std::size_t(8) * 1024 * 1024;
 
     static SharedTexts &instance();
 
