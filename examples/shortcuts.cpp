@@ -33,7 +33,8 @@ int main(int argc, char **argv)
     model.registerAction(QStringLiteral("print"), print, QStringLiteral("File"));
     model.registerAction(QStringLiteral("quit"), quit, QStringLiteral("File"));
 
-    QObject::connect(menu->addAction(QStringLiteral("Configure &shortcuts...")), &QAction::triggered, &window, [&] {
+    const QAction *configure = menu->addAction(QStringLiteral("Configure &shortcuts..."));
+    QObject::connect(configure, &QAction::triggered, &window, [&] {
         EditShortcutsDialog dialog(&model, &window);
         if (dialog.exec() == QDialog::Accepted)
             model.saveKeys(&settings, group); // the library never saves by itself

@@ -46,7 +46,8 @@ constexpr bool gives(const Call &)
 // One desktop entry file.
 VEL_RECORD_NEEDS_CONSTRUCTOR(VelUIDesktopEntry, const QString &);
 VEL_RECORD_NEEDS_CONSTRUCTOR(VelUIDesktopEntry, const VelUIDesktopEntry &);
-static_assert(std::is_copy_assignable_v<VelUIDesktopEntry>, "The platform's VelUIDesktopEntry cannot be assigned");
+static_assert(std::is_copy_assignable_v<VelUIDesktopEntry>,
+              "The platform's VelUIDesktopEntry cannot be assigned");
 static_assert(std::is_same_v<VelUIDesktopEntry::SuitableError, int>,
               "The platform's VelUIDesktopEntry::SuitableError is no int");
 static_assert(std::is_same_v<VelUIDesktopEntry::DisplayableError, int>,
@@ -112,7 +113,8 @@ static_assert(std::is_default_constructible_v<VelUIDesktopAction>,
               "The platform's VelUIDesktopAction lacks the default constructor");
 VEL_RECORD_NEEDS_CONSTRUCTOR(VelUIDesktopAction, const QString &);
 VEL_RECORD_NEEDS_CONSTRUCTOR(VelUIDesktopAction, const VelUIDesktopAction &);
-static_assert(std::is_copy_assignable_v<VelUIDesktopAction>, "The platform's VelUIDesktopAction cannot be assigned");
+static_assert(std::is_copy_assignable_v<VelUIDesktopAction>,
+              "The platform's VelUIDesktopAction cannot be assigned");
 VEL_RECORD_NEEDS(const VelUIDesktopAction, QString, getId());
 VEL_RECORD_NEEDS_VALUE(VelUIDesktopAction, QString, Name);
 VEL_RECORD_NEEDS_VALUE(VelUIDesktopAction, QString, LocalName);
