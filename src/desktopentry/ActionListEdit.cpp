@@ -4,7 +4,8 @@
 #include "ActionListEdit.h"
 
 #include "EditActionsDialog.h"
-#include "GuardedDialog.h"
+
+#include <frame/GuardedDialog.h>
 
 #include <QToolButton>
 

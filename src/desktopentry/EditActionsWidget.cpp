@@ -4,7 +4,8 @@
 #include "EditActionsWidget.h"
 
 #include "ActionPropsDialog.h"
-#include "GuardedDialog.h"
+
+#include <frame/GuardedDialog.h>
 
 #include <QListWidget>
 #include <QPushButton>

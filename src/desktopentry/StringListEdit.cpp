@@ -4,7 +4,8 @@
 #include "StringListEdit.h"
 
 #include "EditStringsDialog.h"
-#include "GuardedDialog.h"
+
+#include <frame/GuardedDialog.h>
 
 #include <QToolButton>
 

@@ -3,12 +3,12 @@
 
 #include <VelDesktopEntryEditDialog.h>
 
-#include "GuardedDialog.h"
-
 #include <VelDesktopEntryPropsWidget.h>
 #include <VelMenuDialog.h>
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
+#include <frame/GuardedDialog.h>
+#include <frame/MessageBox.h>
 #include <velcore/dirs.h>
 #include <velintegration/desktopitems.h>
 
@@ -63,9 +63,7 @@ public:
 
 void VelDesktopEntryEditDialogPrivate::warn(const QString &text)
 {
-    // Not the ready-made box, which would not survive that the dialog goes meanwhile.
-    VelUI::GuardedDialog<QMessageBox> box(QMessageBox::Warning, tr("Warning"), text, QMessageBox::Ok, q);
-    box.exec();
+    MessageBox::show(q, QMessageBox::Warning, tr("Warning"), text);
 }
 
 void VelDesktopEntryEditDialogPrivate::markModified()
@@ -227,7 +225,7 @@ void VelDesktopEntryEditDialog::copyFrom()
 {
     if (!d->props)
         return;
-    VelUI::GuardedDialog<VelMenuDialog> picker(standardDirectory(VelDir::StartMenu), -1, false, false, this);
+    GuardedDialog<VelMenuDialog> picker(standardDirectory(VelDir::StartMenu), -1, false, false, this);
     if (!picker.run())
         return;
     const QString source = picker->selectedItemPath();
@@ -242,7 +240,7 @@ void VelDesktopEntryEditDialog::copyFrom()
 
 void VelDesktopEntryEditDialog::helpSlot()
 {
-    VelUI::GuardedDialog<QMessageBox> box(
+    GuardedDialog<QMessageBox> box(
         QMessageBox::Information, tr("Help"),
         tr("<b>Desktop entry</b> is a multipurpose info file for installed apps, devices, etc. "
            "It can be used to build menu entries, shortcuts, etc. "

@@ -6,10 +6,10 @@
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
 #include "FormLayout.h"
-#include "GuardedDialog.h"
 #include "NamedField.h"
 
 #include <VelDesktopEntryPropsWidget.h>
+#include <frame/GuardedDialog.h>
 
 #include <QComboBox>
 #include <QEvent>

@@ -3,12 +3,12 @@
 
 #include "VelMenuDialog.h"
 
-#include "MessageBox.h"
 #include "VelMenuView.h"
 #include "WmCommand.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
+#include <frame/MessageBox.h>
 
 #include <velcore/dirs.h>
 #include <velintegration/help.h>

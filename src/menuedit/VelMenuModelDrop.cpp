@@ -8,6 +8,8 @@
 #include "VelMenuModel.h"
 #include "VelMenuView.h"
 
+#include <frame/GuardedDialog.h>
+
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -159,13 +161,11 @@ bool VelMenuModel::dropIntoOtherFolder(const Drop &drop)
 bool VelMenuModel::mayOverwrite(const QString &target)
 {
     const QPointer<VelMenuModel> self(this);
-    const QPointer<QMessageBox> box(
-        new QMessageBox(QMessageBox::Question, QFileSystemModel::tr("Attention"),
-                        QFileSystemModel::tr("%1 already exists. Overwrite?").arg(target), QMessageBox::Yes,
-                        qobject_cast<QWidget *>(QObject::parent())));
+    GuardedDialog<QMessageBox> box(QMessageBox::Question, QFileSystemModel::tr("Attention"),
+                                   QFileSystemModel::tr("%1 already exists. Overwrite?").arg(target),
+                                   QMessageBox::Yes, qobject_cast<QWidget *>(QObject::parent()));
     box->setDefaultButton(QMessageBox::No);
-    const int answer = box->exec();
-    delete box;
+    const int answer = box.exec();
     return self && answer != QMessageBox::No;
 }
 

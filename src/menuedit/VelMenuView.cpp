@@ -3,12 +3,13 @@
 
 #include "VelMenuView.h"
 
-#include "MessageBox.h"
 #include "TreeLoader.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuViewPrivate.h"
 #include "WaitCursor.h"
+
+#include <frame/MessageBox.h>
 
 #include <velcore/dirs.h>
 #include <velintegration/startmenu.h>

@@ -3,7 +3,6 @@
 
 #include "EntryName.h"
 #include "FreeName.h"
-#include "MessageBox.h"
 #include "OnDisk.h"
 #include "SortOrder.h"
 #include "VelDesktopEntryEditDialog.h"
@@ -13,6 +12,8 @@
 #include "VelMenuViewPrivate.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/GuardedDialog.h>
+#include <frame/MessageBox.h>
 
 #include <QDir>
 #include <QFileInfo>
@@ -186,14 +187,11 @@ bool VelMenuViewPrivate::edit(const QString &item)
     }
 
     const QPointer<VelMenuView> self(q);
-    const QPointer<VelDesktopEntryEditDialog> dialog(new VelDesktopEntryEditDialog(q));
-    bool accepted = false;
-    if (dialog->setDesktopEntryPath(path, !QFileInfo::exists(path), QString()) && dialog) {
-        dialog->setWindowTitle(VelMenuView::tr("Desktop Entry %1").arg(path));
-        accepted = dialog->exec() == QDialog::Accepted;
-    }
-    delete dialog;
-    if (!self || !accepted)
+    GuardedDialog<VelDesktopEntryEditDialog> dialog(q);
+    if (!dialog->setDesktopEntryPath(path, !QFileInfo::exists(path), QString()) || !dialog.isAlive())
+        return false;
+    dialog->setWindowTitle(VelMenuView::tr("Desktop Entry %1").arg(path));
+    if (!dialog.run() || !self)
         return false;
     q->clearFindResults();
     model->forgetItemInfo(path);

@@ -1,13 +1,14 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "MessageBox.h"
 #include "TreeLoader.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuView.h"
 #include "VelMenuViewPrivate.h"
 #include "WaitCursor.h"
+
+#include <frame/MessageBox.h>
 
 #include <QInputDialog>
 #include <QPointer>

@@ -3,20 +3,17 @@
 
 #include "MessageBox.h"
 
-#include <QPointer>
+#include "GuardedDialog.h"
+
 #include <QPushButton>
 
 QMessageBox::StandardButton MessageBox::show(QWidget *parent, QMessageBox::Icon icon, const QString &title,
                                              const QString &text, QMessageBox::StandardButtons buttons,
                                              QMessageBox::StandardButton defaultButton)
 {
-    const QPointer<QMessageBox> box(new QMessageBox(icon, title, text, buttons, parent));
+    GuardedDialog<QMessageBox> box(icon, title, text, buttons, parent);
     if (defaultButton != QMessageBox::NoButton)
         box->setDefaultButton(defaultButton);
-    box->exec();
-    if (!box)
-        return QMessageBox::NoButton;
-    const QMessageBox::StandardButton answer = box->standardButton(box->clickedButton());
-    delete box;
-    return answer;
+    box.exec();
+    return box.isAlive() ? box->standardButton(box->clickedButton()) : QMessageBox::NoButton;
 }

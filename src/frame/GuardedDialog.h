@@ -8,8 +8,6 @@
 
 #include <utility>
 
-namespace VelUI {
-
 /// A modal dialog that lives in a scope and may lose its parent while it runs.
 ///
 /// The parent takes the dialog with it then; nothing of the parent may be touched after run()
@@ -42,5 +40,3 @@ private:
     Q_DISABLE_COPY(GuardedDialog)
     QPointer<Dialog> m_dialog;
 };
-
-} // namespace VelUI
