@@ -56,6 +56,12 @@ Options parse()
     return options;
 }
 
+int fail(const QString &text)
+{
+    Program::printError(text);
+    return 2;
+}
+
 bool hasPage(const QVector<GalleryPage> &pages, const QString &name)
 {
     return std::any_of(pages.begin(), pages.end(),
@@ -86,7 +92,9 @@ int main(int argc, char **argv)
     if (Program::mayWantNoWindow(argc, argv)) {
         QCoreApplication application(argc, argv);
         Program::loadCatalogues();
-        parse();
+        const Options options = parse();
+        if (!options.error.isEmpty())
+            return fail(options.error);
         // What looked like it was the value of another option.
     }
 
@@ -97,10 +105,8 @@ int main(int argc, char **argv)
     QApplication::setDesktopFileName(QStringLiteral("vel-gallery"));
 
     const Options options = parse();
-    if (!options.error.isEmpty()) {
-        Program::printError(options.error);
-        return 2;
-    }
+    if (!options.error.isEmpty())
+        return fail(options.error);
     const QVector<GalleryPage> pages = galleryPages();
     if (!options.page.isEmpty() && !hasPage(pages, options.page)) {
         Program::printError(

@@ -17,6 +17,7 @@
 #include <QListWidget>
 #include <QPlainTextEdit>
 #include <QProcess>
+#include <QProcessEnvironment>
 #include <QPushButton>
 #include <QSet>
 #include <QSettings>
@@ -76,9 +77,13 @@ private Q_SLOTS:
     void givesAKeyThatIsNoActionsToTheUser();
     void writesPicturesInEveryCombination();
     void showsItsHelpWithoutADisplay();
+    void refusesAnUnknownOption_data();
     void refusesAnUnknownOption();
     void failsForAPageThatDoesNotExist();
     void failsWhenPicturesCannotBeWritten();
+
+private:
+    static QProcessEnvironment withoutADisplay();
 };
 
 void tst_vel_gallery::namesItsPagesOnceAndPlainly()
@@ -266,12 +271,18 @@ void tst_vel_gallery::writesPicturesInEveryCombination()
     QCOMPARE(large.size(), 2 * light.size());
 }
 
-void tst_vel_gallery::showsItsHelpWithoutADisplay()
+QProcessEnvironment tst_vel_gallery::withoutADisplay()
 {
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.insert(s("QT_QPA_PLATFORM"), s("xcb"));
     environment.remove(s("DISPLAY"));
+    return environment;
+}
+
+void tst_vel_gallery::showsItsHelpWithoutADisplay()
+{
     QProcess gallery;
-    gallery.setProcessEnvironment(environment);
+    gallery.setProcessEnvironment(withoutADisplay());
     gallery.start(s(VEL_GALLERY), {s("--help")});
     QVERIFY(gallery.waitForFinished());
     QCOMPARE(gallery.exitCode(), 0);
@@ -279,10 +290,22 @@ void tst_vel_gallery::showsItsHelpWithoutADisplay()
     QVERIFY(gallery.readAllStandardOutput().contains("--screenshots"));
 }
 
+void tst_vel_gallery::refusesAnUnknownOption_data()
+{
+    QTest::addColumn<QStringList>("arguments");
+    QTest::addColumn<bool>("hasDisplay");
+    QTest::newRow("alone") << QStringList{s("--nonsense")} << true;
+    QTest::newRow("beside help, without a display") << QStringList{s("--help"), s("--nonsense")} << false;
+}
+
 void tst_vel_gallery::refusesAnUnknownOption()
 {
+    QFETCH(QStringList, arguments);
+    QFETCH(bool, hasDisplay);
     QProcess gallery;
-    gallery.start(s(VEL_GALLERY), {s("--nonsense")});
+    if (!hasDisplay)
+        gallery.setProcessEnvironment(withoutADisplay());
+    gallery.start(s(VEL_GALLERY), arguments);
     QVERIFY(gallery.waitForFinished());
     QCOMPARE(gallery.exitCode(), 2);
     QCOMPARE(gallery.readAllStandardError(), QByteArray("vel-gallery: Unknown option 'nonsense'.\n"));
