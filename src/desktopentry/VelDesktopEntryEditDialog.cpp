@@ -7,6 +7,7 @@
 #include <VelMenuDialog.h>
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
+#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
 #include <velcore/dirs.h>
@@ -172,9 +173,9 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     d->path = path;
     d->loaded = own;
     if (!loaded) {
-        if (path.endsWith(QLatin1String("/.directory")))
+        if (EntryPath::isRecordFile(path))
             d->props->setType(QStringLiteral("Directory"), {QStringLiteral("Directory")});
-        else if (path.endsWith(QLatin1String(".desktop")))
+        else if (EntryPath::isEntry(path))
             d->props->setType(QStringLiteral("Application"),
                               {QStringLiteral("Application"), QStringLiteral("Link")});
     }

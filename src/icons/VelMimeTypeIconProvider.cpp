@@ -6,6 +6,7 @@
 #include "MimeTypeFinder.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
 
 #include <velcore/dirs.h>
 #include <veluiaux/VelIcon.h>
@@ -106,7 +107,7 @@ QIcon VelMimeTypeIconProvider::icon(const QFileInfo &info) const
         return directoryIcon(info, emblems);
     if (!info.isFile())
         return VelIcon::withEmblems(fileIcon, emblems);
-    if (info.fileName().endsWith(QLatin1String(".desktop")))
+    if (EntryPath::isEntry(info.fileName()))
         return desktopEntryIcon(VelUIDesktopEntry(info.absoluteFilePath()), emblems);
     return regularFileIcon(info, emblems);
 }
@@ -123,7 +124,7 @@ QString VelMimeTypeIconProvider::regularFileType(const QFileInfo &info) const
 
 QIcon VelMimeTypeIconProvider::directoryIcon(const QFileInfo &info, const Emblems &emblems) const
 {
-    const QString path = info.absoluteFilePath() + QStringLiteral("/.directory");
+    const QString path = EntryPath::recordFileOf(info.absoluteFilePath());
     const QString name = QFile::exists(path) ? VelUIDesktopEntry(path).getIcon() : QString();
     return name.isEmpty() ? VelIcon::withEmblems(folderIcon, emblems)
                           : VelIcon::fromTheme(name, emblems, folderIcon);

@@ -8,6 +8,7 @@
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
+#include <frame/EntryPath.h>
 #include <frame/MessageBox.h>
 
 #include <velcore/dirs.h>
@@ -114,7 +115,7 @@ void VelMenuDialogPrivate::connectButtons()
 QString VelMenuDialogPrivate::title(const QString &dir) const
 {
     QString text;
-    const QString recordFile = dir + QLatin1String("/.directory");
+    const QString recordFile = EntryPath::recordFileOf(dir);
     if (QFile::exists(recordFile))
         text += QLatin1String(" \"") + VelUIDesktopEntry(recordFile).getLocalName() + QLatin1Char('"');
     return text + QLatin1Char(' ') + dir;
@@ -219,9 +220,8 @@ void VelMenuDialog::selChanged(QItemSelection selected, QItemSelection)
     if (!ok)
         return;
     const QModelIndexList indexes = selected.indexes();
-    ok->setEnabled(
-        !indexes.isEmpty()
-        && (d->anyItemSelectable || d->pathOf(indexes.constFirst()).endsWith(QLatin1String(".desktop"))));
+    ok->setEnabled(!indexes.isEmpty()
+                   && (d->anyItemSelectable || EntryPath::isEntry(d->pathOf(indexes.constFirst()))));
 }
 
 void VelMenuDialog::changed()
