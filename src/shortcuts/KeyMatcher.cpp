@@ -4,52 +4,13 @@
 #include "KeyMatcher.h"
 
 #include "FileText.h"
-#include "KeyNames.h"
 #include "KeySequences.h"
-#include "VelKeyServer.h"
 
 #include <cstring>
 
 namespace {
 
-constexpr int modifiersButKeypad = int(Qt::KeyboardModifierMask) & ~int(Qt::KeypadModifier);
-
-constexpr unsigned int shiftBit = 1;
-constexpr unsigned int controlBit = 2;
-constexpr unsigned int altBit = 4;
-constexpr unsigned int metaBit = 8;
-constexpr unsigned int noModifier = 16;
-
-bool equals(const char *part, std::size_t length, const char *name)
-{
-    return qstrnicmp(part, name, uint(length)) == 0;
-}
-
-// The packed bit of a modifier; noModifier for any other name.
-unsigned int packedBit(const char *part, std::size_t length)
-{
-    switch (length) {
-    case 3:
-        return equals(part, length, "Alt") ? altBit : noModifier;
-    case 4:
-        return equals(part, length, "Ctrl")                                ? controlBit
-            : equals(part, length, "Mod4") || equals(part, length, "Meta") ? metaBit
-                                                                           : noModifier;
-    case 5:
-        return equals(part, length, "Shift") ? shiftBit : noModifier;
-    case 7:
-        return equals(part, length, "Control") ? controlBit : noModifier;
-    default:
-        return noModifier;
-    }
-}
-
-int qtModifiers(unsigned int packed)
-{
-    const unsigned int mask = ((packed & shiftBit) ? 0x01u : 0u) | ((packed & controlBit) ? 0x04u : 0u)
-        | ((packed & altBit) ? 0x08u : 0u) | ((packed & metaBit) ? 0x40u : 0u);
-    return KeyNames::qtModifiers(mask);
-}
+constexpr int ModifiersButKeypad = int(Qt::KeyboardModifierMask) & ~int(Qt::KeypadModifier);
 
 bool isLetterOrDigit(char character)
 {
@@ -63,7 +24,7 @@ bool isLetterOrDigit(char character)
 struct KeyMatcher::Parts
 {
     bool isSimple = false;
-    unsigned int mask = 0;
+    unsigned int mask = 0; // X11 bits
     const char *key = nullptr;
     std::size_t keyLength = 0;
 
@@ -82,8 +43,8 @@ struct KeyMatcher::Parts
                 continue;
             const std::size_t length = std::size_t(at - key);
             if (length != 4 || std::memcmp(key, "None", 4) != 0) {
-                const unsigned int bit = packedBit(key, length);
-                if (bit == noModifier)
+                const unsigned int bit = KeyNames::modifierBit(key, length);
+                if (bit == 0)
                     return;
                 mask |= bit;
             }
@@ -100,8 +61,10 @@ KeyMatcher::KeyMatcher(const QKeySequence &wanted)
     if (wanted.count() != 1)
         return;
     m_wantedKey = wanted[0] & ~int(Qt::KeyboardModifierMask);
-    for (unsigned int packed = 0; packed < m_wantedMasks.size(); ++packed)
-        m_wantedMasks[packed] = qtModifiers(packed) == (wanted[0] & modifiersButKeypad);
+    for (unsigned int mask = 0; mask <= KeyNames::AllModifiers; ++mask) {
+        if ((mask & ~KeyNames::AllModifiers) == 0)
+            m_wantedMasks[mask] = KeyNames::qtModifiers(mask) == (wanted[0] & ModifiersButKeypad);
+    }
 }
 
 bool KeyMatcher::matches(const char *fileKey) const
@@ -142,7 +105,7 @@ std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
     const std::optional<int> code = KeyNames::codeFromKeyString(QByteArray(parts.key, int(parts.keyLength)));
     if (!code || !KeyNames::readsBackUnchanged(*code))
         return std::nullopt;
-    return m_wanted[0] == (*code | qtModifiers(parts.mask));
+    return m_wanted[0] == (*code | KeyNames::qtModifiers(parts.mask));
 }
 
 bool KeyMatcher::matchesText(const char *fileKey) const
@@ -150,7 +113,7 @@ bool KeyMatcher::matchesText(const char *fileKey) const
     QString key = FileText::withoutQuotes(QString::fromUtf8(fileKey));
     key.replace(QLatin1Char('|'), QLatin1Char('+'));
     key.remove(QLatin1String("None+"));
-    const QString converted = VelKeyServer::KeyStringXToQt(key);
+    const QString converted = KeyNames::fromKeyString(key);
     const QKeySequence sequence(converted.isEmpty() ? key : converted, QKeySequence::NativeText);
     return KeySequences::isKnown(sequence) && sequence == m_wanted;
 }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "KeyNames.h"
+
 #include <QKeySequence>
 
 #include <array>
@@ -34,5 +36,5 @@ private:
 
     const QKeySequence m_wanted;
     int m_wantedKey = 0; // without modifiers; 0 unless the sequence has exactly one key
-    std::array<bool, 16> m_wantedMasks = {}; // by packed modifier mask
+    std::array<bool, KeyNames::AllModifiers + 1> m_wantedMasks = {}; // by X11 modifier mask
 };

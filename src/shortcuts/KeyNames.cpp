@@ -15,20 +15,29 @@ namespace {
 
 struct Modifier
 {
-    const char *name;
+    QLatin1String name; // the one that is written
+    QLatin1String alias; // the other one that is read, where there is one
     unsigned int bit;
 };
 
-constexpr std::array<Modifier, 6> acceptedModifiers = {
-    {{"Ctrl", 0x04}, {"Control", 0x04}, {"Shift", 0x01}, {"Alt", 0x08}, {"Meta", 0x40}, {"Mod4", 0x40}}};
+// In the order in which they are written.
+constexpr std::array<Modifier, 4> Modifiers = {{{QLatin1String("Ctrl", 4), QLatin1String("Control", 7), 0x04},
+                                                {QLatin1String("Shift", 5), QLatin1String("Shift", 5), 0x01},
+                                                {QLatin1String("Alt", 3), QLatin1String("Alt", 3), 0x08},
+                                                {QLatin1String("Mod4", 4), QLatin1String("Meta", 4), 0x40}}};
 
-unsigned int modifierBit(const char *name, int length)
+constexpr unsigned int allBits()
 {
-    for (const Modifier &modifier : acceptedModifiers) {
-        if (length == int(qstrlen(modifier.name)) && qstrnicmp(name, modifier.name, uint(length)) == 0)
-            return modifier.bit;
-    }
-    return 0;
+    unsigned int bits = 0;
+    for (const Modifier &modifier : Modifiers)
+        bits |= modifier.bit;
+    return bits;
+}
+static_assert(allBits() == KeyNames::AllModifiers);
+
+bool equals(QLatin1String known, const char *name, std::size_t length)
+{
+    return std::size_t(known.size()) == length && qstrnicmp(name, known.data(), uint(length)) == 0;
 }
 
 // Deprecated because other layouts need the modifiers too; a key string is independent of the
@@ -43,6 +52,47 @@ bool keyFromSymbol(unsigned int symbol, int *key)
 
 } // namespace
 
+unsigned int KeyNames::modifierBit(const char *name, std::size_t length)
+{
+    for (const Modifier &modifier : Modifiers) {
+        if (equals(modifier.name, name, length) || equals(modifier.alias, name, length))
+            return modifier.bit;
+    }
+    return 0;
+}
+
+int KeyNames::qtModifiers(unsigned int mask)
+{
+    int modifiers = 0;
+    KKeyServer::modXToQt(mask, &modifiers);
+    return modifiers;
+}
+
+QString KeyNames::toKeyString(int code)
+{
+    int symbol = 0;
+    unsigned int mask = 0;
+    if (!KKeyServer::keyQtToSymX(code, &symbol) || !KKeyServer::keyQtToModX(code, &mask))
+        return {};
+    const char *symbolName = XKeysymToString(static_cast<KeySym>(symbol));
+    if (!symbolName)
+        return QLatin1String("");
+
+    QString text;
+    for (const Modifier &modifier : Modifiers) {
+        if (mask & modifier.bit)
+            text += modifier.name + QLatin1Char('+');
+    }
+    return text + QString::fromLocal8Bit(symbolName);
+}
+
+QString KeyNames::fromKeyString(const QString &keyString)
+{
+    const std::optional<int> code = codeFromKeyString(keyString.toLocal8Bit());
+    const QString portable = code ? portableText(*code) : QString();
+    return portable.isEmpty() ? QString() : portable;
+}
+
 std::optional<int> KeyNames::codeFromKeyString(const QByteArray &keyString)
 {
     const int keyBegin = keyString.lastIndexOf('+') + 1;
@@ -56,20 +106,13 @@ std::optional<int> KeyNames::codeFromKeyString(const QByteArray &keyString)
     unsigned int mask = 0;
     for (int begin = 0; begin < keyBegin;) {
         const int end = keyString.indexOf('+', begin);
-        mask |= modifierBit(keyString.constData() + begin, end - begin);
+        mask |= modifierBit(keyString.constData() + begin, std::size_t(end - begin));
         begin = end + 1;
     }
     int key = 0;
     if (!keyFromSymbol(static_cast<unsigned int>(symbol), &key))
         return std::nullopt;
     return key | qtModifiers(mask);
-}
-
-int KeyNames::qtModifiers(unsigned int mask)
-{
-    int modifiers = 0;
-    KKeyServer::modXToQt(mask, &modifiers);
-    return modifiers;
 }
 
 QString KeyNames::portableText(int code)

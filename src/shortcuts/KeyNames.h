@@ -6,20 +6,43 @@
 #include <QByteArray>
 #include <QString>
 
+#include <cstddef>
 #include <optional>
 
+/**
+ * The names of keys: key strings ("Ctrl+Alt+Mod4+F2"), as the window manager writes them, and
+ * what Qt calls the same keys.
+ */
 namespace KeyNames {
 
+/// The X11 bits of all modifiers that a key string can name.
+constexpr unsigned int AllModifiers = 0x4d;
+
 /**
- * Reads a key string ("Ctrl+Alt+F2").
+ * Looks a modifier up.
+ *
+ * @param name one of its names, in any case; not terminated
+ * @param length the length of the name
+ * @return its X11 bit; 0 when no modifier has that name
+ */
+unsigned int modifierBit(const char *name, std::size_t length);
+
+/// The Qt modifiers of an X11 modifier mask.
+int qtModifiers(unsigned int mask);
+
+/// The key string of a Qt key code, see VelKeyServer::KeyQtToKeyStringX().
+QString toKeyString(int code);
+
+/// The portable text that a key string stands for, see VelKeyServer::KeyStringXToQt().
+QString fromKeyString(const QString &keyString);
+
+/**
+ * Reads a key string.
  *
  * @param keyString its bytes in the local 8-bit encoding
  * @return the Qt key code, key and modifiers; nothing when the key string is rejected
  */
 std::optional<int> codeFromKeyString(const QByteArray &keyString);
-
-/// The Qt modifiers of an X11 modifier mask.
-int qtModifiers(unsigned int mask);
 
 /// The portable text of the key sequence of one key code; empty when it has none.
 QString portableText(int code);
