@@ -103,7 +103,7 @@ std::optional<bool> KeyMatcher::decideByParts(const Parts &parts) const
 std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
 {
     const std::optional<int> code = KeyNames::codeFromKeyString(QByteArray(parts.key, int(parts.keyLength)));
-    if (!code || !KeyNames::readsBackUnchanged(*code))
+    if (!code || !KeyNames::roundTrips(*code))
         return std::nullopt;
     return m_wanted[0] == (*code | KeyNames::qtModifiers(parts.mask));
 }

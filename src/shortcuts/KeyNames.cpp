@@ -120,7 +120,7 @@ QString KeyNames::portableText(int code)
     return QKeySequence(code).toString(QKeySequence::PortableText);
 }
 
-bool KeyNames::readsBackUnchanged(int code)
+bool KeyNames::roundTrips(int code)
 {
     const int key = code & ~int(Qt::KeyboardModifierMask);
     const bool isLowerCase = key >= 'a' && key <= 'z';

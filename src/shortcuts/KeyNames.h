@@ -53,6 +53,6 @@ QString portableText(int code);
  * That holds for ASCII keys and the usual named keys. Others (a lower-case letter outside of
  * ASCII, for instance) may read back as another code.
  */
-bool readsBackUnchanged(int code);
+bool roundTrips(int code);
 
 } // namespace KeyNames

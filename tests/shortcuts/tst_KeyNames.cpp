@@ -57,7 +57,7 @@ void tst_KeyNames::writesTheModifiersInOneOrder()
 void tst_KeyNames::readsWhatItWrites()
 {
     const int code = Qt::META | Qt::SHIFT | Qt::Key_F3;
-    QVERIFY(KeyNames::readsBackUnchanged(code));
+    QVERIFY(KeyNames::roundTrips(code));
     QCOMPARE(KeyNames::fromKeyString(KeyNames::toKeyString(code)), KeyNames::portableText(code));
     QCOMPARE(*KeyNames::codeFromKeyString(KeyNames::toKeyString(code).toLocal8Bit()), code);
 }
