@@ -36,7 +36,7 @@ const QVector<Rule> &rules()
         {"src/settings", text("include")},
         {"src/widgets", text("include")},
         {"src/icons", text("include src/frame platform")},
-        {"src/shortcuts", text("include platform")},
+        {"src/shortcuts", text("include src/frame platform")},
         {"src/desktopentry", text("include src/frame platform")},
         {"src/menuedit", text("include src/frame platform")},
         {"apps", text("include platform")},
