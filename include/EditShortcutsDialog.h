@@ -7,7 +7,8 @@
 
 #include <QDialog>
 #include <QKeySequence>
-#include <QScopedPointer>
+
+#include <memory>
 
 class EditShortcutsDialogPrivate;
 class QAbstractButton;
@@ -94,5 +95,5 @@ protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
-    const QScopedPointer<EditShortcutsDialogPrivate> d;
+    const std::unique_ptr<EditShortcutsDialogPrivate> d;
 };

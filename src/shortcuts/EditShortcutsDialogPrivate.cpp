@@ -3,178 +3,212 @@
 
 #include "EditShortcutsDialogPrivate.h"
 
-#include "EditShortcutsDialog.h"
 #include "KeySequences.h"
 #include "ShortcutConflict.h"
 #include "ShortcutsTreeView.h"
 
+#include <frame/MessageBox.h>
+
+#include <QDialog>
 #include <QDialogButtonBox>
-#include <QGridLayout>
+#include <QFocusEvent>
 #include <QGroupBox>
 #include <QKeySequenceEdit>
 #include <QLabel>
-#include <QMessageBox>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QSignalBlocker>
-#include <QVBoxLayout>
 
-namespace {
-
-// Not QMessageBox's own functions: their box would not survive that the dialog goes meanwhile.
-// Returns NoButton in that case.
-QMessageBox::StandardButton showMessage(QWidget *parent, QMessageBox::Icon icon, const QString &title,
-                                        const QString &text, QMessageBox::StandardButtons buttons,
-                                        QMessageBox::StandardButton defaultButton = QMessageBox::NoButton)
+EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts)
+    : form(dialog)
+    , m_dialog(dialog)
+    , m_model(shortcuts)
 {
-    const QPointer<QMessageBox> box(new QMessageBox(icon, title, text, buttons, parent));
-    box->setDefaultButton(defaultButton);
-    box->exec();
-    if (!box)
-        return QMessageBox::NoButton;
-    const QMessageBox::StandardButton answer = box->standardButton(box->clickedButton());
-    delete box;
-    return answer;
-}
-
-} // namespace
-
-EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(EditShortcutsDialog *dialog, ShortcutsModel *shortcuts)
-    : q(dialog)
-    , model(shortcuts)
-{
-}
-
-void EditShortcutsDialogPrivate::buildForm()
-{
-    q->setObjectName(QStringLiteral("EditShortcutsDialog"));
-    q->setWindowTitle(EditShortcutsDialog::tr("Configure shortcuts"));
-    q->resize(614, 504);
-
-    verticalLayout = new QVBoxLayout(q);
-    verticalLayout->setObjectName(QStringLiteral("verticalLayout"));
-
-    treeView = new ShortcutsTreeView(q);
-    treeView->setObjectName(QStringLiteral("treeView"));
-    treeView->setAccessibleName(q->windowTitle());
-    verticalLayout->addWidget(treeView);
-
-    buildKeyBox();
-    verticalLayout->addWidget(groupBox);
-
-    buttonBox = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel | QDialogButtonBox::Reset
-                                         | QDialogButtonBox::RestoreDefaults,
-                                     q);
-    buttonBox->setObjectName(QStringLiteral("buttonBox"));
-    verticalLayout->addWidget(buttonBox);
-}
-
-void EditShortcutsDialogPrivate::buildKeyBox()
-{
-    groupBox = new QGroupBox(EditShortcutsDialog::tr("Choose a key for selected action"), q);
-    groupBox->setObjectName(QStringLiteral("groupBox"));
-    gridLayout = new QGridLayout(groupBox);
-    gridLayout->setObjectName(QStringLiteral("gridLayout"));
-
-    defaultKeyRB = new QRadioButton(EditShortcutsDialog::tr("Default key:"), groupBox);
-    defaultKeyRB->setObjectName(QStringLiteral("defaultKeyRB"));
-    gridLayout->addWidget(defaultKeyRB, 0, 0, 2, 1);
-
-    defaultKeyLabel = new QLabel(groupBox);
-    defaultKeyLabel->setObjectName(QStringLiteral("defaultKeyLabel"));
-    defaultKeyLabel->setTextFormat(Qt::PlainText);
-    gridLayout->addWidget(defaultKeyLabel, 0, 1, 2, 2);
-
-    customKeyRB = new QRadioButton(EditShortcutsDialog::tr("Assign key:"), groupBox);
-    customKeyRB->setObjectName(QStringLiteral("customKeyRB"));
-    gridLayout->addWidget(customKeyRB, 2, 0);
-
-    keyWidget = new QKeySequenceEdit(groupBox);
-    keyWidget->setObjectName(QStringLiteral("keyWidget"));
-    keyWidget->setAccessibleName(customKeyRB->text());
-    keyWidget->setEnabled(false);
-    gridLayout->addWidget(keyWidget, 2, 1, 1, 2);
-    QObject::connect(customKeyRB, &QRadioButton::toggled, keyWidget, &QWidget::setEnabled);
-
-    // Nothing is current yet.
-    groupBox->setEnabled(false);
+    fillTree();
+    setChanged(false);
+    connectKeys();
 }
 
 void EditShortcutsDialogPrivate::fillTree()
 {
-    treeView->setEditTriggers(QAbstractItemView::NoEditTriggers);
-    treeView->setModel(model);
-    treeView->expandAll();
-    treeView->resizeColumnToContents(0);
+    form.treeView->setModel(m_model);
+    form.treeView->expandAll();
+    form.treeView->resizeColumnToContents(0);
 }
 
 void EditShortcutsDialogPrivate::connectKeys()
 {
-    QObject::connect(treeView, &ShortcutsTreeView::currentShortcutChanged, q,
-                     &EditShortcutsDialog::checkCurrentShortcut);
-    QObject::connect(treeView, &ShortcutsTreeView::currentItemIsNotShortcut, q,
-                     &EditShortcutsDialog::disableShortcutEdit);
-    QObject::connect(keyWidget, &QKeySequenceEdit::keySequenceChanged, q,
-                     &EditShortcutsDialog::checkEnteredKeySequence);
-    QObject::connect(defaultKeyRB, &QRadioButton::toggled, q, &EditShortcutsDialog::setDefaultShortcut);
+    QObject::connect(form.treeView, &ShortcutsTreeView::currentShortcutChanged, &m_context,
+                     [this](const QKeySequence &defaultKey, const QKeySequence &pendingKey) {
+                         showShortcut(defaultKey, pendingKey);
+                     });
+    QObject::connect(form.treeView, &ShortcutsTreeView::currentItemIsNotShortcut, &m_context,
+                     [this] { showNoShortcut(); });
+    if (m_model)
+        QObject::connect(m_model, &QObject::destroyed, &m_context, [this] { showNoShortcut(); });
 
-    keyWidget->installEventFilter(q);
-    QObject::connect(keyWidget, &QKeySequenceEdit::editingFinished, q, [this] { endRecording(); });
-    if (model)
-        QObject::connect(model, &QObject::destroyed, q, &EditShortcutsDialog::disableShortcutEdit);
+    QObject::connect(form.keyWidget, &QKeySequenceEdit::keySequenceChanged, &m_context,
+                     [this](const QKeySequence &key) { enterKey(key); });
+    QObject::connect(form.keyWidget, &QKeySequenceEdit::editingFinished, &m_context,
+                     [this] { endRecording(); });
+    QObject::connect(form.defaultKeyRB, &QRadioButton::toggled, &m_context, [this] { enterDefaultKey(); });
+    // Last: the dialog takes events as soon as it has this object.
+    form.keyWidget->installEventFilter(m_dialog);
 }
 
-bool EditShortcutsDialogPrivate::isChanged() const
+void EditShortcutsDialogPrivate::showShortcut(const QKeySequence &defaultKey, const QKeySequence &pendingKey)
 {
-    return buttonBox->button(QDialogButtonBox::Ok)->isEnabled();
+    form.groupBox->setEnabled(true);
+    const QString defaultText = defaultKey.toString(QKeySequence::PortableText);
+    form.defaultKeyLabel->setText(defaultText.isEmpty() ? tr("None") : defaultText);
+    form.defaultKeyRB->setAccessibleDescription(form.defaultKeyLabel->text());
+    showKey(pendingKey);
+    if (defaultKey == pendingKey) {
+        const QSignalBlocker blocker(form.defaultKeyRB);
+        form.defaultKeyRB->setChecked(true);
+        showKey(QKeySequence());
+    } else {
+        form.customKeyRB->setChecked(true);
+    }
 }
 
+void EditShortcutsDialogPrivate::showNoShortcut()
+{
+    form.groupBox->setEnabled(false);
+}
+
+// Puts a key into the key editor without the editor announcing it; ends a recording.
 void EditShortcutsDialogPrivate::showKey(const QKeySequence &key)
 {
-    isRecording = false;
-    const QSignalBlocker blocker(keyWidget);
-    keyWidget->setKeySequence(key);
+    m_isRecording = false;
+    const QSignalBlocker blocker(form.keyWidget);
+    form.keyWidget->setKeySequence(key);
 }
 
-void EditShortcutsDialogPrivate::setPendingKey(const QKeySequence &key)
+void EditShortcutsDialogPrivate::watchKeyEditor(const QEvent &event)
 {
-    treeView->setKeySequence(key);
-    q->setChanged(true);
-    buttonBox->button(QDialogButtonBox::RestoreDefaults)->setEnabled(true);
+    if (event.type() == QEvent::KeyPress) {
+        m_isRecording = true;
+    } else if (event.type() == QEvent::FocusOut
+               && static_cast<const QFocusEvent &>(event).reason() != Qt::PopupFocusReason) {
+        // The editor itself would wait a second for one more chord, while the user goes on to
+        // another row or to Ok.
+        endRecording();
+    }
+}
+
+// Takes the key recorded so far; when there is none, the editor shows the old one again.
+void EditShortcutsDialogPrivate::endRecording()
+{
+    if (!m_isRecording)
+        return;
+    const QKeySequence key = form.keyWidget->keySequence();
+    const bool hasKey = !key.isEmpty() && form.treeView->isShortcutCurrent();
+    showKey(hasKey ? key : form.treeView->currentKeySequence());
+    if (hasKey)
+        enterKey(key);
+}
+
+void EditShortcutsDialogPrivate::enterKey(const QKeySequence &key)
+{
+    if ((key.isEmpty() && m_isRecording) || key == form.treeView->currentKeySequence() || !m_model)
+        return;
+    if (!KeySequences::isKnown(key)) {
+        // A key of the keyboard that Qt has no name for.
+        showKey(form.treeView->currentKeySequence());
+        return;
+    }
+    m_isRecording = false;
+    const ShortcutConflict conflict = ShortcutConflict::find(*m_model, key);
+    if (conflict.kind != ShortcutConflict::None) {
+        refuseKey(key, conflict);
+        return;
+    }
+    if (!form.treeView->isShortcutCurrent()) {
+        // A recording that outlived its row.
+        showKey(QKeySequence());
+        return;
+    }
+    setPendingKey(key);
+}
+
+void EditShortcutsDialogPrivate::refuseKey(const QKeySequence &key, const ShortcutConflict &conflict)
+{
+    const QString text = conflict.kind == ShortcutConflict::Global
+        ? tr("Shortcut '%1' is already used for global action '%2'.")
+        : tr("Shortcut '%1' is already used for action '%2'. Please try another.");
+    const QPointer<QDialog> self(m_dialog);
+    MessageBox::show(m_dialog, QMessageBox::Critical, tr("Shortcuts conflict"),
+                     text.arg(key.toString(QKeySequence::PortableText), conflict.holder));
+    if (self)
+        showKey(form.treeView->currentKeySequence());
+}
+
+void EditShortcutsDialogPrivate::enterDefaultKey()
+{
+    if (!form.defaultKeyRB->isChecked())
+        return;
+    showKey(QKeySequence());
+    setPendingKey(shownDefaultKey());
 }
 
 QKeySequence EditShortcutsDialogPrivate::shownDefaultKey() const
 {
-    const QString text = defaultKeyLabel->text();
-    if (text == EditShortcutsDialog::tr("None"))
+    const QString text = form.defaultKeyLabel->text();
+    if (text == tr("None"))
         return {};
     return KeySequences::fromText(text, QKeySequence::PortableText);
 }
 
-void EditShortcutsDialogPrivate::reportConflict(const ShortcutConflict &conflict, const QKeySequence &key)
+// The tree view hands the key to the model and hears of the change from it.
+void EditShortcutsDialogPrivate::setPendingKey(const QKeySequence &key)
 {
-    const QString text = conflict.kind == ShortcutConflict::Global
-        ? EditShortcutsDialog::tr("Shortcut '%1' is already used for global action '%2'.")
-        : EditShortcutsDialog::tr("Shortcut '%1' is already used for action '%2'. Please try another.");
-    showMessage(q, QMessageBox::Critical, EditShortcutsDialog::tr("Shortcuts conflict"),
-                text.arg(key.toString(QKeySequence::PortableText), conflict.holder), QMessageBox::Ok);
+    form.treeView->setKeySequence(key);
+    setChanged(true);
+    form.buttonBox->button(QDialogButtonBox::RestoreDefaults)->setEnabled(true);
 }
 
-QMessageBox::StandardButton EditShortcutsDialogPrivate::askWhetherToApply()
+bool EditShortcutsDialogPrivate::isChanged() const
 {
-    return showMessage(
-        q, QMessageBox::Warning, EditShortcutsDialog::tr("Apply changes"),
-        EditShortcutsDialog::tr("Some shortcuts have been changed. Do you want to apply changes?"),
-        QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel, QMessageBox::Cancel);
+    return form.buttonBox->button(QDialogButtonBox::Ok)->isEnabled();
 }
 
-void EditShortcutsDialogPrivate::endRecording()
+void EditShortcutsDialogPrivate::setChanged(bool changed)
 {
-    if (!isRecording)
+    form.buttonBox->button(QDialogButtonBox::Ok)->setEnabled(changed);
+    form.buttonBox->button(QDialogButtonBox::Reset)->setEnabled(changed);
+}
+
+void EditShortcutsDialogPrivate::press(QAbstractButton *button)
+{
+    if (!m_model)
         return;
-    const QKeySequence key = keyWidget->keySequence();
-    const bool hasKey = !key.isEmpty() && treeView->isShortcutCurrent();
-    showKey(hasKey ? key : treeView->currentKeySequence());
-    if (hasKey)
-        q->checkEnteredKeySequence(key);
+    QPushButton *restoreButton = form.buttonBox->button(QDialogButtonBox::RestoreDefaults);
+    switch (form.buttonBox->standardButton(button)) {
+    case QDialogButtonBox::RestoreDefaults:
+        m_model->restoreDefaults();
+        setChanged(true);
+        restoreButton->setEnabled(false);
+        break;
+    case QDialogButtonBox::Reset:
+        m_model->resetShortcuts();
+        setChanged(false);
+        restoreButton->setEnabled(true);
+        break;
+    default:
+        break;
+    }
+}
+
+void EditShortcutsDialogPrivate::commit()
+{
+    if (m_model)
+        m_model->commitChanges();
+}
+
+void EditShortcutsDialogPrivate::discard()
+{
+    if (m_model)
+        m_model->resetShortcuts();
+    setChanged(false);
 }

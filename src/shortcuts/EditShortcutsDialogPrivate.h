@@ -3,64 +3,74 @@
 
 #pragma once
 
-#include <QKeySequence>
-#include <QMessageBox>
-#include <QPointer>
-
+#include "EditShortcutsForm.h"
 #include "ShortcutsModel.h"
 
-class EditShortcutsDialog;
-class QDialogButtonBox;
-class QGridLayout;
-class QGroupBox;
-class QKeySequenceEdit;
-class QLabel;
-class QRadioButton;
-class QVBoxLayout;
-class ShortcutsTreeView;
+#include <QCoreApplication>
+#include <QKeySequence>
+#include <QPointer>
+
+class QAbstractButton;
+class QDialog;
+class QEvent;
 struct ShortcutConflict;
 
 /**
- * The form of the dialog, and the steps that its slots are made of.
+ * What the shortcuts dialog does with keys: it follows one from the field where it is recorded,
+ * past those who may have it already, until it is pending in the model.
+ *
+ * It is told of what happens on the form by the form itself; the functions are the steps that
+ * the slots of the dialog take.
  */
 class EditShortcutsDialogPrivate
 {
-public:
-    EditShortcutsDialogPrivate(EditShortcutsDialog *dialog, ShortcutsModel *shortcuts);
+    Q_DECLARE_TR_FUNCTIONS(EditShortcutsDialog)
 
-    void buildForm();
-    void fillTree();
-    void connectKeys();
+public:
+    /// Builds the form on \a dialog and shows \a shortcuts, which may be null, in it.
+    EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts);
 
     /// Whether there is something to apply: the Ok button is the one record of that.
     bool isChanged() const;
-    /// Puts a key into the key editor without the editor announcing it; ends a recording.
-    void showKey(const QKeySequence &key);
-    /// Makes \a key the pending one of the current shortcut, as the user wished.
-    void setPendingKey(const QKeySequence &key);
-    /// The default key as the label shows it.
-    QKeySequence shownDefaultKey() const;
-    void reportConflict(const ShortcutConflict &conflict, const QKeySequence &key);
-    /// What the user wants with the edits when the window is closed.
-    QMessageBox::StandardButton askWhetherToApply();
-    /// Takes the key recorded so far; when there is none, the editor shows the old one again.
-    void endRecording();
+    /// Enables or disables the buttons Ok and Reset.
+    void setChanged(bool changed);
 
-    EditShortcutsDialog *const q;
-    const QPointer<ShortcutsModel> model;
-    QVBoxLayout *verticalLayout = nullptr;
-    ShortcutsTreeView *treeView = nullptr;
-    QGroupBox *groupBox = nullptr;
-    QGridLayout *gridLayout = nullptr;
-    QRadioButton *defaultKeyRB = nullptr;
-    QLabel *defaultKeyLabel = nullptr;
-    QRadioButton *customKeyRB = nullptr;
-    QKeySequenceEdit *keyWidget = nullptr;
-    QDialogButtonBox *buttonBox = nullptr;
-    /// From a key press in the key editor until it is done. An empty key that it announces
-    /// meanwhile is no key that the user chose.
-    bool isRecording = false;
+    /// Shows the keys of the shortcut that is current.
+    void showShortcut(const QKeySequence &defaultKey, const QKeySequence &pendingKey);
+    /// No shortcut is current.
+    void showNoShortcut();
+
+    /// Watches a recording: \a event goes to the key editor.
+    void watchKeyEditor(const QEvent &event);
+    /// Makes \a key the pending one of the current shortcut, or refuses it with a message, in
+    /// which the dialog may go.
+    void enterKey(const QKeySequence &key);
+    /// Makes the default key the pending one if that is what the radio buttons say.
+    void enterDefaultKey();
+
+    /// Restores the defaults or resets the edits, if \a button stands for that.
+    void press(QAbstractButton *button);
+    /// Puts the pending keys into force; the dialog may go when the host hears of them.
+    void commit();
+    /// Throws the edits away.
+    void discard();
+
+    const EditShortcutsForm form;
 
 private:
-    void buildKeyBox();
+    void fillTree();
+    void connectKeys();
+    void showKey(const QKeySequence &key);
+    void endRecording();
+    void refuseKey(const QKeySequence &key, const ShortcutConflict &conflict);
+    void setPendingKey(const QKeySequence &key);
+    QKeySequence shownDefaultKey() const;
+
+    QDialog *const m_dialog;
+    const QPointer<ShortcutsModel> m_model;
+    /// From a key press in the key editor until it is done. An empty key that it announces
+    /// meanwhile is no key that the user chose.
+    bool m_isRecording = false;
+    /// Ends the connections: widgets and model may outlive this object.
+    const QObject m_context;
 };
