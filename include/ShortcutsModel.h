@@ -175,7 +175,7 @@ public Q_SLOTS:
     void saveKeys(QSettings *settings, QString settingsGroup);
 
 private:
-    friend class ShortcutsTreeView;
+    friend class ShortcutRows; // reads all rows at once
     using Objects = QList<IShortcutObject *>;
     using Group = QMap<QString, Objects>;
 

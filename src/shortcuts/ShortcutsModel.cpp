@@ -16,7 +16,7 @@
 namespace {
 
 // The internal id of group rows; that of a shortcut is the row of its group.
-constexpr quintptr groupId = ~quintptr(0);
+constexpr quintptr GroupId = ~quintptr(0);
 
 } // namespace
 
@@ -126,7 +126,7 @@ void ShortcutsModel::announceRows()
 
 bool ShortcutsModel::isShortcutItem(const QModelIndex &index) const
 {
-    return index.isValid() && index.parent().isValid();
+    return index.parent().isValid();
 }
 
 QKeySequence ShortcutsModel::keySequence(const QModelIndex &index) const
@@ -141,8 +141,8 @@ QKeySequence ShortcutsModel::defaultKeySequence(const QModelIndex &index) const
 
 void ShortcutsModel::setKeySequence(const QModelIndex &index, const QKeySequence &key)
 {
-    if (isShortcutItem(index))
-        setData(this->index(index.row(), 1, index.parent()), key, Qt::EditRole);
+    // Refused for a group.
+    setData(this->index(index.row(), 1, index.parent()), key, Qt::EditRole);
 }
 
 IShortcutObject *ShortcutsModel::hasKeySequence(const QKeySequence &key) const
@@ -160,12 +160,12 @@ QModelIndex ShortcutsModel::index(int row, int column, const QModelIndex &parent
 {
     if (!hasIndex(row, column, parent))
         return {};
-    return createIndex(row, column, parent.isValid() ? quintptr(parent.row()) : groupId);
+    return createIndex(row, column, parent.isValid() ? quintptr(parent.row()) : GroupId);
 }
 
 QModelIndex ShortcutsModel::parent(const QModelIndex &index) const
 {
-    if (!index.isValid() || index.internalId() == groupId)
+    if (!index.isValid() || index.internalId() == GroupId)
         return {};
     return this->index(int(index.internalId()), 0);
 }
@@ -174,7 +174,7 @@ int ShortcutsModel::rowCount(const QModelIndex &parent) const
 {
     if (!parent.isValid())
         return m_groupNames.size();
-    if (parent.internalId() != groupId || parent.column() != 0 || parent.row() >= m_groups.size())
+    if (parent.internalId() != GroupId || parent.column() != 0 || parent.row() >= m_groups.size())
         return 0;
     return m_groups.at(parent.row()).size();
 }
@@ -188,7 +188,7 @@ QVariant ShortcutsModel::data(const QModelIndex &index, int role) const
 {
     if (!index.isValid())
         return {};
-    if (index.internalId() == groupId) {
+    if (index.internalId() == GroupId) {
         const bool isName = index.column() == 0 && role == Qt::DisplayRole;
         return isName ? QVariant(m_groupNames.value(index.row())) : QVariant();
     }

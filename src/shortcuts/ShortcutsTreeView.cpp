@@ -4,6 +4,7 @@
 #include "ShortcutsTreeView.h"
 
 #include "RowsChangedEvent.h"
+#include "ShortcutRows.h"
 #include "ShortcutsModel.h"
 #include "TextWidth.h"
 
@@ -16,7 +17,7 @@
 namespace {
 
 // So many of the items that seem widest are measured exactly.
-constexpr int measuredItems = 16;
+constexpr int MeasuredItems = 16;
 
 struct Candidate
 {
@@ -114,22 +115,21 @@ QVector<QModelIndex> ShortcutsTreeView::widestItems(const ShortcutsModel &shortc
     TextWidth textWidth(font());
     const int iconWidth = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
     std::vector<Candidate> candidates;
-    for (int group = 0; group < shortcuts.m_groups.size(); ++group) {
-        candidates.push_back({textWidth.of(shortcuts.m_groupNames.at(group)), group, -1});
-        if (!isExpanded(shortcuts.index(group, 0)))
+    for (int group = 0; group < shortcuts.rowCount(); ++group) {
+        const QModelIndex index = shortcuts.index(group, 0);
+        candidates.push_back({textWidth.of(index.data().toString()), group, -1});
+        if (!isExpanded(index))
             continue;
-        int row = 0;
-        for (const auto &objects : shortcuts.m_groups.at(group)) {
-            if (!objects.isEmpty()) {
-                const IShortcutObject *object = objects.constFirst();
+        const auto objects = ShortcutRows::ofGroup(shortcuts, group);
+        for (int row = 0; row < objects.size(); ++row) {
+            if (const IShortcutObject *object = objects.at(row)) {
                 const int icon = object->icon().isNull() ? 0 : iconWidth;
                 candidates.push_back({textWidth.of(object->text()) + icon + indentation(), group, row});
             }
-            ++row;
         }
     }
     const auto end =
-        candidates.begin() + std::min<std::ptrdiff_t>(measuredItems, std::ptrdiff_t(candidates.size()));
+        candidates.begin() + std::min<std::ptrdiff_t>(MeasuredItems, std::ptrdiff_t(candidates.size()));
     std::partial_sort(candidates.begin(), end, candidates.end(),
                       [](const Candidate &left, const Candidate &right) { return left.width > right.width; });
     QVector<QModelIndex> items;
@@ -188,7 +188,7 @@ void ShortcutsTreeView::refreshRows()
 
 void ShortcutsTreeView::hideEmptyRows(const ShortcutsModel &shortcuts)
 {
-    const auto rows = shortcuts.emptyRows();
+    const auto rows = ShortcutRows::empty(shortcuts);
     for (const auto &[group, row] : rows) {
         const QModelIndex parent = shortcuts.index(group, 0);
         setRowHidden(row, parent, true);
