@@ -54,11 +54,11 @@ VELUIEXTRA_EXPORT QString KeyStringXToQt(const QString &text);
  * string ("|" may stand for "+") or a Qt key text, and each value the name of an action.
  *
  * Sequences are compared as a whole: "Ctrl+K" and "Ctrl+K, Ctrl+C" are two different ones,
- * although the first begins the second. An entry whose key cannot be parsed matches nothing.
+ * although the first begins the second. A key that cannot be parsed matches nothing.
  *
  * @param sequence the sequence to look for
  * @return the name of the global action as it stands in the file, without quotes; of two
- *         entries with the same sequence the one whose key sorts first. A null string when
+ *         keys with the same sequence the one that sorts first. A null string when
  *         none is bound to it or the file cannot be read
  */
 VELUIEXTRA_EXPORT QString checkForGlobalShortcut(const QKeySequence &sequence);

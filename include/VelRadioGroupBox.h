@@ -68,7 +68,7 @@ public:
 protected:
     /**
      * Hands \a event to QWidget::event(): the base class never toggles the box by itself.
-     * @return whether the event was recognised.
+     * @return whether the event was recognized.
      */
     bool event(QEvent *event) override;
 

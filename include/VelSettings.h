@@ -32,7 +32,7 @@ class QSettings;
  * value of "SectionName"; setting it renames the section, removing it drops the header.
  *
  * Writing gives the header, then the keys in sorted order. The format keeps no comments, no blank
- * lines, no order, no header but the last and no entry with an empty value; a value that holds a
+ * lines, no order, no header but the last and no key with an empty value; a value that holds a
  * line break is read back as more than one line. A file is replaced as a whole or, when that
  * fails, left as it was. Keys that another program changed in the meantime are kept, unless they
  * were changed here as well.

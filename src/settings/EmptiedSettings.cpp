@@ -32,16 +32,16 @@ bool copyFile(const QString &path, QIODevice &device)
 // The cache compares times to tell whether its copy of a file is still good.
 void changeTime(const QString &path)
 {
-    constexpr long millisecond = 1000000;
-    constexpr long second = 1000 * millisecond;
+    constexpr long Millisecond = 1000000;
+    constexpr long Second = 1000 * Millisecond;
     const QByteArray name = QFile::encodeName(path);
     struct stat status = {};
     if (stat(name.constData(), &status) != 0)
         return;
     timespec times[2] = {{0, UTIME_OMIT}, status.st_mtim};
-    times[1].tv_nsec += millisecond;
-    if (times[1].tv_nsec >= second) {
-        times[1].tv_nsec -= second;
+    times[1].tv_nsec += Millisecond;
+    if (times[1].tv_nsec >= Second) {
+        times[1].tv_nsec -= Second;
         ++times[1].tv_sec;
     }
     utimensat(AT_FDCWD, name.constData(), times, 0);

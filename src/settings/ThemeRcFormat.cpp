@@ -94,7 +94,7 @@ QVariant typedValue(Text text)
 }
 
 template <typename Text>
-void readEntry(Text key, Text value, QSettings::SettingsMap &map)
+void readKey(Text key, Text value, QSettings::SettingsMap &map)
 {
     if (key.isEmpty() || value.isEmpty())
         return;
@@ -109,7 +109,7 @@ void readLine(Text line, QSettings::SettingsMap &map)
         return;
     const int separator = indexOf(line, '=');
     if (separator >= 0) {
-        readEntry(line.left(separator).trimmed(), line.mid(separator + 1).trimmed(), map);
+        readKey(line.left(separator).trimmed(), line.mid(separator + 1).trimmed(), map);
     } else if (line.startsWith(QLatin1Char('[')) && line.endsWith(QLatin1Char(']'))) {
         QString name = toString(line);
         name.remove(QLatin1Char('[')).remove(QLatin1Char(']'));
@@ -140,8 +140,8 @@ bool isAscii(const char *bytes, int size)
 // comes before, and texts can be converted together.
 bool isUtf8()
 {
-    constexpr int utf8 = 106; // IANA's number
-    return QTextCodec::codecForLocale()->mibEnum() == utf8;
+    constexpr int Utf8 = 106; // IANA's number
+    return QTextCodec::codecForLocale()->mibEnum() == Utf8;
 }
 
 // Reads one line, without its end. Its text ends at the first NUL byte.
@@ -163,7 +163,7 @@ QString sectionLine(const QVariant &name)
     return QLatin1Char('[') + name.toString() + QLatin1String("]\n");
 }
 
-void appendEntry(QString &lines, const QString &key, const QVariant &value)
+void appendKey(QString &lines, const QString &key, const QVariant &value)
 {
     const QString text = value.toString();
     const bool hasBlank = text.contains(QLatin1Char(' ')) || text.contains(QLatin1Char('\t'));
@@ -223,14 +223,14 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
     const auto section = map.constFind(sectionKey());
     if (section != map.constEnd())
         lines = sectionLine(section.value());
-    for (auto entry = map.constBegin(); entry != map.constEnd(); ++entry) {
-        if (entry == section)
+    for (auto it = map.constBegin(); it != map.constEnd(); ++it) {
+        if (it == section)
             continue;
         if (!allAtOnce) {
             bytes += lines.toLocal8Bit();
             lines.clear();
         }
-        appendEntry(lines, entry.key(), entry.value());
+        appendKey(lines, it.key(), it.value());
     }
     bytes += lines.toLocal8Bit();
     return writeThrough(device, bytes);

@@ -15,14 +15,14 @@ class QIODevice;
 namespace ThemeRcFormat {
 
 /**
- * Fills \a map with the entries of \a device, under their bare keys and with their types, and
- * with the last section header under "SectionName".
+ * Fills \a map with the bare keys of \a device and their values, each with its type, and with
+ * the last section header under "SectionName".
  * @return false when the device is not open or gives an error before its end.
  */
 bool read(QIODevice &device, QSettings::SettingsMap &map);
 
 /**
- * Writes \a map to \a device: the section header, then the entries in the order of the map.
+ * Writes \a map to \a device: the section header, then the keys in the order of the map.
  * @return false, after a line on standard error, when the device is closed or read-only or when
  * the map is empty; false when the device does not take all of it.
  */

@@ -54,13 +54,13 @@ QString GlobalShortcuts::find(const QString &path, const QKeySequence &sequence)
     CSimpleIniA ini;
     if (path.isEmpty() || !load(ini, path))
         return {};
-    const CSimpleIniA::TKeyVal *entries = ini.GetSection("ShortCutKeys");
-    if (!entries)
+    const CSimpleIniA::TKeyVal *bindings = ini.GetSection("ShortCutKeys");
+    if (!bindings)
         return {};
     const KeyMatcher matcher(sequence);
-    for (const auto &entry : *entries) {
-        if (matcher.matches(entry.first.pItem))
-            return FileText::withoutQuotes(QString::fromUtf8(entry.second));
+    for (const auto &binding : *bindings) {
+        if (matcher.matches(binding.first.pItem))
+            return FileText::withoutQuotes(QString::fromUtf8(binding.second));
     }
     return {};
 }

@@ -23,7 +23,7 @@ public:
 namespace {
 
 // The distance that the common style leaves between the frame and the indicator.
-constexpr int frameGap = 4;
+constexpr int FrameGap = 4;
 
 // QPointF::toPoint() takes -0.5 to 0, which would lie inside.
 QPoint wholePixels(const QPointF &position)
@@ -62,8 +62,8 @@ public:
         QRegion outline(m_option.rect);
         if (!m_option.text.isEmpty()) {
             const bool leftToRight = m_option.direction == Qt::LeftToRight;
-            outline -= m_indicator.united(m_label).adjusted(leftToRight ? -frameGap : 0, 0,
-                                                            leftToRight ? 0 : frameGap, 0);
+            outline -= m_indicator.united(m_label).adjusted(leftToRight ? -FrameGap : 0, 0,
+                                                            leftToRight ? 0 : FrameGap, 0);
         }
         m_painter->save();
         m_painter->setClipRegion(outline);
