@@ -207,8 +207,8 @@ private Q_SLOTS:
     void emptiesTheMapBeforeReading();
     void readsALineOfOneMebibyte();
     void readsManyLinesOfBothOrders();
-    void writesEntries_data();
-    void writesEntries();
+    void writesKeys_data();
+    void writesKeys();
     void losesOnReadingAndWritingWhatTheFormatDoesNotKeep_data();
     void losesOnReadingAndWritingWhatTheFormatDoesNotKeep();
     void readsAndWritesInTheEncodingOfTheLocale_data();
@@ -334,7 +334,7 @@ void tst_ThemeRcFormat::readsManyLinesOfBothOrders()
     QCOMPARE(writeMap(expected), rising);
 }
 
-void tst_ThemeRcFormat::writesEntries_data()
+void tst_ThemeRcFormat::writesKeys_data()
 {
     QTest::addColumn<Map>("map");
     QTest::addColumn<QByteArray>("expected");
@@ -376,7 +376,7 @@ void tst_ThemeRcFormat::writesEntries_data()
     QTest::newRow("key with blanks") << Map{{s("a b"), 1}} << QByteArray("a b=1\n");
 }
 
-void tst_ThemeRcFormat::writesEntries()
+void tst_ThemeRcFormat::writesKeys()
 {
     QFETCH(Map, map);
     QFETCH(QByteArray, expected);

@@ -79,7 +79,7 @@ private Q_SLOTS:
     void findsNothing_data();
     void findsNothing();
     void findsEveryConvertibleKeyOfAFile();
-    void takesTheEntryWhoseKeySortsFirst();
+    void takesTheKeyThatSortsFirst();
     void comparesWholeSequences();
     void readsTheFileAnewAtEveryCall();
     void readsTheFileOfTheSession();
@@ -265,11 +265,11 @@ void tst_VelKeyServer::knowsWhichCodesReadBackUnchanged()
 
 void tst_VelKeyServer::findsTheGlobalAction_data()
 {
-    QTest::addColumn<QByteArray>("entry");
+    QTest::addColumn<QByteArray>("line");
     QTest::addColumn<QString>("sequence");
     QTest::addColumn<QString>("action");
-    const auto row = [](const char *entry, const char *sequence, const char *action) {
-        QTest::newRow(entry) << QByteArray(entry) << QString::fromUtf8(sequence) << QString::fromUtf8(action);
+    const auto row = [](const char *line, const char *sequence, const char *action) {
+        QTest::newRow(line) << QByteArray(line) << QString::fromUtf8(sequence) << QString::fromUtf8(action);
     };
     row("Ctrl+Alt+F2=act", "Ctrl+Alt+F2", "act");
     row("\"None|Mod4|F1\"=\"VELWM_MENU\"", "Meta+F1", "VELWM_MENU");
@@ -300,17 +300,17 @@ void tst_VelKeyServer::findsTheGlobalAction_data()
 
 void tst_VelKeyServer::findsTheGlobalAction()
 {
-    QFETCH(QByteArray, entry);
+    QFETCH(QByteArray, line);
     QFETCH(QString, sequence);
     write(QStringLiteral("keyshortcutrc"),
-          "; comment\n[Other]\nF12=other\n[ShortCutKeys]\nF11=before\n" + entry + "\nzz=last\n");
+          "; comment\n[Other]\nF12=other\n[ShortCutKeys]\nF11=before\n" + line + "\nzz=last\n");
     const QKeySequence wanted(sequence, QKeySequence::PortableText);
     QTEST(VelKeyServer::checkForGlobalShortcut(wanted), "action");
 }
 
 void tst_VelKeyServer::findsNothing_data()
 {
-    QTest::addColumn<QByteArray>("entry");
+    QTest::addColumn<QByteArray>("line");
     QTest::addColumn<QString>("sequence");
     QTest::newRow("other section") << QByteArray("[Else]\nF1=act") << QStringLiteral("F1");
     QTest::newRow("other key") << QByteArray("F2=act") << QStringLiteral("F1");
@@ -324,9 +324,9 @@ void tst_VelKeyServer::findsNothing_data()
 
 void tst_VelKeyServer::findsNothing()
 {
-    QFETCH(QByteArray, entry);
+    QFETCH(QByteArray, line);
     QFETCH(QString, sequence);
-    write(QStringLiteral("keyshortcutrc"), "[ShortCutKeys]\n" + entry + "\n");
+    write(QStringLiteral("keyshortcutrc"), "[ShortCutKeys]\n" + line + "\n");
     const QKeySequence wanted(sequence, QKeySequence::PortableText);
     QVERIFY(VelKeyServer::checkForGlobalShortcut(wanted).isNull());
 }
@@ -378,7 +378,7 @@ void tst_VelKeyServer::findsEveryConvertibleKeyOfAFile()
     }
 }
 
-void tst_VelKeyServer::takesTheEntryWhoseKeySortsFirst()
+void tst_VelKeyServer::takesTheKeyThatSortsFirst()
 {
     write(QStringLiteral("keyshortcutrc"),
           "[ShortCutKeys]\nNone|F1=third\nfoo|F1=second\nBar|F1=first\nZoo|F1=last\n");
