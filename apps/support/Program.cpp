@@ -73,3 +73,9 @@ void Program::printError(const QString &text)
     std::fprintf(stderr, "%s: %s\n", QCoreApplication::applicationName().toLocal8Bit().constData(),
                  text.toLocal8Bit().constData());
 }
+
+int Program::fail(const QString &text, int status)
+{
+    printError(text);
+    return status;
+}

@@ -3,14 +3,22 @@
 
 #pragma once
 
+#include <QCoreApplication>
 #include <QString>
 
 class QCommandLineParser;
 
-/// What the programs have in common.
+/**
+ * What the programs have in common.
+ *
+ * Each program has a struct for its options, with a member `error` that says what is wrong with the
+ * command line and is empty when nothing is; a function that reads the command line into it; and a
+ * function that does the work and returns the exit status. runWithoutWindows() calls both;
+ * WindowProgram.h has its counterpart for a program that opens windows.
+ */
 namespace Program {
 
-/// Names the organisation, the program \a name and its version; goes before the application object.
+/// Names the organization, the program \a name and its version; goes before the application object.
 void describe(const QString &name);
 
 /**
@@ -37,5 +45,32 @@ QString parse(QCommandLineParser &parser);
 
 /// Prints \a text on standard error as one line, after the program's name.
 void printError(const QString &text);
+
+/// Prints \a text like printError() and returns the exit status \a status.
+int fail(const QString &text, int status);
+
+/**
+ * Makes an application object, reads the command line and goes on with \a run.
+ *
+ * @param wrongUsage the exit status when something is wrong with the command line, not 0
+ * @param parse returns the options
+ * @param run is given the options and returns the exit status
+ */
+template <typename Application, typename Parse, typename Run>
+int runAs(int &argc, char **argv, int wrongUsage, Parse parse, Run run)
+{
+    Application application(argc, argv);
+    loadCatalogues();
+    const auto options = parse();
+    return options.error.isEmpty() ? run(options) : fail(options.error, wrongUsage);
+}
+
+/// The whole main() of the program \a name, which never opens a window; the rest as in runAs().
+template <typename Parse, typename Run>
+int runWithoutWindows(int &argc, char **argv, const QString &name, int wrongUsage, Parse parse, Run run)
+{
+    describe(name);
+    return runAs<QCoreApplication>(argc, argv, wrongUsage, parse, run);
+}
 
 } // namespace Program

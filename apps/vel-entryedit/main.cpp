@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include <support/Program.h>
+#include <support/WindowProgram.h>
 
 #include <VelDesktopEntryEditDialog.h>
 #include <VelDesktopEntryPropsWidget.h>
@@ -10,11 +10,12 @@
 #include <QCommandLineParser>
 #include <QDialogButtonBox>
 #include <QFileInfo>
+#include <QIcon>
 #include <QPushButton>
 
 namespace {
 
-enum ExitStatus { Saved = 0, Cancelled = 1, NotOpened = 2 };
+enum ExitStatus { Saved = 0, Canceled = 1, NotOpened = 2 };
 
 struct Options
 {
@@ -67,12 +68,6 @@ Options parse()
     return options;
 }
 
-int fail(const QString &reason)
-{
-    Program::printError(reason);
-    return NotOpened;
-}
-
 // Looking only: nothing in the form can be changed, and nothing can be saved.
 void makeReadOnly(VelDesktopEntryEditDialog *dialog)
 {
@@ -84,34 +79,21 @@ void makeReadOnly(VelDesktopEntryEditDialog *dialog)
         copyButton->setEnabled(false);
 }
 
+int run(const Options &options)
+{
+    QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
+    VelDesktopEntryEditDialog dialog;
+    if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
+        return Program::fail(text(QT_TRANSLATE_NOOP("vel-entryedit", "cannot open %1")).arg(options.file),
+                             NotOpened);
+    if (options.readOnly)
+        makeReadOnly(&dialog);
+    return dialog.exec() == QDialog::Accepted ? Saved : Canceled;
+}
+
 } // namespace
 
 int main(int argc, char **argv)
 {
-    Program::describe(QStringLiteral("vel-entryedit"));
-    if (Program::mayWantNoWindow(argc, argv)) {
-        QCoreApplication application(argc, argv);
-        Program::loadCatalogues();
-        const Options options = parse();
-        if (!options.error.isEmpty())
-            return fail(options.error);
-        // What looked like it was the value of another option.
-    }
-
-    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
-    QApplication application(argc, argv);
-    Program::loadCatalogues();
-    QApplication::setDesktopFileName(QStringLiteral("vel-entryedit"));
-    QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
-
-    const Options options = parse();
-    if (!options.error.isEmpty())
-        return fail(options.error);
-
-    VelDesktopEntryEditDialog dialog;
-    if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
-        return fail(text(QT_TRANSLATE_NOOP("vel-entryedit", "cannot open %1")).arg(options.file));
-    if (options.readOnly)
-        makeReadOnly(&dialog);
-    return dialog.exec() == QDialog::Accepted ? Saved : Cancelled;
+    return Program::runWithWindows(argc, argv, QStringLiteral("vel-entryedit"), NotOpened, parse, run);
 }

@@ -5,7 +5,7 @@
 #include "GalleryPictures.h"
 #include "GalleryWindow.h"
 
-#include <support/Program.h>
+#include <support/WindowProgram.h>
 
 #include <QApplication>
 #include <QCommandLineParser>
@@ -13,6 +13,8 @@
 #include <algorithm>
 
 namespace {
+
+enum ExitStatus { Done = 0, NotShown = 1, WrongUsage = 2 };
 
 struct Options
 {
@@ -56,12 +58,6 @@ Options parse()
     return options;
 }
 
-int fail(const QString &text)
-{
-    Program::printError(text);
-    return 2;
-}
-
 bool hasPage(const QVector<GalleryPage> &pages, const QString &name)
 {
     return std::any_of(pages.begin(), pages.end(),
@@ -79,6 +75,23 @@ bool writePictures(const QVector<GalleryPage> &pages, const Options &options, co
     return GalleryPictures::writeAtThisScale(chosen, options.context, options.screenshots, options.scale);
 }
 
+int run(const Options &options, const QStringList &arguments)
+{
+    QApplication::setApplicationDisplayName(QCoreApplication::translate("vel-gallery", "Widget gallery"));
+    const QVector<GalleryPage> pages = galleryPages();
+    if (!options.page.isEmpty() && !hasPage(pages, options.page))
+        return Program::fail(
+            QCoreApplication::translate("vel-gallery", "there is no page %1").arg(options.page), NotShown);
+    if (!options.screenshots.isEmpty())
+        return writePictures(pages, options, arguments) ? Done : NotShown;
+
+    GalleryWindow window(pages, options.context);
+    if (!options.page.isEmpty())
+        window.showPage(options.page);
+    window.show();
+    return QApplication::exec();
+}
+
 } // namespace
 
 int main(int argc, char **argv)
@@ -88,37 +101,6 @@ int main(int argc, char **argv)
     for (int i = 1; i < argc; ++i)
         arguments.append(QString::fromLocal8Bit(argv[i]));
 
-    Program::describe(QStringLiteral("vel-gallery"));
-    if (Program::mayWantNoWindow(argc, argv)) {
-        QCoreApplication application(argc, argv);
-        Program::loadCatalogues();
-        const Options options = parse();
-        if (!options.error.isEmpty())
-            return fail(options.error);
-        // What looked like it was the value of another option.
-    }
-
-    QApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
-    QApplication application(argc, argv);
-    Program::loadCatalogues();
-    QApplication::setApplicationDisplayName(QCoreApplication::translate("vel-gallery", "Widget gallery"));
-    QApplication::setDesktopFileName(QStringLiteral("vel-gallery"));
-
-    const Options options = parse();
-    if (!options.error.isEmpty())
-        return fail(options.error);
-    const QVector<GalleryPage> pages = galleryPages();
-    if (!options.page.isEmpty() && !hasPage(pages, options.page)) {
-        Program::printError(
-            QCoreApplication::translate("vel-gallery", "there is no page %1").arg(options.page));
-        return 1;
-    }
-    if (!options.screenshots.isEmpty())
-        return writePictures(pages, options, arguments) ? 0 : 1;
-
-    GalleryWindow window(pages, options.context);
-    if (!options.page.isEmpty())
-        window.showPage(options.page);
-    window.show();
-    return QApplication::exec();
+    return Program::runWithWindows(argc, argv, QStringLiteral("vel-gallery"), WrongUsage, parse,
+                                   [&arguments](const Options &options) { return run(options, arguments); });
 }

@@ -4,13 +4,13 @@
 #include "Options.h"
 
 #include <VelMenuDialog.h>
-#include <support/Program.h>
+#include <support/WindowProgram.h>
 
 #include <velintegration/startmenu.h>
 
-#include <QApplication>
 #include <QFile>
 #include <QFileInfo>
+#include <QGuiApplication>
 #include <QShortcut>
 #include <QStandardPaths>
 
@@ -19,12 +19,6 @@
 namespace {
 
 enum ExitStatus { Done = 0, NothingPicked = 1, CannotStart = 2 };
-
-int fail(const QString &text)
-{
-    Program::printError(text);
-    return CannotStart;
-}
 
 // Whether the directory can be shown; the reason if not.
 QString obstacle(const Options &options)
@@ -44,7 +38,7 @@ QString obstacle(const Options &options)
 }
 
 // Programs that were built or installed beside this one are found without being in PATH.
-void findNeighbours()
+void findNeighbors()
 {
     const QString program = QStringLiteral("vel-open");
     const QString ownDir = QCoreApplication::applicationDirPath();
@@ -61,7 +55,7 @@ void print(const QString &line)
         std::fputc('\n', stdout);
 }
 
-int run(const Options &options)
+int showDialog(const Options &options)
 {
     VelMenuDialog dialog(options.dir, options.iconSize, options.editable, !options.pick, nullptr, Qt::Window);
     QObject::connect(new QShortcut(QKeySequence(Qt::Key_F1), &dialog), &QShortcut::activated, &dialog,
@@ -77,32 +71,21 @@ int run(const Options &options)
     return Done;
 }
 
+int run(const Options &options)
+{
+    // The message box that may follow the dialog would end before it is seen.
+    QGuiApplication::setQuitOnLastWindowClosed(false);
+    const QString why = obstacle(options);
+    if (!why.isEmpty())
+        return Program::fail(why, CannotStart);
+    findNeighbors();
+    return showDialog(options);
+}
+
 } // namespace
 
 int main(int argc, char **argv)
 {
-    Program::describe(QStringLiteral("vel-menuedit"));
-    QGuiApplication::setDesktopFileName(QStringLiteral("vel-menuedit"));
-    if (Program::mayWantNoWindow(argc, argv)) {
-        QCoreApplication application(argc, argv);
-        Program::loadCatalogues();
-        const Options options = Options::parse();
-        if (!options.error.isEmpty())
-            return fail(options.error);
-        // What looked like it was the value of another option.
-    }
-
-    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
-    QApplication application(argc, argv);
-    Program::loadCatalogues();
-    // The message box that may follow the dialog would end before it is seen.
-    QGuiApplication::setQuitOnLastWindowClosed(false);
-    const Options options = Options::parse();
-    if (!options.error.isEmpty())
-        return fail(options.error);
-    const QString why = obstacle(options);
-    if (!why.isEmpty())
-        return fail(why);
-    findNeighbours();
-    return run(options);
+    return Program::runWithWindows(argc, argv, QStringLiteral("vel-menuedit"), CannotStart, Options::parse,
+                                   run);
 }

@@ -20,10 +20,56 @@ namespace {
 
 enum ExitStatus { Done = 0, CannotWrite = 1, CannotStart = 2 };
 
-int fail(const QString &text)
+struct Options
 {
-    Program::printError(text);
-    return CannotStart;
+    QString format;
+    QString dir;
+    QString error; ///< what is wrong with the command line; empty when nothing is
+};
+
+Options parse()
+{
+    QCommandLineParser parser;
+    parser.setApplicationDescription(
+        QCoreApplication::translate("vel-menuprint", "Prints a menu directory in its order."));
+    parser.addHelpOption();
+    parser.addVersionOption();
+    const QCommandLineOption format(
+        QStringLiteral("format"),
+        QCoreApplication::translate("vel-menuprint", "openbox (a pipe menu), json or text (the default)."),
+        QStringLiteral("FORMAT"), QStringLiteral("text"));
+    parser.addOption(format);
+    parser.addPositionalArgument(
+        QStringLiteral("DIR"),
+        QCoreApplication::translate("vel-menuprint",
+                                    "The menu directory; the start menu when none is given."),
+        QStringLiteral("[DIR]"));
+
+    Options options;
+    options.error = Program::parse(parser);
+    if (!options.error.isEmpty())
+        return options;
+    options.format = parser.value(format);
+    options.dir = parser.positionalArguments().value(0, QString::fromStdString(GetVelDir(VelDir::StartMenu)));
+    if (!QStringList({QStringLiteral("openbox"), QStringLiteral("json"), QStringLiteral("text")})
+             .contains(options.format))
+        options.error =
+            QCoreApplication::translate("vel-menuprint", "unknown format: %1").arg(options.format);
+    else if (parser.positionalArguments().size() > 1)
+        options.error = QCoreApplication::translate("vel-menuprint", "more than one directory");
+    return options;
+}
+
+// Whether the directory can be printed; the reason if not.
+QString obstacle(const QFileInfo &directory)
+{
+    if (!directory.isDir())
+        return QCoreApplication::translate("vel-menuprint", "no such directory: %1")
+            .arg(directory.filePath());
+    if (!directory.isReadable() || !directory.isExecutable())
+        return QCoreApplication::translate("vel-menuprint", "cannot read the directory %1")
+            .arg(directory.filePath());
+    return {};
 }
 
 QByteArray printed(const QString &format, const MenuItem &menu)
@@ -35,52 +81,21 @@ QByteArray printed(const QString &format, const MenuItem &menu)
     return MenuFormat::text(menu);
 }
 
+int run(const Options &options)
+{
+    const QFileInfo directory(options.dir);
+    const QString why = obstacle(directory);
+    if (!why.isEmpty())
+        return Program::fail(why, CannotStart);
+    const QByteArray out = printed(options.format, MenuTree::read(directory.absoluteFilePath()));
+    const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
+        && std::fflush(stdout) == 0;
+    return written ? Done : Program::fail(qt_error_string(errno), CannotWrite);
+}
+
 } // namespace
 
 int main(int argc, char **argv)
 {
-    Program::describe(QStringLiteral("vel-menuprint"));
-    QCoreApplication application(argc, argv);
-    Program::loadCatalogues();
-
-    QCommandLineParser parser;
-    parser.setApplicationDescription(
-        QCoreApplication::translate("vel-menuprint", "Prints a menu directory in its order."));
-    parser.addHelpOption();
-    parser.addVersionOption();
-    const QCommandLineOption formatOption(
-        QStringLiteral("format"),
-        QCoreApplication::translate("vel-menuprint", "openbox (a pipe menu), json or text (the default)."),
-        QStringLiteral("FORMAT"), QStringLiteral("text"));
-    parser.addOption(formatOption);
-    parser.addPositionalArgument(
-        QStringLiteral("DIR"),
-        QCoreApplication::translate("vel-menuprint",
-                                    "The menu directory; the start menu when none is given."),
-        QStringLiteral("[DIR]"));
-    const QString error = Program::parse(parser);
-    if (!error.isEmpty())
-        return fail(error);
-
-    const QString format = parser.value(formatOption);
-    if (!QStringList({QStringLiteral("openbox"), QStringLiteral("json"), QStringLiteral("text")})
-             .contains(format))
-        return fail(QCoreApplication::translate("vel-menuprint", "unknown format: %1").arg(format));
-    if (parser.positionalArguments().size() > 1)
-        return fail(QCoreApplication::translate("vel-menuprint", "more than one directory"));
-    const QFileInfo directory(
-        parser.positionalArguments().value(0, QString::fromStdString(GetVelDir(VelDir::StartMenu))));
-    if (!directory.isDir())
-        return fail(
-            QCoreApplication::translate("vel-menuprint", "no such directory: %1").arg(directory.filePath()));
-    if (!directory.isReadable() || !directory.isExecutable())
-        return fail(QCoreApplication::translate("vel-menuprint", "cannot read the directory %1")
-                        .arg(directory.filePath()));
-
-    const QByteArray out = printed(format, MenuTree::read(directory.absoluteFilePath()));
-    const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
-        && std::fflush(stdout) == 0;
-    if (!written)
-        Program::printError(qt_error_string(errno));
-    return written ? Done : CannotWrite;
+    return Program::runWithoutWindows(argc, argv, QStringLiteral("vel-menuprint"), CannotStart, parse, run);
 }

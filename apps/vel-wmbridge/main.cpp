@@ -98,28 +98,24 @@ void report(const Bridge *bridge)
     });
 }
 
-} // namespace
-
-int main(int argc, char **argv)
+int run(const Options &options)
 {
-    Program::describe(QStringLiteral("vel-wmbridge"));
-    QCoreApplication application(argc, argv);
-    Program::loadCatalogues();
-    const Options options = parse();
-    if (!options.error.isEmpty()) {
-        Program::printError(options.error);
-        return CannotStart;
-    }
-
     Bridge bridge(options.commands);
     report(&bridge);
-    if (!bridge.start(options.replace)) {
-        Program::printError(QCoreApplication::translate(
-            "vel-wmbridge", "cannot take the channel: there is no display, or another program has it"));
-        return ChannelTaken;
-    }
+    if (!bridge.start(options.replace))
+        return Program::fail(
+            QCoreApplication::translate(
+                "vel-wmbridge", "cannot take the channel: there is no display, or another program has it"),
+            ChannelTaken);
     quitOnSignals();
     const int status = QCoreApplication::exec();
     bridge.stop();
     return status;
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    return Program::runWithoutWindows(argc, argv, QStringLiteral("vel-wmbridge"), CannotStart, parse, run);
 }
