@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "GalleryPage.h"
+#include "SampleFolder.h"
 
 #include <VelDesktopEntryPropsWidget.h>
 
@@ -12,52 +13,19 @@
 #include <QFrame>
 #include <QHBoxLayout>
 #include <QLabel>
-#include <QTemporaryFile>
 #include <QVBoxLayout>
 
 namespace {
-
-const char application[] = "[Desktop Entry]\n"
-                           "Type=Application\n"
-                           "Name=Text Editor\n"
-                           "Icon=accessories-text-editor\n"
-                           "Exec=editor %U\n"
-                           "TryExec=editor\n"
-                           "GenericName=Editor\n"
-                           "Comment=Write and change texts\n"
-                           "NotShowIn=Kiosk;\n"
-                           "MimeType=text/plain;text/x-log;\n"
-                           "Categories=Utility;TextEditor;\n"
-                           "Keywords=write;note;\n"
-                           "StartupNotify=true\n"
-                           "Actions=new-window;empty;\n"
-                           "\n"
-                           "[Desktop Action new-window]\n"
-                           "Name=New Window\n"
-                           "Exec=editor --new-window\n"
-                           "\n"
-                           "[Desktop Action empty]\n"
-                           "Name=Empty Text\n"
-                           "Exec=editor --empty\n";
-
-const char link[] = "[Desktop Entry]\n"
-                    "Type=Link\n"
-                    "Name=Standards\n"
-                    "Icon=text-html\n"
-                    "URL=https://www.freedesktop.org\n"
-                    "Comment=Where desktops agree\n";
 
 QString text(const char *source)
 {
     return QCoreApplication::translate("DesktopEntryPages", source);
 }
 
-void showSample(VelDesktopEntryPropsWidget *form, const char *sample)
+void showSample(VelDesktopEntryPropsWidget *form, const QString &name)
 {
-    QTemporaryFile file;
-    if (!file.open() || file.write(sample) < 0 || !file.flush())
-        return;
-    VelUIDesktopEntry entry(file.fileName());
+    const SampleFolder samples(QStringLiteral("entries"));
+    VelUIDesktopEntry entry(samples.filePath(name));
     entry.load();
     form->loadFrom(entry);
 }
@@ -66,7 +34,7 @@ QWidget *createFormPage(const GalleryContext &, QWidget *parent)
 {
     auto *page = new QWidget(parent);
     auto *form = new VelDesktopEntryPropsWidget(page);
-    showSample(form, link);
+    showSample(form, QStringLiteral("standards.desktop"));
     auto *readOnly = new QCheckBox(text(QT_TRANSLATE_NOOP("DesktopEntryPages", "&Read-only")), page);
     auto *urlButton =
         new QCheckBox(text(QT_TRANSLATE_NOOP("DesktopEntryPages", "&Button beside the address")), page);
@@ -99,7 +67,7 @@ QWidget *createFieldsPage(const GalleryContext &, QWidget *parent)
     auto *form = new VelDesktopEntryPropsWidget(page);
     form->setFrameStyle(QFrame::NoFrame);
     form->setType(QStringLiteral("Application"), {QStringLiteral("Application")});
-    showSample(form, application);
+    showSample(form, QStringLiteral("editor.desktop"));
 
     auto *layout = new QVBoxLayout(page);
     layout->addWidget(note);

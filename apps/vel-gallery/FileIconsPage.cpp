@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "GalleryPage.h"
-#include "SampleMenu.h"
+#include "SampleFolder.h"
 
 #include <VelMimeTypeIconProvider.h>
 
@@ -11,42 +11,40 @@
 #include <QTreeView>
 #include <QVBoxLayout>
 
-#include <memory>
-
 namespace {
 
-// What the model needs for as long as the page lives.
-struct FileIcons
+// A file model with the desktop's icons, on the files of a menu.
+class FileIconsPage : public QWidget
 {
-    SampleMenu sample;
-    VelMimeTypeIconProvider provider;
-    QFileSystemModel model;
+public:
+    explicit FileIconsPage(QWidget *parent)
+        : QWidget(parent)
+        , m_view(new QTreeView(this))
+    {
+        m_model.setIconProvider(&m_icons);
+        m_model.setFilter(QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden);
+        m_view->setModel(&m_model);
+        m_view->setRootIndex(m_model.setRootPath(m_files.path()));
+        connect(&m_model, &QFileSystemModel::directoryLoaded, m_view, &QTreeView::expandAll);
+        m_view->setColumnWidth(0, 240);
+
+        auto *layout = new QVBoxLayout(this);
+        layout->addWidget(m_view);
+    }
+
+    ~FileIconsPage() override
+    {
+        delete m_view; // before what it shows
+    }
+
+    bool showsRows() const { return m_model.rowCount(m_view->rootIndex()) == 4; }
+
+private:
+    const SampleFolder m_files{QStringLiteral("menu")};
+    VelMimeTypeIconProvider m_icons; // before the model, which does not own it
+    QFileSystemModel m_model;
+    QTreeView *const m_view;
 };
-
-QWidget *createPage(const GalleryContext &, QWidget *parent)
-{
-    auto *page = new QWidget(parent);
-    auto icons = std::make_shared<FileIcons>();
-    icons->model.setIconProvider(&icons->provider);
-    icons->model.setFilter(QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden);
-    auto *view = new QTreeView(page);
-    view->setModel(&icons->model);
-    view->setRootIndex(icons->model.setRootPath(icons->sample.path()));
-    QObject::connect(&icons->model, &QFileSystemModel::directoryLoaded, view, [view] { view->expandAll(); });
-    view->setColumnWidth(0, 240);
-    // The view is gone before what it shows.
-    QObject::connect(view, &QObject::destroyed, page, [icons] {});
-
-    auto *layout = new QVBoxLayout(page);
-    layout->addWidget(view);
-    return page;
-}
-
-bool showsRows(QWidget *page)
-{
-    const auto *view = page->findChild<QTreeView *>();
-    return view && view->model()->rowCount(view->rootIndex()) == 4;
-}
 
 } // namespace
 
@@ -63,7 +61,7 @@ QFileSystemModel model;
 model.setIconProvider(&icons);
 view->setModel(&model);
 view->setRootIndex(model.setRootPath(directory));)");
-    page.create = createPage;
-    page.isReady = showsRows;
+    page.create = [](const GalleryContext &, QWidget *parent) { return new FileIconsPage(parent); };
+    page.isReady = [](QWidget *made) { return static_cast<FileIconsPage *>(made)->showsRows(); };
     return page;
 }

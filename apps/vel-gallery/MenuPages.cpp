@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "GalleryPage.h"
-#include "SampleMenu.h"
+#include "SampleFolder.h"
 
 #include <VelDesktopEntryEditDialog.h>
 #include <VelMenuDialog.h>
@@ -14,8 +14,6 @@
 #include <QPushButton>
 #include <QToolBar>
 #include <QVBoxLayout>
-
-#include <memory>
 
 namespace {
 
@@ -33,72 +31,85 @@ QLabel *plainLabel(QWidget *parent)
     return label;
 }
 
-// The page that shows a sample keeps it as long as it lives itself.
-template <typename Widget>
-std::shared_ptr<SampleMenu> keepSample(Widget *page)
+// A menu that can be edited, with the actions that have icons in a tool bar.
+class MenuViewPage : public QWidget
 {
-    auto sample = std::make_shared<SampleMenu>();
-    QObject::connect(page, &QObject::destroyed, page, [sample] {});
-    return sample;
-}
+public:
+    explicit MenuViewPage(QWidget *parent)
+        : QWidget(parent)
+        , m_view(new VelMenuView(m_menu.path(), -1, true, this))
+    {
+        auto *toolBar = new QToolBar(this);
+        for (QAction *action : m_view->actions()) {
+            if (!action->icon().isNull())
+                toolBar->addAction(action);
+        }
+        auto *path = plainLabel(this);
+        connect(m_view, &VelMenuView::selectionChanged, path, &QLabel::setText);
 
-QWidget *createViewPage(const GalleryContext &, QWidget *parent)
-{
-    auto *page = new QWidget(parent);
-    const auto sample = keepSample(page);
-    auto *view = new VelMenuView(sample->path(), -1, true, page);
-    auto *path = plainLabel(page);
-    QObject::connect(view, &VelMenuView::selectionChanged, path, &QLabel::setText);
-
-    auto *toolBar = new QToolBar(page);
-    for (QAction *action : view->actions()) {
-        if (!action->icon().isNull())
-            toolBar->addAction(action);
+        auto *layout = new QVBoxLayout(this);
+        layout->addWidget(toolBar);
+        layout->addWidget(m_view, 1);
+        layout->addWidget(path);
     }
-    auto *layout = new QVBoxLayout(page);
-    layout->addWidget(toolBar);
-    layout->addWidget(view, 1);
-    layout->addWidget(path);
-    return page;
-}
 
-bool showsRows(QWidget *page)
+    ~MenuViewPage() override
+    {
+        delete m_view; // before the files that it shows
+    }
+
+    bool showsRows() const { return m_view->model()->rowCount(m_view->rootIndex()) == 3; }
+
+private:
+    const SampleFolder m_menu{QStringLiteral("menu")};
+    VelMenuView *const m_view;
+};
+
+// A button for each dialog; a label that tells what was picked.
+class MenuDialogsPage : public QWidget
 {
-    const auto *view = page->findChild<VelMenuView *>();
-    return view && view->model()->rowCount(view->rootIndex()) == 3;
-}
+public:
+    explicit MenuDialogsPage(QWidget *parent)
+        : QWidget(parent)
+        , m_result(plainLabel(this))
+    {
+        auto *layout = new QVBoxLayout(this);
+        const auto addButton = [this, layout](const QString &title, void (MenuDialogsPage::*open)()) {
+            auto *button = new QPushButton(title, this);
+            connect(button, &QPushButton::clicked, this, open);
+            layout->addWidget(button, 0, Qt::AlignLeading);
+        };
+        addButton(text(QT_TRANSLATE_NOOP("MenuPages", "&Pick an entry...")), &MenuDialogsPage::pickEntry);
+        addButton(text(QT_TRANSLATE_NOOP("MenuPages", "Edit the &menu...")), &MenuDialogsPage::editMenu);
+        addButton(text(QT_TRANSLATE_NOOP("MenuPages", "Edit an e&ntry...")), &MenuDialogsPage::editEntry);
+        layout->addWidget(m_result);
+        layout->addStretch(1);
+    }
 
-QWidget *createDialogsPage(const GalleryContext &, QWidget *parent)
-{
-    auto *page = new QWidget(parent);
-    const auto sample = keepSample(page);
-    auto *pick = new QPushButton(text(QT_TRANSLATE_NOOP("MenuPages", "&Pick an entry...")), page);
-    auto *edit = new QPushButton(text(QT_TRANSLATE_NOOP("MenuPages", "Edit the &menu...")), page);
-    auto *entry = new QPushButton(text(QT_TRANSLATE_NOOP("MenuPages", "Edit an e&ntry...")), page);
-    auto *result = plainLabel(page);
-
-    QObject::connect(pick, &QPushButton::clicked, page, [page, sample, result] {
-        VelMenuDialog dialog(sample->path(), -1, false, false, page);
+private:
+    void pickEntry()
+    {
+        VelMenuDialog dialog(m_menu.path(), -1, false, false, this);
         if (dialog.exec() == QDialog::Accepted)
-            result->setText(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr));
-    });
-    QObject::connect(edit, &QPushButton::clicked, page, [page, sample] {
-        VelMenuDialog dialog(sample->path(), -1, true, true, page);
-        dialog.exec();
-    });
-    QObject::connect(entry, &QPushButton::clicked, page, [page, sample] {
-        VelDesktopEntryEditDialog dialog(page);
-        if (dialog.setDesktopEntryPath(sample->entryPath(), true))
-            dialog.exec();
-    });
+            m_result->setText(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr));
+    }
 
-    auto *layout = new QVBoxLayout(page);
-    for (QPushButton *button : {pick, edit, entry})
-        layout->addWidget(button, 0, Qt::AlignLeading);
-    layout->addWidget(result);
-    layout->addStretch(1);
-    return page;
-}
+    void editMenu()
+    {
+        VelMenuDialog dialog(m_menu.path(), -1, true, true, this);
+        dialog.exec();
+    }
+
+    void editEntry()
+    {
+        VelDesktopEntryEditDialog dialog(this);
+        if (dialog.setDesktopEntryPath(m_menu.filePath(QStringLiteral("terminal.desktop")), true))
+            dialog.exec();
+    }
+
+    const SampleFolder m_menu{QStringLiteral("menu")};
+    QLabel *const m_result;
+};
 
 } // namespace
 
@@ -114,8 +125,8 @@ connect(view, &VelMenuView::selectionChanged,
 
 for (QAction *action : view->actions())
     toolBar->addAction(action);)");
-    page.create = createViewPage;
-    page.isReady = showsRows;
+    page.create = [](const GalleryContext &, QWidget *parent) { return new MenuViewPage(parent); };
+    page.isReady = [](QWidget *made) { return static_cast<MenuViewPage *>(made)->showsRows(); };
     return page;
 }
 
@@ -138,6 +149,6 @@ editor.exec();
 VelDesktopEntryEditDialog dialog(this);
 if (dialog.setDesktopEntryPath(path, true))
     dialog.exec();)");
-    page.create = createDialogsPage;
+    page.create = [](const GalleryContext &, QWidget *parent) { return new MenuDialogsPage(parent); };
     return page;
 }
