@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "EditorCommands.h"
-#include "EditorKey.h"
 #include "GalleryPage.h"
+#include "editor/EditorCommands.h"
+#include "editor/EditorKey.h"
 
 #include <EditShortcutsDialog.h>
 #include <ShortcutsModel.h>
@@ -77,10 +77,10 @@ void addEditorKey(QPlainTextEdit *editor, QLabel *last, ShortcutsModel *model, c
         cursor.removeSelectedText();
         last->setText(PageTexts::tr("Used: %1").arg(text));
     };
-    auto *key = new EditorKey(
-        editor,
-        {QStringLiteral("delete-line"), QCoreApplication::translate("EditorCommands", "Text"), text,
-         QKeySequence(QStringLiteral("Ctrl+Shift+K"), QKeySequence::PortableText), deleteLine});
+    auto *key =
+        new EditorKey(editor,
+                      {QStringLiteral("delete-line"), EditorTexts::tr("Text"), text,
+                       QKeySequence(QStringLiteral("Ctrl+Shift+K"), QKeySequence::PortableText), deleteLine});
     const QVariant saved = settings.value(settingsGroup + QLatin1Char('/') + key->name());
     if (saved.isValid()) {
         key->setObjectKeySequence(QKeySequence(saved.toString(), QKeySequence::PortableText));

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <QCoreApplication>
 #include <QString>
 #include <QVector>
 
@@ -24,5 +25,8 @@ struct EditorCommand
     std::function<void(QPlainTextEdit *)> run;
 };
 
-/// All of them, in the order of the menus.
-QVector<EditorCommand> editorCommands();
+/// Where the translators find the texts of all commands.
+struct EditorTexts
+{
+    Q_DECLARE_TR_FUNCTIONS(EditorCommands)
+};
