@@ -12,12 +12,12 @@
         <translation>&amp;Knopf neben der Adresse</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>Gefragt nach %1</translation>
+        <source>Information requested for %1</source>
+        <translation>Informationen zu %1 angefordert</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
-        <translation>Befehle und Dateien, Symbole, Listen und Aktionen werden hinter den Knöpfen ihrer Felder bearbeitet.</translation>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
+        <translation>Befehle, Dateien, Symbole, Listen und Aktionen werden mit den Knöpfen neben ihren Feldern bearbeitet.</translation>
     </message>
     <message>
         <source>Properties form</source>
@@ -131,7 +131,7 @@
         <translation>Auswahl &amp;weitersuchen</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Auswahl rückwärts suchen</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Ausgewähltes Wort suchen</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Auswahl mit Groß- und Kleinschreibung suchen</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Groß- und Kleinbuchstaben tauschen</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>Erste Buchstaben groß</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Neue Zeile darunter</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Zeilen verdoppeln</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Zeilen umkehren</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Doppelte Zeilen entfernen</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Kommentierung der Zeilen aufheben</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Tabulatoren in Leerzeichen umwandeln</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>&amp;Zeilenumbruch</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>&amp;Feste Zeichenbreite</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>&amp;Proportionale Zeichenbreite</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>N&amp;ur lesen</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>&amp;Breiter Cursor</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>Auf Cursor ze&amp;ntrieren</translation>
     </message>
     <message>
@@ -352,8 +352,8 @@
         <translation>&amp;Tasten drücken:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
-        <translation>So schreibt sie die Fensterverwaltung:</translation>
+        <source>In the window manager&apos;s notation:</source>
+        <translation>In der Schreibweise der Fensterverwaltung:</translation>
     </message>
     <message>
         <source>Read back:</source>
@@ -434,7 +434,7 @@
         <translation>&amp;Direkte Verbindung</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Es muss nichts eingestellt werden.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Größe:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Die Datei, wie sie auf der Festplatte steht</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Inhalt der Datei auf der Festplatte</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Ganze Zeile löschen</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Verwendet: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Letzter Befehl: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ und eine dritte
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>die Seite %1 wurde nicht fertig</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ und eine dritte
         <translation>der Ordner %1 kann nicht angelegt werden</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Zeigt die Bedienelemente, Dialoge und Modelle der Bibliothek bei der Arbeit.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Mit der Seite &lt;name&gt; beginnen.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Bilder aller Seiten oder der mit --page angegebenen Seite nach &lt;dir&gt; schreiben und beenden.</translation>
     </message>
     <message>

@@ -12,11 +12,11 @@
         <translation>&amp;Botón junto a la dirección</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>Se ha preguntado por %1</translation>
+        <source>Information requested for %1</source>
+        <translation>Se ha pedido información sobre %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Las órdenes y archivos, los iconos, las listas y las acciones se editan con los botones de sus campos.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>&amp;Buscar la selección siguiente</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Buscar la selección anterior</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Buscar la palabra seleccionada</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Buscar la selección distinguiendo mayúsculas</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Intercambiar mayúsculas y minúsculas</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>Poner mayúscula inicial</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Línea nueva debajo</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Duplicar líneas</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Invertir líneas</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Eliminar líneas duplicadas</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Descomentar líneas</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Convertir tabuladores en espacios</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>A&amp;justar líneas</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>Ancho &amp;fijo</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>Ancho &amp;proporcional</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>So&amp;lo lectura</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>Cursor a&amp;ncho</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>&amp;Centrar en el cursor</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Pulsar teclas:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Tal como las escribe el gestor de ventanas:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>Conexión &amp;directa</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>No hay nada que configurar.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>Ta&amp;maño:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>El archivo tal como está en el disco</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Contenido del archivo en el disco</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Eliminar la línea completa</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Usado: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Última orden: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ y una tercera
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>la página %1 no llegó a estar lista</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ y una tercera
         <translation>no se puede crear la carpeta %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Muestra los elementos gráficos, diálogos y modelos de la biblioteca en funcionamiento.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Empezar por la página &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Escribir en &lt;dir&gt; imágenes de todas las páginas, o de la indicada con --page, y terminar.</translation>
     </message>
     <message>

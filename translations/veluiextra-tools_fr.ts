@@ -12,11 +12,11 @@
         <translation>&amp;Bouton à côté de l&apos;adresse</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>Question posée à propos de %1</translation>
+        <source>Information requested for %1</source>
+        <translation>Informations demandées sur %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Les commandes et les fichiers, les icônes, les listes et les actions se modifient avec les boutons de leurs champs.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>Chercher la sélection &amp;suivante</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Chercher la sélection précédente</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Chercher le mot sélectionné</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Chercher la sélection en respectant la casse</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Inverser la casse</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>Mettre une majuscule initiale</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Nouvelle ligne en dessous</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Dupliquer les lignes</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Inverser l&apos;ordre des lignes</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Supprimer les lignes en double</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Décommenter les lignes</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Tabulations en espaces</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>&amp;Couper les lignes</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>Chasse &amp;fixe</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>Chasse &amp;proportionnelle</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>&amp;Lecture seule</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>&amp;Gros curseur</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>Ce&amp;ntrer sur le curseur</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Appuyer sur des touches :</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Telles que les écrit le gestionnaire de fenêtres :</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>Connexion &amp;directe</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Il n&apos;y a rien à configurer.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Taille :</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Le fichier tel quel sur le disque</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Contenu du fichier sur le disque</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Supprimer toute la ligne</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Utilisé : %1</translation>
+        <source>Last command: %1</source>
+        <translation>Dernière commande : %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ et une troisième
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>la page %1 n&apos;a pas pu être préparée</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ et une troisième
         <translation>impossible de créer le dossier %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Montre les composants graphiques, boîtes de dialogue et modèles de la bibliothèque à l&apos;œuvre.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Commencer par la page &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Écrire dans &lt;dir&gt; des images de toutes les pages, ou de celle indiquée par --page, puis quitter.</translation>
     </message>
     <message>

@@ -12,11 +12,11 @@
         <translation>&amp;Pulsante accanto all&apos;indirizzo</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
+        <source>Information requested for %1</source>
         <translation>Chieste informazioni su %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Comandi e file, icone, elenchi e azioni si modificano con i pulsanti dei rispettivi campi.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>Trova &amp;selezione successiva</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Trova selezione precedente</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Trova la parola selezionata</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Trova selezione distinguendo maiuscole</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Scambia maiuscole e minuscole</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>Iniziale maiuscola</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Nuova riga sotto</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Duplica righe</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Inverti righe</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Rimuovi righe duplicate</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Decommenta righe</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Tabulazioni in spazi</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>A capo a&amp;utomatico</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>Larghezza &amp;fissa</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>Larghezza &amp;proporzionale</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>S&amp;ola lettura</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>Cursore &amp;largo</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>&amp;Centra sul cursore</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Premi i tasti:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Come li scrive il gestore delle finestre:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>Connessione &amp;diretta</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Non occorre impostare nulla.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Dimensione:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Il file così com&apos;è sul disco</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Contenuto del file sul disco</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Elimina l&apos;intera riga</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Usato: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Ultimo comando: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ e una terza
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>la pagina %1 non è diventata pronta</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ e una terza
         <translation>impossibile creare la cartella %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Mostra gli elementi grafici, le finestre e i modelli della libreria al lavoro.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Inizia dalla pagina &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Scrive in &lt;dir&gt; le immagini di tutte le pagine, o di quella indicata con --page, e termina.</translation>
     </message>
     <message>

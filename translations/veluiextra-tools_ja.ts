@@ -12,11 +12,11 @@
         <translation>アドレスの横のボタン(&amp;B)</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>%1 について問い合わせました</translation>
+        <source>Information requested for %1</source>
+        <translation>%1 の情報が要求されました</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>コマンドとファイル、アイコン、リスト、アクションは、それぞれのフィールドのボタンから編集します。</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>選択した文字列の次を検索(&amp;G)</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>選択した文字列の前を検索</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>選択した単語を検索</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>大文字と小文字を区別して検索</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>大文字と小文字を入れ替える</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>先頭の文字を大文字にする</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>下に新しい行</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>行を複製</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>行を逆順にする</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>重複する行を削除</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>行のコメントを解除</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>タブを空白に変換</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>行を折り返す(&amp;W)</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>等幅フォント(&amp;F)</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>プロポーショナルフォント(&amp;P)</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>読み取り専用(&amp;R)</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
-        <translation>太いカーソル(&amp;B)</translation>
+        <source>Wide cur&amp;sor</source>
+        <translation>太いカーソル(&amp;S)</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>カーソルを中央に表示(&amp;C)</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>キーを押してください(&amp;P):</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>ウィンドウマネージャでの表記:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>直接接続(&amp;D)</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>設定の必要はありません。</translation>
     </message>
     <message>
@@ -473,7 +473,7 @@
         <translation>サイズ(&amp;S):</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
+        <source>Contents of the file on disk</source>
         <translation>ディスク上のファイルの内容</translation>
     </message>
     <message>
@@ -492,8 +492,8 @@
         <translation>行全体を削除</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>使用: %1</translation>
+        <source>Last command: %1</source>
+        <translation>最後のコマンド: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ and a third one
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>ページ %1 の準備ができませんでした</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ and a third one
         <translation>フォルダ %1 を作成できません</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>ライブラリのウィジェット、ダイアログ、モデルが動く様子を表示します。</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>ページ &lt;name&gt; から始めます。</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>すべてのページ、または --page で指定したページの画像を &lt;dir&gt; に書き込んで終了します。</translation>
     </message>
     <message>

@@ -12,11 +12,11 @@
         <translation>&amp;Przycisk obok adresu</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>Zapytano o %1</translation>
+        <source>Information requested for %1</source>
+        <translation>Poproszono o informacje o %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Polecenia i pliki, ikony, listy i działania edytuje się przyciskami ich pól.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>Znajdź &amp;następne zaznaczone</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Znajdź poprzednie zaznaczone</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Znajdź zaznaczone słowo</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Znajdź zaznaczone z uwzględnieniem wielkości liter</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Zamień wielkość liter</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>Wielka pierwsza litera</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Nowy wiersz poniżej</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Powiel wiersze</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Odwróć kolejność wierszy</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Usuń powtórzone wiersze</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Odkomentuj wiersze</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Tabulatory na odstępy</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>&amp;Zawijaj wiersze</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>&amp;Stała szerokość</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>P&amp;roporcjonalna szerokość</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>Tylko do &amp;odczytu</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>Szero&amp;ki kursor</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>Wyśro&amp;dkuj na kursorze</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Naciśnij klawisze:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>W zapisie zarządcy okien:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>&amp;Bezpośrednie połączenie</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Nic nie trzeba ustawiać.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Rozmiar:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Plik w postaci zapisanej na dysku</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Zawartość pliku na dysku</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Usuń cały wiersz</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Użyto: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Ostatnie polecenie: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ i jeszcze trzeci
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>strona %1 nie została przygotowana</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ i jeszcze trzeci
         <translation>nie można utworzyć katalogu %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Pokazuje elementy interfejsu, okna dialogowe i modele biblioteki w działaniu.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Zacznij od strony &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Zapisz w &lt;dir&gt; obrazy wszystkich stron lub strony podanej w --page i zakończ.</translation>
     </message>
     <message>

@@ -12,11 +12,11 @@
         <translation>&amp;Botão ao lado do endereço</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>Perguntado sobre %1</translation>
+        <source>Information requested for %1</source>
+        <translation>Informações solicitadas sobre %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Comandos e arquivos, ícones, listas e ações são editados com os botões de seus campos.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>Localizar próxima &amp;seleção</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Localizar seleção anterior</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Localizar palavra selecionada</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Localizar seleção diferenciando maiúsculas</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Inverter maiúsculas e minúsculas</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>Primeira letra maiúscula</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Nova linha abaixo</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Duplicar linhas</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Inverter linhas</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Remover linhas duplicadas</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Descomentar linhas</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Tabulações em espaços</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>&amp;Quebra de linhas</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>Largura &amp;fixa</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>Largura &amp;proporcional</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>Somente &amp;leitura</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>Cursor lar&amp;go</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>&amp;Centralizar no cursor</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Pressione teclas:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Como o gerenciador de janelas as escreve:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>Conexão &amp;direta</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Nada precisa ser configurado.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Tamanho:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>O arquivo como está no disco</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Conteúdo do arquivo no disco</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Excluir a linha inteira</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Usado: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Último comando: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ e uma terceira
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>a página %1 não ficou pronta</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ e uma terceira
         <translation>não foi possível criar a pasta %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Mostra os widgets, janelas e modelos da biblioteca em funcionamento.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Começar pela página &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Gravar em &lt;dir&gt; imagens de todas as páginas, ou da indicada com --page, e terminar.</translation>
     </message>
     <message>

@@ -12,11 +12,11 @@
         <translation>&amp;Кнопка рядом с адресом</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
+        <source>Information requested for %1</source>
         <translation>Запрошены сведения о %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Команды и файлы, значки, списки и действия изменяются с помощью кнопок в их полях.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>&amp;Найти выделенное далее</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Найти выделенное ранее</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Найти выделенное слово</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Найти выделенное с учётом регистра</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Поменять регистр</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>С прописной буквы</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Новая строка ниже</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Дублировать строки</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Обратить порядок строк</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Удалить повторяющиеся строки</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Раскомментировать строки</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Табуляции в пробелы</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>Перенос &amp;строк</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>М&amp;оноширинный шрифт</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>&amp;Пропорциональный шрифт</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>&amp;Только чтение</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>&amp;Широкий курсор</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>По &amp;центру</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Нажмите клавиши:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Как их записывает диспетчер окон:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>&amp;Прямое соединение</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Ничего настраивать не нужно.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Размер:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Файл в том виде, как он записан на диске</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Содержимое файла на диске</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Удалить всю строку</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Использовано: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Последняя команда: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ and a third one
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>страница %1 не готова</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ and a third one
         <translation>не удалось создать папку %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Показывает виджеты, диалоговые окна и модели библиотеки в работе.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Начать со страницы &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Записать в &lt;dir&gt; изображения всех страниц или указанной в --page и завершить работу.</translation>
     </message>
     <message>

@@ -12,11 +12,11 @@
         <translation>Adresin yanında &amp;düğme</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>%1 hakkında soruldu</translation>
+        <source>Information requested for %1</source>
+        <translation>%1 hakkında bilgi istendi</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Komutlar ve dosyalar, simgeler, listeler ve eylemler alanlarının düğmeleriyle düzenlenir.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>Seçileni yine &amp;bul</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Seçileni önceki konumda bul</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Seçili sözcüğü bul</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Seçileni büyük/küçük harfe duyarlı bul</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Büyük ve küçük harfleri değiştir</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>İlk harfi büyüt</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Alta yeni satır</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Satırları çoğalt</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Satırları ters çevir</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Yinelenen satırları kaldır</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Satırları yorumdan çıkar</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Sekmeleri boşluğa çevir</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>Satırları &amp;kaydır</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>&amp;Sabit genişlik</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>&amp;Orantılı genişlik</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>Sal&amp;t okunur</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>&amp;Geniş imleç</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>İ&amp;mlece ortala</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Tuşlara basın:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Pencere yöneticisinin yazdığı biçimde:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>&amp;Doğrudan bağlantı</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Hiçbir şeyin ayarlanması gerekmiyor.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>B&amp;oyut:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Diskteki haliyle dosya</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Diskteki dosyanın içeriği</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Tüm satırı sil</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Kullanıldı: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Son komut: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ ve bir üçüncüsü
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>%1 sayfası hazır olmadı</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ ve bir üçüncüsü
         <translation>%1 klasörü oluşturulamıyor</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Kitaplığın parçacıklarını, iletişim kutularını ve modellerini çalışırken gösterir.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>&lt;name&gt; sayfasıyla başla.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Tüm sayfaların ya da --page ile verilen sayfanın resimlerini &lt;dir&gt; dizinine yaz ve bitir.</translation>
     </message>
     <message>

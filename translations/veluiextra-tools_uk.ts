@@ -12,11 +12,11 @@
         <translation>&amp;Кнопка поруч з адресою</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>Запитано про %1</translation>
+        <source>Information requested for %1</source>
+        <translation>Запитано відомості про %1</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>Команди і файли, піктограми, списки та дії змінюються за допомогою кнопок їхніх полів.</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>Знайти вибране &amp;далі</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>Знайти вибране раніше</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>Знайти вибране слово</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>Знайти вибране з врахуванням регістру</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>Змінити регістр на протилежний</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>З великої літери</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>Новий рядок нижче</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>Дублювати рядки</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>Обернути порядок рядків</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>Вилучити повторювані рядки</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>Розкоментувати рядки</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>Табуляції на пробіли</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>Пе&amp;реносити рядки</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>&amp;Фіксована ширина</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>&amp;Пропорційна ширина</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>&amp;Лише читання</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
+        <source>Wide cur&amp;sor</source>
         <translation>&amp;Широкий курсор</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>По &amp;центру</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>&amp;Натисніть клавіші:</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>Як їх записує засіб керування вікнами:</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>&amp;Пряме з&apos;єднання</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>Нічого налаштовувати не потрібно.</translation>
     </message>
     <message>
@@ -473,8 +473,8 @@
         <translation>&amp;Розмір:</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
-        <translation>Файл у тому вигляді, як він записаний на диску</translation>
+        <source>Contents of the file on disk</source>
+        <translation>Вміст файлу на диску</translation>
     </message>
     <message>
         <source>Name a settings file on the command line to edit it here.</source>
@@ -492,8 +492,8 @@
         <translation>Вилучити весь рядок</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>Використано: %1</translation>
+        <source>Last command: %1</source>
+        <translation>Остання команда: %1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ and a third one
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>сторінка %1 не готова</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ and a third one
         <translation>не вдалося створити теку %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>Показує віджети, діалогові вікна та моделі бібліотеки в роботі.</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>Почати зі сторінки &lt;name&gt;.</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>Записати до &lt;dir&gt; зображення всіх сторінок або вказаної у --page і завершити роботу.</translation>
     </message>
     <message>

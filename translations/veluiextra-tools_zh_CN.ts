@@ -12,11 +12,11 @@
         <translation>地址旁的按钮(&amp;B)</translation>
     </message>
     <message>
-        <source>Asked about %1</source>
-        <translation>询问了 %1</translation>
+        <source>Information requested for %1</source>
+        <translation>已请求 %1 的信息</translation>
     </message>
     <message>
-        <source>Commands and files, icons, lists and actions are edited behind the buttons of their fields.</source>
+        <source>Use the buttons beside the fields to edit commands, files, icons, lists and actions.</source>
         <translation>命令和文件、图标、列表和操作通过其字段的按钮进行编辑。</translation>
     </message>
     <message>
@@ -131,7 +131,7 @@
         <translation>查找下一个选中内容(&amp;G)</translation>
     </message>
     <message>
-        <source>Find selected before</source>
+        <source>Find selected backward</source>
         <translation>查找上一个选中内容</translation>
     </message>
     <message>
@@ -139,7 +139,7 @@
         <translation>查找选中的单词</translation>
     </message>
     <message>
-        <source>Find selected in this case</source>
+        <source>Find selected, matching case</source>
         <translation>区分大小写查找选中内容</translation>
     </message>
     <message>
@@ -191,7 +191,7 @@
         <translation>互换大小写</translation>
     </message>
     <message>
-        <source>Capitalise</source>
+        <source>Capitalize</source>
         <translation>首字母大写</translation>
     </message>
     <message>
@@ -211,7 +211,7 @@
         <translation>在下方新建行</translation>
     </message>
     <message>
-        <source>Double lines</source>
+        <source>Duplicate lines</source>
         <translation>重复行</translation>
     </message>
     <message>
@@ -227,7 +227,7 @@
         <translation>反转行序</translation>
     </message>
     <message>
-        <source>Remove double lines</source>
+        <source>Remove duplicate lines</source>
         <translation>删除重复行</translation>
     </message>
     <message>
@@ -255,7 +255,7 @@
         <translation>取消注释行</translation>
     </message>
     <message>
-        <source>Tabulators to spaces</source>
+        <source>Tabs to spaces</source>
         <translation>制表符转为空格</translation>
     </message>
     <message>
@@ -275,11 +275,11 @@
         <translation>自动换行(&amp;W)</translation>
     </message>
     <message>
-        <source>&amp;Fixed width</source>
+        <source>&amp;Fixed-width font</source>
         <translation>等宽字体(&amp;F)</translation>
     </message>
     <message>
-        <source>&amp;Proportional width</source>
+        <source>&amp;Proportional font</source>
         <translation>比例字体(&amp;P)</translation>
     </message>
     <message>
@@ -291,11 +291,11 @@
         <translation>只读(&amp;R)</translation>
     </message>
     <message>
-        <source>&amp;Broad cursor</source>
-        <translation>粗光标(&amp;B)</translation>
+        <source>Wide cur&amp;sor</source>
+        <translation>粗光标(&amp;S)</translation>
     </message>
     <message>
-        <source>&amp;Centre on cursor</source>
+        <source>&amp;Center on cursor</source>
         <translation>光标居中(&amp;C)</translation>
     </message>
     <message>
@@ -352,7 +352,7 @@
         <translation>按下按键(&amp;P)：</translation>
     </message>
     <message>
-        <source>As the window manager writes them:</source>
+        <source>In the window manager&apos;s notation:</source>
         <translation>窗口管理器的写法：</translation>
     </message>
     <message>
@@ -434,7 +434,7 @@
         <translation>直接连接(&amp;D)</translation>
     </message>
     <message>
-        <source>Nothing has to be set.</source>
+        <source>There is nothing to set.</source>
         <translation>无需任何设置。</translation>
     </message>
     <message>
@@ -473,7 +473,7 @@
         <translation>大小(&amp;S)：</translation>
     </message>
     <message>
-        <source>The file as it stands on disk</source>
+        <source>Contents of the file on disk</source>
         <translation>磁盘上的文件内容</translation>
     </message>
     <message>
@@ -492,8 +492,8 @@
         <translation>删除整行</translation>
     </message>
     <message>
-        <source>Used: %1</source>
-        <translation>已使用：%1</translation>
+        <source>Last command: %1</source>
+        <translation>上一个命令：%1</translation>
     </message>
     <message>
         <source>one line
@@ -560,7 +560,7 @@ and a third one
 <context>
     <name>vel-gallery</name>
     <message>
-        <source>the page %1 did not get ready</source>
+        <source>the page %1 did not finish loading</source>
         <translation>页面 %1 未能就绪</translation>
     </message>
     <message>
@@ -572,15 +572,15 @@ and a third one
         <translation>无法创建文件夹 %1</translation>
     </message>
     <message>
-        <source>Shows the widgets, dialogs and models of the library at work.</source>
+        <source>Shows the library&apos;s widgets, dialogs and models in action.</source>
         <translation>展示库中部件、对话框和模型的实际效果。</translation>
     </message>
     <message>
-        <source>Begin with the page &lt;name&gt;.</source>
+        <source>Start with the page &lt;name&gt;.</source>
         <translation>从页面 &lt;name&gt; 开始。</translation>
     </message>
     <message>
-        <source>Write pictures of every page, or of that given with --page, to &lt;dir&gt; and end.</source>
+        <source>Write screenshots of every page, or of the page given with --page, to &lt;dir&gt; and exit.</source>
         <translation>将所有页面或 --page 指定的页面的图片写入 &lt;dir&gt; 后退出。</translation>
     </message>
     <message>

@@ -44,7 +44,8 @@ QWidget *createFormPage(const GalleryContext &, QWidget *parent)
     QObject::connect(urlButton, &QCheckBox::toggled, form, &VelDesktopEntryPropsWidget::setShowURLInfoButton);
     QObject::connect(
         form, &VelDesktopEntryPropsWidget::requestedURLInfo, requested, [requested](const QString &url) {
-            requested->setText(text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Asked about %1")).arg(url));
+            requested->setText(
+                text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Information requested for %1")).arg(url));
         });
     urlButton->setChecked(true);
 
@@ -60,8 +61,8 @@ QWidget *createFieldsPage(const GalleryContext &, QWidget *parent)
 {
     auto *page = new QWidget(parent);
     auto *note = new QLabel(text(QT_TRANSLATE_NOOP("DesktopEntryPages",
-                                                   "Commands and files, icons, lists and actions are edited "
-                                                   "behind the buttons of their fields.")),
+                                                   "Use the buttons beside the fields to edit commands, "
+                                                   "files, icons, lists and actions.")),
                             page);
     note->setWordWrap(true);
     auto *form = new VelDesktopEntryPropsWidget(page);

@@ -19,7 +19,7 @@ struct GalleryContext
 /// One page of the gallery: a widget at work and the code that makes it.
 struct GalleryPage
 {
-    /// The name on the command line and in the names of pictures: lower case, words joined by "-".
+    /// The name on the command line and in the names of screenshots: lower case, words joined by "-".
     QString name;
     /// The title in the list, for the user.
     QString title;

@@ -33,7 +33,7 @@ QWidget *createPage(const GalleryContext &, QWidget *parent)
     auto *keys = new QKeySequenceEdit(page);
     layout->addRow(text(QT_TRANSLATE_NOOP("KeyNamesPage", "&Press keys:")), keys);
     QLabel *x11 =
-        addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "As the window manager writes them:")));
+        addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "In the window manager's notation:")));
     QLabel *qt = addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "Read back:")));
     QLabel *global =
         addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "Global action with these keys:")));

@@ -52,7 +52,7 @@ VelRadioGroupBox *noneBox(QWidget *parent)
 {
     auto *box =
         new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Direct connection")), parent);
-    auto *note = new QLabel(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Nothing has to be set.")), box);
+    auto *note = new QLabel(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "There is nothing to set.")), box);
     auto *layout = new QVBoxLayout(box);
     layout->addWidget(note);
     return box;

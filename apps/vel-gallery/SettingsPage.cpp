@@ -92,7 +92,7 @@ private:
     {
         m_file = new QPlainTextEdit(this);
         m_file->setObjectName(QStringLiteral("fileView"));
-        m_file->setAccessibleName(tr("The file as it stands on disk"));
+        m_file->setAccessibleName(tr("Contents of the file on disk"));
         m_file->setReadOnly(true);
         m_file->setTabChangesFocus(true);
         m_file->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));

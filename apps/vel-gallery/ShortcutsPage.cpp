@@ -59,7 +59,7 @@ void addCommands(QMainWindow *page, QPlainTextEdit *editor, QLabel *last, Shortc
         action->setShortcut(QKeySequence(command.key, QKeySequence::PortableText));
         QObject::connect(action, &QAction::triggered, editor, [editor, last, action, command] {
             command.run(editor);
-            last->setText(PageTexts::tr("Used: %1").arg(action->iconText()));
+            last->setText(PageTexts::tr("Last command: %1").arg(action->iconText()));
         });
         model->registerAction(command.name, action, command.menu);
     }
@@ -75,7 +75,7 @@ void addEditorKey(QPlainTextEdit *editor, QLabel *last, ShortcutsModel *model, c
         if (!cursor.movePosition(QTextCursor::NextBlock, QTextCursor::KeepAnchor))
             cursor.movePosition(QTextCursor::EndOfBlock, QTextCursor::KeepAnchor);
         cursor.removeSelectedText();
-        last->setText(PageTexts::tr("Used: %1").arg(text));
+        last->setText(PageTexts::tr("Last command: %1").arg(text));
     };
     auto *key =
         new EditorKey(editor,

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "GalleryPages.h"
-#include "GalleryPictures.h"
+#include "GalleryScreenshots.h"
 #include "GalleryWindow.h"
 
 #include <support/WindowProgram.h>
@@ -20,7 +20,7 @@ struct Options
 {
     QString page;
     QString screenshots;
-    int scale = 0; // 0: pictures at every scale
+    int scale = 0; // 0: screenshots at every scale
     GalleryContext context;
     QString error; ///< what is wrong with the command line; empty when nothing is
 };
@@ -29,16 +29,17 @@ Options parse()
 {
     QCommandLineParser parser;
     parser.setApplicationDescription(QCoreApplication::translate(
-        "vel-gallery", "Shows the widgets, dialogs and models of the library at work."));
+        "vel-gallery", "Shows the library's widgets, dialogs and models in action."));
     parser.addHelpOption();
     parser.addVersionOption();
     const QCommandLineOption page(QStringLiteral("page"),
-                                  QCoreApplication::translate("vel-gallery", "Begin with the page <name>."),
+                                  QCoreApplication::translate("vel-gallery", "Start with the page <name>."),
                                   QStringLiteral("name"));
     const QCommandLineOption screenshots(
         QStringLiteral("screenshots"),
         QCoreApplication::translate(
-            "vel-gallery", "Write pictures of every page, or of that given with --page, to <dir> and end."),
+            "vel-gallery",
+            "Write screenshots of every page, or of the page given with --page, to <dir> and exit."),
         QStringLiteral("dir"));
     QCommandLineOption scale(QStringLiteral("scale"), QString(), QStringLiteral("factor"),
                              QStringLiteral("0"));
@@ -64,15 +65,15 @@ bool hasPage(const QVector<GalleryPage> &pages, const QString &name)
                        [&name](const GalleryPage &page) { return page.name == name; });
 }
 
-bool writePictures(const QVector<GalleryPage> &pages, const Options &options, const QStringList &arguments)
+bool writeScreenshots(const QVector<GalleryPage> &pages, const Options &options, const QStringList &arguments)
 {
     if (options.scale == 0)
-        return GalleryPictures::runAtEveryScale(arguments);
+        return GalleryScreenshots::runAtEveryScale(arguments);
     QVector<GalleryPage> chosen;
     std::copy_if(pages.begin(), pages.end(), std::back_inserter(chosen), [&options](const GalleryPage &page) {
         return options.page.isEmpty() || page.name == options.page;
     });
-    return GalleryPictures::writeAtThisScale(chosen, options.context, options.screenshots, options.scale);
+    return GalleryScreenshots::writeAtThisScale(chosen, options.context, options.screenshots, options.scale);
 }
 
 int run(const Options &options, const QStringList &arguments)
@@ -83,7 +84,7 @@ int run(const Options &options, const QStringList &arguments)
         return Program::fail(
             QCoreApplication::translate("vel-gallery", "there is no page %1").arg(options.page), NotShown);
     if (!options.screenshots.isEmpty())
-        return writePictures(pages, options, arguments) ? Done : NotShown;
+        return writeScreenshots(pages, options, arguments) ? Done : NotShown;
 
     GalleryWindow window(pages, options.context);
     if (!options.page.isEmpty())

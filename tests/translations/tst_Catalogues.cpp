@@ -36,9 +36,9 @@ const QVector<QStringList> &together()
         list("Edit the &menu...|Edit an e&ntry...|&Pick an entry..."),
         list("&New|&Open...|&Save...|Insert &date|Insert &time|Insert &rule"),
         list("&Undo|&Redo|Cu&t|&Copy|&Paste|Select &all|Find selected a&gain|Go to &line..."),
-        list("Zoom &in|Zoom &out|&Wrap lines|&Fixed width|&Proportional width|O&verwrite|&Read only|&Broad "
-             "cursor|"
-             "&Centre on cursor|Scroll &up|Scroll &down|Scroll to &top|Scroll to botto&m"),
+        list("Zoom &in|Zoom &out|&Wrap lines|&Fixed-width font|&Proportional font|O&verwrite|&Read only|Wide "
+             "cur&sor|"
+             "&Center on cursor|Scroll &up|Scroll &down|Scroll to &top|Scroll to botto&m"),
     };
     return all;
 }

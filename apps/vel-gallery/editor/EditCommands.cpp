@@ -77,11 +77,11 @@ QVector<EditorCommand> findCommands()
     return {
         {QStringLiteral("find-selected"), menu, EditorTexts::tr("Find selected a&gain"), QStringLiteral("F3"),
          [](auto *e) { find(e, {}); }},
-        {QStringLiteral("find-previous"), menu, EditorTexts::tr("Find selected before"),
+        {QStringLiteral("find-previous"), menu, EditorTexts::tr("Find selected backward"),
          QStringLiteral("Shift+F3"), [](auto *e) { find(e, QTextDocument::FindBackward); }},
         {QStringLiteral("find-word"), menu, EditorTexts::tr("Find selected word"), QString(),
          [](auto *e) { find(e, QTextDocument::FindWholeWords); }},
-        {QStringLiteral("find-case"), menu, EditorTexts::tr("Find selected in this case"), QString(),
+        {QStringLiteral("find-case"), menu, EditorTexts::tr("Find selected, matching case"), QString(),
          [](auto *e) { find(e, QTextDocument::FindCaseSensitively); }},
     };
 }

@@ -90,7 +90,7 @@ QVector<EditorCommand> wordCommands()
         {QStringLiteral("word-lower"), menu, EditorTexts::tr("To lower case"), QStringLiteral("Shift+F7"),
          word([](const QString &w) { return w.toLower(); })},
         {QStringLiteral("word-swap"), menu, EditorTexts::tr("Swap case"), QString(), word(swapCase)},
-        {QStringLiteral("word-capital"), menu, EditorTexts::tr("Capitalise"), QString(),
+        {QStringLiteral("word-capital"), menu, EditorTexts::tr("Capitalize"), QString(),
          word([](const QString &w) { return w.left(1).toUpper() + w.mid(1).toLower(); })},
     };
 }
@@ -115,7 +115,7 @@ QVector<EditorCommand> listCommands()
 {
     const QString menu = EditorTexts::tr("Text");
     return {
-        {QStringLiteral("lines-double"), menu, EditorTexts::tr("Double lines"), QStringLiteral("Ctrl+D"),
+        {QStringLiteral("lines-double"), menu, EditorTexts::tr("Duplicate lines"), QStringLiteral("Ctrl+D"),
          lines([](QStringList &all) { all += QStringList(all); })},
         {QStringLiteral("lines-join"), menu, EditorTexts::tr("Join lines"), QStringLiteral("Ctrl+J"),
          lines([](QStringList &all) { all = QStringList(all.join(QLatin1Char(' '))); })},
@@ -124,7 +124,7 @@ QVector<EditorCommand> listCommands()
         {QStringLiteral("lines-reverse"), menu, EditorTexts::tr("Reverse lines"),
          QStringLiteral("Ctrl+K, Ctrl+R"),
          lines([](QStringList &all) { std::reverse(all.begin(), all.end()); })},
-        {QStringLiteral("lines-unique"), menu, EditorTexts::tr("Remove double lines"), QString(),
+        {QStringLiteral("lines-unique"), menu, EditorTexts::tr("Remove duplicate lines"), QString(),
          lines([](QStringList &all) { all.removeDuplicates(); })},
         {QStringLiteral("lines-empty"), menu, EditorTexts::tr("Remove empty lines"), QString(),
          lines([](QStringList &all) { all.removeAll(QString()); })},
@@ -150,7 +150,7 @@ QVector<EditorCommand> eachLineCommands()
          QStringLiteral("Ctrl+K, Ctrl+U"), eachLine([](const QString &line) {
              return line.mid(line.startsWith(QLatin1String("# ")) ? 2 : 0);
          })},
-        {QStringLiteral("lines-spaces"), menu, EditorTexts::tr("Tabulators to spaces"), QString(),
+        {QStringLiteral("lines-spaces"), menu, EditorTexts::tr("Tabs to spaces"), QString(),
          eachLine([](QString line) { return line.replace(QLatin1Char('\t'), QLatin1String("    ")); })},
     };
 }

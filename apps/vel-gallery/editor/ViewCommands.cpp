@@ -27,17 +27,17 @@ QVector<EditorCommand> showCommands()
              const bool isWrapped = e->lineWrapMode() != QPlainTextEdit::NoWrap;
              e->setLineWrapMode(isWrapped ? QPlainTextEdit::NoWrap : QPlainTextEdit::WidgetWidth);
          }},
-        {QStringLiteral("view-fixed"), menu, EditorTexts::tr("&Fixed width"), QString(),
+        {QStringLiteral("view-fixed"), menu, EditorTexts::tr("&Fixed-width font"), QString(),
          [](auto *e) { e->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont)); }},
-        {QStringLiteral("view-proportional"), menu, EditorTexts::tr("&Proportional width"), QString(),
+        {QStringLiteral("view-proportional"), menu, EditorTexts::tr("&Proportional font"), QString(),
          [](auto *e) { e->setFont(QFontDatabase::systemFont(QFontDatabase::GeneralFont)); }},
         {QStringLiteral("view-overwrite"), menu, EditorTexts::tr("O&verwrite"), QString(),
          [](auto *e) { e->setOverwriteMode(!e->overwriteMode()); }},
         {QStringLiteral("view-read-only"), menu, EditorTexts::tr("&Read only"), QString(),
          [](auto *e) { e->setReadOnly(!e->isReadOnly()); }},
-        {QStringLiteral("view-cursor"), menu, EditorTexts::tr("&Broad cursor"), QString(),
+        {QStringLiteral("view-cursor"), menu, EditorTexts::tr("Wide cur&sor"), QString(),
          [](auto *e) { e->setCursorWidth(e->cursorWidth() == 1 ? 3 : 1); }},
-        {QStringLiteral("view-centre"), menu, EditorTexts::tr("&Centre on cursor"), QStringLiteral("Ctrl+L"),
+        {QStringLiteral("view-centre"), menu, EditorTexts::tr("&Center on cursor"), QStringLiteral("Ctrl+L"),
          [](auto *e) { e->centerCursor(); }},
     };
 }

@@ -7,13 +7,13 @@
 
 #include <QVector>
 
-/// Pictures of the pages in every combination of palette, direction and scale.
-namespace GalleryPictures {
+/// Screenshots of the pages in every combination of palette, direction and scale.
+namespace GalleryScreenshots {
 
 /**
  * Writes "<page>-<light|dark>-<ltr|rtl>-<scale>.png" into \a directory for each page, at the
  * scale at which the program runs, which \a scale names. The folder is made when it is missing.
- * \return false after a line on standard error when a picture could not be made.
+ * \return false after a line on standard error when a screenshot could not be made.
  */
 bool writeAtThisScale(const QVector<GalleryPage> &pages, const GalleryContext &context,
                       const QString &directory, int scale);
@@ -24,4 +24,4 @@ bool writeAtThisScale(const QVector<GalleryPage> &pages, const GalleryContext &c
  */
 bool runAtEveryScale(const QStringList &arguments);
 
-} // namespace GalleryPictures
+} // namespace GalleryScreenshots

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "GalleryPictures.h"
+#include "GalleryScreenshots.h"
 
 #include "GalleryWindow.h"
 
@@ -23,7 +23,7 @@ QPalette darkPalette()
 {
     const QColor window(0x31, 0x36, 0x3b);
     const QColor text(0xef, 0xf0, 0xf1);
-    const QColor grey(0x7f, 0x8c, 0x8d);
+    const QColor gray(0x7f, 0x8c, 0x8d);
     QPalette palette(text, window.lighter(115), window.lighter(150), window.darker(150), window.darker(120),
                      text, Qt::white, QColor(0x23, 0x26, 0x29), window);
     palette.setColor(QPalette::Highlight, QColor(0x3d, 0xae, 0xe9));
@@ -32,9 +32,9 @@ QPalette darkPalette()
     palette.setColor(QPalette::ToolTipBase, window);
     palette.setColor(QPalette::ToolTipText, text);
     palette.setColor(QPalette::Link, QColor(0x3d, 0xae, 0xe9));
-    palette.setColor(QPalette::PlaceholderText, grey);
+    palette.setColor(QPalette::PlaceholderText, gray);
     for (const QPalette::ColorRole role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
-        palette.setColor(QPalette::Disabled, role, grey);
+        palette.setColor(QPalette::Disabled, role, gray);
     return palette;
 }
 
@@ -49,11 +49,11 @@ bool waitUntilReady(const GalleryPage &page, QWidget *widget)
         }
     } while (!deadline.hasExpired());
     Program::printError(
-        QCoreApplication::translate("vel-gallery", "the page %1 did not get ready").arg(page.name));
+        QCoreApplication::translate("vel-gallery", "the page %1 did not finish loading").arg(page.name));
     return false;
 }
 
-bool writePicture(GalleryWindow *window, const GalleryPage &page, const QString &path)
+bool writeScreenshot(GalleryWindow *window, const GalleryPage &page, const QString &path)
 {
     window->showPage(page.name);
     if (!waitUntilReady(page, window->currentPage()))
@@ -66,7 +66,7 @@ bool writePicture(GalleryWindow *window, const GalleryPage &page, const QString 
 
 } // namespace
 
-namespace GalleryPictures {
+namespace GalleryScreenshots {
 
 bool writeAtThisScale(const QVector<GalleryPage> &pages, const GalleryContext &context,
                       const QString &directory, int scale)
@@ -97,7 +97,7 @@ bool writeAtThisScale(const QVector<GalleryPage> &pages, const GalleryContext &c
                         .arg(page.name, palette.name,
                              direction == Qt::LeftToRight ? QStringLiteral("ltr") : QStringLiteral("rtl"),
                              QString::number(scale));
-                written = writePicture(&window, page, QDir(directory).filePath(name)) && written;
+                written = writeScreenshot(&window, page, QDir(directory).filePath(name)) && written;
             }
         }
     }
@@ -122,4 +122,4 @@ bool runAtEveryScale(const QStringList &arguments)
     return succeeded;
 }
 
-} // namespace GalleryPictures
+} // namespace GalleryScreenshots
