@@ -70,7 +70,7 @@ void Options::chooseDir(const QCommandLineParser &parser)
     dir = startMenu;
     if (isDir) {
         const QString given = parser.value(QStringLiteral("dir"));
-        // Without a trailing "/", so that a standard directory is recognised.
+        // Without a trailing "/", so that a standard directory is recognized.
         dir = given.isEmpty() ? given : QDir::cleanPath(QDir().absoluteFilePath(given));
     } else if (isDesktop) {
         dir = standardDir(VelDir::Desktop);

@@ -25,16 +25,16 @@ QByteArray languageCode(int i)
 QByteArray entry(int languages, int number)
 {
     QByteArray bytes = "# A desktop entry\n[Desktop Entry]\nVersion=1.0\nType=Application\n";
-    const auto localised = [&](const QByteArray &key, const QByteArray &value) {
+    const auto localized = [&](const QByteArray &key, const QByteArray &value) {
         bytes += key + "=" + value + "\n";
         for (int i = 0; i < languages; ++i)
             bytes += key + "[" + languageCode(i) + "]=" + value + " \xC3\xBC" + languageCode(i) + "\n";
     };
     const QByteArray name = "Application " + QByteArray::number(number);
-    localised("Name", name);
-    localised("GenericName", "Text editor of the kind");
-    localised("Comment", "Edit text files and look at what is in them");
-    localised("Keywords", "text;editor;notes;plain;");
+    localized("Name", name);
+    localized("GenericName", "Text editor of the kind");
+    localized("Comment", "Edit text files and look at what is in them");
+    localized("Keywords", "text;editor;notes;plain;");
     bytes += "Exec=application-" + QByteArray::number(number)
         + " --new-window %U\nTryExec=application\nIcon=accessories"
           "-text-editor\nTerminal=false\nStartupNotify=true\nCategories=Utility;TextEditor;\nMimeType=text/"
@@ -42,7 +42,7 @@ QByteArray entry(int languages, int number)
           "text/x-c;text/x-c++;application/x-shellscript;\nActions=window;document;\n";
     for (const QByteArray id : {"window", "document"}) {
         bytes += "\n[Desktop Action " + id + "]\n";
-        localised("Name", "New " + id);
+        localized("Name", "New " + id);
         bytes += "Exec=application --new-" + id + "\n";
     }
     return bytes;

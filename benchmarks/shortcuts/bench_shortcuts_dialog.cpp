@@ -5,7 +5,7 @@
 //
 // Both are given what an application keeps its actions in anyway, a ShortcutsModel and a
 // KActionCollection; making these is not measured. There is an icon theme, as on any desktop:
-// without one neither dialog has a picture on its buttons.
+// without one neither dialog has icons on its buttons.
 
 #include "Comparison.h"
 #include "EditShortcutsDialog.h"
