@@ -26,11 +26,6 @@ struct Options
     QString error; ///< what is wrong with the command line; empty when nothing is
 };
 
-QString text(const char *source)
-{
-    return QCoreApplication::translate("vel-entryedit", source);
-}
-
 QString absolute(const QString &path)
 {
     return path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
@@ -39,21 +34,21 @@ QString absolute(const QString &path)
 Options parse()
 {
     QCommandLineParser parser;
-    parser.setApplicationDescription(text(QT_TRANSLATE_NOOP("vel-entryedit", "Edits a desktop entry.")));
+    parser.setApplicationDescription(QCoreApplication::translate("vel-entryedit", "Edits a desktop entry."));
     parser.addHelpOption();
     parser.addVersionOption();
     const QCommandLineOption create(
         QStringLiteral("create"),
-        text(QT_TRANSLATE_NOOP("vel-entryedit", "Make a new entry when there is no such file.")));
+        QCoreApplication::translate("vel-entryedit", "Make a new entry when there is no such file."));
     const QCommandLineOption pattern(
         QStringLiteral("template"),
-        text(QT_TRANSLATE_NOOP("vel-entryedit", "Begin with the values of the entry <file>.")),
+        QCoreApplication::translate("vel-entryedit", "Begin with the values of the entry <file>."),
         QStringLiteral("file"));
     const QCommandLineOption readOnly(QStringLiteral("read-only"),
-                                      text(QT_TRANSLATE_NOOP("vel-entryedit", "Show the entry only.")));
+                                      QCoreApplication::translate("vel-entryedit", "Show the entry only."));
     parser.addOptions({create, pattern, readOnly});
     parser.addPositionalArgument(QStringLiteral("file"),
-                                 text(QT_TRANSLATE_NOOP("vel-entryedit", "The entry to edit.")));
+                                 QCoreApplication::translate("vel-entryedit", "The entry to edit."));
 
     Options options;
     options.error = Program::parse(parser);
@@ -61,7 +56,7 @@ Options parse()
         return options;
     options.file = absolute(parser.positionalArguments().value(0));
     if (parser.positionalArguments().size() != 1 || options.file.isEmpty())
-        options.error = text(QT_TRANSLATE_NOOP("vel-entryedit", "one file has to be named"));
+        options.error = QCoreApplication::translate("vel-entryedit", "one file has to be named");
     options.pattern = absolute(parser.value(pattern));
     options.create = parser.isSet(create);
     options.readOnly = parser.isSet(readOnly);
@@ -84,7 +79,7 @@ int run(const Options &options)
     QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
     VelDesktopEntryEditDialog dialog;
     if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
-        return Program::fail(text(QT_TRANSLATE_NOOP("vel-entryedit", "cannot open %1")).arg(options.file),
+        return Program::fail(QCoreApplication::translate("vel-entryedit", "cannot open %1").arg(options.file),
                              NotOpened);
     if (options.readOnly)
         makeReadOnly(&dialog);

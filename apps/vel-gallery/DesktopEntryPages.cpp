@@ -17,10 +17,10 @@
 
 namespace {
 
-QString text(const char *source)
+struct PageTexts
 {
-    return QCoreApplication::translate("DesktopEntryPages", source);
-}
+    Q_DECLARE_TR_FUNCTIONS(DesktopEntryPages)
+};
 
 void showSample(VelDesktopEntryPropsWidget *form, const QString &name)
 {
@@ -35,18 +35,16 @@ QWidget *createFormPage(const GalleryContext &, QWidget *parent)
     auto *page = new QWidget(parent);
     auto *form = new VelDesktopEntryPropsWidget(page);
     showSample(form, QStringLiteral("standards.desktop"));
-    auto *readOnly = new QCheckBox(text(QT_TRANSLATE_NOOP("DesktopEntryPages", "&Read-only")), page);
-    auto *urlButton =
-        new QCheckBox(text(QT_TRANSLATE_NOOP("DesktopEntryPages", "&Button beside the address")), page);
+    auto *readOnly = new QCheckBox(PageTexts::tr("&Read-only"), page);
+    auto *urlButton = new QCheckBox(PageTexts::tr("&Button beside the address"), page);
     auto *requested = new QLabel(page);
     requested->setTextFormat(Qt::PlainText);
     QObject::connect(readOnly, &QCheckBox::toggled, form, &VelDesktopEntryPropsWidget::setReadOnly);
     QObject::connect(urlButton, &QCheckBox::toggled, form, &VelDesktopEntryPropsWidget::setShowURLInfoButton);
-    QObject::connect(
-        form, &VelDesktopEntryPropsWidget::requestedURLInfo, requested, [requested](const QString &url) {
-            requested->setText(
-                text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Information requested for %1")).arg(url));
-        });
+    QObject::connect(form, &VelDesktopEntryPropsWidget::requestedURLInfo, requested,
+                     [requested](const QString &url) {
+                         requested->setText(PageTexts::tr("Information requested for %1").arg(url));
+                     });
     urlButton->setChecked(true);
 
     auto *layout = new QVBoxLayout(page);
@@ -60,9 +58,8 @@ QWidget *createFormPage(const GalleryContext &, QWidget *parent)
 QWidget *createFieldsPage(const GalleryContext &, QWidget *parent)
 {
     auto *page = new QWidget(parent);
-    auto *note = new QLabel(text(QT_TRANSLATE_NOOP("DesktopEntryPages",
-                                                   "Use the buttons beside the fields to edit commands, "
-                                                   "files, icons, lists and actions.")),
+    auto *note = new QLabel(PageTexts::tr("Use the buttons beside the fields to edit commands, "
+                                          "files, icons, lists and actions."),
                             page);
     note->setWordWrap(true);
     auto *form = new VelDesktopEntryPropsWidget(page);
@@ -82,8 +79,8 @@ GalleryPage desktopEntryFormPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("desktop-entry-form");
-    page.title = text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Properties form"));
-    page.category = text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Desktop entries"));
+    page.title = PageTexts::tr("Properties form");
+    page.category = PageTexts::tr("Desktop entries");
     page.snippet = QStringLiteral(R"(auto *form = new VelDesktopEntryPropsWidget(page);
 form->loadFrom(VelUIDesktopEntry(path));
 
@@ -104,8 +101,8 @@ GalleryPage desktopEntryFieldsPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("desktop-entry-fields");
-    page.title = text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Paths, icons, lists and actions"));
-    page.category = text(QT_TRANSLATE_NOOP("DesktopEntryPages", "Desktop entries"));
+    page.title = PageTexts::tr("Paths, icons, lists and actions");
+    page.category = PageTexts::tr("Desktop entries");
     page.snippet = QStringLiteral(R"(auto *form = new VelDesktopEntryPropsWidget(page);
 form->setFrameStyle(QFrame::NoFrame);
 

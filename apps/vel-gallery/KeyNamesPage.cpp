@@ -12,10 +12,10 @@
 
 namespace {
 
-QString text(const char *source)
+struct PageTexts
 {
-    return QCoreApplication::translate("KeyNamesPage", source);
-}
+    Q_DECLARE_TR_FUNCTIONS(KeyNamesPage)
+};
 
 QLabel *addRow(QFormLayout *layout, const QString &title)
 {
@@ -31,12 +31,10 @@ QWidget *createPage(const GalleryContext &, QWidget *parent)
     auto *page = new QWidget(parent);
     auto *layout = new QFormLayout(page);
     auto *keys = new QKeySequenceEdit(page);
-    layout->addRow(text(QT_TRANSLATE_NOOP("KeyNamesPage", "&Press keys:")), keys);
-    QLabel *x11 =
-        addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "In the window manager's notation:")));
-    QLabel *qt = addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "Read back:")));
-    QLabel *global =
-        addRow(layout, text(QT_TRANSLATE_NOOP("KeyNamesPage", "Global action with these keys:")));
+    layout->addRow(PageTexts::tr("&Press keys:"), keys);
+    QLabel *x11 = addRow(layout, PageTexts::tr("In the window manager's notation:"));
+    QLabel *qt = addRow(layout, PageTexts::tr("Read back:"));
+    QLabel *global = addRow(layout, PageTexts::tr("Global action with these keys:"));
 
     QObject::connect(keys, &QKeySequenceEdit::keySequenceChanged, page, [=](const QKeySequence &sequence) {
         const QString name = sequence.isEmpty() ? QString() : VelKeyServer::KeyQtToKeyStringX(sequence[0]);
@@ -54,8 +52,8 @@ GalleryPage keyNamesPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("key-names");
-    page.title = text(QT_TRANSLATE_NOOP("KeyNamesPage", "Key names"));
-    page.category = text(QT_TRANSLATE_NOOP("KeyNamesPage", "Shortcuts"));
+    page.title = PageTexts::tr("Key names");
+    page.category = PageTexts::tr("Shortcuts");
     page.snippet = QStringLiteral(R"(const int code = sequence[0];
 // "Ctrl+Alt+F2"
 const QString name = VelKeyServer::KeyQtToKeyStringX(code);

@@ -17,10 +17,10 @@
 
 namespace {
 
-QString text(const char *source)
+struct PageTexts
 {
-    return QCoreApplication::translate("MenuPages", source);
-}
+    Q_DECLARE_TR_FUNCTIONS(MenuPages)
+};
 
 QLabel *plainLabel(QWidget *parent)
 {
@@ -79,9 +79,9 @@ public:
             connect(button, &QPushButton::clicked, this, open);
             layout->addWidget(button, 0, Qt::AlignLeading);
         };
-        addButton(text(QT_TRANSLATE_NOOP("MenuPages", "&Pick an entry...")), &MenuDialogsPage::pickEntry);
-        addButton(text(QT_TRANSLATE_NOOP("MenuPages", "Edit the &menu...")), &MenuDialogsPage::editMenu);
-        addButton(text(QT_TRANSLATE_NOOP("MenuPages", "Edit an e&ntry...")), &MenuDialogsPage::editEntry);
+        addButton(PageTexts::tr("&Pick an entry..."), &MenuDialogsPage::pickEntry);
+        addButton(PageTexts::tr("Edit the &menu..."), &MenuDialogsPage::editMenu);
+        addButton(PageTexts::tr("Edit an e&ntry..."), &MenuDialogsPage::editEntry);
         layout->addWidget(m_result);
         layout->addStretch(1);
     }
@@ -117,8 +117,8 @@ GalleryPage menuViewPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("menu-view");
-    page.title = text(QT_TRANSLATE_NOOP("MenuPages", "Menu tree"));
-    page.category = text(QT_TRANSLATE_NOOP("MenuPages", "Menus"));
+    page.title = PageTexts::tr("Menu tree");
+    page.category = PageTexts::tr("Menus");
     page.snippet = QStringLiteral(R"(auto *view = new VelMenuView(directory, -1, true, page);
 connect(view, &VelMenuView::selectionChanged,
         label, &QLabel::setText);
@@ -134,8 +134,8 @@ GalleryPage menuDialogsPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("menu-dialogs");
-    page.title = text(QT_TRANSLATE_NOOP("MenuPages", "Menu and entry dialogs"));
-    page.category = text(QT_TRANSLATE_NOOP("MenuPages", "Menus"));
+    page.title = PageTexts::tr("Menu and entry dialogs");
+    page.category = PageTexts::tr("Menus");
     page.snippet = QStringLiteral(R"(// Pick an entry of a menu.
 VelMenuDialog picker(directory, -1, false, false, this);
 if (picker.exec() == QDialog::Accepted)

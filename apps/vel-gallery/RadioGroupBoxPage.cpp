@@ -16,43 +16,39 @@
 
 namespace {
 
-QString text(const char *source)
+struct PageTexts
 {
-    return QCoreApplication::translate("RadioGroupBoxPage", source);
-}
+    Q_DECLARE_TR_FUNCTIONS(RadioGroupBoxPage)
+};
 
 VelRadioGroupBox *automaticBox(QWidget *parent)
 {
-    auto *box = new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Automatic configuration")),
-                                     parent);
+    auto *box = new VelRadioGroupBox(PageTexts::tr("&Automatic configuration"), parent);
     auto *form = new QFormLayout(box);
-    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Script address:")), new QLineEdit(box));
-    form->addRow(
-        new QCheckBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Ask again at every start")), box));
+    form->addRow(PageTexts::tr("Script address:"), new QLineEdit(box));
+    form->addRow(new QCheckBox(PageTexts::tr("Ask again at every start"), box));
     return box;
 }
 
 VelRadioGroupBox *manualBox(QWidget *parent)
 {
-    auto *box =
-        new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Manual configuration")), parent);
+    auto *box = new VelRadioGroupBox(PageTexts::tr("&Manual configuration"), parent);
     auto *port = new QSpinBox(box);
     port->setRange(1, 65535);
     port->setValue(8080);
     auto *protocol = new QComboBox(box);
     protocol->addItems({QStringLiteral("HTTP"), QStringLiteral("SOCKS")});
     auto *form = new QFormLayout(box);
-    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Host:")), new QLineEdit(box));
-    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Port:")), port);
-    form->addRow(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Protocol:")), protocol);
+    form->addRow(PageTexts::tr("Host:"), new QLineEdit(box));
+    form->addRow(PageTexts::tr("Port:"), port);
+    form->addRow(PageTexts::tr("Protocol:"), protocol);
     return box;
 }
 
 VelRadioGroupBox *noneBox(QWidget *parent)
 {
-    auto *box =
-        new VelRadioGroupBox(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "&Direct connection")), parent);
-    auto *note = new QLabel(text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "There is nothing to set.")), box);
+    auto *box = new VelRadioGroupBox(PageTexts::tr("&Direct connection"), parent);
+    auto *note = new QLabel(PageTexts::tr("There is nothing to set."), box);
     auto *layout = new QVBoxLayout(box);
     layout->addWidget(note);
     return box;
@@ -83,8 +79,8 @@ GalleryPage radioGroupBoxPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("radio-group-box");
-    page.title = text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Radio group boxes"));
-    page.category = text(QT_TRANSLATE_NOOP("RadioGroupBoxPage", "Widgets"));
+    page.title = PageTexts::tr("Radio group boxes");
+    page.category = PageTexts::tr("Widgets");
     page.snippet =
         QStringLiteral(R"(auto *automatic = new VelRadioGroupBox(tr("&Automatic configuration"), page);
 auto *manual = new VelRadioGroupBox(tr("&Manual configuration"), page);
