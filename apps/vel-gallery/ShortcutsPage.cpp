@@ -9,7 +9,6 @@
 #include <ShortcutsModel.h>
 
 #include <QAction>
-#include <QCoreApplication>
 #include <QLabel>
 #include <QMainWindow>
 #include <QMenu>
@@ -23,104 +22,130 @@
 
 namespace {
 
-struct PageTexts
-{
-    Q_DECLARE_TR_FUNCTIONS(ShortcutsPage)
-};
-
+const QString settingsName = QStringLiteral("vel-gallery");
 const QString settingsGroup = QStringLiteral("Shortcuts");
 
-QString settingsName()
+QKeySequence portableKey(const QString &key)
 {
-    return QStringLiteral("vel-gallery");
+    return QKeySequence(key, QKeySequence::PortableText);
 }
 
-void configure(QMainWindow *page, ShortcutsModel *model)
+void deleteLine(QPlainTextEdit *editor)
 {
-    const QPointer<EditShortcutsDialog> dialog(new EditShortcutsDialog(model, page));
-    if (dialog->exec() == QDialog::Accepted && dialog) {
-        QSettings settings(settingsName(), settingsName());
-        model->saveKeys(&settings, settingsGroup);
+    QTextCursor cursor = editor->textCursor();
+    cursor.movePosition(QTextCursor::StartOfBlock);
+    if (!cursor.movePosition(QTextCursor::NextBlock, QTextCursor::KeepAnchor))
+        cursor.movePosition(QTextCursor::EndOfBlock, QTextCursor::KeepAnchor);
+    cursor.removeSelectedText();
+}
+
+// A small text editor whose keys the user can change, with each kind of shortcut object.
+class ShortcutsPage : public QMainWindow
+{
+    Q_OBJECT
+
+public:
+    explicit ShortcutsPage(QWidget *parent)
+        : QMainWindow(parent, Qt::Widget)
+    {
+        QSettings settings(settingsName, settingsName);
+        m_model = new ShortcutsModel(&settings, settingsGroup, this);
+        m_model->setObjectName(QStringLiteral("shortcutsModel"));
+        buildEditor();
+        addCommands();
+        addEditorKey(settings);
+        addFocusShortcut();
+        addConfigureAction();
     }
-    delete dialog;
-}
 
-// The menus of the commands, each with its action of the command's name.
-void addCommands(QMainWindow *page, QPlainTextEdit *editor, QLabel *last, ShortcutsModel *model)
-{
-    QMap<QString, QMenu *> menus;
-    const auto commands = editorCommands();
-    for (const EditorCommand &command : commands) {
-        QMenu *&menu = menus[command.menu];
-        if (!menu)
-            menu = page->menuBar()->addMenu(command.menu);
-        QAction *action = menu->addAction(command.text);
-        action->setObjectName(command.name);
-        action->setShortcut(QKeySequence(command.key, QKeySequence::PortableText));
-        QObject::connect(action, &QAction::triggered, editor, [editor, last, action, command] {
-            command.run(editor);
-            last->setText(PageTexts::tr("Last command: %1").arg(action->iconText()));
-        });
-        model->registerAction(command.name, action, command.menu);
+    static QString pageTitle() { return tr("Shortcuts"); }
+    static QString pageCategory() { return tr("Shortcuts"); }
+
+private:
+    void buildEditor()
+    {
+        m_editor = new QPlainTextEdit(this);
+        m_editor->setObjectName(QStringLiteral("editor"));
+        m_editor->setPlainText(tr("one line\nanother line\nand a third one\n"));
+        setCentralWidget(m_editor);
+        m_last = new QLabel(this);
+        m_last->setObjectName(QStringLiteral("lastCommand"));
+        statusBar()->addWidget(m_last);
+        statusBar()->setSizeGripEnabled(false);
     }
-}
 
-// A key that is no action's; its saved key is not the model's business.
-void addEditorKey(QPlainTextEdit *editor, QLabel *last, ShortcutsModel *model, const QSettings &settings)
-{
-    const QString text = PageTexts::tr("Delete the whole line");
-    const auto deleteLine = [last, text](QPlainTextEdit *e) {
-        QTextCursor cursor = e->textCursor();
-        cursor.movePosition(QTextCursor::StartOfBlock);
-        if (!cursor.movePosition(QTextCursor::NextBlock, QTextCursor::KeepAnchor))
-            cursor.movePosition(QTextCursor::EndOfBlock, QTextCursor::KeepAnchor);
-        cursor.removeSelectedText();
-        last->setText(PageTexts::tr("Last command: %1").arg(text));
-    };
-    auto *key =
-        new EditorKey(editor,
-                      {QStringLiteral("delete-line"), EditorTexts::tr("Text"), text,
-                       QKeySequence(QStringLiteral("Ctrl+Shift+K"), QKeySequence::PortableText), deleteLine});
-    const QVariant saved = settings.value(settingsGroup + QLatin1Char('/') + key->name());
-    if (saved.isValid()) {
-        key->setObjectKeySequence(QKeySequence(saved.toString(), QKeySequence::PortableText));
-        key->reset();
+    // The menus of the commands, each with its action of the command's name.
+    void addCommands()
+    {
+        QMap<QString, QMenu *> menus;
+        const auto commands = editorCommands();
+        for (const EditorCommand &command : commands) {
+            QMenu *&menu = menus[command.menu];
+            if (!menu)
+                menu = menuBar()->addMenu(command.menu);
+            QAction *action = menu->addAction(command.text);
+            action->setObjectName(command.name);
+            action->setShortcut(portableKey(command.key));
+            connect(action, &QAction::triggered, m_editor, [this, action, command] {
+                command.run(m_editor);
+                showLast(action->iconText());
+            });
+            m_model->registerAction(command.name, action, command.menu);
+        }
     }
-    model->registerShortcutObject(key);
-}
 
-QWidget *createPage(const GalleryContext &context, QWidget *parent)
-{
-    Q_UNUSED(context)
-    auto *page = new QMainWindow(parent, Qt::Widget);
-    QSettings settings(settingsName(), settingsName());
-    auto *model = new ShortcutsModel(&settings, settingsGroup, page);
-    model->setObjectName(QStringLiteral("shortcutsModel"));
-    auto *editor = new QPlainTextEdit(page);
-    editor->setObjectName(QStringLiteral("editor"));
-    editor->setPlainText(PageTexts::tr("one line\nanother line\nand a third one\n"));
-    page->setCentralWidget(editor);
-    auto *last = new QLabel(page);
-    last->setObjectName(QStringLiteral("lastCommand"));
-    page->statusBar()->addWidget(last);
-    page->statusBar()->setSizeGripEnabled(false);
-    addCommands(page, editor, last, model);
-    addEditorKey(editor, last, model, settings);
+    // A key that is no action's; its saved key is not the model's business.
+    void addEditorKey(const QSettings &settings)
+    {
+        const QString text = tr("Delete the whole line");
+        const auto run = [this, text](QPlainTextEdit *editor) {
+            deleteLine(editor);
+            showLast(text);
+        };
+        auto *key = new EditorKey(m_editor,
+                                  {QStringLiteral("delete-line"), EditorTexts::tr("Text"), text,
+                                   portableKey(QStringLiteral("Ctrl+Shift+K")), run});
+        const QVariant saved = settings.value(settingsGroup + QLatin1Char('/') + key->name());
+        if (saved.isValid()) {
+            key->setObjectKeySequence(portableKey(saved.toString()));
+            key->reset();
+        }
+        m_model->registerShortcutObject(key);
+    }
 
-    auto *focusShortcut = new QShortcut(QKeySequence(Qt::Key_F6), page);
-    QObject::connect(focusShortcut, &QShortcut::activated, editor, [editor] { editor->setFocus(); });
-    model->registerShortcut(QStringLiteral("focus-editor"), focusShortcut, PageTexts::tr("Go to the editor"),
-                            PageTexts::tr("View"));
+    void addFocusShortcut()
+    {
+        auto *shortcut = new QShortcut(QKeySequence(Qt::Key_F6), this);
+        connect(shortcut, &QShortcut::activated, m_editor, [this] { m_editor->setFocus(); });
+        m_model->registerShortcut(QStringLiteral("focus-editor"), shortcut, tr("Go to the editor"),
+                                  tr("View"));
+    }
 
-    QAction *configureAction = page->menuBar()
-                                   ->addMenu(PageTexts::tr("Settings"))
-                                   ->addAction(PageTexts::tr("Configure shortcuts..."));
-    configureAction->setObjectName(QStringLiteral("configure-shortcuts"));
-    configureAction->setShortcut(QKeySequence(QStringLiteral("Ctrl+F12"), QKeySequence::PortableText));
-    QObject::connect(configureAction, &QAction::triggered, page, [page, model] { configure(page, model); });
-    model->registerAction(configureAction->objectName(), configureAction, PageTexts::tr("Settings"));
-    return page;
-}
+    void addConfigureAction()
+    {
+        QAction *action = menuBar()->addMenu(tr("Settings"))->addAction(tr("Configure shortcuts..."));
+        action->setObjectName(QStringLiteral("configure-shortcuts"));
+        action->setShortcut(portableKey(QStringLiteral("Ctrl+F12")));
+        connect(action, &QAction::triggered, this, &ShortcutsPage::configure);
+        m_model->registerAction(action->objectName(), action, tr("Settings"));
+    }
+
+    void configure()
+    {
+        const QPointer<EditShortcutsDialog> dialog(new EditShortcutsDialog(m_model, this));
+        if (dialog->exec() == QDialog::Accepted && dialog) {
+            QSettings settings(settingsName, settingsName);
+            m_model->saveKeys(&settings, settingsGroup);
+        }
+        delete dialog;
+    }
+
+    void showLast(const QString &command) { m_last->setText(tr("Last command: %1").arg(command)); }
+
+    ShortcutsModel *m_model = nullptr;
+    QPlainTextEdit *m_editor = nullptr;
+    QLabel *m_last = nullptr;
+};
 
 } // namespace
 
@@ -128,8 +153,8 @@ GalleryPage shortcutsPage()
 {
     GalleryPage page;
     page.name = QStringLiteral("shortcuts");
-    page.title = PageTexts::tr("Shortcuts");
-    page.category = PageTexts::tr("Shortcuts");
+    page.title = ShortcutsPage::pageTitle();
+    page.category = ShortcutsPage::pageCategory();
     page.snippet = QStringLiteral(R"(QSettings settings;
 auto *model = new ShortcutsModel(&settings, "Shortcuts", this);
 model->registerAction("file-save", saveAction, tr("File"));
@@ -140,6 +165,8 @@ model->registerShortcutObject(new EditorKey(editor, deleteLine));
 EditShortcutsDialog dialog(model, this);
 if (dialog.exec() == QDialog::Accepted)
     model->saveKeys(&settings, "Shortcuts");)");
-    page.create = createPage;
+    page.create = [](const GalleryContext &, QWidget *parent) { return new ShortcutsPage(parent); };
     return page;
 }
+
+#include "ShortcutsPage.moc"
