@@ -35,7 +35,6 @@ constexpr std::string_view Keywords = "Keywords";
 constexpr std::string_view SortOrder = "SortOrder";
 constexpr std::string_view Actions = "Actions";
 constexpr std::string_view DBusActivatable = "DBusActivatable";
-constexpr std::string_view Implements = "Implements";
 constexpr std::string_view PrefersNonDefaultGpu = "PrefersNonDefaultGPU";
 constexpr std::string_view SingleMainWindow = "SingleMainWindow";
 

@@ -158,17 +158,6 @@ void EntryDocument::setFlag(std::string_view group, std::string_view key, bool v
         m_changes.set({std::string(group), std::string(key), {}, std::string(value ? "true" : "false")});
 }
 
-bool EntryDocument::hasGroup(std::string_view group) const
-{
-    if (this->group(group).group() != DesktopEntryText::NoGroup)
-        return true;
-    for (const auto &change : m_changes.all()) {
-        if (change.value && change.group == group)
-            return true;
-    }
-    return false;
-}
-
 void EntryDocument::removeKey(std::string_view group, std::string_view key)
 {
     std::unordered_set<std::string> inFile;

@@ -66,7 +66,6 @@ public:
     void setLocalList(std::string_view group, std::string_view key, const QStringList &value);
     void setFlag(std::string_view group, std::string_view key, bool value);
 
-    bool hasGroup(std::string_view group) const;
     /// Removes a key in all languages.
     void removeKey(std::string_view group, std::string_view key);
     void removeGroups(const std::unordered_set<std::string> &groups);

@@ -26,7 +26,6 @@ struct FileStamp
     explicit FileStamp(const struct stat &status);
 
     bool operator==(const FileStamp &other) const;
-    bool operator!=(const FileStamp &other) const { return !(*this == other); }
 
     /// Whether a later change is sure to give another stamp: neither time is younger than 50 ms.
     bool isSettled() const;
