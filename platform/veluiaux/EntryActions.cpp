@@ -58,7 +58,7 @@ QList<VelUIDesktopAction> writable(const QList<VelUIDesktopAction> &actions, con
 VelUIDesktopAction read(const EntryDocument &entry, const QString &id)
 {
     const std::string name = groupOf(id);
-    const EntryReader group = entry.group(name);
+    const GroupValues group = entry.group(name);
     VelUIDesktopAction action(id);
     action.setName(group.text(Names::Name));
     action.setLocalName(group.localText(Names::Name));

@@ -4,6 +4,7 @@
 #include "TestCase.h"
 
 #include <EntryDocument.h>
+#include <EntryFile.h>
 #include <SharedTexts.h>
 
 #include <fcntl.h>
@@ -41,7 +42,7 @@ QByteArray tst_SharedTexts::settled(const QString &name, const QByteArray &bytes
 {
     const QByteArray file = QFile::encodeName(write(name, bytes));
     const auto isSettled = [&file] {
-        const auto read = EntryFile::readAnew(file);
+        const auto read = EntryFile::read(file);
         return read && read->settled;
     };
     if (!QTest::qWaitFor(isSettled))
@@ -52,17 +53,17 @@ QByteArray tst_SharedTexts::settled(const QString &name, const QByteArray &bytes
 void tst_SharedTexts::givesOneTextForAnUnchangedFile()
 {
     const QByteArray file = settled(QStringLiteral("x"), "[Desktop Entry]\n");
-    const auto first = EntryFile::read(file);
-    const auto second = EntryFile::read(file);
+    const auto first = SharedTexts::instance().findOrRead(file, EntryFile::read);
+    const auto second = SharedTexts::instance().findOrRead(file, EntryFile::read);
     QVERIFY(first && second);
     QCOMPARE(first->text.get(), second->text.get());
-    QVERIFY(EntryFile::readAnew(file)->text.get() != first->text.get());
+    QVERIFY(EntryFile::read(file)->text.get() != first->text.get());
 }
 
 void tst_SharedTexts::doesNotKeepAFileThatIsTooYoung()
 {
     const QByteArray file = QFile::encodeName(write(QStringLiteral("x"), "[Desktop Entry]\n"));
-    const auto first = EntryFile::read(file);
+    const auto first = SharedTexts::instance().findOrRead(file, EntryFile::read);
     QVERIFY(first);
     if (first->settled)
         QSKIP("the machine was too slow to read the file within 50 ms");
@@ -76,7 +77,7 @@ void tst_SharedTexts::doesNotKeepAFileFromTheFuture()
     ::clock_gettime(CLOCK_REALTIME, &now);
     const struct timespec times[] = {{now.tv_sec + 3600, 0}, {now.tv_sec + 3600, 0}};
     QCOMPARE(::utimensat(AT_FDCWD, file.constData(), times, 0), 0);
-    QVERIFY(!EntryFile::read(file)->settled);
+    QVERIFY(!SharedTexts::instance().findOrRead(file, EntryFile::read)->settled);
     QCOMPARE(SharedTexts::instance().cost(), std::size_t(0));
 }
 
@@ -93,7 +94,7 @@ void tst_SharedTexts::readsAnewWhatHasChanged()
 {
     QFETCH(QString, how);
     const QByteArray file = settled(QStringLiteral("x"), "[A]\n");
-    const auto first = EntryFile::read(file);
+    const auto first = SharedTexts::instance().findOrRead(file, EntryFile::read);
     struct stat status;
     QCOMPARE(::stat(file.constData(), &status), 0);
     const struct timespec times[] = {status.st_atim, status.st_mtim};
@@ -109,7 +110,7 @@ void tst_SharedTexts::readsAnewWhatHasChanged()
     } else {
         QCOMPARE(::utimensat(AT_FDCWD, file.constData(), nullptr, 0), 0);
     }
-    const auto second = EntryFile::read(file);
+    const auto second = SharedTexts::instance().findOrRead(file, EntryFile::read);
     if (how == QLatin1String("gone")) {
         QVERIFY(!second);
         return;
@@ -121,7 +122,7 @@ void tst_SharedTexts::readsAnewWhatHasChanged()
 void tst_SharedTexts::staysWithinItsLimit()
 {
     const QByteArray file = settled(QStringLiteral("x"), "[Desktop Entry]\n" + QByteArray(100000, '#'));
-    const auto text = EntryFile::readAnew(file);
+    const auto text = EntryFile::read(file);
     SharedTexts texts;
     for (int i = 0; i < 200; ++i) {
         texts.insert(QByteArray::number(i), *text);
@@ -138,9 +139,9 @@ void tst_SharedTexts::forgetsTheLeastRecentlyUsed()
     const QByteArray unused =
         settled(QStringLiteral("unused"), "[Desktop Entry]\n" + QByteArray(100000, '#'));
     SharedTexts texts;
-    const auto file = EntryFile::readAnew(used);
+    const auto file = EntryFile::read(used);
     texts.insert(used, *file);
-    texts.insert(unused, *EntryFile::readAnew(unused));
+    texts.insert(unused, *EntryFile::read(unused));
     for (int i = 0; i < 200; ++i) {
         texts.insert(QByteArray::number(i), *file);
         QVERIFY(texts.find(used));

@@ -6,6 +6,7 @@
 #include "DesktopEntryNames.h"
 #include "DesktopEntryValue.h"
 #include "DesktopEntryWriter.h"
+#include "EntryFile.h"
 #include "SharedTexts.h"
 
 #include <velcore/language.h>
@@ -59,7 +60,7 @@ void EntryDocument::setPath(const QByteArray &path)
 bool EntryDocument::load()
 {
     m_changes = {};
-    auto file = EntryFile::read(m_path);
+    auto file = SharedTexts::instance().findOrRead(m_path, EntryFile::read);
     m_read = file.has_value();
     m_textPath = m_path;
     m_text = file ? std::move(file->text) : emptyText();
@@ -179,19 +180,18 @@ void EntryDocument::removeGroups(const std::unordered_set<std::string> &groups)
     m_changes.removeGroups(groups);
 }
 
-std::vector<EntryDocument::Entry> EntryDocument::entries() const
+std::vector<EntryDocument::KeyValue> EntryDocument::keyValues() const
 {
-    std::vector<Entry> entries;
+    std::vector<KeyValue> all;
     std::unordered_map<std::string, std::size_t> known;
     const auto add = [&](std::string_view group, std::string_view key, std::string_view locale,
                          std::string_view value) {
         const std::string place = std::string(group) + '\n' + std::string(key) + '\n' + std::string(locale);
-        const auto [found, isNew] = known.emplace(place, entries.size());
+        const auto [found, isNew] = known.emplace(place, all.size());
         if (isNew)
-            entries.push_back(
-                {std::string(group), std::string(key), std::string(locale), std::string(value)});
+            all.push_back({std::string(group), std::string(key), std::string(locale), std::string(value)});
         else
-            entries[found->second].value = value;
+            all[found->second].value = value;
     };
     for (std::size_t i = 0; i < m_text->groups().size(); ++i) {
         const auto &group = m_text->groups()[i];
@@ -210,7 +210,7 @@ std::vector<EntryDocument::Entry> EntryDocument::entries() const
         if (change.value)
             add(change.group, change.key, change.locale, *change.value);
     }
-    return entries;
+    return all;
 }
 
 void EntryDocument::inheritFrom(const EntryDocument &other)
@@ -221,20 +221,20 @@ void EntryDocument::inheritFrom(const EntryDocument &other)
         for (const QString &id : other.list(Names::MainGroup, Names::Actions))
             actions.insert(Names::actionGroup(id.toStdString()));
     }
-    std::vector<Entry> taken;
-    for (Entry &entry : other.entries()) {
-        if (Names::isActionGroup(entry.group) && actions.count(entry.group) == 0)
+    std::vector<KeyValue> taken;
+    for (KeyValue &theirs : other.keyValues()) {
+        if (Names::isActionGroup(theirs.group) && actions.count(theirs.group) == 0)
             continue;
-        if (has(entry.group, entry.key))
+        if (has(theirs.group, theirs.key))
             continue;
-        if (!entry.locale.empty()
-            && (!other.has(entry.group, entry.key) || group(entry.group).value(entry.key, entry.locale)))
+        if (!theirs.locale.empty()
+            && (!other.has(theirs.group, theirs.key) || group(theirs.group).value(theirs.key, theirs.locale)))
             continue;
-        taken.push_back(std::move(entry));
+        taken.push_back(std::move(theirs));
     }
-    for (Entry &entry : taken)
+    for (KeyValue &key : taken)
         m_changes.set(
-            {std::move(entry.group), std::move(entry.key), std::move(entry.locale), std::move(entry.value)});
+            {std::move(key.group), std::move(key.key), std::move(key.locale), std::move(key.value)});
     m_valid = m_valid || (other.m_valid && !taken.empty());
 }
 
@@ -255,7 +255,7 @@ bool EntryDocument::save()
         return replace(*target, *m_text);
 
     // Somebody else may have written meanwhile: our changes go into what stands there now.
-    const auto file = EntryFile::readAnew(target->path);
+    const auto file = EntryFile::read(target->path);
     if (!file)
         return false;
     return replace(*target, file->text->bytes() == m_text->bytes() ? *m_text : *file->text);

@@ -5,8 +5,8 @@
 
 #include "AtomicFile.h"
 #include "DesktopEntryChanges.h"
-#include "EntryFile.h"
-#include "EntryReader.h"
+#include "FileStamp.h"
+#include "GroupValues.h"
 
 #include <QByteArray>
 #include <QString>
@@ -28,7 +28,7 @@ class EntryDocument
 {
 public:
     /// A key with the value it has now, as it stands (or is to stand) in the file.
-    struct Entry
+    struct KeyValue
     {
         std::string group;
         std::string key;
@@ -50,7 +50,7 @@ public:
     void inheritFrom(const EntryDocument &other);
 
     /// The values of one group, for looking at several at once; see there for how long.
-    EntryReader group(std::string_view name) const { return {*m_text, m_changes, name}; }
+    GroupValues group(std::string_view name) const { return {*m_text, m_changes, name}; }
 
     /// Whether the key stands in the entry, if only with an empty value.
     bool has(std::string_view group, std::string_view key) const;
@@ -71,7 +71,7 @@ public:
     void removeGroups(const std::unordered_set<std::string> &groups);
 
     /// All keys that count, in the order of the file, then of the setting.
-    std::vector<Entry> entries() const;
+    std::vector<KeyValue> keyValues() const;
 
 private:
     template <typename T>

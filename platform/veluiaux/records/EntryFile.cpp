@@ -4,9 +4,7 @@
 #include "EntryFile.h"
 
 #include "FileDescriptor.h"
-#include "SharedTexts.h"
 
-#include <ctime>
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -14,14 +12,6 @@
 #include <cerrno>
 
 namespace {
-
-constexpr std::int64_t Second = 1000000000;
-constexpr std::int64_t SettlingTime = Second / 20;
-
-std::int64_t nanoseconds(const timespec &time)
-{
-    return std::int64_t(time.tv_sec) * Second + time.tv_nsec;
-}
 
 // Reads until the end, or until there is more than a desktop entry may have.
 bool readAll(int file, int expected, QByteArray *bytes)
@@ -48,30 +38,7 @@ bool readAll(int file, int expected, QByteArray *bytes)
 
 } // namespace
 
-FileStamp::FileStamp(const struct stat &status)
-    : device(status.st_dev)
-    , inode(status.st_ino)
-    , size(status.st_size)
-    , modified(nanoseconds(status.st_mtim))
-    , changed(nanoseconds(status.st_ctim))
-{
-}
-
-bool FileStamp::operator==(const FileStamp &other) const
-{
-    return device == other.device && inode == other.inode && size == other.size && modified == other.modified
-        && changed == other.changed;
-}
-
-bool FileStamp::isSettled() const
-{
-    timespec now;
-    ::clock_gettime(CLOCK_REALTIME, &now);
-    const std::int64_t latest = nanoseconds(now) - SettlingTime;
-    return modified <= latest && changed <= latest;
-}
-
-std::optional<EntryFile> EntryFile::readAnew(const QByteArray &path)
+std::optional<FileText> EntryFile::read(const QByteArray &path)
 {
     if (path.isEmpty() || path.contains('\0'))
         return std::nullopt;
@@ -82,7 +49,7 @@ std::optional<EntryFile> EntryFile::readAnew(const QByteArray &path)
         || status.st_size > LargestSize)
         return std::nullopt;
 
-    EntryFile result;
+    FileText result;
     result.stamp = FileStamp(status);
     result.settled = result.stamp.isSettled();
     QByteArray bytes;
@@ -91,15 +58,4 @@ std::optional<EntryFile> EntryFile::readAnew(const QByteArray &path)
     result.settled = result.settled && bytes.size() == result.stamp.size;
     result.text = std::make_shared<DesktopEntryText>(std::move(bytes));
     return result;
-}
-
-std::optional<EntryFile> EntryFile::read(const QByteArray &path)
-{
-    SharedTexts &shared = SharedTexts::instance();
-    if (auto known = shared.find(path))
-        return known;
-    auto file = readAnew(path);
-    if (file && file->settled)
-        shared.insert(path, *file);
-    return file;
 }

@@ -19,9 +19,19 @@ SharedTexts &SharedTexts::instance()
     return *texts;
 }
 
-std::optional<EntryFile> SharedTexts::find(const QByteArray &path)
+std::optional<FileText> SharedTexts::findOrRead(const QByteArray &path, Reader read)
 {
-    std::optional<EntryFile> known;
+    if (auto known = find(path))
+        return known;
+    auto file = read(path);
+    if (file && file->settled)
+        insert(path, *file);
+    return file;
+}
+
+std::optional<FileText> SharedTexts::find(const QByteArray &path)
+{
+    std::optional<FileText> known;
     {
         const std::lock_guard<std::mutex> lock(m_mutex);
         const auto found = m_index.constFind(path);
@@ -37,7 +47,7 @@ std::optional<EntryFile> SharedTexts::find(const QByteArray &path)
     return std::nullopt;
 }
 
-void SharedTexts::insert(const QByteArray &path, const EntryFile &file)
+void SharedTexts::insert(const QByteArray &path, const FileText &file)
 {
     const std::size_t cost = ItemCost + std::size_t(path.size()) + file.text->cost();
     const std::lock_guard<std::mutex> lock(m_mutex);

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "EntryFile.h"
+#include "FileText.h"
 
 #include <QByteArray>
 #include <QHash>
@@ -23,14 +23,20 @@
 class SharedTexts
 {
 public:
+    /// Reads a file from disk; none when that failed.
+    using Reader = std::optional<FileText> (*)(const QByteArray &path);
+
     /// The memory that texts and their indexes may take, in bytes.
     static constexpr std::size_t Limit = std::size_t(8) * 1024 * 1024;
 
     static SharedTexts &instance();
 
+    /// The text of \a path: the one that is known while the file is as it was, else what \a read
+    /// gives, which is kept for the next time if its stamp is settled.
+    std::optional<FileText> findOrRead(const QByteArray &path, Reader read);
     /// The text of \a path if it is known and the file still as it was.
-    std::optional<EntryFile> find(const QByteArray &path);
-    void insert(const QByteArray &path, const EntryFile &file);
+    std::optional<FileText> find(const QByteArray &path);
+    void insert(const QByteArray &path, const FileText &file);
     /// Forgets the text of \a path, which was just replaced.
     void remove(const QByteArray &path);
 
@@ -42,7 +48,7 @@ private:
     struct Item
     {
         QByteArray path;
-        EntryFile file;
+        FileText file;
         std::size_t cost;
     };
     using Items = std::list<Item>; // the most recently used first

@@ -20,12 +20,12 @@
  * Finds the group and the user's language once for all values. For use at once, not for
  * keeping: text, changes, the name of the group and the environment have to stay as they are.
  */
-class EntryReader
+class GroupValues
 {
 public:
     using Value = std::optional<std::string_view>;
 
-    EntryReader(const DesktopEntryText &text, const DesktopEntryChanges &changes, std::string_view group);
+    GroupValues(const DesktopEntryText &text, const DesktopEntryChanges &changes, std::string_view group);
 
     /// The group in the text, unless it is removed.
     int group() const { return m_index; }
@@ -35,7 +35,7 @@ public:
     /// The bytes of a value with what was changed.
     Value value(std::string_view key, std::string_view locale = {}) const;
 
-    /// The value as QString or QStringList; none if it is missing or spoiled.
+    /// The value as QString or QStringList; none if it is missing or malformed.
     template <typename T>
     std::optional<T> read(std::string_view key) const;
     /// The value in the user's language, and of which variant it is.

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "EntryReader.h"
+#include "GroupValues.h"
 
 #include "DesktopEntryValue.h"
 
-EntryReader::EntryReader(const DesktopEntryText &text, const DesktopEntryChanges &changes,
+GroupValues::GroupValues(const DesktopEntryText &text, const DesktopEntryChanges &changes,
                          std::string_view group)
     : m_text(text)
     , m_changes(changes)
@@ -14,20 +14,20 @@ EntryReader::EntryReader(const DesktopEntryText &text, const DesktopEntryChanges
 {
 }
 
-const MessageLocale &EntryReader::locale() const
+const MessageLocale &GroupValues::locale() const
 {
     if (!m_locale)
         m_locale = MessageLocale::current();
     return *m_locale;
 }
 
-EntryReader::Value EntryReader::base(std::string_view key, std::string_view locale) const
+GroupValues::Value GroupValues::base(std::string_view key, std::string_view locale) const
 {
     const auto place = m_text.key(m_index, key, locale);
     return place ? Value(m_text.value(*place)) : std::nullopt;
 }
 
-EntryReader::Value EntryReader::value(std::string_view key, std::string_view locale) const
+GroupValues::Value GroupValues::value(std::string_view key, std::string_view locale) const
 {
     if (const auto *change = m_changes.find(m_group, key, locale))
         return change->value ? Value(*change->value) : std::nullopt;
@@ -35,14 +35,14 @@ EntryReader::Value EntryReader::value(std::string_view key, std::string_view loc
 }
 
 template <typename T>
-std::optional<T> EntryReader::read(std::string_view key) const
+std::optional<T> GroupValues::read(std::string_view key) const
 {
     const Value bytes = value(key);
     return bytes ? DesktopEntryValue::decode<T>(*bytes) : std::nullopt;
 }
 
 template <typename T>
-std::optional<T> EntryReader::readLocal(std::string_view key, std::string *locale) const
+std::optional<T> GroupValues::readLocal(std::string_view key, std::string *locale) const
 {
     const MessageLocale &messages = this->locale();
     Value byRank[MessageLocale::BestRank + 1];
@@ -56,7 +56,7 @@ std::optional<T> EntryReader::readLocal(std::string_view key, std::string *local
             if (const auto *change = wanted.empty() ? nullptr : m_changes.find(m_group, key, wanted))
                 byRank[rank] = change->value ? Value(*change->value) : std::nullopt;
         }
-        // A variant that is spoiled does not stand in the way of a less exact one.
+        // A variant that is malformed does not stand in the way of a less exact one.
         auto result = byRank[rank] ? DesktopEntryValue::decode<T>(*byRank[rank]) : std::nullopt;
         if (!result)
             continue;
@@ -67,12 +67,12 @@ std::optional<T> EntryReader::readLocal(std::string_view key, std::string *local
     return std::nullopt;
 }
 
-template std::optional<QString> EntryReader::read(std::string_view key) const;
-template std::optional<QStringList> EntryReader::read(std::string_view key) const;
-template std::optional<QString> EntryReader::readLocal(std::string_view key, std::string *locale) const;
-template std::optional<QStringList> EntryReader::readLocal(std::string_view key, std::string *locale) const;
+template std::optional<QString> GroupValues::read(std::string_view key) const;
+template std::optional<QStringList> GroupValues::read(std::string_view key) const;
+template std::optional<QString> GroupValues::readLocal(std::string_view key, std::string *locale) const;
+template std::optional<QStringList> GroupValues::readLocal(std::string_view key, std::string *locale) const;
 
-bool EntryReader::flag(std::string_view key) const
+bool GroupValues::flag(std::string_view key) const
 {
     const Value bytes = value(key);
     return bytes && DesktopEntryValue::toFlag(*bytes);

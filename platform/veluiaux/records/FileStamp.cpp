@@ -1,0 +1,42 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FileStamp.h"
+
+#include <ctime>
+#include <sys/stat.h>
+
+namespace {
+
+constexpr std::int64_t Second = 1000000000;
+constexpr std::int64_t SettlingTime = Second / 20;
+
+std::int64_t nanoseconds(const timespec &time)
+{
+    return std::int64_t(time.tv_sec) * Second + time.tv_nsec;
+}
+
+} // namespace
+
+FileStamp::FileStamp(const struct stat &status)
+    : device(status.st_dev)
+    , inode(status.st_ino)
+    , size(status.st_size)
+    , modified(nanoseconds(status.st_mtim))
+    , changed(nanoseconds(status.st_ctim))
+{
+}
+
+bool FileStamp::operator==(const FileStamp &other) const
+{
+    return device == other.device && inode == other.inode && size == other.size && modified == other.modified
+        && changed == other.changed;
+}
+
+bool FileStamp::isSettled() const
+{
+    timespec now;
+    ::clock_gettime(CLOCK_REALTIME, &now);
+    const std::int64_t latest = nanoseconds(now) - SettlingTime;
+    return modified <= latest && changed <= latest;
+}
