@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-// The keys of the main group one by one, in the order of the header.
+// The getters and setters of the main group's keys, in the order of the header.
 
 #include <veluiaux/VelUIDesktopEntry.h>
 
