@@ -3,7 +3,7 @@
 
 #include "EmblemLayout.h"
 
-#include <QtMath>
+#include <QtGlobal>
 
 int EmblemLayout::extent(int extent)
 {
@@ -15,11 +15,18 @@ int EmblemLayout::extent(int extent)
     return extent / 2;
 }
 
-QRect EmblemLayout::square(const QSize &picture, qreal ratio, Qt::Corner corner)
+QRect EmblemLayout::square(const QSize &pixmap, qreal ratio, Qt::Corner corner)
 {
-    const int logical = qRound(qMin(picture.width(), picture.height()) / ratio);
+    const int logical = qRound(qMin(pixmap.width(), pixmap.height()) / ratio);
     const int edge = qRound(extent(logical) * ratio);
+    const QSize size(edge, edge);
+    return QRect(place(size, QRect(QPoint(), pixmap), corner), size);
+}
+
+QPoint EmblemLayout::place(const QSize &size, const QRect &rect, Qt::Corner corner)
+{
     const bool right = corner == Qt::TopRightCorner || corner == Qt::BottomRightCorner;
     const bool bottom = corner == Qt::BottomLeftCorner || corner == Qt::BottomRightCorner;
-    return QRect(right ? picture.width() - edge : 0, bottom ? picture.height() - edge : 0, edge, edge);
+    return QPoint(rect.x() + (right ? rect.width() - size.width() : 0),
+                  rect.y() + (bottom ? rect.height() - size.height() : 0));
 }

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <QPoint>
 #include <QRect>
 #include <QSize>
 #include <Qt>
@@ -14,12 +15,15 @@ namespace EmblemLayout {
 int extent(int extent);
 
 /**
- * The square of an emblem, in the pixels of the picture it is drawn on.
+ * The square of an emblem, in the pixels of the pixmap it is drawn on.
  *
- * @param picture size of the picture
- * @param ratio pixels of the picture for one logical pixel
- * @param corner the corner of the picture, whatever the direction of the layout
+ * @param pixmap size of the pixmap
+ * @param ratio pixels of the pixmap for one logical pixel
+ * @param corner the corner of the pixmap, whatever the direction of the layout
  */
-QRect square(const QSize &picture, qreal ratio, Qt::Corner corner);
+QRect square(const QSize &pixmap, qreal ratio, Qt::Corner corner);
+
+/// Where what is of \a size stands in the corner \a corner of \a rect.
+QPoint place(const QSize &size, const QRect &rect, Qt::Corner corner);
 
 } // namespace EmblemLayout

@@ -4,7 +4,6 @@
 #include "IconDrawing.h"
 
 #include "EmblemLayout.h"
-#include "LazyIconEngine.h"
 
 #include <QGuiApplication>
 #include <QPainter>
@@ -12,45 +11,34 @@
 
 namespace {
 
-/// The pixel ratio at which QIcon::pixmap() makes its pictures.
+/// The pixel ratio at which QIcon::pixmap() makes its pixmaps.
 qreal ratioOfQt()
 {
     return QCoreApplication::testAttribute(Qt::AA_UseHighDpiPixmaps) ? qGuiApp->devicePixelRatio() : 1.0;
 }
 
-/// Where a picture of \a size stands in \a square, which lies in \a corner.
-QPoint placeInCorner(const QSize &size, const QRect &square, Qt::Corner corner)
-{
-    const bool right = corner == Qt::TopRightCorner || corner == Qt::BottomRightCorner;
-    const bool bottom = corner == Qt::BottomLeftCorner || corner == Qt::BottomRightCorner;
-    return QPoint(square.x() + (right ? square.width() - size.width() : 0),
-                  square.y() + (bottom ? square.height() - size.height() : 0));
-}
-
 } // namespace
 
-QPixmap IconDrawing::picture(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode,
-                             QIcon::State state)
+QPixmap IconDrawing::pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode,
+                            QIcon::State state)
 {
     // Asked for a logical size, QIcon multiplies it by its own ratio.
     const qreal ratio = ratioOfQt();
     const QSize size(qFloor(pixels.width() / ratio), qFloor(pixels.height() / ratio));
-    QPixmap picture = icon.pixmap(size, mode, state);
-    picture.setDevicePixelRatio(1);
-    if (fit == Fit::Exactly && !picture.isNull() && picture.size() != pixels)
-        picture = picture.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
-    return picture;
+    QPixmap pixmap = icon.pixmap(size, mode, state);
+    pixmap.setDevicePixelRatio(1);
+    if (fit == Fit::Exactly && !pixmap.isNull() && pixmap.size() != pixels)
+        pixmap = pixmap.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+    return pixmap;
 }
 
-void IconDrawing::layEmblems(QPixmap &picture, const QMap<Qt::Corner, QString> &emblems, qreal ratio,
-                             QIcon::Mode mode)
+void IconDrawing::overlayEmblems(QPixmap &pixmap, const QMap<Qt::Corner, QPixmap> &emblems, qreal ratio)
 {
-    QPainter painter(&picture);
+    QPainter painter(&pixmap);
     for (auto it = emblems.cbegin(); it != emblems.cend(); ++it) {
-        const QRect square = EmblemLayout::square(picture.size(), ratio, it.key());
-        const LazyIconEngine engine(it.value(), {}, QIcon());
-        QPixmap emblem = engine.picture(square.size(), ratio, Fit::AtMost, mode, QIcon::Off);
+        const QRect square = EmblemLayout::square(pixmap.size(), ratio, it.key());
+        QPixmap emblem = it.value();
         emblem.setDevicePixelRatio(1);
-        painter.drawPixmap(placeInCorner(emblem.size(), square, it.key()), emblem);
+        painter.drawPixmap(EmblemLayout::place(emblem.size(), square, it.key()), emblem);
     }
 }

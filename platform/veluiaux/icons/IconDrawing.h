@@ -6,25 +6,25 @@
 #include <QIcon>
 #include <QMap>
 #include <QPixmap>
-#include <QString>
+#include <QSize>
 
-/// Makes the pictures of icons; remembers nothing.
+/// Makes the pixmaps of icons; remembers nothing and looks nothing up.
 namespace IconDrawing {
 
-/// How a picture fills the pixels that it is made for.
+/// How a pixmap fills the pixels that it is made for.
 enum class Fit {
-    AtMost, ///< smaller where the icon has no picture as large
-    Exactly ///< scaled where the icon has no picture of that size
+    AtMost, ///< smaller where the icon has no pixmap as large
+    Exactly ///< scaled where the icon has no pixmap of that size
 };
 
 /**
- * The picture of \a icon for \a pixels of the device, with a pixel ratio of 1; null when the
+ * The pixmap of \a icon for \a pixels of the device, with a pixel ratio of 1; null when the
  * icon has none.
  */
-QPixmap picture(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode, QIcon::State state);
+QPixmap pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode, QIcon::State state);
 
-/// Lays \a emblems, names of theme icons, into the corners of \a picture, which has \a ratio
-/// pixels for one logical pixel.
-void layEmblems(QPixmap &picture, const QMap<Qt::Corner, QString> &emblems, qreal ratio, QIcon::Mode mode);
+/// Draws \a emblems over the corners of \a pixmap, which has \a ratio pixels for one logical
+/// pixel; EmblemLayout says how large they may be. A null emblem is left out.
+void overlayEmblems(QPixmap &pixmap, const QMap<Qt::Corner, QPixmap> &emblems, qreal ratio);
 
 } // namespace IconDrawing

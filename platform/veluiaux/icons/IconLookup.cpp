@@ -9,7 +9,7 @@
 
 namespace {
 
-QString withoutPictureSuffix(const QString &name)
+QString withoutImageSuffix(const QString &name)
 {
     for (const QLatin1String suffix :
          {QLatin1String(".png"), QLatin1String(".svg"), QLatin1String(".svgz"), QLatin1String(".xpm")}) {
@@ -25,8 +25,8 @@ QIcon iconOfFile(const QString &path)
     if (!QFileInfo(path).isFile())
         return QIcon();
     QIcon icon(path);
-    // What only has the suffix of a picture gives an icon that is not null; a drawing has no
-    // sizes of its own, but can be made in any.
+    // What only has the suffix of an image gives an icon that is not null; a drawing has no sizes
+    // of its own, but can be made in any.
     if (icon.availableSizes().isEmpty() && icon.actualSize(QSize(16, 16)).isEmpty())
         return QIcon();
     return icon;
@@ -38,7 +38,7 @@ QIcon IconLookup::find(const QString &name)
 {
     if (QDir::isAbsolutePath(name))
         return iconOfFile(name);
-    const QIcon icon = QIcon::fromTheme(withoutPictureSuffix(name));
+    const QIcon icon = QIcon::fromTheme(withoutImageSuffix(name));
     return icon.isNull() || icon.availableSizes().isEmpty() ? QIcon() : icon;
 }
 

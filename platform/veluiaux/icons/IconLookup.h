@@ -9,7 +9,7 @@
 /// Finds icons by the names that desktop entries use.
 namespace IconLookup {
 
-/// The icon \a name: a theme name, one with the suffix of a picture file, or an absolute path.
+/// The icon \a name: a theme name, one with the suffix of an image file, or an absolute path.
 /// Null when there is none.
 QIcon find(const QString &name);
 

@@ -19,18 +19,18 @@ IconMemory &IconMemory::instance()
     return memory;
 }
 
-bool IconMemory::findPicture(const QString &key, QPixmap *picture) const
+bool IconMemory::findPixmap(const QString &key, QPixmap *pixmap) const
 {
-    return QPixmapCache::find(pictureKey(key), picture);
+    return QPixmapCache::find(pixmapKey(key), pixmap);
 }
 
-void IconMemory::keepPicture(const QString &key, const QPixmap &picture) const
+void IconMemory::keepPixmap(const QString &key, const QPixmap &pixmap) const
 {
-    QPixmapCache::insert(pictureKey(key), picture);
+    QPixmapCache::insert(pixmapKey(key), pixmap);
 }
 
-QString IconMemory::pictureKey(const QString &key) const
+QString IconMemory::pixmapKey(const QString &key) const
 {
-    // Others use the cache of pixmaps too, and its pictures outlive a change of the theme.
+    // Others use the cache of pixmaps too, and its contents outlive a change of the theme.
     return QStringLiteral("velicon/") + QString::number(m_generation) + QLatin1Char('/') + key;
 }

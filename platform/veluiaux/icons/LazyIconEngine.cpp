@@ -3,6 +3,7 @@
 
 #include "LazyIconEngine.h"
 
+#include "EmblemLayout.h"
 #include "IconLookup.h"
 #include "IconMemory.h"
 #include "ThemeState.h"
@@ -14,7 +15,7 @@
 namespace {
 
 // Stands in no name of a file and in no name of an icon.
-constexpr QChar separator(0x1f);
+constexpr QChar Separator(0x1f);
 
 } // namespace
 
@@ -43,7 +44,7 @@ const QIcon &LazyIconEngine::base() const
 const QString &LazyIconEngine::baseKey() const
 {
     if (m_baseKey.isNull()) {
-        m_baseKey = (m_name.isEmpty() ? QString() : IconLookup::identity(m_name)) + separator
+        m_baseKey = (m_name.isEmpty() ? QString() : IconLookup::identity(m_name)) + Separator
             + QString::number(m_plain.cacheKey(), 16);
     }
     return m_baseKey;
@@ -51,53 +52,66 @@ const QString &LazyIconEngine::baseKey() const
 
 QString LazyIconEngine::sizedKey(const QSize &size, QIcon::Mode mode, QIcon::State state) const
 {
-    // Disabled and selected pictures are tinted by the palette.
+    // Disabled and selected pixmaps are tinted by the palette.
     const qint64 numbers[] = {size.width(), size.height(), mode * 2 + state,
                               QGuiApplication::palette().cacheKey()};
     QString key = baseKey();
     for (const qint64 number : numbers) {
-        key += separator;
+        key += Separator;
         key += QString::number(number, 36);
     }
     return key;
 }
 
-QPixmap LazyIconEngine::picture(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
-                                QIcon::State state) const
+QPixmap LazyIconEngine::scaledPixmap(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
+                                     QIcon::State state) const
 {
     if (pixels.isEmpty())
         return QPixmap();
     const IconMemory &memory = IconMemory::instance();
-    QString key = sizedKey(pixels, mode, state) + separator + QString::number(qRound64(ratio * 1000))
-        + separator + QString::number(int(fit));
+    QString key = sizedKey(pixels, mode, state) + Separator + QString::number(qRound64(ratio * 1000))
+        + Separator + QString::number(int(fit));
     for (auto it = m_emblems.cbegin(); it != m_emblems.cend(); ++it)
-        key += separator + QString::number(it.key()) + it.value();
+        key += Separator + QString::number(it.key()) + it.value();
 
-    QPixmap picture;
-    if (memory.findPicture(key, &picture))
-        return picture;
-    picture = IconDrawing::picture(base(), pixels, fit, mode, state);
-    if (picture.isNull())
-        return picture;
+    QPixmap pixmap;
+    if (memory.findPixmap(key, &pixmap))
+        return pixmap;
+    pixmap = IconDrawing::pixmap(base(), pixels, fit, mode, state);
+    if (pixmap.isNull())
+        return pixmap;
     if (!m_emblems.isEmpty())
-        IconDrawing::layEmblems(picture, m_emblems, ratio, mode);
-    picture.setDevicePixelRatio(ratio);
-    memory.keepPicture(key, picture);
-    return picture;
+        IconDrawing::overlayEmblems(pixmap, emblemPixmaps(pixmap.size(), ratio, mode), ratio);
+    pixmap.setDevicePixelRatio(ratio);
+    memory.keepPixmap(key, pixmap);
+    return pixmap;
+}
+
+QMap<Qt::Corner, QPixmap> LazyIconEngine::emblemPixmaps(const QSize &size, qreal ratio,
+                                                        QIcon::Mode mode) const
+{
+    QMap<Qt::Corner, QPixmap> pixmaps;
+    for (auto it = m_emblems.cbegin(); it != m_emblems.cend(); ++it) {
+        const QSize pixels = EmblemLayout::square(size, ratio, it.key()).size();
+        const LazyIconEngine emblem(it.value(), {}, QIcon());
+        pixmaps.insert(it.key(),
+                       emblem.scaledPixmap(pixels, ratio, IconDrawing::Fit::AtMost, mode, QIcon::Off));
+    }
+    return pixmaps;
 }
 
 QPixmap LazyIconEngine::pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state)
 {
-    return picture(size, 1, IconDrawing::Fit::AtMost, mode, state);
+    return scaledPixmap(size, 1, IconDrawing::Fit::AtMost, mode, state);
 }
 
 void LazyIconEngine::paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State state)
 {
     // QIcon has made the rectangle as large as actualSize() says.
     const qreal ratio = painter->device()->devicePixelRatioF();
-    const QPixmap picture = this->picture(rect.size() * ratio, ratio, IconDrawing::Fit::Exactly, mode, state);
-    if (!picture.isNull())
-        painter->drawPixmap(rect, picture);
+    const QPixmap pixmap = scaledPixmap(rect.size() * ratio, ratio, IconDrawing::Fit::Exactly, mode, state);
+    if (!pixmap.isNull())
+        painter->drawPixmap(rect, pixmap);
 }
 
 QSize LazyIconEngine::actualSize(const QSize &size, QIcon::Mode mode, QIcon::State state)
@@ -149,8 +163,8 @@ void LazyIconEngine::virtual_hook(int id, void *data)
         *static_cast<bool *>(data) = isEmpty();
     } else if (id == QIconEngine::ScaledPixmapHook) {
         auto *argument = static_cast<QIconEngine::ScaledPixmapArgument *>(data);
-        argument->pixmap = picture(argument->size, argument->scale, IconDrawing::Fit::AtMost, argument->mode,
-                                   argument->state);
+        argument->pixmap = scaledPixmap(argument->size, argument->scale, IconDrawing::Fit::AtMost,
+                                        argument->mode, argument->state);
     } else {
         QIconEngine::virtual_hook(id, data);
     }

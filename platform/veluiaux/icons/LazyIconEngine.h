@@ -14,7 +14,7 @@
  * The engine of an icon that is looked up when it is needed.
  *
  * Holds only the parts of the icon. What they come to is kept in IconMemory for all engines
- * made of the same parts, so that a picture that is known already is found without a look at
+ * made of the same parts, so that a pixmap that is known already is found without a look at
  * the theme.
  */
 class LazyIconEngine : public QIconEngine
@@ -33,20 +33,21 @@ public:
     QString iconName() const override;
     void virtual_hook(int id, void *data) override;
 
-    /// A picture for \a pixels, drawn for and with the pixel ratio \a ratio.
-    QPixmap picture(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
-                    QIcon::State state) const;
-
 protected:
     LazyIconEngine(const LazyIconEngine &other) = default;
 
 private:
+    /// A pixmap for \a pixels, drawn for and with the pixel ratio \a ratio.
+    QPixmap scaledPixmap(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
+                         QIcon::State state) const;
+    /// The pixmaps of the emblems for a pixmap of \a size; null ones where the theme lacks them.
+    QMap<Qt::Corner, QPixmap> emblemPixmaps(const QSize &size, qreal ratio, QIcon::Mode mode) const;
     /// The icon without emblems, as the theme now has it.
     const QIcon &base() const;
     bool isEmpty() const;
     /// Names the parts, without the emblems, for what is remembered.
     const QString &baseKey() const;
-    /// Names the parts with all that a picture or a size of them depends on but the emblems.
+    /// Names the parts with all that a pixmap or a size of them depends on but the emblems.
     QString sizedKey(const QSize &size, QIcon::Mode mode, QIcon::State state) const;
 
     const QString m_name;
