@@ -27,10 +27,12 @@ const QVector<Rule> &rules()
         return QString::fromLatin1(list).split(QLatin1Char(' '));
     };
     static const QVector<Rule> all{
+        {"platform/rules", {}},
         {"platform/velcore", {}},
-        {"platform/veluiaux", text("platform/velcore/include")},
-        {"platform/velintegration", text("platform/velcore/include platform/veluiaux/include")},
-        {"platform/programs", text("platform")},
+        {"platform/veluiaux", text("platform/rules platform/velcore/include")},
+        {"platform/velintegration",
+         text("platform/rules platform/velcore/include platform/veluiaux/include")},
+        {"platform/programs", text("platform platform/rules")},
         {"include", {}},
         {"src/frame", text("platform")},
         {"src/settings", text("include")},
@@ -104,6 +106,7 @@ QString resolve(const QString &includer, const QString &written)
 {
     QStringList candidates{QFileInfo(includer).absolutePath(), sourceDir + QStringLiteral("/src"),
                            sourceDir + QStringLiteral("/include"), sourceDir + QStringLiteral("/apps")};
+    candidates << sourceDir + QStringLiteral("/platform/rules");
     for (const char *library : {"velcore", "veluiaux", "velintegration"}) {
         candidates << sourceDir + QStringLiteral("/platform/%1/include").arg(QLatin1String(library))
                    << sourceDir + QStringLiteral("/platform/%1").arg(QLatin1String(library));

@@ -11,10 +11,9 @@
 /**
  * The words of a command line whose field codes are filled in.
  *
- * Words are quoted as in the Exec key of a desktop entry: in double quotes a backslash protects
- * a double quote, a backtick, a dollar sign and a backslash. Single quotes and backslashes
- * outside of quotes count as in a shell, because filled-in arguments come that way. Nothing is
- * expanded.
+ * Words are quoted as in the Exec key of a desktop entry. Single quotes and backslashes outside
+ * of quotes count as in a shell, because filled-in arguments come that way (see ShellQuoting).
+ * Nothing is expanded.
  *
  * @return nothing when a quote is left open or the line ends with a backslash
  */

@@ -3,15 +3,15 @@
 
 #include "ExecLine.h"
 
+#include <ShellQuoting.h>
+
 namespace {
 
-enum class Quote { None, Single, Double };
+using ShellQuoting::Kind;
+using ShellQuoting::Piece;
+using ShellQuoting::Quote;
 
-constexpr QChar Backslash = QLatin1Char('\\');
-constexpr QChar SingleQuote = QLatin1Char('\'');
-constexpr QChar DoubleQuote = QLatin1Char('"');
 constexpr QChar Percent = QLatin1Char('%');
-constexpr QChar Blank = QLatin1Char(' ');
 
 bool isDeprecatedCode(QChar code)
 {
@@ -26,16 +26,6 @@ bool isArgumentCode(QChar code)
 bool isCode(QChar code)
 {
     return code == Percent || isArgumentCode(code) || isDeprecatedCode(code);
-}
-
-// The state of quoting behind a character that no backslash stands before.
-Quote after(Quote quote, QChar c)
-{
-    if (c == SingleQuote && quote != Quote::Double)
-        return quote == Quote::Single ? Quote::None : Quote::Single;
-    if (c == DoubleQuote && quote != Quote::Single)
-        return quote == Quote::Double ? Quote::None : Quote::Double;
-    return quote;
 }
 
 QStringList fileOrNothing(const QString &argument)
@@ -67,31 +57,15 @@ QStringList argumentsOf(QChar code, const ExecLine::Arguments &arguments)
     }
 }
 
-// An argument as it stands inside the given quoting, without the quotes around it.
-QString escaped(const QString &argument, Quote quote)
-{
-    QString text;
-    text.reserve(argument.size() + 2);
-    for (const QChar c : argument) {
-        if (quote == Quote::Double && QLatin1String("\\\"`$").contains(c))
-            text += Backslash;
-        if (quote != Quote::Double && c == SingleQuote)
-            text += QLatin1String("'\\''");
-        else
-            text += c;
-    }
-    return text;
-}
-
 // One word an argument; inside quotes they end between two words and begin again.
 QString quoted(const QStringList &arguments, Quote quote)
 {
-    const QChar mark = quote == Quote::Double ? DoubleQuote : SingleQuote;
+    const QChar mark = quote == Quote::Double ? QLatin1Char('"') : QLatin1Char('\'');
     QString words;
     for (const QString &argument : arguments) {
         if (!words.isEmpty())
-            words += mark + QString(Blank) + mark;
-        words += escaped(argument, quote);
+            words += mark + QStringLiteral(" ") + mark;
+        words += ShellQuoting::escaped(argument, quote);
     }
     if (quote == Quote::None && !arguments.isEmpty())
         return mark + words + mark;
@@ -104,27 +78,20 @@ QString ExecLine::expand(const QString &exec, const Arguments &arguments)
 {
     QString line;
     line.reserve(exec.size());
-    Quote quote = Quote::None;
-    for (int i = 0; i < exec.size(); ++i) {
-        const QChar c = exec.at(i);
-        const QChar next = i + 1 < exec.size() ? exec.at(i + 1) : QChar();
-        if (c == Percent) {
-            if (!isCode(next))
-                return {};
-            line += next == Percent ? QString(Percent) : quoted(argumentsOf(next, arguments), quote);
-            ++i;
-        } else if (c == Backslash && quote != Quote::Single && next == Percent) {
-            // Before a code it stands for itself; it must not undo the quoting of what comes in.
-            const bool plainPercent = i + 2 < exec.size() && exec.at(i + 2) == Percent;
-            line += plainPercent ? QLatin1String("\\") : QLatin1String("\\\\");
-        } else if (c == Backslash && quote != Quote::Single && i + 1 < exec.size()) {
-            line += c;
-            line += next;
-            ++i;
-        } else {
-            line += c;
-            quote = after(quote, c);
+    ShellQuoting::Scanner scanner(exec);
+    while (!scanner.atEnd()) {
+        const Piece piece = scanner.next();
+        if (piece.character() != Percent) {
+            ShellQuoting::append(line, piece.written);
+            continue;
         }
+        const QChar code = scanner.take();
+        if (!isCode(code))
+            return {};
+        // A backslash before a code stands for itself; it must not undo the quoting of what comes in.
+        if (piece.kind == Kind::Escape)
+            line += code == Percent ? QLatin1String("\\") : QLatin1String("\\\\");
+        line += code == Percent ? QString(Percent) : quoted(argumentsOf(code, arguments), scanner.quote());
     }
     return line;
 }
@@ -134,38 +101,27 @@ std::optional<QString> ExecLine::program(const QString &exec)
     QString program;
     bool begun = false;
     bool ended = false;
-    Quote quote = Quote::None;
-    const auto add = [&](QChar c) {
+    ShellQuoting::Scanner scanner(exec);
+    while (!scanner.atEnd()) {
+        const Piece piece = scanner.next();
+        if (piece.kind == Kind::OpenEscape)
+            return std::nullopt;
+        if (piece.kind == Kind::Blank) {
+            ended = begun;
+            continue;
+        }
+        if (piece.kind == Kind::Character && piece.character() == Percent) {
+            const QChar code = scanner.take();
+            if (!isCode(code) || (!ended && isArgumentCode(code)))
+                return std::nullopt;
+            if (code != Percent)
+                continue;
+        }
         begun = true;
         if (!ended)
-            program += c;
-    };
-    for (int i = 0; i < exec.size(); ++i) {
-        const QChar c = exec.at(i);
-        const QChar next = i + 1 < exec.size() ? exec.at(i + 1) : QChar();
-        if (c == Percent) {
-            if (!isCode(next) || (!ended && isArgumentCode(next)))
-                return std::nullopt;
-            if (next == Percent)
-                add(Percent);
-            ++i;
-        } else if (c == Backslash && quote != Quote::Single) {
-            if (i + 1 == exec.size())
-                return std::nullopt;
-            if (quote == Quote::Double && !QLatin1String("\\\"`$").contains(next))
-                add(c);
-            add(next);
-            ++i;
-        } else if (quote == Quote::None && (c == Blank || c == QLatin1Char('\t') || c == QLatin1Char('\n'))) {
-            ended = begun;
-        } else if (after(quote, c) != quote) {
-            begun = true;
-            quote = after(quote, c);
-        } else {
-            add(c);
-        }
+            ShellQuoting::append(program, piece.meant);
     }
-    if (quote != Quote::None)
+    if (scanner.quote() != Quote::None)
         return std::nullopt;
     return program;
 }
