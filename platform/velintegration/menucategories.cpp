@@ -5,42 +5,9 @@
 
 #include "menunames.h"
 
+#include <DesktopEntryValue.h>
+
 #include <algorithm>
-
-namespace {
-
-// An item of a list as a desktop entry holds it.
-QByteArray escaped(const QString &item)
-{
-    QByteArray result;
-    for (const char c : item.toUtf8()) {
-        switch (c) {
-        case '\\':
-            result += "\\\\";
-            break;
-        case ';':
-            result += "\\;";
-            break;
-        case '\n':
-            result += "\\n";
-            break;
-        case '\r':
-            result += "\\r";
-            break;
-        case '\t':
-            result += "\\t";
-            break;
-        case ' ':
-            result += result.isEmpty() ? "\\s" : " ";
-            break;
-        default:
-            result += c;
-        }
-    }
-    return result;
-}
-
-} // namespace
 
 const QVector<MenuCategory> &menuCategories()
 {
@@ -91,8 +58,6 @@ QByteArray menuDirectoryEntry(const MenuCategory &category, const QStringList &s
         entry += "Name[" + QByteArray(name.language) + "]=" + name.text + '\n';
     entry += "Icon=" + QByteArray(category.icon) + '\n';
     if (!sortOrder.isEmpty())
-        entry += "SortOrder=";
-    for (const QString &item : sortOrder)
-        entry += escaped(item) + ';';
-    return sortOrder.isEmpty() ? entry : entry + '\n';
+        entry += "SortOrder=" + QByteArray::fromStdString(DesktopEntryValue::fromList(sortOrder)) + '\n';
+    return entry;
 }

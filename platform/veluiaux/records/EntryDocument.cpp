@@ -4,11 +4,11 @@
 #include "EntryDocument.h"
 
 #include "DesktopEntryNames.h"
-#include "DesktopEntryValue.h"
 #include "DesktopEntryWriter.h"
 #include "EntryFile.h"
 #include "SharedTexts.h"
 
+#include <DesktopEntryValue.h>
 #include <velcore/language.h>
 
 #include <mutex>

@@ -3,7 +3,7 @@
 
 #include "GroupValues.h"
 
-#include "DesktopEntryValue.h"
+#include <DesktopEntryValue.h>
 
 GroupValues::GroupValues(const DesktopEntryText &text, const DesktopEntryChanges &changes,
                          std::string_view group)
