@@ -3,9 +3,9 @@
 
 #include <velintegration/startmenu.h>
 
-#include "applicationsmenu.h"
-#include "foldercopy.h"
-#include "folderreplacement.h"
+#include "ApplicationsMenu.h"
+#include "FolderCopy.h"
+#include "FolderReplacement.h"
 
 namespace fs = std::filesystem;
 

@@ -3,7 +3,7 @@
 
 #include <velintegration/wmcommand.h>
 
-#include "xerrortrap.h"
+#include "XErrorTrap.h"
 
 #include <cstring>
 

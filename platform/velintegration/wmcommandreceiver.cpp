@@ -5,7 +5,7 @@
 
 #include <velintegration/wmcommand.h>
 
-#include "managerselection.h"
+#include "ManagerSelection.h"
 
 #include <memory>
 #include <utility>

@@ -3,7 +3,7 @@
 
 #include "TestCase.h"
 
-#include <folderreplacement.h>
+#include <FolderReplacement.h>
 
 #include <QDir>
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "folderreplacement.h"
+#include "FolderReplacement.h"
 
 #include <algorithm>
 #include <cerrno>

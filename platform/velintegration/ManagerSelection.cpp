@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "managerselection.h"
+#include "ManagerSelection.h"
 
-#include "xerrortrap.h"
+#include "XErrorTrap.h"
 
 #include <chrono>
 #include <climits>

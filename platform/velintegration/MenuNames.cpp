@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "menunames.h"
+#include "MenuNames.h"
 
 #include <cstddef>
 #include <iterator>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "foldercopy.h"
+#include "FolderCopy.h"
 
 #include <algorithm>
 #include <system_error>

@@ -1,9 +1,9 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "menucategories.h"
+#include "MenuCategories.h"
 
-#include "menunames.h"
+#include "MenuNames.h"
 
 #include <DesktopEntryValue.h>
 

@@ -1,11 +1,11 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "applicationsmenu.h"
+#include "ApplicationsMenu.h"
 
-#include "foldercopy.h"
-#include "installedapplications.h"
-#include "menucategories.h"
+#include "FolderCopy.h"
+#include "InstalledApplications.h"
+#include "MenuCategories.h"
 
 #include <velcore/language.h>
 #include <veluiaux/VelUIDesktopEntry.h>
