@@ -10,11 +10,11 @@
 
 namespace {
 
-const char defaultLanguage[] = "en";
+constexpr char DefaultLanguage[] = "en";
 
 // Desktop entries are translated by language; these are the customary exceptions.
-const char *const byCountry[] = {"en_GB", "pt_BR", "zh_CN", "zh_HK", "zh_TW"};
-const char *const byModifier[] = {"be@latin",          "ca@valencia", "sr@ijekavian",
+const char *const ByCountry[] = {"en_GB", "pt_BR", "zh_CN", "zh_HK", "zh_TW"};
+const char *const ByModifier[] = {"be@latin",          "ca@valencia", "sr@ijekavian",
                                   "sr@ijekavianlatin", "sr@latin",    "uz@cyrillic"};
 
 // lang_COUNTRY.ENCODING@MODIFIER
@@ -71,10 +71,10 @@ std::string velLanguageCode()
 {
     const Locale locale = parsed(messageLocale());
     if (!isLanguage(locale.language) || locale.language == "POSIX")
-        return defaultLanguage;
+        return DefaultLanguage;
     std::string withModifier = locale.language + "@" + locale.modifier;
-    if (contains(byModifier, withModifier))
+    if (contains(ByModifier, withModifier))
         return withModifier;
     const std::string withCountry = locale.language + "_" + locale.country;
-    return contains(byCountry, withCountry) ? withCountry : locale.language;
+    return contains(ByCountry, withCountry) ? withCountry : locale.language;
 }

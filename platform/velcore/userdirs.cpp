@@ -9,7 +9,7 @@
 
 namespace {
 
-const char desktopKey[] = "XDG_DESKTOP_DIR";
+constexpr char DesktopKey[] = "XDG_DESKTOP_DIR";
 
 std::string trimmed(const std::string &text)
 {
@@ -54,7 +54,7 @@ std::string resolved(const std::string &value)
 std::string desktopOfLine(const std::string &line)
 {
     const std::size_t equals = line.find('=');
-    if (equals == std::string::npos || trimmed(line.substr(0, equals)) != desktopKey)
+    if (equals == std::string::npos || trimmed(line.substr(0, equals)) != DesktopKey)
         return {};
     return resolved(unquoted(trimmed(line.substr(equals + 1))));
 }

@@ -17,7 +17,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-const int mostLinks = 40;
+constexpr int MostLinks = 40;
 
 // Where a path leads, with all links followed; empty when they lead in a circle.
 fs::path resolved(const fs::path &path)
@@ -29,7 +29,7 @@ fs::path resolved(const fs::path &path)
     result = fs::absolute(path, error);
     if (!result.has_filename()) // a trailing "/"
         result = result.parent_path();
-    for (int i = 0; i < mostLinks; ++i) {
+    for (int i = 0; i < MostLinks; ++i) {
         if (!fs::is_symlink(fs::symlink_status(result, error)))
             return result;
         const fs::path next = fs::read_symlink(result, error);

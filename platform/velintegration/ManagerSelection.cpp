@@ -13,7 +13,7 @@
 
 namespace {
 
-const std::chrono::seconds releaseTimeout(5);
+constexpr std::chrono::seconds ReleaseTimeout(5);
 
 struct PropertyOf
 {
@@ -102,7 +102,7 @@ Time ManagerSelection::serverTime()
 
 void ManagerSelection::waitForRelease(Window previous)
 {
-    const auto deadline = std::chrono::steady_clock::now() + releaseTimeout;
+    const auto deadline = std::chrono::steady_clock::now() + ReleaseTimeout;
     XEvent event;
     while (!XCheckTypedWindowEvent(m_display, previous, DestroyNotify, &event)) {
         const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(

@@ -8,16 +8,16 @@
 
 namespace {
 
-const char *const languages[] = {"de", "es", "fr", "it", "ja", "pl", "pt_BR", "ru", "tr", "uk", "zh_CN"};
+const char *const Languages[] = {"de", "es", "fr", "it", "ja", "pl", "pt_BR", "ru", "tr", "uk", "zh_CN"};
 
 struct Translations
 {
     const char *english;
-    const char *texts[std::size(languages)]; // in the order of the languages
+    const char *texts[std::size(Languages)]; // in the order of Languages
 };
 
 // clang-format off
-const Translations table[] = {
+const Translations Table[] = {
     {"Start Menu",
      {"Startmenü", "Menú de inicio", "Menu de démarrage", "Menu di avvio", "スタートメニュー", "Menu startowe", "Menu Iniciar", "Меню запуска", "Başlat Menüsü", "Меню запуску", "开始菜单"}},
     {"Multimedia",
@@ -56,11 +56,11 @@ const Translations table[] = {
 QVector<MenuName> menuNames(const QByteArray &englishName)
 {
     QVector<MenuName> names;
-    for (const Translations &row : table) {
+    for (const Translations &row : Table) {
         if (englishName != row.english)
             continue;
-        for (std::size_t i = 0; i < std::size(languages); ++i)
-            names.append(MenuName{languages[i], row.texts[i]});
+        for (std::size_t i = 0; i < std::size(Languages); ++i)
+            names.append(MenuName{Languages[i], row.texts[i]});
     }
     return names;
 }

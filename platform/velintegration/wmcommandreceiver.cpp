@@ -20,7 +20,7 @@ struct CloseDisplay
 };
 
 // Longer than any property can be; the server cuts it to what is there.
-const long wholeProperty = 0x1fffffff;
+constexpr long WholeProperty = 0x1fffffff;
 
 } // namespace
 
@@ -72,7 +72,7 @@ void WmCommandReceiverPrivate::readProperty()
     unsigned long count = 0;
     unsigned long left = 0;
     unsigned char *data = nullptr;
-    if (XGetWindowProperty(display.get(), selection->window(), property, 0, wholeProperty, True,
+    if (XGetWindowProperty(display.get(), selection->window(), property, 0, WholeProperty, True,
                            AnyPropertyType, &type, &format, &count, &left, &data)
             != Success
         || !data)

@@ -13,7 +13,7 @@
 
 namespace {
 
-const int answerTime = 1100; // milliseconds
+constexpr int AnswerTime = 1100; // milliseconds
 
 // Without an address the bus library would start a bus of its own.
 bool hasSessionBus()
@@ -55,10 +55,10 @@ bool activateOnBus(const QString &path)
     call.setArguments({platformData()});
     QElapsedTimer timer;
     timer.start();
-    const QDBusMessage answer = bus.call(call, QDBus::Block, answerTime);
+    const QDBusMessage answer = bus.call(call, QDBus::Block, AnswerTime);
     if (answer.type() == QDBusMessage::ReplyMessage)
         return true;
     // Who has not answered in time has been found and takes its time to start; who went away gives
     // the same error, but at once. The bus library's timer may be a twentieth early.
-    return QDBusError(answer).type() == QDBusError::NoReply && timer.elapsed() >= answerTime * 3 / 4;
+    return QDBusError(answer).type() == QDBusError::NoReply && timer.elapsed() >= AnswerTime * 3 / 4;
 }

@@ -10,7 +10,7 @@
 
 namespace {
 
-const int openingTime = 1100; // milliseconds; a browser that stays in front takes longer
+constexpr int OpeningTime = 1100; // milliseconds; a browser that stays in front takes longer
 
 void takeOffStreams(QProcess *process)
 {
@@ -63,7 +63,7 @@ QString openWithDesktop(const QString &target)
     process->start(QStringLiteral("xdg-open"), {target});
     if (!process->waitForStarted())
         return QStringLiteral("cannot start xdg-open: %1").arg(process->errorString());
-    if (!process->waitForFinished(openingTime))
+    if (!process->waitForFinished(OpeningTime))
         return {};
     if (process->exitStatus() == QProcess::NormalExit && process->exitCode() == 0)
         return {};

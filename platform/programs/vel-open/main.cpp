@@ -27,10 +27,10 @@
 
 namespace {
 
-const char usage[] = "usage: vel-open --exec PATH\n"
-                     "Runs a desktop entry, or opens a file or folder.\n";
-const std::chrono::milliseconds longestWait(1600);
-const char success = '+';
+constexpr char Usage[] = "usage: vel-open --exec PATH\n"
+                         "Runs a desktop entry, or opens a file or folder.\n";
+constexpr std::chrono::milliseconds LongestWait(1600);
+constexpr char Success = '+';
 
 int fail(const std::string &path, const std::string &reason)
 {
@@ -69,7 +69,7 @@ void leaveTheCaller()
     leaveTheCaller();
     const QCoreApplication application(argc, argv);
     const QString reason = runEntry(QFile::decodeName(path));
-    const std::string text = reason.isEmpty() ? std::string(1, success) : reason.toLocal8Bit().toStdString();
+    const std::string text = reason.isEmpty() ? std::string(1, Success) : reason.toLocal8Bit().toStdString();
     const ssize_t written = write(outcome, text.data(), text.size());
     _exit(written < 0 ? 1 : 0);
 }
@@ -77,7 +77,7 @@ void leaveTheCaller()
 // What the child wrote; nothing when it takes longer than a caller may wait.
 std::optional<std::string> waitForOutcome(int outcome)
 {
-    const auto deadline = std::chrono::steady_clock::now() + longestWait;
+    const auto deadline = std::chrono::steady_clock::now() + LongestWait;
     std::string text;
     for (;;) {
         const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(
@@ -109,7 +109,7 @@ int run(int argc, char **argv, const char *path)
         work(ends[1], argc, argv, path);
     close(ends[1]);
     const std::optional<std::string> outcome = waitForOutcome(ends[0]);
-    if (!outcome || *outcome == std::string(1, success))
+    if (!outcome || *outcome == std::string(1, Success))
         return 0;
     return fail(path, outcome->empty() ? std::string("the start ended unexpectedly") : *outcome);
 }
@@ -119,7 +119,7 @@ int run(int argc, char **argv, const char *path)
 int main(int argc, char **argv)
 {
     if (argc == 2 && std::strcmp(argv[1], "--help") == 0) {
-        std::fputs(usage, stdout);
+        std::fputs(Usage, stdout);
         return 0;
     }
     if (argc == 2 && std::strcmp(argv[1], "--version") == 0) {

@@ -12,8 +12,8 @@
 
 namespace {
 
-const char usage[] = "usage: vel-wmfunc WORDS...\n"
-                     "Sends the words, joined by blanks, to the window manager.\n";
+constexpr char Usage[] = "usage: vel-wmfunc WORDS...\n"
+                         "Sends the words, joined by blanks, to the window manager.\n";
 
 int fail(const char *reason)
 {
@@ -37,7 +37,7 @@ int main(int argc, char **argv)
 {
     const std::string first = argc == 2 ? argv[1] : "";
     if (first == "--help") {
-        std::fputs(usage, stdout);
+        std::fputs(Usage, stdout);
         return 0;
     }
     if (first == "--version") {

@@ -8,7 +8,7 @@
 #include <string_view>
 
 /**
- * The user's message locale and how well the language of a localised key fits it.
+ * The user's message locale and how well the language of a localized key fits it.
  *
  * Read from LC_ALL, LC_MESSAGES and LANG, the first that is set and not empty, without
  * encoding. "C", "POSIX" and no locale at all stand for "en". The object points into the

@@ -8,11 +8,11 @@
 #include <string>
 
 /**
- * Returns the code of the language that the user's desktop entries are localised in.
+ * Returns the code of the language that the user's desktop entries are localized in.
  *
  * That is the POSIX message locale (LC_ALL, LC_MESSAGES, LANG, the first that is set and
  * not empty) reduced to the language ("de" for de_DE.UTF-8), except where desktop entries
- * are customarily localised by country or script ("pt_BR", "zh_CN", "sr@latin").
+ * are customarily localized by country or script ("pt_BR", "zh_CN", "sr@latin").
  *
  * @return the code; "en" for the locales "C" and "POSIX" and when none is set
  */
