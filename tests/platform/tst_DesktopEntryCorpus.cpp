@@ -18,7 +18,7 @@
  * The desktop entries of all packages installed on this machine, read beside GKeyFile.
  *
  * GKeyFile takes lang@MODIFIER before lang_COUNTRY, the standard and the record the other way
- * round; it takes the unlocalised value where there is no other, the record gives none; and it
+ * round; it takes the unlocalized value where there is no other, the record gives none; and it
  * has no value for an escape it does not know, where the record keeps the escape; and it refuses
  * a file for one bad line. Everything else has to be the same.
  */
@@ -84,9 +84,9 @@ bool peerCannotRead(GKeyFile *file, const QByteArray &group, const QByteArray &k
 {
     GError *error = nullptr;
     g_free(g_key_file_get_string(file, group.constData(), key.constData(), &error));
-    const bool isSpoiled = error && peerHas(file, group, key);
+    const bool isMalformed = error && peerHas(file, group, key);
     g_clear_error(&error);
-    return isSpoiled;
+    return isMalformed;
 }
 
 // The value for a locale in the standard's order, found with GKeyFile's help.
@@ -112,7 +112,7 @@ QByteArray peerVariant(GKeyFile *file, const QByteArray &group, const QByteArray
     return {};
 }
 
-// How GKeyFile itself would choose; empty where it takes the unlocalised value.
+// How GKeyFile itself would choose; empty where it takes the unlocalized value.
 QByteArray peerLocale(GKeyFile *file, const QByteArray &group, const QByteArray &key,
                       const QByteArray &locale)
 {
@@ -149,7 +149,7 @@ public:
 
     void localText(const QByteArray &group, const QByteArray &key, const QString &value)
     {
-        // An escape that GKeyFile does not know spoils its value; ours keeps it as it stands.
+        // An escape that GKeyFile does not know makes its value malformed; ours keeps it as it stands.
         const QByteArray variant = peerVariant(m_peer, group, key, m_order);
         if (!variant.isEmpty() && peerCannotRead(m_peer, group, variant)) {
             ++unknownEscapes;

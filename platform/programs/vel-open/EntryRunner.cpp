@@ -8,6 +8,7 @@
 #include "ProgramStart.h"
 #include "Terminal.h"
 
+#include <WindowManagerCommand.h>
 #include <velintegration/wmcommand.h>
 #include <veluiaux/VelUIDesktopEntry.h>
 
@@ -92,7 +93,7 @@ QString runApplication(const VelUIDesktopEntry &entry, const QString &path)
     const QString exec = entry.getExec();
     if (exec.isEmpty())
         return QStringLiteral("there is no command in it");
-    return exec.startsWith(QLatin1String("VELWM_")) ? sendToWindowManager(exec) : runCommand(entry, path);
+    return isWindowManagerCommand(exec) ? sendToWindowManager(exec) : runCommand(entry, path);
 }
 
 } // namespace

@@ -5,24 +5,14 @@
 
 #include "ThemeState.h"
 
+#include <LocalFile.h>
+
 #include <QFileInfo>
 #include <QMimeDatabase>
 #include <QString>
 #include <QUrl>
 
 namespace {
-
-/// The file that \a text names, as a path or as a URL; empty when it names none here.
-QString localFile(const QString &text, const QUrl &url)
-{
-    if (text.startsWith(QLatin1Char('/')))
-        return text;
-    if (url.scheme() != QLatin1String("file"))
-        return QString();
-    if (!url.host().isEmpty() && url.host() != QLatin1String("localhost"))
-        return QString();
-    return url.path(QUrl::FullyDecoded);
-}
 
 struct Kind
 {
@@ -32,13 +22,12 @@ struct Kind
 
 Kind kindOf(const QString &text)
 {
-    const QUrl url(text);
-    const QFileInfo file(localFile(text, url));
+    const QFileInfo file(localFile(text));
     if (!file.filePath().isEmpty() && file.exists()) {
         const QMimeType type = QMimeDatabase().mimeTypeForFile(file);
         return {type.iconName().toStdString(), type.name().toStdString()};
     }
-    const QString scheme = text.startsWith(QLatin1Char('/')) ? QString() : url.scheme();
+    const QString scheme = text.startsWith(QLatin1Char('/')) ? QString() : QUrl(text).scheme();
     if (scheme == QLatin1String("http") || scheme == QLatin1String("https"))
         return {"text-html", "text/html"};
     if (scheme == QLatin1String("mailto"))

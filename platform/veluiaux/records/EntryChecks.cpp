@@ -8,8 +8,10 @@
 #include "ExecLine.h"
 #include "ProgramSearch.h"
 
+#include <LocalFile.h>
+#include <WindowManagerCommand.h>
+
 #include <QFile>
-#include <QUrl>
 
 #include <cstdlib>
 
@@ -22,12 +24,6 @@ using EntryChecks::Unsuitable;
 QString mainText(const EntryDocument &entry, std::string_view key)
 {
     return entry.text(Names::MainGroup, key);
-}
-
-// A command of the window manager's own, for which there is no program.
-bool isWindowManagerCommand(const QString &exec)
-{
-    return exec.startsWith(QLatin1String("VELWM_"));
 }
 
 Unsuitable checkProgram(const QString &exec, const QString &program, const QString &folder)
@@ -67,16 +63,6 @@ Unsuitable checkApplication(const EntryDocument &entry)
             return reason;
     }
     return checkTryExec(mainText(entry, Names::TryExec));
-}
-
-// The file that a link leads to; empty when it leads elsewhere.
-QString localFile(const QString &target)
-{
-    if (target.startsWith(QLatin1Char('/')))
-        return target;
-    const QUrl url(target);
-    const bool isHere = url.host().isEmpty() || url.host() == QLatin1String("localhost");
-    return url.scheme() == QLatin1String("file") && isHere ? url.path(QUrl::FullyDecoded) : QString();
 }
 
 Unsuitable checkLink(const EntryDocument &entry)
