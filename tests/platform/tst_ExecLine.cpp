@@ -3,11 +3,9 @@
 
 #include "TestCase.h"
 
-#include <EntryChecks.h>
-#include <EntryDocument.h>
 #include <ExecLine.h>
 
-/// Command lines of entries, and what speaks against an entry.
+/// Command lines of entries.
 class tst_ExecLine : public TestCase
 {
     Q_OBJECT
@@ -17,13 +15,6 @@ private Q_SLOTS:
     void findsTheProgram();
     void quotesForThePlace_data();
     void quotesForThePlace();
-    void tellsWhyAnEntryIsUnsuitable_data();
-    void tellsWhyAnEntryIsUnsuitable();
-    void tellsWhyAnEntryIsNotDisplayed_data();
-    void tellsWhyAnEntryIsNotDisplayed();
-
-private:
-    EntryDocument document(const QByteArray &keys);
 };
 
 void tst_ExecLine::findsTheProgram_data()
@@ -71,65 +62,6 @@ void tst_ExecLine::quotesForThePlace()
     ExecLine::Arguments arguments;
     arguments.filePath = QStringLiteral("a $'b");
     QCOMPARE(ExecLine::expand(exec, arguments), line);
-}
-
-EntryDocument tst_ExecLine::document(const QByteArray &keys)
-{
-    EntryDocument document;
-    document.setPath(QFile::encodeName(write(QStringLiteral("x.desktop"), "[Desktop Entry]\n" + keys)));
-    if (!document.load())
-        QTest::qFail("the entry does not load", __FILE__, __LINE__);
-    return document;
-}
-
-void tst_ExecLine::tellsWhyAnEntryIsUnsuitable_data()
-{
-    QTest::addColumn<QByteArray>("keys");
-    QTest::addColumn<int>("reason");
-    const QByteArray application = "Type=Application\nName=A\n";
-    const auto row = [](const char *name, const QByteArray &keys, EntryChecks::Unsuitable reason) {
-        QTest::newRow(name) << keys << int(reason);
-    };
-    row("nothing", application + "Exec=sh -c x\n", EntryChecks::Suitable);
-    row("no type", "Name=A\nExec=sh\n", EntryChecks::Unusable);
-    row("no command", application, EntryChecks::NoExec);
-    row("a command that does not parse", application + "Exec=\"sh\n", EntryChecks::Unusable);
-    row("a program that is gone", application + "Exec=/nosuch/x\n", EntryChecks::ProgramMissing);
-    row("a program that does not run", application + "Exec=/etc/passwd\n", EntryChecks::ProgramNotExecutable);
-    row("a program nobody has", application + "Exec=vel-no-such\n", EntryChecks::ProgramNotInPath);
-    row("a test program that is gone", application + "Exec=sh\nTryExec=/nosuch/x\n",
-        EntryChecks::TryExecMissing);
-    row("a test program nobody has", application + "Exec=sh\nTryExec=vel-no-such\n",
-        EntryChecks::TryExecNotInPath);
-    row("a link to nowhere", "Type=Link\nName=A\nURL=/nosuch\n", EntryChecks::UrlMissing);
-}
-
-void tst_ExecLine::tellsWhyAnEntryIsUnsuitable()
-{
-    QFETCH(QByteArray, keys);
-    QFETCH(int, reason);
-    QCOMPARE(int(EntryChecks::suitability(document(keys))), reason);
-}
-
-void tst_ExecLine::tellsWhyAnEntryIsNotDisplayed_data()
-{
-    QTest::addColumn<QByteArray>("keys");
-    QTest::addColumn<int>("reason");
-    QTest::newRow("nothing") << QByteArray("TryExec=sh\nOnlyShowIn=VEL;\n") << int(EntryChecks::Displayed);
-    QTest::newRow("hidden") << QByteArray("NoDisplay=true\nHidden=true\n") << int(EntryChecks::IsHidden);
-    QTest::newRow("no menu") << QByteArray("NoDisplay=true\nNotShowIn=VEL;\n")
-                             << int(EntryChecks::IsNotForMenus);
-    QTest::newRow("others") << QByteArray("NotShowIn=VEL;\nTryExec=vel-no-such\n")
-                            << int(EntryChecks::IsForOtherDesktops);
-    QTest::newRow("not installed") << QByteArray("TryExec=vel-no-such\n") << int(EntryChecks::NotInstalled);
-}
-
-void tst_ExecLine::tellsWhyAnEntryIsNotDisplayed()
-{
-    QFETCH(QByteArray, keys);
-    QFETCH(int, reason);
-    qunsetenv("XDG_CURRENT_DESKTOP");
-    QCOMPARE(int(EntryChecks::displayability(document(keys))), reason);
 }
 
 VEL_TEST_GUILESS_MAIN(tst_ExecLine)
