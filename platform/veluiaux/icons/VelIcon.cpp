@@ -19,7 +19,7 @@ QIcon VelIcon::fromTheme(const QString &name, const QPair<Qt::Corner, QString> &
 
 QIcon VelIcon::withEmblems(const QIcon &icon, const QMap<Qt::Corner, QString> &emblems)
 {
-    // Whether the icon is null is not asked here: that may be dear to find out.
+    // Whether the icon is null is not asked here: that may be expensive to find out.
     if (emblems.isEmpty())
         return icon;
     return QIcon(new LazyIconEngine(QString(), emblems, icon));
