@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "MenuTestCase.h"
-
 #include "ModalDriver.h"
 #include "VelMenuView.h"
 
@@ -12,18 +11,14 @@
 #include <QMenu>
 #include <QMouseEvent>
 #include <QPointer>
-#include <QProcess>
-#include <QPushButton>
-#include <QScrollBar>
 #include <QSignalSpy>
 #include <QSortFilterProxyModel>
-#include <QStandardPaths>
 
 #include <fstream>
 #include <memory>
 #include <string>
 
-/// Building, selecting, showing, running and rebuilding.
+/// What a view shows, and how.
 class tst_VelMenuView : public MenuTestCase
 {
     Q_OBJECT
@@ -42,29 +37,10 @@ private Q_SLOTS:
     void beginsADragOfARowOnlyWhenEditable();
     void opensTheEditorOnADoubleClickOnlyWhenEditable();
     void sortsAsTheMenuDoes();
-    void tellsWhatIsSelected();
-    void showsAndSelectsAnItemInAFolderNeverOpened();
-    void scrollsToAnItemThatArrivesLater();
-    void selectsNothingThatIsNoItemOfTheMenu();
-    void selectsAgainWhatAnOlderListingTookAway();
-    void selectsNoNeighbourOfARowThatGoes();
-    void goesAwayBeforeItScrolls();
     void sortsAnewWhenToldThatAnOrderChanged();
     void passesOnThatFilesWereDropped();
     void startsAfreshOnAnotherDirectory();
-    void opensTheSelectedEntry();
-    void tellsWhenItCannotOpenTheSelectedEntry();
-    void opensNothingWithoutASelection();
-    void leavesTheStartedProgramRunningWhenItGoesAway();
-    void goesAwayWhileItTellsThatNothingStarted();
-    void rebuildsTheStartMenuAfterAsking();
-    void leavesTheStartMenuWhenToldSo();
-    void leavesTheStartMenuWhenItCannotBeRebuilt();
-    void goesAwayWhileItAsksToRebuild();
     void goesAwayWhileItLoads();
-
-private:
-    void installOpener(const QByteArray &script);
 };
 
 void tst_VelMenuView::showsNothingAndMakesNothingWhereThereIsNoDirectory()
@@ -288,119 +264,6 @@ void tst_VelMenuView::sortsAsTheMenuDoes()
         (QStringList{QStringLiteral("C"), QStringLiteral("Zoo"), QStringLiteral("B"), QStringLiteral("A")}));
 }
 
-void tst_VelMenuView::tellsWhatIsSelected()
-{
-    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    VelMenuView view(menu(), -1, true);
-    QVERIFY(open(view, menu(), 1));
-    QVERIFY(!view.selectedItem().isValid());
-    QCOMPARE(view.selectedPath(), QString());
-
-    QSignalSpy selections(&view, QOverload<const QString &>::of(&VelMenuView::selectionChanged));
-    select(view, a);
-    QCOMPARE(view.selectedPath(), a);
-    QCOMPARE(view.selectedItem(), files(view)->index(a));
-    QCOMPARE(selections.takeLast().constFirst().toString(), a);
-    view.selectionModel()->clearSelection();
-    QCOMPARE(selections.takeLast().constFirst().toString(), QString());
-    view.selectionChangedSlot();
-    QCOMPARE(selections.count(), 1);
-}
-
-void tst_VelMenuView::showsAndSelectsAnItemInAFolderNeverOpened()
-{
-    const QString deep = writeEntry(QStringLiteral("one/two/a.desktop"), QStringLiteral("A"));
-    VelMenuView view(menu(), -1, true);
-    view.show();
-    QVERIFY(open(view, menu(), 1));
-    view.showAndSelect(deep);
-    QCOMPARE(view.selectedPath(), deep);
-    QVERIFY(view.isExpanded(shown(view, menu() + QLatin1String("/one/two"))));
-    QTRY_VERIFY(view.visualRect(shown(view, deep)).isValid());
-    QVERIFY(view.isExpanded(shown(view, menu() + QLatin1String("/one"))));
-    QCOMPARE(view.selectionModel()->selectedIndexes().size(), 1);
-    QCOMPARE(view.currentIndex(), shown(view, deep));
-}
-
-void tst_VelMenuView::scrollsToAnItemThatArrivesLater()
-{
-    for (int i = 0; i < 200; ++i)
-        writeEntry(QStringLiteral("sub/e%1.desktop").arg(i, 3, 10, QLatin1Char('0')),
-                   QStringLiteral("E%1").arg(i, 3, 10, QLatin1Char('0')));
-    VelMenuView view(menu(), -1, true);
-    view.resize(200, 150);
-    // What becomes the current item would come into sight by itself.
-    view.setAutoScroll(false);
-    view.show();
-    QVERIFY(QTest::qWaitForWindowExposed(&view));
-    const QString last = menu() + QLatin1String("/sub/e150.desktop");
-    QVERIFY(open(view, menu(), 1));
-    QVERIFY(open(view, menu() + QLatin1String("/sub"), 200));
-    view.showAndSelect(last);
-    QTRY_VERIFY(view.viewport()->rect().contains(view.visualRect(shown(view, last))));
-}
-
-void tst_VelMenuView::selectsNothingThatIsNoItemOfTheMenu()
-{
-    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    const QString outside = write(QStringLiteral("outside.desktop"), entryText(QStringLiteral("O")));
-    VelMenuView view(menu(), -1, true);
-    QVERIFY(open(view, menu(), 1));
-    for (const QString &path : {outside, menu(), menu() + QLatin1String("/none"), QString()}) {
-        select(view, a);
-        view.showAndSelect(path);
-        QVERIFY2(!view.selectedItem().isValid(), qPrintable(path));
-    }
-}
-
-void tst_VelMenuView::selectsAgainWhatAnOlderListingTookAway()
-{
-    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
-    VelMenuView view(menu(), -1, true);
-    view.show();
-    QVERIFY(open(view, menu(), 2));
-    view.showAndSelect(b);
-    // What the model does with a listing made before the item.
-    QVERIFY(QMetaObject::invokeMethod(files(view), "_q_directoryChanged", Q_ARG(QString, menu()),
-                                      Q_ARG(QStringList, QStringList{QStringLiteral("a.desktop")})));
-    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("A")});
-    QVERIFY(!view.selectedItem().isValid());
-    writeEntry(QStringLiteral("c.desktop"), QStringLiteral("C"));
-    QTRY_COMPARE(view.selectedPath(), b);
-}
-
-void tst_VelMenuView::selectsNoNeighbourOfARowThatGoes()
-{
-    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
-    const QString c = writeEntry(QStringLiteral("c.desktop"), QStringLiteral("C"));
-    VelMenuView view(menu(), -1, true);
-    view.show();
-    QVERIFY(open(view, menu(), 3));
-    QTRY_COMPARE(names(view, menu()).constFirst(), QStringLiteral("A"));
-    select(view, b);
-    QVERIFY(QFile::remove(b));
-    QTRY_COMPARE(names(view, menu()).size(), 2);
-    QVERIFY(!view.selectedItem().isValid());
-    QCOMPARE(view.currentIndex(), shown(view, c));
-    // It is no longer waited for.
-    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
-    QTRY_COMPARE(names(view, menu()).size(), 3);
-    QTest::qWait(0);
-    QVERIFY(!view.selectedItem().isValid());
-}
-
-void tst_VelMenuView::goesAwayBeforeItScrolls()
-{
-    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    auto view = std::make_unique<VelMenuView>(menu(), -1, true);
-    QVERIFY(open(*view, menu(), 1));
-    view->showAndSelect(a);
-    view.reset();
-    QTest::qWait(0);
-}
-
 void tst_VelMenuView::sortsAnewWhenToldThatAnOrderChanged()
 {
     for (const char *name : {"a", "b"})
@@ -449,180 +312,6 @@ void tst_VelMenuView::startsAfreshOnAnotherDirectory()
     QVERIFY(!view.acceptDrops());
     QCOMPARE(view.dragDropMode(), QAbstractItemView::NoDragDrop);
     view.setParent(nullptr);
-}
-
-void tst_VelMenuView::installOpener(const QByteArray &script)
-{
-    const QString program = write(QStringLiteral("bin/vel-open"), "#!/bin/sh\n" + script);
-    QVERIFY(QFile::setPermissions(program, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
-    qputenv("PATH", QFile::encodeName(path(QStringLiteral("bin"))) + ":/usr/bin:/bin");
-}
-
-void tst_VelMenuView::opensTheSelectedEntry()
-{
-    const QString log = path(QStringLiteral("log"));
-    installOpener("printf '%s|' \"$@\" >'" + QFile::encodeName(log) + ".part'\nmv '" + QFile::encodeName(log)
-                  + ".part' '" + QFile::encodeName(log) + "'\n");
-    const QString entry = writeEntry(QStringLiteral("with blank %1.desktop"), QStringLiteral("A"));
-    VelMenuView view(menu(), -1, true);
-    QVERIFY(open(view, menu(), 1));
-    select(view, entry);
-    view.slotExe();
-    QTRY_VERIFY(QFile::exists(log));
-    QCOMPARE(read(log), "--exec|" + QFile::encodeName(entry) + '|');
-    QTRY_VERIFY(!view.findChild<QProcess *>());
-}
-
-void tst_VelMenuView::tellsWhenItCannotOpenTheSelectedEntry()
-{
-    qputenv("PATH", QFile::encodeName(path(QStringLiteral("empty"))));
-    const QString entry = writeEntry(QStringLiteral("a %1 %2.desktop"), QStringLiteral("A"));
-    VelMenuView view(menu(), -1, true);
-    QVERIFY(open(view, menu(), 1));
-    select(view, entry);
-    ModalDriver modal;
-    modal.answer({QMessageBox::Warning, QStringLiteral("Warning"),
-                  QStringLiteral("Can't start:\nvel-open --exec ") + entry, QMessageBox::Ok},
-                 QMessageBox::Ok);
-    view.slotExe();
-    QVERIFY(modal.finished());
-    QVERIFY(!view.findChild<QProcess *>());
-    QCOMPARE(view.selectedPath(), entry);
-    qputenv("PATH", "/usr/bin:/bin");
-}
-
-void tst_VelMenuView::opensNothingWithoutASelection()
-{
-    const QString log = path(QStringLiteral("log"));
-    installOpener(">'" + QFile::encodeName(log) + "'\n");
-    VelMenuView view(menu(), -1, true);
-    view.slotExe();
-    QVERIFY(!view.findChild<QProcess *>());
-}
-
-void tst_VelMenuView::leavesTheStartedProgramRunningWhenItGoesAway()
-{
-    const QString go = path(QStringLiteral("go"));
-    const QString log = path(QStringLiteral("log"));
-    installOpener("while [ ! -e '" + QFile::encodeName(go)
-                  + "' ]; do sleep 0.05; done\n"
-                    "echo alive >'"
-                  + QFile::encodeName(log) + "'\n");
-    const QString entry = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    QPointer<QProcess> started;
-    {
-        VelMenuView view(menu(), -1, true);
-        QVERIFY(open(view, menu(), 1));
-        select(view, entry);
-        view.slotExe();
-        started = view.findChild<QProcess *>();
-    }
-    QVERIFY(started);
-    write(QStringLiteral("go"), "");
-    QTRY_VERIFY(QFile::exists(log));
-    // It has gone when the program had.
-    QTRY_VERIFY(!started);
-}
-
-void tst_VelMenuView::goesAwayWhileItTellsThatNothingStarted()
-{
-    qputenv("PATH", QFile::encodeName(path(QStringLiteral("empty"))));
-    const QString entry = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
-    auto *view = new VelMenuView(menu(), -1, true);
-    QVERIFY(open(*view, menu(), 1));
-    select(*view, entry);
-    ModalDriver modal;
-    modal.handle([view](QWidget *) { delete view; });
-    view->slotExe();
-    QVERIFY(modal.finished());
-    qputenv("PATH", "/usr/bin:/bin");
-}
-
-void tst_VelMenuView::rebuildsTheStartMenuAfterAsking()
-{
-    write(QStringLiteral("data/applications/x.desktop"),
-          entryText(QStringLiteral("Xylophone"), "Exec=true\nCategories=Game;\n"));
-    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("data"))));
-    write(QStringLiteral("config/startmenu/old.desktop"), entryText(QStringLiteral("Old")));
-    VelMenuView view(QString(), -1, true);
-    view.show();
-    QVERIFY(open(view, startMenu(), 1));
-    select(view, startMenu() + QLatin1String("/old.desktop"));
-    QSignalSpy changes(&view, &VelMenuView::changed);
-    QSignalSpy selections(&view, QOverload<const QString &>::of(&VelMenuView::selectionChanged));
-
-    ModalDriver modal;
-    modal.answer({QMessageBox::Question, QStringLiteral("Warning"),
-                  QStringLiteral("All previous shortcuts\nwill be lost. Are you sure?"),
-                  QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok},
-                 QMessageBox::Ok);
-    view.slotRecreate();
-    QVERIFY(modal.finished());
-    QCOMPARE(changes.count(), 1);
-    QVERIFY(!view.selectedItem().isValid());
-    QCOMPARE(selections.takeLast().constFirst().toString(), QString());
-    QVERIFY(!QGuiApplication::overrideCursor());
-    QTRY_VERIFY(!names(view, startMenu()).isEmpty());
-    QVERIFY(!names(view, startMenu()).contains(QStringLiteral("Old")));
-    QVERIFY(!QFile::exists(startMenu() + QLatin1String("/old.desktop")));
-
-    // What is made in the new directory shows, so it is the new one that is watched.
-    write(QStringLiteral("config/startmenu/later.desktop"), entryText(QStringLiteral("Later")));
-    QTRY_VERIFY(names(view, startMenu()).contains(QStringLiteral("Later")));
-    select(view, startMenu() + QLatin1String("/later.desktop"));
-    QVERIFY(action(view, QStringLiteral("editAction"))->isEnabled());
-    QVERIFY(QMetaObject::invokeMethod(files(view), "changed"));
-    QCOMPARE(changes.count(), 2);
-    qputenv("XDG_DATA_DIRS", "/usr/local/share:/usr/share");
-}
-
-void tst_VelMenuView::leavesTheStartMenuWhenToldSo()
-{
-    write(QStringLiteral("config/startmenu/old.desktop"), entryText(QStringLiteral("Old")));
-    VelMenuView view(QString(), -1, true);
-    QVERIFY(open(view, startMenu(), 1));
-    QSignalSpy changes(&view, &VelMenuView::changed);
-    for (const bool escape : {false, true}) {
-        ModalDriver modal;
-        modal.handle([escape](QWidget *window) {
-            if (escape)
-                QTest::keyClick(window, Qt::Key_Escape);
-            else
-                qobject_cast<QMessageBox *>(window)->button(QMessageBox::Cancel)->click();
-        });
-        view.slotRecreate();
-        QVERIFY(modal.finished());
-    }
-    QCOMPARE(changes.count(), 0);
-    QCOMPARE(names(view, startMenu()), QStringList{QStringLiteral("Old")});
-    QVERIFY(QFile::exists(startMenu() + QLatin1String("/old.desktop")));
-}
-
-void tst_VelMenuView::leavesTheStartMenuWhenItCannotBeRebuilt()
-{
-    write(QStringLiteral("config/startmenu"), "in the way");
-    VelMenuView view(QString(), -1, true);
-    ModalDriver modal;
-    modal.handle(
-        [](QWidget *window) { qobject_cast<QMessageBox *>(window)->button(QMessageBox::Ok)->click(); });
-    expectWarning(QStringLiteral("VelMenuView: can't create the start menu"));
-    view.slotRecreate();
-    QVERIFY(modal.finished());
-    QVERIFY(!QGuiApplication::overrideCursor());
-    QCOMPARE(read(startMenu()), QByteArray("in the way"));
-    QVERIFY(!view.selectedItem().isValid());
-    QVERIFY(!view.rootIndex().isValid() || view.model()->rowCount(view.rootIndex()) == 0);
-}
-
-void tst_VelMenuView::goesAwayWhileItAsksToRebuild()
-{
-    write(QStringLiteral("config/startmenu/old.desktop"), entryText(QStringLiteral("Old")));
-    auto *view = new VelMenuView(QString(), -1, true);
-    ModalDriver modal;
-    modal.handle([view](QWidget *) { delete view; });
-    view->slotRecreate();
-    QVERIFY(modal.finished());
-    QVERIFY(QFile::exists(startMenu() + QLatin1String("/old.desktop")));
 }
 
 void tst_VelMenuView::goesAwayWhileItLoads()
