@@ -3,14 +3,14 @@
 
 #include "MenuMirror.h"
 
+#include "SortOrderWalk.h"
+
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
 
 #include <algorithm>
-#include <climits>
 
-#include <fnmatch.h>
 #include <unistd.h>
 
 namespace {
@@ -30,50 +30,6 @@ QByteArray linkText(const QString &path)
     const auto size = readlink(QFile::encodeName(path).constData(), text.data(), size_t(text.size()));
     return size < 0 ? QByteArray() : text.left(int(size));
 }
-
-// The places of two names in a list, by walking it.
-struct Walk
-{
-    int leftExact = -1;
-    int rightExact = -1;
-    int leftAny = -1;
-    int rightAny = -1;
-
-    Walk(const QStringList &list, const QString &left, const QString &right)
-    {
-        for (int i = 0; i < list.size(); ++i) {
-            if (step(list.at(i), i, left, right))
-                return;
-        }
-    }
-
-    bool step(const QString &element, int i, const QString &left, const QString &right)
-    {
-        if (element == left) {
-            const bool ends = rightExact != -1;
-            leftExact = i;
-            if (!ends)
-                leftAny = i;
-            return ends;
-        }
-        if (element == right) {
-            rightExact = rightAny = i;
-            return leftExact != -1;
-        }
-        if (leftAny == -1 && rightAny == -1 && element.contains(QLatin1Char('*'))) {
-            const QByteArray pattern = element.toLocal8Bit();
-            if (fnmatch(pattern.constData(), left.toLocal8Bit().constData(), 0) == 0)
-                leftAny = i;
-            if (fnmatch(pattern.constData(), right.toLocal8Bit().constData(), 0) == 0)
-                rightAny = i;
-        }
-        return false;
-    }
-
-    static int place(int exact, int any) { return exact != -1 ? exact : any != -1 ? any : INT_MAX; }
-    int leftPlace() const { return place(leftExact, leftAny); }
-    int rightPlace() const { return place(rightExact, rightAny); }
-};
 
 } // namespace
 
@@ -279,7 +235,7 @@ void MenuMirror::keepFolderNames()
 
 bool MenuMirror::standsBefore(const QString &folder, const QString &left, const QString &right) const
 {
-    const Walk walk(sortOrderOf(folder), left, right);
+    const SortOrderWalk walk(sortOrderOf(folder), left, right);
     if (walk.leftPlace() != walk.rightPlace())
         return walk.leftPlace() < walk.rightPlace();
     const bool leftIsFolder = isShownAsFolder(join(folder, left));

@@ -1,13 +1,12 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "SortOrderWalk.h"
 #include "TestCase.h"
 
 #include <menuedit/SortOrder.h>
 
 #include <QRandomGenerator>
-
-#include <fnmatch.h>
 
 using SortOrder::AtEnd;
 
@@ -28,67 +27,6 @@ private Q_SLOTS:
 };
 
 namespace {
-
-bool matches(const QString &pattern, const QString &name)
-{
-    return fnmatch(pattern.toLocal8Bit().constData(), name.toLocal8Bit().constData(), 0) == 0;
-}
-
-// The positions found by one walk over the list, element by element.
-struct Walk
-{
-    int leftExact = -1;
-    int rightExact = -1;
-    int leftAny = -1;
-    int rightAny = -1;
-
-    // Whether the walk goes on.
-    bool step(int i, const QString &e, const QString &left, const QString &right)
-    {
-        if (e == left) {
-            if (rightExact != -1) {
-                leftExact = i;
-                return false;
-            }
-            if (e == right) {
-                leftExact = rightExact = rightAny = i;
-                return false;
-            }
-            leftExact = leftAny = i;
-        } else if (e == right) {
-            rightExact = rightAny = i;
-            return leftExact == -1;
-        } else if (leftAny == -1 && rightAny == -1 && e.contains(QLatin1Char('*'))) {
-            if (matches(e, left))
-                leftAny = i;
-            if (matches(e, right))
-                rightAny = i;
-        }
-        return true;
-    }
-
-    SortOrder::Places resolve() const
-    {
-        const int rightOfAny = rightAny != -1 ? rightAny : AtEnd;
-        if (leftExact != -1)
-            return {leftExact, rightExact != -1 ? rightExact : rightOfAny};
-        if (rightExact != -1)
-            return {leftAny != -1 ? leftAny : AtEnd, rightExact};
-        if (leftAny != -1)
-            return {leftAny, rightOfAny};
-        return {AtEnd, rightOfAny};
-    }
-};
-
-SortOrder::Places walked(const QStringList &list, const QString &left, const QString &right)
-{
-    Walk walk;
-    for (int i = 0; i < list.size(); ++i) {
-        if (!walk.step(i, list.at(i), left, right))
-            break;
-    }
-    return walk.resolve();
-}
 
 QString pick(const QStringList &from)
 {
@@ -167,9 +105,9 @@ void tst_SortOrder::agreesWithTheWalkOverRandomLists()
         const QString right = pick(names);
 
         const SortOrder::Places places = SortOrder::places(list, left, right);
-        const SortOrder::Places expected = walked(list, left, right);
+        const SortOrderWalk expected(list, left, right);
 
-        if (places.left != expected.left || places.right != expected.right)
+        if (places.left != expected.leftPlace() || places.right != expected.rightPlace())
             QFAIL(qPrintable(list.join(QLatin1Char(' ')) + QStringLiteral(" : ") + left + QLatin1Char(' ')
                              + right));
     }

@@ -2,14 +2,13 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "ProxyTestCase.h"
+#include "SortOrderWalk.h"
 
 #include <frame/DesktopEntryRecord.h>
 
 #include <QDateTime>
 #include <QDir>
 #include <QRandomGenerator>
-
-#include <fnmatch.h>
 
 /// The comparison of two rows, against one that keeps nothing, and what it reads.
 class tst_VelMenuProxyModelComparison : public ProxyTestCase
@@ -91,46 +90,10 @@ bool tst_VelMenuProxyModelComparison::plainLessThan(const QModelIndex &left, con
         VelUIDesktopEntry(m_model->filePath(left.parent()) + QStringLiteral("/.directory")).getSortOrder();
     const QString leftName = left.data(QFileSystemModel::FileNameRole).toString();
     const QString rightName = right.data(QFileSystemModel::FileNameRole).toString();
-    const auto matches = [](const QString &e, const QString &name) {
-        return fnmatch(e.toLocal8Bit().constData(), name.toLocal8Bit().constData(), 0) == 0;
-    };
-    int leftExact = -1, rightExact = -1, leftAny = -1, rightAny = -1;
-    for (int i = 0; i < list.size(); ++i) {
-        const QString &e = list.at(i);
-        if (e == leftName) {
-            if (rightExact != -1) {
-                leftExact = i;
-                break;
-            }
-            if (e == rightName) {
-                leftExact = rightExact = rightAny = i;
-                break;
-            }
-            leftExact = leftAny = i;
-        } else if (e == rightName) {
-            rightExact = rightAny = i;
-            if (leftExact != -1)
-                break;
-        } else if (leftAny == -1 && rightAny == -1 && e.contains(QLatin1Char('*'))) {
-            leftAny = matches(e, leftName) ? i : -1;
-            rightAny = matches(e, rightName) ? i : -1;
-        }
-    }
-    const int end = 2147483647;
-    int l = end, r = end;
-    if (leftExact != -1) {
-        l = leftExact;
-        r = rightExact != -1 ? rightExact : rightAny != -1 ? rightAny : end;
-    } else if (rightExact != -1) {
-        r = rightExact;
-        l = leftAny != -1 ? leftAny : end;
-    } else if (leftAny != -1) {
-        l = leftAny;
-        r = rightAny != -1 ? rightAny : end;
-    } else if (rightAny != -1) {
-        r = rightAny;
-    }
-    return l != r ? r < l : plainFallback(left, right);
+    const SortOrderWalk walk(list, leftName, rightName);
+    if (walk.leftPlace() != walk.rightPlace())
+        return walk.rightPlace() < walk.leftPlace();
+    return plainFallback(left, right);
 }
 
 void tst_VelMenuProxyModelComparison::agreesWithThePlainComparison()
