@@ -1,90 +1,22 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "TestCase.h"
+#include "VelOpenTestCase.h"
 
 #include <velintegration/wmcommandreceiver.h>
 
-#include <QDBusConnection>
-#include <QDBusContext>
-#include <QDBusMessage>
 #include <QDir>
-#include <QElapsedTimer>
 #include <QProcess>
-#include <QTimer>
-
-#include <memory>
 
 #include <fcntl.h>
-#include <sys/types.h>
 #include <unistd.h>
 
-/// An application on the session bus.
-class BusApplication : public QObject, protected QDBusContext
+/// The program that opens an entry, a link, a folder or a file.
+class tst_vel_open : public VelOpenTestCase
 {
     Q_OBJECT
-    Q_CLASSINFO("D-Bus Interface", "org.freedesktop.Application")
-
-public:
-    enum Manner { Answers, Refuses, Hesitates, Leaves };
-    explicit BusApplication(Manner manner)
-        : m_manner(manner)
-    {
-    }
-    int activations() const { return m_activations; }
-    QVariantMap platformData() const { return m_platformData; }
-
-public Q_SLOTS:
-    void Activate(const QVariantMap &platformData)
-    {
-        ++m_activations;
-        m_platformData = platformData;
-        if (m_manner == Refuses)
-            sendErrorReply(QStringLiteral("org.example.Error"), QStringLiteral("no"));
-        else if (m_manner != Answers)
-            setDelayedReply(true);
-        if (m_manner == Leaves)
-            QTimer::singleShot(0, this, &BusApplication::left);
-    }
-
-Q_SIGNALS:
-    void left();
-
-private:
-    Manner m_manner;
-    int m_activations = 0;
-    QVariantMap m_platformData;
-};
-
-class VelOpenTest : public TestCase
-{
-    Q_OBJECT
-
-private:
-    static QString program()
-    {
-        return QCoreApplication::applicationDirPath() + QStringLiteral("/../bin/vel-open");
-    }
-    QByteArray bytes(const QString &text) const { return QFile::encodeName(text); }
-    QString script(const QString &name, const QByteArray &commands);
-    QString probe(const QByteArray &name, const QByteArray &what);
-    QString entry(const QByteArray &keys, const QString &name = QStringLiteral("x.desktop"));
-    QString application(const QByteArray &keys) { return entry("Type=Application\nName=x\n" + keys); }
-    int open(const QString &path);
-    QByteArray told(const char *name = "told") const;
-    QString startBus();
-    void activate(BusApplication::Manner manner, int activations, bool execRuns,
-                  const QByteArray &beforeAll = QByteArray());
-
-    QByteArray m_path;
-    QByteArray m_error;
-    qint64 m_time = 0;
-    std::unique_ptr<QProcess> m_bus;
 
 private Q_SLOTS:
-    void init();
-    void cleanup();
-
     void failsWithoutAPath();
     void tellsHowItIsUsed();
     void failsWithOneLineForAMissingFile();
@@ -108,81 +40,9 @@ private Q_SLOTS:
     void doesNotWaitForABrowser();
     void sendsWindowManagerCommands();
     void failsWithoutAWindowManager();
-    void activatesOverTheBusFirst_data();
-    void activatesOverTheBusFirst();
-    void runsTheCommandWhenTheBusRefuses();
-    void runsTheCommandWhenTheApplicationGoesAway();
-    void handsTheStartupIdOn();
-    void runsTheCommandWhenNobodyIsOnTheBus();
-    void runsTheCommandWithoutABus();
-    void leavesAnApplicationThatTakesItsTimeAlone();
-    void asksNoBusForOtherEntries();
 };
 
-void VelOpenTest::init()
-{
-    TestCase::init();
-    m_path = qgetenv("PATH");
-    qputenv("PATH", bytes(path(QStringLiteral("bin"))) + ':' + m_path);
-}
-
-void VelOpenTest::cleanup()
-{
-    QDBusConnection::disconnectFromBus(QStringLiteral("test"));
-    if (m_bus) {
-        m_bus->terminate();
-        m_bus->waitForFinished();
-        m_bus.reset();
-    }
-    qputenv("PATH", m_path);
-    qunsetenv("TERMINAL");
-    qunsetenv("DBUS_SESSION_BUS_ADDRESS");
-    TestCase::cleanup();
-}
-
-QString VelOpenTest::script(const QString &name, const QByteArray &commands)
-{
-    const QString file = write(QStringLiteral("bin/") + name, "#!/bin/sh\n" + commands);
-    QFile::setPermissions(file, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
-    return file;
-}
-
-// A program that tells something: the file appears when all of it is written.
-QString VelOpenTest::probe(const QByteArray &name, const QByteArray &what)
-{
-    const QByteArray told = "'" + bytes(folder());
-    return script(QFile::decodeName(name),
-                  "text=$(" + what + "\necho .)\nprintf %s \"${text%.}\" >" + told + "/new'\n/bin/mv " + told
-                      + "/new' " + told + "/told'\n");
-}
-
-QString VelOpenTest::entry(const QByteArray &keys, const QString &name)
-{
-    return write(name, "[Desktop Entry]\n" + keys);
-}
-
-int VelOpenTest::open(const QString &path)
-{
-    QProcess process;
-    QElapsedTimer timer;
-    timer.start();
-    process.setWorkingDirectory(folder());
-    process.start(program(), {QStringLiteral("--exec"), path});
-    // Events go on meanwhile: the applications on the bus live in this process.
-    if (!QTest::qWaitFor([&process] { return process.state() == QProcess::NotRunning; }, 20000))
-        return -2;
-    m_time = timer.elapsed();
-    m_error = process.readAllStandardError();
-    return process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
-}
-
-QByteArray VelOpenTest::told(const char *name) const
-{
-    QFile file(path(QString::fromLatin1(name)));
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
-
-void VelOpenTest::failsWithoutAPath()
+void tst_vel_open::failsWithoutAPath()
 {
     for (const char *arguments : {"", "--exec", "--exec|", "x|y", "--exec|a|b"}) {
         QProcess process;
@@ -193,7 +53,7 @@ void VelOpenTest::failsWithoutAPath()
     }
 }
 
-void VelOpenTest::tellsHowItIsUsed()
+void tst_vel_open::tellsHowItIsUsed()
 {
     QProcess process;
     process.start(program(), {QStringLiteral("--help")});
@@ -205,7 +65,7 @@ void VelOpenTest::tellsHowItIsUsed()
     QCOMPARE(process.readAllStandardOutput(), QByteArray("vel-open " VEL_VERSION "\n"));
 }
 
-void VelOpenTest::failsWithOneLineForAMissingFile()
+void tst_vel_open::failsWithOneLineForAMissingFile()
 {
     QCOMPARE(open(path(QStringLiteral("a\nb.desktop"))), 1);
     QCOMPARE(m_error.count('\n'), 1);
@@ -213,7 +73,7 @@ void VelOpenTest::failsWithOneLineForAMissingFile()
     QVERIFY2(m_error.contains("a?b.desktop: "), m_error.constData());
 }
 
-void VelOpenTest::failsForAnEntryThatCannotRun_data()
+void tst_vel_open::failsForAnEntryThatCannotRun_data()
 {
     QTest::addColumn<QByteArray>("contents");
     const QByteArray start = "[Desktop Entry]\nType=Application\nName=x\n";
@@ -234,7 +94,7 @@ void VelOpenTest::failsForAnEntryThatCannotRun_data()
     QTest::newRow("link without URL") << QByteArray("[Desktop Entry]\nType=Link\nName=x\n");
 }
 
-void VelOpenTest::failsForAnEntryThatCannotRun()
+void tst_vel_open::failsForAnEntryThatCannotRun()
 {
     QFETCH(QByteArray, contents);
     const QString broken = write(QStringLiteral("bin/broken-interpreter"), "#!/no/such/interpreter\n");
@@ -245,7 +105,7 @@ void VelOpenTest::failsForAnEntryThatCannotRun()
              m_error.constData());
 }
 
-void VelOpenTest::runsTheCommandWithItsArguments()
+void tst_vel_open::runsTheCommandWithItsArguments()
 {
     probe("my probe", "printf '%s|' \"$@\"");
     const QString path =
@@ -257,7 +117,7 @@ void VelOpenTest::runsTheCommandWithItsArguments()
     QTRY_COMPARE(told(), "a  b|$\"\\|c|%|--icon|my icon|It's|" + bytes(path) + "|end|");
 }
 
-void VelOpenTest::tellsTheProgramItsNameInTheUsersLanguage()
+void tst_vel_open::tellsTheProgramItsNameInTheUsersLanguage()
 {
     probe("probe", "printf '%s|' \"$@\"");
     const QByteArray before = qgetenv("LC_ALL");
@@ -267,7 +127,7 @@ void VelOpenTest::tellsTheProgramItsNameInTheUsersLanguage()
     QTRY_COMPARE(told(), QByteArray("Ding|"));
 }
 
-void VelOpenTest::findsAPathThatIsRelative()
+void tst_vel_open::findsAPathThatIsRelative()
 {
     probe("probe", "printf %s \"$1\"");
     const QString path = application("Exec=probe %k\n");
@@ -275,7 +135,7 @@ void VelOpenTest::findsAPathThatIsRelative()
     QTRY_COMPARE(told(), bytes(path));
 }
 
-void VelOpenTest::startsInTheFolderOfTheEntry()
+void tst_vel_open::startsInTheFolderOfTheEntry()
 {
     probe("probe", "/bin/pwd");
     QDir().mkpath(path(QStringLiteral("some where")));
@@ -287,7 +147,7 @@ void VelOpenTest::startsInTheFolderOfTheEntry()
     QTRY_COMPARE(told("local"), QByteArray("\n"));
 }
 
-void VelOpenTest::givesTheProgramASessionOfItsOwn_data()
+void tst_vel_open::givesTheProgramASessionOfItsOwn_data()
 {
     QTest::addColumn<QByteArray>("program");
     QTest::addColumn<QByteArray>("keys");
@@ -295,7 +155,7 @@ void VelOpenTest::givesTheProgramASessionOfItsOwn_data()
     QTest::newRow("link") << QByteArray("xdg-open") << QByteArray("Type=Link\nURL=https://localhost/\n");
 }
 
-void VelOpenTest::givesTheProgramASessionOfItsOwn()
+void tst_vel_open::givesTheProgramASessionOfItsOwn()
 {
     QFETCH(QByteArray, program);
     QFETCH(QByteArray, keys);
@@ -307,7 +167,7 @@ void VelOpenTest::givesTheProgramASessionOfItsOwn()
     QVERIFY(session != getsid(0));
 }
 
-void VelOpenTest::keepsTheProgramOffTheFilesOfTheCaller()
+void tst_vel_open::keepsTheProgramOffTheFilesOfTheCaller()
 {
     int ends[2];
     QCOMPARE(pipe(ends), 0); // inherited by all that is started here
@@ -325,7 +185,7 @@ void VelOpenTest::keepsTheProgramOffTheFilesOfTheCaller()
     QVERIFY2(!told().contains("socket:"), told().constData());
 }
 
-void VelOpenTest::programOutlivesIt()
+void tst_vel_open::programOutlivesIt()
 {
     probe("probe",
           "while ! [ -e '" + bytes(path(QStringLiteral("go"))) + "' ]; do /bin/sleep 0.02; done; echo alive");
@@ -336,7 +196,7 @@ void VelOpenTest::programOutlivesIt()
     QTRY_COMPARE(told(), QByteArray("alive\n"));
 }
 
-void VelOpenTest::runsTerminalEntriesInATerminal_data()
+void tst_vel_open::runsTerminalEntriesInATerminal_data()
 {
     QTest::addColumn<QByteArray>("variable");
     QTest::addColumn<QByteArray>("installed");
@@ -354,7 +214,7 @@ void VelOpenTest::runsTerminalEntriesInATerminal_data()
     QTest::newRow("only xterm") << QByteArray() << QByteArray("xterm") << QByteArray("xterm|-e|");
 }
 
-void VelOpenTest::runsTerminalEntriesInATerminal()
+void tst_vel_open::runsTerminalEntriesInATerminal()
 {
     QFETCH(QByteArray, variable);
     QFETCH(QByteArray, installed);
@@ -369,7 +229,7 @@ void VelOpenTest::runsTerminalEntriesInATerminal()
     QTRY_COMPARE(told(), expected + "program|a b|");
 }
 
-void VelOpenTest::failsWithoutATerminal()
+void tst_vel_open::failsWithoutATerminal()
 {
     script(QStringLiteral("program"), "");
     qputenv("PATH", bytes(path(QStringLiteral("bin"))));
@@ -377,7 +237,7 @@ void VelOpenTest::failsWithoutATerminal()
     QCOMPARE(m_error.count('\n'), 1);
 }
 
-void VelOpenTest::failsForATerminalEntryWithoutItsProgram()
+void tst_vel_open::failsForATerminalEntryWithoutItsProgram()
 {
     probe("xterm", "echo started");
     qputenv("PATH", bytes(path(QStringLiteral("bin"))));
@@ -385,7 +245,7 @@ void VelOpenTest::failsForATerminalEntryWithoutItsProgram()
     QCOMPARE(told(), QByteArray());
 }
 
-void VelOpenTest::opensLinksFoldersAndFiles_data()
+void tst_vel_open::opensLinksFoldersAndFiles_data()
 {
     QTest::addColumn<QString>("name");
     QTest::addColumn<QByteArray>("contents");
@@ -400,7 +260,7 @@ void VelOpenTest::opensLinksFoldersAndFiles_data()
         << "sub/a.desktop" << QByteArray("[Desktop Entry]\nType=Directory\n") << "~/sub";
 }
 
-void VelOpenTest::opensLinksFoldersAndFiles()
+void tst_vel_open::opensLinksFoldersAndFiles()
 {
     QFETCH(QString, name);
     QFETCH(QByteArray, contents);
@@ -414,7 +274,7 @@ void VelOpenTest::opensLinksFoldersAndFiles()
     QTRY_COMPARE(told(), bytes(opened.replace(QLatin1Char('~'), folder())) + '|');
 }
 
-void VelOpenTest::failsWhenNothingOpensTheFile()
+void tst_vel_open::failsWhenNothingOpensTheFile()
 {
     const QString file = write(QStringLiteral("notes.txt"), "text");
     script(QStringLiteral("xdg-open"), "exit 3\n");
@@ -426,7 +286,7 @@ void VelOpenTest::failsWhenNothingOpensTheFile()
     QCOMPARE(m_error.count('\n'), 1);
 }
 
-void VelOpenTest::doesNotWaitForABrowser()
+void tst_vel_open::doesNotWaitForABrowser()
 {
     probe("xdg-open",
           "while ! [ -e '" + bytes(path(QStringLiteral("go"))) + "' ]; do /bin/sleep 0.02; done; echo alive");
@@ -436,7 +296,7 @@ void VelOpenTest::doesNotWaitForABrowser()
     QTRY_COMPARE(told(), QByteArray("alive\n"));
 }
 
-void VelOpenTest::sendsWindowManagerCommands()
+void tst_vel_open::sendsWindowManagerCommands()
 {
     QList<QByteArray> lines;
     WmCommandReceiver receiver([&lines](const std::string &line) { lines.append(line.c_str()); });
@@ -446,134 +306,11 @@ void VelOpenTest::sendsWindowManagerCommands()
     QCOMPARE(lines, QList<QByteArray>({"VELWM_MOVE  1 \"2\" %f"}));
 }
 
-void VelOpenTest::failsWithoutAWindowManager()
+void tst_vel_open::failsWithoutAWindowManager()
 {
     QCOMPARE(open(application("Exec=VELWM_QUIT\n")), 1);
     QCOMPARE(m_error.count('\n'), 1);
 }
 
-QString VelOpenTest::startBus()
-{
-    m_bus.reset(new QProcess);
-    m_bus->start(QStringLiteral("dbus-daemon"),
-                 {QStringLiteral("--session"), QStringLiteral("--nofork"), QStringLiteral("--nopidfile"),
-                  QStringLiteral("--print-address=1")});
-    QByteArray address;
-    while (!address.endsWith('\n') && m_bus->waitForReadyRead(10000))
-        address += m_bus->readAllStandardOutput();
-    qputenv("DBUS_SESSION_BUS_ADDRESS", address.trimmed());
-    return QString::fromLatin1(address.trimmed());
-}
-
-void VelOpenTest::activate(BusApplication::Manner manner, int activations, bool execRuns,
-                           const QByteArray &beforeAll)
-{
-    const QString address = startBus();
-    QVERIFY(!address.isEmpty());
-    {
-        QDBusConnection bus = QDBusConnection::connectToBus(address, QStringLiteral("test"));
-        QVERIFY(bus.isConnected());
-        BusApplication application(manner);
-        QVERIFY(bus.registerService(QStringLiteral("org.example.My-App")));
-        QVERIFY(bus.registerObject(QStringLiteral("/org/example/My_App"), &application,
-                                   QDBusConnection::ExportAllSlots));
-        connect(&application, &BusApplication::left, this, [&bus] {
-            QDBusConnection::disconnectFromBus(QStringLiteral("test"));
-            bus = QDBusConnection(QString()); // the last one that held it
-        });
-        probe("probe", "echo ran");
-        // Where the command must not run, to try it would be an error.
-        const QByteArray program = execRuns ? "probe" : "no-such-program-here";
-        const QString path = write(QStringLiteral("org.example.My-App.desktop"),
-                                   beforeAll + "[Desktop Entry]\nType=Application\nName=x\nExec=" + program
-                                       + "\nDBusActivatable=true\n");
-        QCOMPARE(open(path), 0);
-        QVERIFY2(m_time < 2000, qPrintable(QString::number(m_time)));
-        QCOMPARE(application.activations(), activations);
-        QCOMPARE(application.platformData().value(QStringLiteral("desktop-startup-id")).toByteArray(),
-                 qgetenv("DESKTOP_STARTUP_ID"));
-    }
-    if (execRuns)
-        QTRY_COMPARE(told(), QByteArray("ran\n"));
-}
-
-void VelOpenTest::activatesOverTheBusFirst_data()
-{
-    QTest::addColumn<QByteArray>("beforeAll");
-    QTest::newRow("plain") << QByteArray();
-    QTest::newRow("byte order mark") << QByteArray("\xEF\xBB\xBF");
-}
-
-void VelOpenTest::activatesOverTheBusFirst()
-{
-    QFETCH(QByteArray, beforeAll);
-    activate(BusApplication::Answers, 1, false, beforeAll);
-}
-
-void VelOpenTest::runsTheCommandWhenTheBusRefuses()
-{
-    activate(BusApplication::Refuses, 1, true);
-}
-
-void VelOpenTest::runsTheCommandWhenTheApplicationGoesAway()
-{
-    activate(BusApplication::Leaves, 1, true);
-}
-
-void VelOpenTest::handsTheStartupIdOn()
-{
-    qputenv("DESKTOP_STARTUP_ID", "menu_TIME1234");
-    activate(BusApplication::Answers, 1, false);
-    qunsetenv("DESKTOP_STARTUP_ID");
-}
-
-void VelOpenTest::runsTheCommandWhenNobodyIsOnTheBus()
-{
-    QVERIFY(!startBus().isEmpty());
-    probe("probe", "echo ran");
-    const QByteArray keys = "Type=Application\nName=x\nExec=probe\nDBusActivatable=true\n";
-    QCOMPARE(open(entry(keys, QStringLiteral("org.example.Nobody.desktop"))), 0);
-    QTRY_COMPARE(told(), QByteArray("ran\n"));
-    QVERIFY(QFile::remove(path(QStringLiteral("told"))));
-    QCOMPARE(open(entry(keys, QStringLiteral("no bus name.desktop"))), 0);
-    QTRY_COMPARE(told(), QByteArray("ran\n"));
-    // Without a command there is nothing to fall back on.
-    QCOMPARE(open(entry("Type=Application\nName=x\nDBusActivatable=true\n",
-                        QStringLiteral("org.example.Nobody.desktop"))),
-             1);
-}
-
-void VelOpenTest::runsTheCommandWithoutABus()
-{
-    probe("probe", "echo ran");
-    const QByteArray keys = "Type=Application\nName=x\nExec=probe\nDBusActivatable=true\n";
-    QCOMPARE(open(entry(keys, QStringLiteral("org.example.App.desktop"))), 0);
-    QTRY_COMPARE(told(), QByteArray("ran\n"));
-}
-
-void VelOpenTest::leavesAnApplicationThatTakesItsTimeAlone()
-{
-    activate(BusApplication::Hesitates, 1, false);
-}
-
-void VelOpenTest::asksNoBusForOtherEntries()
-{
-    const QString address = startBus();
-    {
-        QDBusConnection bus = QDBusConnection::connectToBus(address, QStringLiteral("test"));
-        BusApplication application(BusApplication::Answers);
-        QVERIFY(bus.registerService(QStringLiteral("org.example.App")));
-        QVERIFY(bus.registerObject(QStringLiteral("/org/example/App"), &application,
-                                   QDBusConnection::ExportAllSlots));
-        probe("probe", "echo ran");
-        QCOMPARE(open(entry("Type=Application\nName=x\nExec=probe\nDBusActivatable=false\n"
-                            "[Desktop Action a]\nDBusActivatable=true\n",
-                            QStringLiteral("org.example.App.desktop"))),
-                 0);
-        QCOMPARE(application.activations(), 0);
-    }
-    QTRY_COMPARE(told(), QByteArray("ran\n"));
-}
-
-VEL_TEST_GUILESS_MAIN(VelOpenTest)
+VEL_TEST_GUILESS_MAIN(tst_vel_open)
 #include "tst_vel_open.moc"
