@@ -1,50 +1,21 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "OrdinaryUser.h"
-#include "TestCase.h"
+#include "StartMenuTestCase.h"
 
 #include <velintegration/startmenu.h>
 #include <veluiaux/VelUIDesktopEntry.h>
 
 #include <QDir>
-#include <QDirIterator>
-#include <QFileInfo>
 
-#include <csignal>
-
-#include <sys/resource.h>
 #include <unistd.h>
 
-class StartMenuTest : public TestCase
+/// Which applications stand in a start menu, in which folders, and in which order.
+class tst_startmenu : public StartMenuTestCase
 {
     Q_OBJECT
 
-private:
-    QString menu() const { return path(QStringLiteral("config/vel/startmenu")); }
-    QString inMenu(const QString &name) const { return menu() + QLatin1Char('/') + name; }
-    bool create() const { return CreateStartMenu(QFile::encodeName(menu()).constData(), nullptr); }
-    QString install(const QString &name, const QByteArray &categories, const QByteArray &more = QByteArray())
-    {
-        return write(QStringLiteral("home/applications/") + name,
-                     "[Desktop Entry]\nType=Application\nName=" + QFileInfo(name).completeBaseName().toUtf8()
-                         + "\nExec=true\nCategories=" + categories + '\n' + more);
-    }
-    static QStringList names(const QString &folder)
-    {
-        return QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot,
-                                      QDir::Name);
-    }
-    static QMap<QString, QByteArray> tree(const QString &folder);
-    QStringList sortOrder(const QString &folder) const
-    {
-        return VelUIDesktopEntry(folder + QStringLiteral("/.directory")).getSortOrder();
-    }
-
 private Q_SLOTS:
-    void init();
-    void cleanup();
-
     void refusesAnEmptyDirectory();
     void isTheBareRootWithoutApplications();
     void groupsByTheFirstMainCategory_data();
@@ -68,67 +39,16 @@ private Q_SLOTS:
     void usesTheDefaultDirectories();
     void namesThatClashGetTheirIds();
     void namesThatClashWithAnIdGetTheirsToo();
-    void entriesAreIndependentCopies();
-    void copiesCanBeWritten();
-    void theSameInputGivesTheSameTree();
-    void replacesTheOldMenu();
-    void missingParentsAreMade();
-    void aLinkIsFollowed();
-    void aDanglingLinkIsFollowed();
-    void aCircleOfLinksIsRefused();
-    void linksInTheOldMenuAreNotFollowed();
-    void keepsThePermissionsOfTheOldMenu();
-    void removesReadOnlyFoldersOfTheOldMenu();
-    void aFullDiskLeavesTheOldMenuWhole();
-    void aFileInTheWayStays();
-    void madeParentsGoWhenItFails();
-    void aTemplateIsCopiedInstead();
-    void aTemplateIsCopiedWithoutLinks();
-    void aTemplateMayHoldTheMenu();
-    void aMissingTemplateLeavesTheOldMenuWhole();
-    void theSampleMenuShowsAllItsEntries();
 };
 
-void StartMenuTest::init()
-{
-    TestCase::init();
-    qputenv("XDG_DATA_HOME", QFile::encodeName(path(QStringLiteral("home"))));
-    qputenv(
-        "XDG_DATA_DIRS",
-        QFile::encodeName(path(QStringLiteral("local")) + QLatin1Char(':') + path(QStringLiteral("system"))));
-    qputenv("LC_ALL", "C.UTF-8");
-}
-
-void StartMenuTest::cleanup()
-{
-    qunsetenv("LC_ALL");
-    TestCase::cleanup();
-}
-
-QMap<QString, QByteArray> StartMenuTest::tree(const QString &folder)
-{
-    QMap<QString, QByteArray> files;
-    QDirIterator it(folder, QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot,
-                    QDirIterator::Subdirectories);
-    while (it.hasNext()) {
-        const QString path = it.next();
-        const QString name = path.mid(folder.size() + 1);
-        files.insert(name,
-                     it.fileInfo().isSymLink()   ? QByteArray("link")
-                         : it.fileInfo().isDir() ? QByteArray("folder")
-                                                 : read(path));
-    }
-    return files;
-}
-
-void StartMenuTest::refusesAnEmptyDirectory()
+void tst_startmenu::refusesAnEmptyDirectory()
 {
     QVERIFY(!CreateStartMenu(nullptr, nullptr));
     QVERIFY(!CreateStartMenu("", nullptr));
     QVERIFY(!CreateStartMenu("/", nullptr));
 }
 
-void StartMenuTest::isTheBareRootWithoutApplications()
+void tst_startmenu::isTheBareRootWithoutApplications()
 {
     QVERIFY(create());
     QCOMPARE(names(menu()), QStringList(QStringLiteral(".directory")));
@@ -138,7 +58,7 @@ void StartMenuTest::isTheBareRootWithoutApplications()
     QCOMPARE(root.getSortOrder(), QStringList());
 }
 
-void StartMenuTest::groupsByTheFirstMainCategory_data()
+void tst_startmenu::groupsByTheFirstMainCategory_data()
 {
     QTest::addColumn<QByteArray>("categories");
     QTest::addColumn<QString>("folder");
@@ -170,7 +90,7 @@ void StartMenuTest::groupsByTheFirstMainCategory_data()
             << QByteArray(row.first) << QString::fromLatin1(row.second);
 }
 
-void StartMenuTest::groupsByTheFirstMainCategory()
+void tst_startmenu::groupsByTheFirstMainCategory()
 {
     QFETCH(QByteArray, categories);
     QFETCH(QString, folder);
@@ -181,7 +101,7 @@ void StartMenuTest::groupsByTheFirstMainCategory()
              QStringList({QStringLiteral(".directory"), QStringLiteral("app.desktop")}));
 }
 
-void StartMenuTest::ordersTheFoldersAsTheStandardDoes()
+void tst_startmenu::ordersTheFoldersAsTheStandardDoes()
 {
     const QByteArrayList categories = {"",        "Utility",   "System", "Settings",  "Science",     "Office",
                                        "Network", "Graphics",  "Game",   "Education", "Development", "Video",
@@ -196,7 +116,7 @@ void StartMenuTest::ordersTheFoldersAsTheStandardDoes()
     QCOMPARE(names(menu()).size(), 15);
 }
 
-void StartMenuTest::makesNoFolderWithoutApplications()
+void tst_startmenu::makesNoFolderWithoutApplications()
 {
     install(QStringLiteral("a.desktop"), "Game;");
     install(QStringLiteral("b.desktop"), "Office;", "NoDisplay=true\n");
@@ -205,7 +125,7 @@ void StartMenuTest::makesNoFolderWithoutApplications()
     QCOMPARE(sortOrder(menu()), QStringList(QStringLiteral("Game")));
 }
 
-void StartMenuTest::namesEveryFolderInAllLanguages_data()
+void tst_startmenu::namesEveryFolderInAllLanguages_data()
 {
     QTest::addColumn<QString>("folder");
     QTest::addColumn<QString>("english");
@@ -226,7 +146,7 @@ void StartMenuTest::namesEveryFolderInAllLanguages_data()
                            << "Sonstiges" << QStringLiteral("其他");
 }
 
-void StartMenuTest::namesEveryFolderInAllLanguages()
+void tst_startmenu::namesEveryFolderInAllLanguages()
 {
     QFETCH(QString, folder);
     QFETCH(QString, english);
@@ -253,7 +173,7 @@ void StartMenuTest::namesEveryFolderInAllLanguages()
     QCOMPARE(bytes.count("\nName["), catalogues.size());
 }
 
-void StartMenuTest::givesEveryFolderAnIconOfItsOwn()
+void tst_startmenu::givesEveryFolderAnIconOfItsOwn()
 {
     install(QStringLiteral("a.desktop"), "Game;");
     install(QStringLiteral("b.desktop"), "Settings;");
@@ -269,7 +189,7 @@ void StartMenuTest::givesEveryFolderAnIconOfItsOwn()
     QCOMPARE(icon("."), QStringLiteral("start-here"));
 }
 
-void StartMenuTest::ordersTheEntriesByTheirShownNames()
+void tst_startmenu::ordersTheEntriesByTheirShownNames()
 {
     install(QStringLiteral("1.desktop"), "Game;", "Name[de]=Zebra\n");
     write(QStringLiteral("home/applications/2.desktop"),
@@ -284,7 +204,7 @@ void StartMenuTest::ordersTheEntriesByTheirShownNames()
     QCOMPARE(sortOrder(inMenu(QStringLiteral("Game"))), list("2.desktop 3.desktop 1.desktop"));
 }
 
-void StartMenuTest::ordersEntriesOfOneNameByTheirFiles()
+void tst_startmenu::ordersEntriesOfOneNameByTheirFiles()
 {
     const QByteArray entry = "[Desktop Entry]\nType=Application\nName=Same\nExec=true\nCategories=Game;\n";
     write(QStringLiteral("home/applications/z.desktop"), entry);
@@ -296,7 +216,7 @@ void StartMenuTest::ordersEntriesOfOneNameByTheirFiles()
         QStringList({QStringLiteral("a.desktop"), QStringLiteral("b.desktop"), QStringLiteral("z.desktop")}));
 }
 
-void StartMenuTest::listsOddFileNames()
+void tst_startmenu::listsOddFileNames()
 {
     const QStringList names = {QStringLiteral(" a.desktop"), QStringLiteral("a;b.desktop"),
                                QStringLiteral("c\\d.desktop"), QStringLiteral("e f.desktop"),
@@ -309,7 +229,7 @@ void StartMenuTest::listsOddFileNames()
     QCOMPARE(sortOrder(inMenu(QStringLiteral("Game"))), names);
 }
 
-void StartMenuTest::leavesOutWhatIsNotDisplayable_data()
+void tst_startmenu::leavesOutWhatIsNotDisplayable_data()
 {
     QTest::addColumn<QByteArray>("entry");
     const QByteArray start = "[Desktop Entry]\nType=Application\nName=x\nExec=true\nCategories=Game;\n";
@@ -324,7 +244,7 @@ void StartMenuTest::leavesOutWhatIsNotDisplayable_data()
     QTest::newRow("empty") << QByteArray();
 }
 
-void StartMenuTest::leavesOutWhatIsNotDisplayable()
+void tst_startmenu::leavesOutWhatIsNotDisplayable()
 {
     QFETCH(QByteArray, entry);
     write(QStringLiteral("home/applications/x.desktop"), entry);
@@ -335,7 +255,7 @@ void StartMenuTest::leavesOutWhatIsNotDisplayable()
              QStringList({QStringLiteral(".directory"), QStringLiteral("shown.desktop")}));
 }
 
-void StartMenuTest::hidesAnIdThatWasSeenEarlier()
+void tst_startmenu::hidesAnIdThatWasSeenEarlier()
 {
     const QByteArray entry = "[Desktop Entry]\nType=Application\nExec=true\nCategories=Game;\nName=";
     write(QStringLiteral("system/applications/a.desktop"), entry + "system");
@@ -352,14 +272,14 @@ void StartMenuTest::hidesAnIdThatWasSeenEarlier()
     QCOMPARE(read(inMenu(QStringLiteral("Game/b.desktop"))), entry + "home");
 }
 
-void StartMenuTest::hidesAnIdBehindWhatIsNoApplication_data()
+void tst_startmenu::hidesAnIdBehindWhatIsNoApplication_data()
 {
     QTest::addColumn<QString>("kind");
     for (const char *kind : {"hidden entry", "garbage", "link to /dev/null", "link to nowhere"})
         QTest::newRow(kind) << QString::fromLatin1(kind);
 }
 
-void StartMenuTest::hidesAnIdBehindWhatIsNoApplication()
+void tst_startmenu::hidesAnIdBehindWhatIsNoApplication()
 {
     QFETCH(QString, kind);
     const QByteArray entry = "[Desktop Entry]\nType=Application\nExec=true\nCategories=Game;\nName=x\n";
@@ -376,7 +296,7 @@ void StartMenuTest::hidesAnIdBehindWhatIsNoApplication()
     QCOMPARE(names(menu()), QStringList(QStringLiteral(".directory")));
 }
 
-void StartMenuTest::findsApplicationsInSubfolders()
+void tst_startmenu::findsApplicationsInSubfolders()
 {
     install(QStringLiteral("one/two/app.desktop"), "Game;");
     install(QStringLiteral(".hidden.desktop"), "Game;");
@@ -386,7 +306,7 @@ void StartMenuTest::findsApplicationsInSubfolders()
              QStringList({QStringLiteral(".directory"), QStringLiteral("app.desktop")}));
 }
 
-void StartMenuTest::survivesLinksInACircle()
+void tst_startmenu::survivesLinksInACircle()
 {
     install(QStringLiteral("sub/app.desktop"), "Game;");
     QVERIFY(QFile::link(path(QStringLiteral("home/applications")),
@@ -397,14 +317,14 @@ void StartMenuTest::survivesLinksInACircle()
              QStringList({QStringLiteral(".directory"), QStringLiteral("app.desktop")}));
 }
 
-void StartMenuTest::usesTheDefaultDirectories_data()
+void tst_startmenu::usesTheDefaultDirectories_data()
 {
     QTest::addColumn<QByteArray>("dataHome");
     QTest::newRow("none set") << QByteArray();
     QTest::newRow("no absolute path") << QByteArray("relative");
 }
 
-void StartMenuTest::usesTheDefaultDirectories()
+void tst_startmenu::usesTheDefaultDirectories()
 {
     QFETCH(QByteArray, dataHome);
     const QByteArray home = qgetenv("HOME");
@@ -423,7 +343,7 @@ void StartMenuTest::usesTheDefaultDirectories()
              QStringList({QStringLiteral(".directory"), QStringLiteral("a.desktop")}));
 }
 
-void StartMenuTest::namesThatClashGetTheirIds()
+void tst_startmenu::namesThatClashGetTheirIds()
 {
     install(QStringLiteral("app.desktop"), "Game;");
     install(QStringLiteral("one/app.desktop"), "Game;");
@@ -438,7 +358,7 @@ void StartMenuTest::namesThatClashGetTheirIds()
              QStringList({QStringLiteral(".directory"), QStringLiteral("app.desktop")}));
 }
 
-void StartMenuTest::namesThatClashWithAnIdGetTheirsToo()
+void tst_startmenu::namesThatClashWithAnIdGetTheirsToo()
 {
     install(QStringLiteral("app.desktop"), "Game;");
     install(QStringLiteral("one/app.desktop"), "Game;");
@@ -449,231 +369,5 @@ void StartMenuTest::namesThatClashWithAnIdGetTheirsToo()
                           QStringLiteral("one-app.desktop"), QStringLiteral("sub-one-app.desktop")}));
 }
 
-void StartMenuTest::entriesAreIndependentCopies()
-{
-    const QString original = install(QStringLiteral("real.desktop"), "Game;", "# comment\nX-Own=1\n");
-    QVERIFY(QFile::link(original, path(QStringLiteral("home/applications/linked.desktop"))));
-    const QByteArray bytes = read(original);
-    QVERIFY(create());
-    for (const char *name : {"Game/real.desktop", "Game/linked.desktop"}) {
-        const QString copy = inMenu(QString::fromLatin1(name));
-        QVERIFY(!QFileInfo(copy).isSymLink());
-        QCOMPARE(read(copy), bytes);
-        QFile file(copy);
-        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Truncate));
-    }
-    QCOMPARE(read(original), bytes);
-}
-
-void StartMenuTest::copiesCanBeWritten()
-{
-    const QString original = install(QStringLiteral("a.desktop"), "Game;");
-    QVERIFY(QFile::setPermissions(original, QFile::ReadOwner | QFile::ReadGroup | QFile::ReadOther));
-    QVERIFY(create());
-    QVERIFY(QFileInfo(inMenu(QStringLiteral("Game/a.desktop"))).permissions() & QFile::WriteOwner);
-    QVERIFY(!(QFileInfo(original).permissions() & QFile::WriteOwner));
-}
-
-void StartMenuTest::theSameInputGivesTheSameTree()
-{
-    for (int i = 0; i < 40; ++i)
-        install(QStringLiteral("app%1.desktop").arg((i * 17) % 40), i % 2 ? "Game;" : "Office;");
-    install(QStringLiteral("one/app1.desktop"), "Game;");
-    QVERIFY(create());
-    const QMap<QString, QByteArray> first = tree(menu());
-    QVERIFY(first.size() > 41);
-    QVERIFY(create());
-    QCOMPARE(tree(menu()), first);
-    const QString other = path(QStringLiteral("other"));
-    QVERIFY(CreateStartMenu(QFile::encodeName(other).constData(), nullptr));
-    QCOMPARE(tree(other), first);
-}
-
-void StartMenuTest::replacesTheOldMenu()
-{
-    install(QStringLiteral("a.desktop"), "Game;");
-    write(QStringLiteral("config/vel/startmenu/Game/mine.desktop"), "[Desktop Entry]\n");
-    write(QStringLiteral("config/vel/startmenu/Mine/.directory"), "[Desktop Entry]\n");
-    QVERIFY(create());
-    QCOMPARE(tree(menu()).keys(),
-             QStringList({QStringLiteral(".directory"), QStringLiteral("Game"),
-                          QStringLiteral("Game/.directory"), QStringLiteral("Game/a.desktop")}));
-    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
-}
-
-void StartMenuTest::missingParentsAreMade()
-{
-    const QString deep = path(QStringLiteral("one/two/three/menu/"));
-    QVERIFY(CreateStartMenu(QFile::encodeName(deep).constData(), nullptr));
-    QVERIFY(QFile::exists(path(QStringLiteral("one/two/three/menu/.directory"))));
-    QCOMPARE(names(path(QStringLiteral("one/two/three"))), QStringList(QStringLiteral("menu")));
-}
-
-void StartMenuTest::aLinkIsFollowed()
-{
-    install(QStringLiteral("a.desktop"), "Game;");
-    write(QStringLiteral("real/menu/old.desktop"), "[Desktop Entry]\n");
-    QDir().mkpath(path(QStringLiteral("config/vel")));
-    QVERIFY(QFile::link(path(QStringLiteral("real/menu")), menu()));
-    QVERIFY(create());
-    QVERIFY(QFileInfo(menu()).isSymLink());
-    QCOMPARE(names(path(QStringLiteral("real/menu"))),
-             QStringList({QStringLiteral(".directory"), QStringLiteral("Game")}));
-    QCOMPARE(names(path(QStringLiteral("real"))), QStringList(QStringLiteral("menu")));
-}
-
-void StartMenuTest::aDanglingLinkIsFollowed()
-{
-    QDir().mkpath(path(QStringLiteral("config/vel")));
-    QVERIFY(QFile::link(QStringLiteral("../../real/menu"), menu()));
-    QVERIFY(create());
-    QVERIFY(QFileInfo(menu()).isSymLink());
-    QCOMPARE(names(path(QStringLiteral("real/menu"))), QStringList(QStringLiteral(".directory")));
-}
-
-void StartMenuTest::aCircleOfLinksIsRefused()
-{
-    QDir().mkpath(path(QStringLiteral("config/vel")));
-    QVERIFY(QFile::link(QStringLiteral("startmenu"), menu()));
-    QVERIFY(!create());
-    QVERIFY(QFileInfo(menu()).isSymLink());
-    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
-}
-
-void StartMenuTest::linksInTheOldMenuAreNotFollowed()
-{
-    const QString precious = write(QStringLiteral("precious/file"), "x");
-    QDir().mkpath(menu());
-    QVERIFY(QFile::link(path(QStringLiteral("precious")), inMenu(QStringLiteral("link"))));
-    QVERIFY(create());
-    QCOMPARE(read(precious), QByteArray("x"));
-    QCOMPARE(names(menu()), QStringList(QStringLiteral(".directory")));
-}
-
-void StartMenuTest::keepsThePermissionsOfTheOldMenu()
-{
-    const auto permissions = QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner;
-    QDir().mkpath(menu());
-    QVERIFY(QFile::setPermissions(menu(), permissions));
-    QVERIFY(create());
-    QCOMPARE(QFileInfo(menu()).permissions() & (QFile::ReadGroup | QFile::ReadOther), QFile::Permissions());
-}
-
-void StartMenuTest::removesReadOnlyFoldersOfTheOldMenu()
-{
-    write(QStringLiteral("config/vel/startmenu/a/b/c.desktop"), "[Desktop Entry]\n");
-    for (const char *name : {"a/b", "a"})
-        QVERIFY(QFile::setPermissions(inMenu(QString::fromLatin1(name)), QFile::ReadOwner | QFile::ExeOwner));
-    const OrdinaryUser user(folder());
-    QVERIFY(create());
-    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
-}
-
-void StartMenuTest::aFullDiskLeavesTheOldMenuWhole()
-{
-    install(QStringLiteral("large.desktop"), "Game;", "# " + QByteArray(9000, 'x') + '\n');
-    write(QStringLiteral("config/vel/startmenu/Mine/mine.desktop"), "[Desktop Entry]\n");
-    const QMap<QString, QByteArray> before = tree(path(QStringLiteral("config")));
-    rlimit limit;
-    getrlimit(RLIMIT_FSIZE, &limit);
-    const rlimit small = {5000, limit.rlim_max};
-    const auto previous = std::signal(SIGXFSZ, SIG_IGN);
-    setrlimit(RLIMIT_FSIZE, &small);
-    const bool created = create();
-    setrlimit(RLIMIT_FSIZE, &limit);
-    std::signal(SIGXFSZ, previous);
-    QVERIFY(!created);
-    QCOMPARE(tree(path(QStringLiteral("config"))), before);
-}
-
-void StartMenuTest::aFileInTheWayStays()
-{
-    write(QStringLiteral("config/vel/startmenu"), "a file");
-    QVERIFY(!create());
-    QCOMPARE(read(menu()), QByteArray("a file"));
-    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
-}
-
-void StartMenuTest::madeParentsGoWhenItFails()
-{
-    install(QStringLiteral("large.desktop"), "Game;", "# " + QByteArray(9000, 'x') + '\n');
-    rlimit limit;
-    getrlimit(RLIMIT_FSIZE, &limit);
-    const rlimit small = {5000, limit.rlim_max};
-    const auto previous = std::signal(SIGXFSZ, SIG_IGN);
-    setrlimit(RLIMIT_FSIZE, &small);
-    const bool created = create();
-    setrlimit(RLIMIT_FSIZE, &limit);
-    std::signal(SIGXFSZ, previous);
-    QVERIFY(!created);
-    QCOMPARE(names(folder()), QStringList(QStringLiteral("home")));
-}
-
-void StartMenuTest::aTemplateIsCopiedInstead()
-{
-    install(QStringLiteral("a.desktop"), "Game;");
-    write(QStringLiteral("config/vel/startmenu/old.desktop"), "[Desktop Entry]\n");
-    write(QStringLiteral("template/.directory"), "[Desktop Entry]\nSortOrder=b;a;\n");
-    write(QStringLiteral("template/a/x.desktop"), "anything\0at all");
-    QDir().mkpath(path(QStringLiteral("template/b")));
-    const QByteArray from = QFile::encodeName(path(QStringLiteral("template")));
-    QVERIFY(CreateStartMenu(QFile::encodeName(menu()).constData(), from.constData()));
-    QCOMPARE(tree(menu()), tree(path(QStringLiteral("template"))));
-    // An empty name is none.
-    QVERIFY(CreateStartMenu(QFile::encodeName(menu()).constData(), ""));
-    QVERIFY(QFile::exists(inMenu(QStringLiteral("Game/a.desktop"))));
-}
-
-void StartMenuTest::aTemplateIsCopiedWithoutLinks()
-{
-    const QString file = write(QStringLiteral("real/x.desktop"), "x");
-    QDir().mkpath(path(QStringLiteral("template/sub")));
-    QVERIFY(QFile::link(file, path(QStringLiteral("template/file.desktop"))));
-    QVERIFY(QFile::link(path(QStringLiteral("real")), path(QStringLiteral("template/folder"))));
-    QVERIFY(QFile::link(QStringLiteral("nowhere"), path(QStringLiteral("template/dangling"))));
-    QVERIFY(QFile::link(path(QStringLiteral("template")), path(QStringLiteral("template/sub/up"))));
-    const QByteArray from = QFile::encodeName(path(QStringLiteral("template")));
-    QVERIFY(CreateStartMenu(QFile::encodeName(menu()).constData(), from.constData()));
-    const QMap<QString, QByteArray> expected = {{QStringLiteral("file.desktop"), "x"},
-                                                {QStringLiteral("folder"), "folder"},
-                                                {QStringLiteral("folder/x.desktop"), "x"},
-                                                {QStringLiteral("sub"), "folder"}};
-    QCOMPARE(tree(menu()), expected);
-}
-
-void StartMenuTest::aTemplateMayHoldTheMenu()
-{
-    write(QStringLiteral("config/vel/x.desktop"), "x");
-    const QByteArray from = QFile::encodeName(path(QStringLiteral("config")));
-    QVERIFY(CreateStartMenu(QFile::encodeName(menu()).constData(), from.constData()));
-    QCOMPARE(tree(menu()).keys(), QStringList({QStringLiteral("vel"), QStringLiteral("vel/x.desktop")}));
-}
-
-void StartMenuTest::aMissingTemplateLeavesTheOldMenuWhole()
-{
-    write(QStringLiteral("config/vel/startmenu/old.desktop"), "[Desktop Entry]\n");
-    const QMap<QString, QByteArray> before = tree(path(QStringLiteral("config")));
-    const QByteArray from = QFile::encodeName(path(QStringLiteral("missing")));
-    QVERIFY(!CreateStartMenu(QFile::encodeName(menu()).constData(), from.constData()));
-    QCOMPARE(tree(path(QStringLiteral("config"))), before);
-}
-
-void StartMenuTest::theSampleMenuShowsAllItsEntries()
-{
-    const QString sample = QStringLiteral(VEL_SOURCE_DIR "/data/sample");
-    qputenv("XDG_DATA_DIRS", QFile::encodeName(sample));
-    QVERIFY(create());
-    QStringList shown;
-    const QMap<QString, QByteArray> files = tree(menu());
-    for (auto it = files.begin(); it != files.end(); ++it) {
-        if (it.key().endsWith(QLatin1String(".desktop")))
-            shown.append(QFileInfo(it.key()).fileName());
-    }
-    shown.sort();
-    QCOMPARE(shown, names(sample + QStringLiteral("/applications")));
-    QVERIFY(shown.size() >= 10);
-    QVERIFY(!sortOrder(menu()).contains(QStringLiteral("Other")));
-}
-
-VEL_TEST_GUILESS_MAIN(StartMenuTest)
+VEL_TEST_GUILESS_MAIN(tst_startmenu)
 #include "tst_startmenu.moc"
