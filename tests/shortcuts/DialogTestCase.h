@@ -53,6 +53,10 @@ protected Q_SLOTS:
     }
 
 protected:
+    static inline const QKeySequence f1{Qt::Key_F1};
+    static inline const QKeySequence f2{Qt::Key_F2};
+    static inline const QKeySequence f9{Qt::Key_F9};
+
     static QString str(const char *text) { return QString::fromLatin1(text); }
 
     QAction *addAction(const char *name, const char *group, const QKeySequence &key)

@@ -8,13 +8,6 @@
 #include <QProcess>
 #include <QSignalSpy>
 
-namespace {
-
-const QKeySequence f1(Qt::Key_F1);
-const QKeySequence f9(Qt::Key_F9);
-
-} // namespace
-
 class tst_EditShortcutsDialogKeys : public DialogTestCase
 {
     Q_OBJECT
