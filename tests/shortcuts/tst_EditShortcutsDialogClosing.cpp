@@ -3,6 +3,7 @@
 
 #include "DialogTestCase.h"
 
+#include <QPointer>
 #include <QSignalSpy>
 #include <QTimer>
 
@@ -222,15 +223,17 @@ void tst_EditShortcutsDialogClosing::outlivesItsModel()
 void tst_EditShortcutsDialogClosing::goesWithItsParentAndModel()
 {
     auto *window = new QWidget;
-    auto *model = new ShortcutsModel(nullptr, QString(), window);
+    const QPointer<ShortcutsModel> model = new ShortcutsModel(nullptr, QString(), window);
     auto *action = new QAction(window);
     model->registerAction(str("x"), action, str("g"));
-    auto *dialog = new EditShortcutsDialog(model, window);
-    auto *inner = new ShortcutsModel(nullptr, QString(), dialog);
-    auto *second = new EditShortcutsDialog(inner, dialog);
+    const QPointer<EditShortcutsDialog> dialog = new EditShortcutsDialog(model, window);
+    const QPointer<ShortcutsModel> inner = new ShortcutsModel(nullptr, QString(), dialog);
+    const QPointer<EditShortcutsDialog> second = new EditShortcutsDialog(inner, dialog);
     dialog->show();
     second->show();
     delete window;
+    QVERIFY(!dialog && !model);
+    QVERIFY(!second && !inner);
 }
 
 void tst_EditShortcutsDialogClosing::goesBeforeAModelThatIsItsChild()
