@@ -7,6 +7,7 @@
 #include "GalleryWindow.h"
 #include "ModalDriver.h"
 #include "TestCase.h"
+#include "XDoTool.h"
 
 #include <EditShortcutsDialog.h>
 
@@ -53,11 +54,15 @@ private:
 void waitUntilSettled(QWidget *window)
 {
     QTRY_VERIFY_WITH_TIMEOUT((window->activateWindow(), window->isActiveWindow()), 10000);
-    QPoint place;
-    do {
-        place = window->mapToGlobal(QPoint());
-        QTest::qWait(200);
-    } while (place != window->mapToGlobal(QPoint()));
+    const QString ask =
+        QStringLiteral("mousemove %1 getmouselocation --shell").arg(XDoTool::at(window, {5, 5}));
+    const auto isWhereItShows = [&] {
+        const QByteArrayList found = XDoTool::ask(ask).split('\n');
+        const QPoint place = window->mapToGlobal(QPoint(5, 5));
+        return found.contains("X=" + QByteArray::number(place.x()))
+            && found.contains("Y=" + QByteArray::number(place.y()));
+    };
+    QTRY_VERIFY_WITH_TIMEOUT(isWhereItShows(), 10000);
 }
 
 } // namespace

@@ -195,7 +195,13 @@ void tst_VelSettingsProcesses::leavesAWholeFileWhenItIsKilled()
     for (int round = 0; round < 20; ++round) {
         const auto writer = startWriter({file, s("grow")});
         QVERIFY(writer->waitForReadyRead());
-        usleep(useconds_t(1000 + round * 1500)); // a different place of the writing each time
+        // Somewhere in the writing, later each time.
+        qint64 size = QFileInfo(file).size();
+        for (int change = 0; change <= round; ++change) {
+            const auto hasChanged = [&] { return QFileInfo(file).size() != size; };
+            QVERIFY(QTest::qWaitFor(hasChanged));
+            size = QFileInfo(file).size();
+        }
         writer->kill();
         QVERIFY(writer->waitForFinished());
         // Qt waits half a minute for the owner of a lock that names none; that need not be seen here.
