@@ -188,7 +188,7 @@ void tst_vel_entryedit::createsAnEntryThatRuns()
     QVERIFY(!QFile::exists(file));
     QCOMPARE(program.state(), QProcess::Running);
 
-    // From the name over its localised one and two icons with their buttons to the command.
+    // From the name over its localized one and two icons with their buttons to the command.
     waitForWindow(QStringLiteral("Desktop Entry Editor"));
     pressKeys(QStringList(QVector<QString>(6, QStringLiteral("Tab")).toList()));
     typeText(script + QStringLiteral(" started"));

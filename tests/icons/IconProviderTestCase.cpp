@@ -30,13 +30,13 @@ void IconProviderTestCase::init()
     qputenv("VEL_DATA_DIR", QFile::encodeName(path(QStringLiteral(".data"))));
     QVERIFY(QDir().mkpath(path(QStringLiteral(".data/pixmaps"))));
     for (const int size : {16, 32}) {
-        writePicture(QStringLiteral("folder%1.xpm").arg(size), size, folderColor);
-        writePicture(QStringLiteral("icon%1.xpm").arg(size), size, fileColor);
+        writePixmap(QStringLiteral("folder%1.xpm").arg(size), size, folderColor);
+        writePixmap(QStringLiteral("icon%1.xpm").arg(size), size, fileColor);
     }
     m_provider = std::make_unique<VelMimeTypeIconProvider>();
 }
 
-void IconProviderTestCase::writePicture(const QString &name, int size, const QColor &color)
+void IconProviderTestCase::writePixmap(const QString &name, int size, const QColor &color)
 {
     QImage image(size, size, QImage::Format_RGB32);
     image.fill(color);

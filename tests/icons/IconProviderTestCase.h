@@ -47,7 +47,7 @@ protected:
     /// The icon of \a name below folder().
     QIcon iconOf(const QString &name) const { return m_provider->icon(QFileInfo(path(name))); }
     /// Writes a built-in pixmap of one color.
-    void writePicture(const QString &name, int size, const QColor &color);
+    void writePixmap(const QString &name, int size, const QColor &color);
     /// Makes a named pipe.
     void makePipe(const QString &name);
 

@@ -70,7 +70,7 @@ void tst_VelMimeTypeIconProviderPixmaps::looksTheThemeUpWhenTheIconIsPainted()
 
 void tst_VelMimeTypeIconProviderPixmaps::readsThePicturesFromTheDesktopsDirectory()
 {
-    writePicture(QStringLiteral("icon32.xpm"), 32, Qt::magenta);
+    writePixmap(QStringLiteral("icon32.xpm"), 32, Qt::magenta);
     const VelMimeTypeIconProvider provider;
     QVERIFY(QDir(path(QStringLiteral(".data"))).removeRecursively());
     makePipe(QStringLiteral("pipe"));

@@ -153,7 +153,7 @@ bool FileManager::activate()
         Patience);
 }
 
-// The item lies on a background of one colour.
+// The item lies on a background of one color.
 bool FileManager::showsItem() const
 {
     const int side = 40;

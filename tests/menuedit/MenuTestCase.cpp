@@ -24,10 +24,10 @@ void MenuTestCase::init()
     // A theme with an icon of the editor's own on top of one with all the others.
     write(QStringLiteral("icons/menutest/index.theme"),
           "[Icon Theme]\nName=menutest\nInherits=breeze\nDirectories=22\n[22]\nSize=22\n");
-    QPixmap picture(22, 22);
-    picture.fill(Qt::red);
+    QPixmap pixmap(22, 22);
+    pixmap.fill(Qt::red);
     QDir().mkpath(path(QStringLiteral("icons/menutest/22")));
-    QVERIFY(picture.save(path(QStringLiteral("icons/menutest/22/velmenuedit.png"))));
+    QVERIFY(pixmap.save(path(QStringLiteral("icons/menutest/22/velmenuedit.png"))));
     QIcon::setThemeSearchPaths({path(QStringLiteral("icons")), QStringLiteral("/usr/share/icons")});
     QIcon::setThemeName(QStringLiteral("menutest"));
 }

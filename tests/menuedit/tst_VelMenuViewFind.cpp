@@ -28,7 +28,7 @@ private Q_SLOTS:
     void searchesAnewWhenTheMatchesWereDropped();
     void bringsTheMatchIntoSight();
     void tellsWhenNothingMatches();
-    void findsNeitherTheMenuNorItsNeighbours();
+    void findsNeitherTheMenuNorItsNeighbors();
     void doesNotFollowLinksInCircles();
     void passesOverFoldersThatCannotBeRead();
     void stopsAtItsLimits();
@@ -224,14 +224,14 @@ void tst_VelMenuViewFind::tellsWhenNothingMatches()
     QVERIFY(modal.finished());
 }
 
-void tst_VelMenuViewFind::findsNeitherTheMenuNorItsNeighbours()
+void tst_VelMenuViewFind::findsNeitherTheMenuNorItsNeighbors()
 {
     write(QStringLiteral("needlemenu/.directory"), "[Desktop Entry]\nType=Directory\nName=Needle root\n");
     const QString inside =
         write(QStringLiteral("needlemenu/x.desktop"), entryText(QStringLiteral("Needle inside")));
-    write(QStringLiteral("needleneighbour.desktop"), entryText(QStringLiteral("Needle outside")));
+    write(QStringLiteral("needleneighbor.desktop"), entryText(QStringLiteral("Needle outside")));
     VelMenuView view(path(QStringLiteral("needlemenu")), -1, true);
-    // The neighbours are known to the model.
+    // The neighbors are known to the model.
     files(view)->fetchMore(files(view)->index(folder()));
     QTRY_VERIFY(files(view)->rowCount(files(view)->index(folder())) > 1);
     find(view, QStringLiteral("needle"));

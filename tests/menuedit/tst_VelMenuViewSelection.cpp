@@ -20,7 +20,7 @@ private Q_SLOTS:
     void scrollsToAnItemThatArrivesLater();
     void selectsNothingThatIsNoItemOfTheMenu();
     void selectsAgainWhatAnOlderListingTookAway();
-    void selectsNoNeighbourOfARowThatGoes();
+    void selectsNoNeighborOfARowThatGoes();
     void goesAwayBeforeItScrolls();
 };
 
@@ -106,7 +106,7 @@ void tst_VelMenuViewSelection::selectsAgainWhatAnOlderListingTookAway()
     QTRY_COMPARE(view.selectedPath(), b);
 }
 
-void tst_VelMenuViewSelection::selectsNoNeighbourOfARowThatGoes()
+void tst_VelMenuViewSelection::selectsNoNeighborOfARowThatGoes()
 {
     writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
     const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));

@@ -9,7 +9,7 @@ namespace {
 
 const QString sourceDir = QStringLiteral(VEL_SOURCE_DIR);
 
-// The program without its licence lines, as a guide shows it.
+// The program without its license lines, as a guide shows it.
 QByteArray programOf(const QByteArray &source)
 {
     return source.mid(source.indexOf("\n\n") + 2);

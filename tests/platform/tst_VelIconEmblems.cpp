@@ -20,7 +20,7 @@ private Q_SLOTS:
     void laysEmblemsOnAGivenIcon();
     void givesTheIconItselfWithoutEmblems();
     void leavesAnEmblemOutThatTheThemeLacks();
-    void greysEmblemsOutWithTheirIcon();
+    void graysEmblemsOutWithTheirIcon();
 };
 
 void tst_VelIconEmblems::laysEmblemsIntoTheirCorners_data()
@@ -71,7 +71,7 @@ void tst_VelIconEmblems::laysEmblemsIntoTheirCorners()
         for (int x = 0; x < image.width(); ++x) {
             const QColor expected = square.contains(x, y) ? Qt::blue : Qt::red;
             if (image.pixelColor(x, y) != expected)
-                QFAIL(qPrintable(QStringLiteral("wrong colour at %1, %2").arg(x).arg(y)));
+                QFAIL(qPrintable(QStringLiteral("wrong color at %1, %2").arg(x).arg(y)));
         }
     }
 }
@@ -138,7 +138,7 @@ void tst_VelIconEmblems::leavesAnEmblemOutThatTheThemeLacks()
     QCOMPARE(image.pixelColor(15, 15), QColor(Qt::blue));
 }
 
-void tst_VelIconEmblems::greysEmblemsOutWithTheirIcon()
+void tst_VelIconEmblems::graysEmblemsOutWithTheirIcon()
 {
     const Emblems emblems{{Qt::TopLeftCorner, QStringLiteral("emblem-blue")}};
     const QImage image =

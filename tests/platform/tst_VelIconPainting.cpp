@@ -19,7 +19,7 @@ private Q_SLOTS:
     void looksTheThemeUpWhenItIsPainted();
     void followsAChangeOfTheTheme();
     void showsAPictureFileAsItIsNow();
-    void centresASmallerPicture();
+    void centersASmallerPixmap();
     void drawsForThePixelRatioOfTheDevice_data();
     void drawsForThePixelRatioOfTheDevice();
     void scalesUpForADeviceOfMorePixels();
@@ -143,7 +143,7 @@ void tst_VelIconPainting::showsAPictureFileAsItIsNow()
     QVERIFY(themeIcon(path).isNull());
 }
 
-void tst_VelIconPainting::centresASmallerPicture()
+void tst_VelIconPainting::centersASmallerPixmap()
 {
     QPixmap small(8, 8);
     small.fill(Qt::yellow);

@@ -27,7 +27,7 @@ private Q_SLOTS:
     void readsFlags();
     void readsTheVariantOfTheLocale_data();
     void readsTheVariantOfTheLocale();
-    void neverGivesTheUnlocalisedValueForALocalOne();
+    void neverGivesTheUnlocalizedValueForALocalOne();
     void readsBackAnyTextItWrites_data();
     void readsBackAnyTextItWrites();
     void readsBackAnyListItWrites_data();
@@ -196,7 +196,7 @@ void tst_VelUIDesktopEntry::readsLists_data()
     row("escaped backslash before a separator", "a\\\\;b;", {text("a\\"), text("b")});
     row("blanks inside stay", "a; b ;", {text("a"), text(" b ")});
     row("other escapes", "\\sa\\n;\\q;", {text(" a\n"), text("\\q")});
-    row("one item not valid UTF-8 spoils the key", "a;\xFF;", {});
+    row("one item not valid UTF-8 makes the key malformed", "a;\xFF;", {});
 }
 
 void tst_VelUIDesktopEntry::readsLists()
@@ -278,7 +278,7 @@ void tst_VelUIDesktopEntry::readsTheVariantOfTheLocale()
     QCOMPARE(record.getLocalName(), QString());
 }
 
-void tst_VelUIDesktopEntry::neverGivesTheUnlocalisedValueForALocalOne()
+void tst_VelUIDesktopEntry::neverGivesTheUnlocalizedValueForALocalOne()
 {
     const VelUIDesktopEntry record(write(
         QStringLiteral("x.desktop"),

@@ -140,12 +140,12 @@ void tst_VelUIDesktopEntryChanges::writesOnlyTheLinesOfChangedKeys_data()
         "[Desktop Entry]\r\nName=New\r\nIcon=x\r\n");
     row("byte order mark", "\xEF\xBB\xBF" + Header + "Name=A\n", name,
         "\xEF\xBB\xBF" + Header + "Name=New\n");
-    row("value that was spoiled", Header + "Name=\xFF\n", name, Header + "Name=New\n");
+    row("malformed value", Header + "Name=\xFF\n", name, Header + "Name=New\n");
     row("empty value", Header + "Name=\nIcon=i\n", name, Header + "Name=New\nIcon=i\n");
     row("the last of duplicates", Header + "Name=A\nName=B\n", name, Header + "Name=A\nName=New\n");
     row("the last of duplicate groups", Header + "Name=A\n" + Header + "Name=B\n", name,
         Header + "Name=A\n" + Header + "Name=New\n");
-    row("spoiled lines elsewhere stay", Header + "Icon=\xFF\nName=A\n", name,
+    row("malformed lines elsewhere stay", Header + "Icon=\xFF\nName=A\n", name,
         Header + "Icon=\xFF\nName=New\n");
 
     row("removal", Header + "Icon=i\nName=A\nName[de]=B\n#end\n", noName,
@@ -222,7 +222,7 @@ void tst_VelUIDesktopEntryChanges::changesNothingWhenASetterGetsTheGettersValue_
     QTest::newRow("escapes written in another way") << QByteArray("@=a\\sb\\q\tc\n");
     QTest::newRow("list with empty items and no end") << QByteArray("@=a;;b\n");
     QTest::newRow("list of nothing") << QByteArray("@=;;\n");
-    QTest::newRow("spoiled") << QByteArray("@=\xFF\n");
+    QTest::newRow("malformed") << QByteArray("@=\xFF\n");
     QTest::newRow("no flag") << QByteArray("@=0\n");
     QTest::newRow("duplicates") << QByteArray("@=x\n@=y\n");
 }
@@ -327,7 +327,7 @@ void tst_VelUIDesktopEntryChanges::writesTheLocalVariantThatTheGetterFound_data(
         "Name=a\nName[de_AT]=c\nName[de]=X\n");
     row("a new one by country", "pt_BR.UTF-8", "Name=a\n", "X", "Name=a\nName[pt_BR]=X\n");
     row("a new one for no locale", "C", "Name=a\n", "X", "Name=a\nName[en]=X\n");
-    row("the spoiled one", "de_DE.UTF-8", "Name=a\nName[de]=\xFF\n", "X", "Name=a\nName[de]=X\n");
+    row("the malformed one", "de_DE.UTF-8", "Name=a\nName[de]=\xFF\n", "X", "Name=a\nName[de]=X\n");
     row("removal of the one found", "de_DE.UTF-8", "Name=a\nName[de]=b\nName[de_DE]=c\n", "",
         "Name=a\nName[de]=b\n");
     row("removal of duplicates", "de_DE.UTF-8", "Name[de]=a\nName=a\nName[de]=b\n", "", "Name=a\n");

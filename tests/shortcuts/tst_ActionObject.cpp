@@ -23,7 +23,7 @@ private Q_SLOTS:
     void leavesTheMnemonicMarksOut();
     void showsTheActionAsItIsNow();
     void asksForItsRemovalWhenTheActionGoes();
-    void bearsTheActionGoingWhileItIsApplied();
+    void survivesTheDeletionOfTheActionWhileItIsApplied();
     void declaresNothingOfItsOwn();
 };
 
@@ -132,7 +132,7 @@ void tst_ActionObject::asksForItsRemovalWhenTheActionGoes()
     object.apply();
 }
 
-void tst_ActionObject::bearsTheActionGoingWhileItIsApplied()
+void tst_ActionObject::survivesTheDeletionOfTheActionWhileItIsApplied()
 {
     auto *action = new QAction(QStringLiteral("Play"), this);
     auto *object = new ActionObject(QStringLiteral("n"), action, QStringLiteral("g"));

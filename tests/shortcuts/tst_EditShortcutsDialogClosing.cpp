@@ -22,10 +22,10 @@ private Q_SLOTS:
     void asksBeforeItCloses_data();
     void asksBeforeItCloses();
     void staysOpenWhenClosingIsCancelled();
-    void bearsTheCurrentActionGoing();
-    void bearsItsOwnEndInsideAMessage();
-    void bearsItsOwnEndOnOk();
-    void bearsItsOwnEndOnClosing();
+    void survivesTheDeletionOfTheCurrentAction();
+    void survivesItsDeletionInsideAMessage();
+    void survivesItsDeletionOnOk();
+    void survivesItsDeletionOnClosing();
     void outlivesItsModel();
     void goesWithItsParentAndModel();
     void goesBeforeAModelThatIsItsChild();
@@ -143,7 +143,7 @@ void tst_EditShortcutsDialogClosing::staysOpenWhenClosingIsCancelled()
     QCOMPARE(open->shortcut(), f1);
 }
 
-void tst_EditShortcutsDialogClosing::bearsTheCurrentActionGoing()
+void tst_EditShortcutsDialogClosing::survivesTheDeletionOfTheCurrentAction()
 {
     m_dialog->show();
     select("open");
@@ -159,7 +159,7 @@ void tst_EditShortcutsDialogClosing::bearsTheCurrentActionGoing()
     button(QDialogButtonBox::Ok)->click();
 }
 
-void tst_EditShortcutsDialogClosing::bearsItsOwnEndInsideAMessage()
+void tst_EditShortcutsDialogClosing::survivesItsDeletionInsideAMessage()
 {
     select("open");
     // Not within an event of the box itself.
@@ -180,7 +180,7 @@ void tst_EditShortcutsDialogClosing::bearsItsOwnEndInsideAMessage()
     QVERIFY(!m_dialog);
 }
 
-void tst_EditShortcutsDialogClosing::bearsItsOwnEndOnOk()
+void tst_EditShortcutsDialogClosing::survivesItsDeletionOnOk()
 {
     m_dialog->show();
     select("open");
@@ -191,7 +191,7 @@ void tst_EditShortcutsDialogClosing::bearsItsOwnEndOnOk()
     QCOMPARE(open->shortcut(), f9);
 }
 
-void tst_EditShortcutsDialogClosing::bearsItsOwnEndOnClosing()
+void tst_EditShortcutsDialogClosing::survivesItsDeletionOnClosing()
 {
     m_dialog->show();
     select("open");

@@ -20,7 +20,7 @@ private Q_SLOTS:
     void ignoresAKeyThatQtCannotName();
     void changesNothingWhileNoShortcutIsCurrent();
     void acceptsAPrefixOfAnotherKey();
-    void bearsTheConflictingActionGoing();
+    void survivesTheDeletionOfTheConflictingAction();
 };
 
 void tst_EditShortcutsDialogConflicts::takesAFreeKey()
@@ -169,7 +169,7 @@ void tst_EditShortcutsDialogConflicts::acceptsAPrefixOfAnotherKey()
     QCOMPARE(pendingKey("open"), QKeySequence(Qt::CTRL | Qt::Key_K));
 }
 
-void tst_EditShortcutsDialogConflicts::bearsTheConflictingActionGoing()
+void tst_EditShortcutsDialogConflicts::survivesTheDeletionOfTheConflictingAction()
 {
     select("open");
     ModalDriver modal;

@@ -71,7 +71,7 @@ private Q_SLOTS:
     void remembersWhatItSaved();
     void bringsEverythingBackAfterARestart();
     void neverSavesByItself();
-    void bearsMissingSettings();
+    void survivesMissingSettings();
 
     void commitsEveryObjectSilently();
     void announcesResetAndRestorePerGroup();
@@ -352,7 +352,7 @@ void tst_ShortcutPersistence::neverSavesByItself()
     QVERIFY(m_settings->allKeys().isEmpty());
 }
 
-void tst_ShortcutPersistence::bearsMissingSettings()
+void tst_ShortcutPersistence::survivesMissingSettings()
 {
     ShortcutsModel model(nullptr, str("Keys"));
     addAction(&model, "a", f1);

@@ -22,9 +22,9 @@ private Q_SLOTS:
     void givesOtherGroupsAnEmptyEntryOfTheName();
     void keepsPersistentIndexesOnTheirShortcuts();
     void losesAllActionsOfADestroyedWindow();
-    void bearsRemovalsInBulkOperations_data();
-    void bearsRemovalsInBulkOperations();
-    void bearsRegistrationInABulkOperation();
+    void survivesRemovalsInBulkOperations_data();
+    void survivesRemovalsInBulkOperations();
+    void survivesRegistrationInABulkOperation();
     void deletesItsObjectsButNotWhatTheyWrap();
 };
 
@@ -139,7 +139,7 @@ void tst_ShortcutsModelObjects::losesAllActionsOfADestroyedWindow()
     m_model->commitChanges();
 }
 
-void tst_ShortcutsModelObjects::bearsRemovalsInBulkOperations_data()
+void tst_ShortcutsModelObjects::survivesRemovalsInBulkOperations_data()
 {
     QTest::addColumn<int>("operation");
     QTest::newRow("commit") << 0;
@@ -147,7 +147,7 @@ void tst_ShortcutsModelObjects::bearsRemovalsInBulkOperations_data()
     QTest::newRow("restore") << 2;
 }
 
-void tst_ShortcutsModelObjects::bearsRemovalsInBulkOperations()
+void tst_ShortcutsModelObjects::survivesRemovalsInBulkOperations()
 {
     QFETCH(int, operation);
     QList<QAction *> actions;
@@ -176,7 +176,7 @@ void tst_ShortcutsModelObjects::bearsRemovalsInBulkOperations()
     QVERIFY(!m_model->hasKeySequence(f2));
 }
 
-void tst_ShortcutsModelObjects::bearsRegistrationInABulkOperation()
+void tst_ShortcutsModelObjects::survivesRegistrationInABulkOperation()
 {
     auto *object = new KeyTestObject(str("m"), str("g"), f1);
     m_model->registerShortcutObject(object);

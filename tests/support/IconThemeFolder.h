@@ -8,7 +8,7 @@
 #include <QVector>
 
 /**
- * A small icon theme of plainly coloured squares, on disk.
+ * A small icon theme of plainly colored squares, on disk.
  */
 class IconThemeFolder
 {

@@ -16,7 +16,7 @@ QStringList languages()
 
 } // namespace
 
-// What menus and software centres show of the programs before they are started.
+// What menus and software centers show of the programs before they are started.
 class tst_DesktopFileLanguages : public TestCase
 {
     Q_OBJECT
