@@ -14,8 +14,6 @@
 
 #include <csignal>
 
-#include <unistd.h>
-
 namespace {
 
 QString s(const char *utf8)
