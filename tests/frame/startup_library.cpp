@@ -2,4 +2,4 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 // The library's start-up routine alone, on the directory that the build names.
-#include "TranslationCatalogue.cpp"
+#include "TranslationCatalog.cpp"

@@ -20,7 +20,7 @@ namespace {
 
 void say(const char *moment)
 {
-    // Libraries under ours bring catalogues of their own.
+    // Libraries under ours bring catalogs of their own.
     int count = 0;
     bool onApplicationThread = true;
     for (const QTranslator *translator : qApp->findChildren<QTranslator *>()) {

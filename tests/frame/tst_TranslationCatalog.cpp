@@ -15,18 +15,18 @@ const char german[] = "Neuer Eintrag, 1 translators\n";
 } // namespace
 
 // Each test runs a program of its own: what it loads, and when, is what is tested.
-class tst_TranslationCatalogue : public TestCase
+class tst_TranslationCatalog : public TestCase
 {
     Q_OBJECT
 
 private Q_SLOTS:
     void init();
 
-    void textsStayEnglishWithoutACatalogue();
-    void textsStayEnglishForACatalogueThatIsDamaged();
-    void textsStayEnglishInALanguageWithoutCatalogue();
-    void loadsTheCatalogueOfTheSystemLanguage_data();
-    void loadsTheCatalogueOfTheSystemLanguage();
+    void textsStayEnglishWithoutACatalog();
+    void textsStayEnglishForACatalogThatIsDamaged();
+    void textsStayEnglishInALanguageWithoutCatalog();
+    void loadsTheCatalogOfTheSystemLanguage_data();
+    void loadsTheCatalogOfTheSystemLanguage();
     void waitsForTheApplicationWhenLoadedBeforeIt();
     void loadsAtOnceWhenOpenedOnTheApplicationThread();
     void waitsForTheEventLoopWhenOpenedOnAnotherThread();
@@ -35,23 +35,23 @@ private Q_SLOTS:
 
 private:
     QByteArray probe(const QString &program, const QStringList &arguments, const QString &language);
-    void addCatalogue(const QString &name);
+    void addCatalog(const QString &name);
 };
 
-void tst_TranslationCatalogue::init()
+void tst_TranslationCatalog::init()
 {
     TestCase::init();
-    QDir(QStringLiteral(VEL_CATALOGUE_DIR)).removeRecursively();
-    QVERIFY(QDir().mkpath(QStringLiteral(VEL_CATALOGUE_DIR)));
+    QDir(QStringLiteral(VEL_CATALOG_DIR)).removeRecursively();
+    QVERIFY(QDir().mkpath(QStringLiteral(VEL_CATALOG_DIR)));
 }
 
-void tst_TranslationCatalogue::addCatalogue(const QString &name)
+void tst_TranslationCatalog::addCatalog(const QString &name)
 {
-    QVERIFY(QFile::copy(QStringLiteral(VEL_MESSAGES), QStringLiteral(VEL_CATALOGUE_DIR "/") + name));
+    QVERIFY(QFile::copy(QStringLiteral(VEL_MESSAGES), QStringLiteral(VEL_CATALOG_DIR "/") + name));
 }
 
-QByteArray tst_TranslationCatalogue::probe(const QString &program, const QStringList &arguments,
-                                           const QString &language)
+QByteArray tst_TranslationCatalog::probe(const QString &program, const QStringList &arguments,
+                                         const QString &language)
 {
     QProcess process;
     QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
@@ -59,7 +59,7 @@ QByteArray tst_TranslationCatalogue::probe(const QString &program, const QString
     environment.insert(QStringLiteral("LC_ALL"), language);
     environment.insert(QStringLiteral("LANGUAGE"), language);
     environment.insert(QStringLiteral("VEL_REDIRECT_FROM"), QStringLiteral("/usr/share/vel/translations"));
-    environment.insert(QStringLiteral("VEL_REDIRECT_TO"), QStringLiteral(VEL_CATALOGUE_DIR));
+    environment.insert(QStringLiteral("VEL_REDIRECT_TO"), QStringLiteral(VEL_CATALOG_DIR));
     if (arguments.contains(QStringLiteral(VEL_LIBRARY))) {
         environment.insert(QStringLiteral("LD_PRELOAD"), QStringLiteral(VEL_REDIRECT));
         environment.insert(QStringLiteral("ASAN_OPTIONS"),
@@ -73,17 +73,17 @@ QByteArray tst_TranslationCatalogue::probe(const QString &program, const QString
     return process.readAllStandardOutput();
 }
 
-void tst_TranslationCatalogue::textsStayEnglishWithoutACatalogue()
+void tst_TranslationCatalog::textsStayEnglishWithoutACatalog()
 {
     QCOMPARE(probe(QStringLiteral(VEL_LINKED_PROBE), {}, QStringLiteral("de_DE.UTF-8")),
              QByteArray("started: ") + english + "running: " + english);
 }
 
-void tst_TranslationCatalogue::textsStayEnglishForACatalogueThatIsDamaged()
+void tst_TranslationCatalog::textsStayEnglishForACatalogThatIsDamaged()
 {
-    QFile file(QStringLiteral(VEL_CATALOGUE_DIR "/libveluiextra_de.qm"));
+    QFile file(QStringLiteral(VEL_CATALOG_DIR "/libveluiextra_de.qm"));
     QVERIFY(file.open(QIODevice::WriteOnly));
-    QVERIFY(file.write("no catalogue") > 0);
+    QVERIFY(file.write("no catalog") > 0);
     file.close();
 
     // Neither installed nor left behind as a child of the application.
@@ -91,15 +91,15 @@ void tst_TranslationCatalogue::textsStayEnglishForACatalogueThatIsDamaged()
              QByteArray("started: ") + english + "running: " + english);
 }
 
-void tst_TranslationCatalogue::textsStayEnglishInALanguageWithoutCatalogue()
+void tst_TranslationCatalog::textsStayEnglishInALanguageWithoutCatalog()
 {
-    addCatalogue(QStringLiteral("libveluiextra_de.qm"));
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
 
     QCOMPARE(probe(QStringLiteral(VEL_LINKED_PROBE), {}, QStringLiteral("fr_FR.UTF-8")),
              QByteArray("started: ") + english + "running: " + english);
 }
 
-void tst_TranslationCatalogue::loadsTheCatalogueOfTheSystemLanguage_data()
+void tst_TranslationCatalog::loadsTheCatalogOfTheSystemLanguage_data()
 {
     QTest::addColumn<QString>("fileName");
     QTest::addColumn<QString>("language");
@@ -111,62 +111,62 @@ void tst_TranslationCatalogue::loadsTheCatalogueOfTheSystemLanguage_data()
         << QStringLiteral("libveluiextra_de.qm") << QStringLiteral("de_AT.UTF-8");
 }
 
-void tst_TranslationCatalogue::loadsTheCatalogueOfTheSystemLanguage()
+void tst_TranslationCatalog::loadsTheCatalogOfTheSystemLanguage()
 {
     QFETCH(QString, fileName);
     QFETCH(QString, language);
-    addCatalogue(fileName);
+    addCatalog(fileName);
 
     QCOMPARE(probe(QStringLiteral(VEL_LINKED_PROBE), {}, language),
              QByteArray("started: ") + german + "running: " + german);
 }
 
-void tst_TranslationCatalogue::waitsForTheApplicationWhenLoadedBeforeIt()
+void tst_TranslationCatalog::waitsForTheApplicationWhenLoadedBeforeIt()
 {
-    addCatalogue(QStringLiteral("libveluiextra_de.qm"));
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
 
     QCOMPARE(probe(QStringLiteral(VEL_PROBE), {QStringLiteral("before"), QStringLiteral(VEL_WITH_DIRECTORY)},
                    QStringLiteral("de")),
              QByteArray("started: ") + german + "running: " + german);
 }
 
-void tst_TranslationCatalogue::loadsAtOnceWhenOpenedOnTheApplicationThread()
+void tst_TranslationCatalog::loadsAtOnceWhenOpenedOnTheApplicationThread()
 {
-    addCatalogue(QStringLiteral("libveluiextra_de.qm"));
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
 
     QCOMPARE(probe(QStringLiteral(VEL_PROBE), {QStringLiteral("after"), QStringLiteral(VEL_WITH_DIRECTORY)},
                    QStringLiteral("de")),
              QByteArray("started: ") + german + "running: " + german);
 }
 
-void tst_TranslationCatalogue::waitsForTheEventLoopWhenOpenedOnAnotherThread()
+void tst_TranslationCatalog::waitsForTheEventLoopWhenOpenedOnAnotherThread()
 {
-    addCatalogue(QStringLiteral("libveluiextra_de.qm"));
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
 
     QCOMPARE(probe(QStringLiteral(VEL_PROBE), {QStringLiteral("worker"), QStringLiteral(VEL_WITH_DIRECTORY)},
                    QStringLiteral("de")),
              QByteArray("started: ") + english + "running: " + german);
 }
 
-void tst_TranslationCatalogue::doesNothingWithoutADirectory()
+void tst_TranslationCatalog::doesNothingWithoutADirectory()
 {
-    addCatalogue(QStringLiteral("libveluiextra_de.qm"));
-    QVERIFY(QDir::setCurrent(QStringLiteral(VEL_CATALOGUE_DIR)));
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
+    QVERIFY(QDir::setCurrent(QStringLiteral(VEL_CATALOG_DIR)));
 
     QCOMPARE(probe(QStringLiteral(VEL_PROBE),
                    {QStringLiteral("after"), QStringLiteral(VEL_WITHOUT_DIRECTORY)}, QStringLiteral("de")),
              QByteArray("started: ") + english + "running: " + english);
 }
 
-void tst_TranslationCatalogue::libraryLooksInItsFixedDirectory()
+void tst_TranslationCatalog::libraryLooksInItsFixedDirectory()
 {
-    addCatalogue(QStringLiteral("libveluiextra_de.qm"));
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
 
     QCOMPARE(probe(QStringLiteral(VEL_PROBE), {QStringLiteral("after"), QStringLiteral(VEL_LIBRARY)},
                    QStringLiteral("de")),
              QByteArray("started: ") + german + "running: " + german);
 }
 
-VEL_TEST_GUILESS_MAIN(tst_TranslationCatalogue)
+VEL_TEST_GUILESS_MAIN(tst_TranslationCatalog)
 
-#include "tst_TranslationCatalogue.moc"
+#include "tst_TranslationCatalog.moc"

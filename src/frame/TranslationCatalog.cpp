@@ -13,30 +13,30 @@
 
 namespace {
 
-void loadCatalogue()
+void loadCatalog()
 {
     const QString directory = QStringLiteral(VEL_TRANSLATIONS_DIR);
     if (directory.isEmpty())
         return;
 
     auto translator = std::make_unique<QTranslator>(QCoreApplication::instance());
-    // A missing catalogue is no error: the texts stay English.
+    // A missing catalog is no error: the texts stay English.
     if (!translator->load(QLocale::system(), QStringLiteral("libveluiextra"), QStringLiteral("_"), directory))
         return;
     QCoreApplication::installTranslator(translator.release()); // the application's now
 }
 
 // A library opened by a worker thread leaves the translator to the application's thread.
-void installCatalogue()
+void installCatalog()
 {
     QCoreApplication *application = QCoreApplication::instance();
     if (QThread::currentThread() == application->thread())
-        loadCatalogue();
+        loadCatalog();
     else
-        QTimer::singleShot(0, application, loadCatalogue);
+        QTimer::singleShot(0, application, loadCatalog);
 }
 
 // Qt calls the routine when the application object is made, or at once when there is one.
-Q_COREAPP_STARTUP_FUNCTION(installCatalogue)
+Q_COREAPP_STARTUP_FUNCTION(installCatalog)
 
 } // namespace
