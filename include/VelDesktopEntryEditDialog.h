@@ -26,7 +26,7 @@ class VelDesktopEntryEditDialogPrivate;
  * \endcode
  *
  * The size is remembered in the application's default QSettings, so the application needs an
- * organisation name and an application name.
+ * organization name and an application name.
  */
 class VELUIEXTRA_EXPORT VelDesktopEntryEditDialog : public QDialog
 {
@@ -87,5 +87,5 @@ private Q_SLOTS:
 
 private:
     Q_DISABLE_COPY(VelDesktopEntryEditDialog)
-    std::unique_ptr<VelDesktopEntryEditDialogPrivate> d;
+    const std::unique_ptr<VelDesktopEntryEditDialogPrivate> d;
 };

@@ -10,6 +10,7 @@
 #include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
+#include <frame/Unsuitable.h>
 #include <velcore/dirs.h>
 #include <velintegration/desktopitems.h>
 
@@ -17,9 +18,12 @@
 #include <QDialogButtonBox>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QPoint>
 #include <QPointer>
 #include <QPushButton>
 #include <QVBoxLayout>
+
+#include <optional>
 
 namespace {
 
@@ -49,14 +53,15 @@ public:
     void warn(const QString &text);
     void markModified();
     bool checkSuitable(const VelUIDesktopEntry &entry);
+    bool inheritFrom(const QString &pattern, VelUIDesktopEntry *entry);
     void savePosition();
+
+    static QString unsuitableText(VelUIDesktopEntry::SuitableError error);
 
     VelDesktopEntryEditDialog *const q;
     QPointer<VelDesktopEntryPropsWidget> props;
     QString path;
-    int posX = -1;
-    int posY = -1;
-    int posSet = 0;
+    std::optional<QPoint> position; // on the desktop
     // As it was read; saving through a copy writes only what differs from it, so that what
     // another program changed meanwhile stays.
     VelUIDesktopEntry loaded{QString()};
@@ -81,27 +86,41 @@ bool VelDesktopEntryEditDialogPrivate::checkSuitable(const VelUIDesktopEntry &en
     VelUIDesktopEntry::SuitableError error = 0;
     if (entry.isSuitable(&error))
         return true;
-    switch (error) {
-    case 1:
-        warn(tr("no executable"));
-        break;
-    case 2:
-    case 3:
-    case 4:
-        warn(tr("can't find executable"));
-        break;
-    case 5:
-    case 6:
-        warn(tr("can't find try executable"));
-        break;
-    case 7:
-        warn(tr("can't find URL"));
-        break;
-    default:
-        warn(tr("wrong/incomplete desktop entry"));
-        break;
-    }
+    warn(unsuitableText(error));
     return false;
+}
+
+QString VelDesktopEntryEditDialogPrivate::unsuitableText(VelUIDesktopEntry::SuitableError error)
+{
+    switch (error) {
+    case Unsuitable::NoExec:
+        return tr("no executable");
+    case Unsuitable::ProgramMissing:
+    case Unsuitable::ProgramNotExecutable:
+    case Unsuitable::ProgramNotInPath:
+        return tr("can't find executable");
+    case Unsuitable::TryExecPathMissing:
+    case Unsuitable::TryExecNotInPath:
+        return tr("can't find try executable");
+    case Unsuitable::UrlMissing:
+        return tr("can't find URL");
+    default:
+        return tr("wrong/incomplete desktop entry");
+    }
+}
+
+// Gives the entry what it lacks; false when the dialog was deleted behind a message.
+bool VelDesktopEntryEditDialogPrivate::inheritFrom(const QString &pattern, VelUIDesktopEntry *entry)
+{
+    VelUIDesktopEntry source{QString()};
+    source.setFilePath(pattern);
+    if (source.load()) {
+        entry->inheritFrom(source);
+        return true;
+    }
+    const QPointer<VelDesktopEntryEditDialog> self(q);
+    warn(tr("Can't load file %1").arg(pattern));
+    return self;
 }
 
 void VelDesktopEntryEditDialogPrivate::savePosition()
@@ -111,7 +130,7 @@ void VelDesktopEntryEditDialogPrivate::savePosition()
         warn(tr("Can't save position on desktop for %1").arg(path));
         return;
     }
-    SaveDesktopItemPosition(file.fileName().toLocal8Bit().constData(), posX, posY);
+    SaveDesktopItemPosition(file.fileName().toLocal8Bit().constData(), position->x(), position->y());
 }
 
 VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
@@ -158,17 +177,8 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
         return false;
     }
     const VelUIDesktopEntry own = entry;
-    if (!pattern.isEmpty()) {
-        VelUIDesktopEntry source{QString()};
-        source.setFilePath(pattern);
-        const QPointer<VelDesktopEntryEditDialog> alive(this);
-        if (source.load())
-            entry.inheritFrom(source);
-        else
-            d->warn(tr("Can't load file %1").arg(pattern));
-        if (!alive)
-            return false;
-    }
+    if (!pattern.isEmpty() && !d->inheritFrom(pattern, &entry))
+        return false;
     d->props->loadFrom(entry);
     d->path = path;
     d->loaded = own;
@@ -189,9 +199,7 @@ void VelDesktopEntryEditDialog::setDesktopEntryCoords(int xx, int yy)
 {
     if (!d->props)
         return;
-    d->posX = xx;
-    d->posY = yy;
-    d->posSet = 1;
+    d->position = QPoint(xx, yy);
 }
 
 void VelDesktopEntryEditDialog::accept()
@@ -203,22 +211,22 @@ void VelDesktopEntryEditDialog::accept()
     VelUIDesktopEntry entry = d->loaded;
     entry.setFilePath(d->path);
     d->props->saveTo(&entry);
-    const QPointer<VelDesktopEntryEditDialog> alive(this);
+    const QPointer<VelDesktopEntryEditDialog> self(this);
     if (!d->checkSuitable(entry))
         return;
     VelUIDesktopEntry::DisplayableError displayError = 0;
     if (!entry.isDisplayable(&displayError))
         d->warn(tr("You create hidden desktop entry"));
-    if (!alive)
+    if (!self)
         return;
     if (!entry.save()) {
         d->warn(tr("Can't save file %1").arg(d->path));
         return;
     }
     d->loaded = entry;
-    if (d->posSet)
+    if (d->position)
         d->savePosition();
-    if (alive)
+    if (self)
         QDialog::accept();
 }
 
