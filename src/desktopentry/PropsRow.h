@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "EntryTypeRules.h"
+
 #include <frame/DesktopEntryRecord.h>
 
 #include <QString>
@@ -20,7 +22,7 @@ struct PropsRow
     using Form = VelDesktopEntryPropsWidgetPrivate;
 
     enum class Label { Plain, Required, Localised };
-    enum class ShownFor { All, Application, Link };
+    using ShownFor = EntryTypeRules::ShownFor;
 
     Label kind;
     const char *label; ///< an English text in the context of the form

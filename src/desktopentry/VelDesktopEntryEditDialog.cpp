@@ -3,11 +3,12 @@
 
 #include <VelDesktopEntryEditDialog.h>
 
+#include "EntryTypeRules.h"
+
 #include <VelDesktopEntryPropsWidget.h>
 #include <VelMenuDialog.h>
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
-#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
 #include <frame/Unsuitable.h>
@@ -183,11 +184,8 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     d->path = path;
     d->loaded = own;
     if (!loaded) {
-        if (EntryPath::isRecordFile(path))
-            d->props->setType(QStringLiteral("Directory"), {QStringLiteral("Directory")});
-        else if (EntryPath::isEntry(path))
-            d->props->setType(QStringLiteral("Application"),
-                              {QStringLiteral("Application"), QStringLiteral("Link")});
+        const EntryTypeRules::NewEntry types = EntryTypeRules::newEntryAt(path);
+        d->props->setType(types.type, types.allowed);
     }
     setWindowTitle(tr("Desktop Entry Editor") + QStringLiteral(" - ") + path + QStringLiteral("[*]"));
     // Filling the form is not a change of the user's.

@@ -238,5 +238,5 @@ void VelDesktopEntryPropsWidgetPrivate::setShowURLInfoButton(bool on)
     if (on == showURLInfoButton)
         return;
     showURLInfoButton = on;
-    urlInfoButton->setVisible(on && isShown(ShownFor::Link));
+    urlInfoButton->setVisible(on && isShown(ShownFor::Links));
 }

@@ -65,7 +65,7 @@ PropsRow typeRowEntry(const char *label)
 
 PropsRow urlRowEntry(const char *label)
 {
-    PropsRow entry = row(Label::Required, label, ShownFor::Link, nullptr, &Form::url, &Entry::getURL,
+    PropsRow entry = row(Label::Required, label, ShownFor::Links, nullptr, &Form::url, &Entry::getURL,
                          &Entry::setURL, &Form::urlRow);
     entry.add = [](Form &form, const QString &text) { return form.addUrlRow(text); };
     return entry;
@@ -94,7 +94,7 @@ PropsRow withShowInChoice(PropsRow row)
 const std::vector<PropsRow> &VelDesktopEntryPropsWidgetPrivate::rows()
 {
     constexpr Label plain = Label::Plain, required = Label::Required, local = Label::Localised;
-    constexpr ShownFor all = ShownFor::All, application = ShownFor::Application;
+    constexpr ShownFor all = ShownFor::All, application = ShownFor::Applications;
     using F = Form;
     using E = Entry;
     // clang-format off

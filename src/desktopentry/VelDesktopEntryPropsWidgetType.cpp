@@ -5,6 +5,7 @@
 
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
+#include "EntryTypeRules.h"
 #include "FormLayout.h"
 #include "NamedField.h"
 
@@ -27,15 +28,11 @@ namespace {
 
 using ShownFor = PropsRow::ShownFor;
 
-const QLatin1String applicationType("Application");
-const QLatin1String linkType("Link");
-const QLatin1String directoryType("Directory");
-
 QIcon typeIcon(const QString &type)
 {
-    if (type == linkType)
+    if (type == EntryTypeRules::Link)
         return QIcon::fromTheme(QStringLiteral("text-html"));
-    if (type == directoryType)
+    if (type == EntryTypeRules::Directory)
         return QIcon::fromTheme(QStringLiteral("folder"));
     return QIcon::fromTheme(QStringLiteral("system-run"));
 }
@@ -64,8 +61,7 @@ bool VelDesktopEntryPropsWidgetPrivate::eventFilter(QObject *watched, QEvent *ev
 
 void VelDesktopEntryPropsWidgetPrivate::setType(const QString &newType, const QStringList &newAllowedTypes)
 {
-    const QStringList allowed =
-        newAllowedTypes.isEmpty() ? QStringList{applicationType, linkType, directoryType} : newAllowedTypes;
+    const QStringList allowed = EntryTypeRules::choices(newAllowedTypes);
     if (newType.isEmpty() || !allowed.contains(newType))
         return;
     if (newType == type && allowed == allowedTypes)
@@ -79,11 +75,11 @@ void VelDesktopEntryPropsWidgetPrivate::setType(const QString &newType, const QS
 
 QString VelDesktopEntryPropsWidgetPrivate::typeName(const QString &type)
 {
-    if (type == applicationType)
+    if (type == EntryTypeRules::Application)
         return tr("Application");
-    if (type == linkType)
+    if (type == EntryTypeRules::Link)
         return tr("Link");
-    if (type == directoryType)
+    if (type == EntryTypeRules::Directory)
         return tr("Directory");
     return type;
 }
@@ -106,23 +102,15 @@ void VelDesktopEntryPropsWidgetPrivate::applyType(const QString &newType)
 {
     type = newType;
     selectType();
-    setRowsShown(ShownFor::Application);
-    setRowsShown(ShownFor::Link);
-    layout->setRowVisible(typeRow, allowedTypes.size() > 1 || type != directoryType);
-    urlInfoButton->setVisible(showURLInfoButton && isShown(ShownFor::Link));
+    setRowsShown(ShownFor::Applications);
+    setRowsShown(ShownFor::Links);
+    layout->setRowVisible(typeRow, EntryTypeRules::hasChoice(type, allowedTypes));
+    urlInfoButton->setVisible(showURLInfoButton && isShown(ShownFor::Links));
 }
 
 bool VelDesktopEntryPropsWidgetPrivate::isShown(ShownFor group) const
 {
-    switch (group) {
-    case ShownFor::Application:
-        return type == applicationType;
-    case ShownFor::Link:
-        return type == linkType;
-    case ShownFor::All:
-        break;
-    }
-    return true;
+    return EntryTypeRules::isShown(group, type);
 }
 
 void VelDesktopEntryPropsWidgetPrivate::setRowsShown(ShownFor group)
