@@ -13,7 +13,7 @@ namespace VelUI {
 
 namespace {
 
-const ListLineForm::Names formNames = {
+const ListLineForm::Names FormNames = {
     "ActionListEdit",
     "actionListShow",
     "editActionsButton",
@@ -34,13 +34,12 @@ QStringList idsOf(const QList<VelUIDesktopAction> &actions)
 ActionListEdit::ActionListEdit(QWidget *parent)
     : QWidget(parent)
 {
-    m_ui.setupUi(this, formNames);
+    m_ui.setupUi(this, FormNames);
     connect(m_ui.button, &QToolButton::clicked, this, &ActionListEdit::editActions);
 }
 
 void ActionListEdit::setActions(const QList<VelUIDesktopAction> &actions)
 {
-    // The platform promises no comparison of actions, and an equal list does no harm.
     m_actions = actions;
     m_ui.show(idsOf(m_actions));
 }

@@ -6,7 +6,7 @@
 #include "FieldValue.h"
 #include "FormLayout.h"
 #include "IconEdit.h"
-#include "LocalisedLabel.h"
+#include "LocalizedLabel.h"
 #include "NamedField.h"
 #include "PathEdit.h"
 #include "ShowInChoice.h"
@@ -59,11 +59,11 @@ void ActionPropsDialog::addRows(FormLayout *layout)
     m_name = makeField<QLineEdit>("nameEdit", this);
     layout->setRowLabelBold(layout->addRow(tr("Name"), m_name));
     m_localName = makeField<QLineEdit>("localNameEdit", this);
-    layout->addRow(localisedLabel(tr("Name")), m_localName);
+    layout->addRow(localizedLabel(tr("Name")), m_localName);
     m_icon = makeField<IconEdit>("iconEdit", this);
     layout->addRow(tr("Icon"), m_icon);
     m_localIcon = makeField<IconEdit>("localIconEdit", this);
-    layout->addRow(localisedLabel(tr("Icon")), m_localIcon);
+    layout->addRow(localizedLabel(tr("Icon")), m_localIcon);
     addShowInRows(layout);
     m_exec = makeField<PathEdit>("execEdit", this);
     layout->setRowLabelBold(layout->addRow(tr("Exec"), m_exec));

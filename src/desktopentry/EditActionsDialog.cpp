@@ -9,7 +9,7 @@ namespace VelUI {
 
 namespace {
 
-const ListDialogForm::Names formNames = {
+const ListDialogForm::Names FormNames = {
     "EditActionsDialog",
     QT_TRANSLATE_NOOP("EditActionsDialog", "Actions"),
 };
@@ -20,7 +20,7 @@ EditActionsDialog::EditActionsDialog(const QList<VelUIDesktopAction> &actions, Q
     : QDialog(parent)
     , m_listWidget(new EditActionsWidget(this))
 {
-    m_ui.setupUi(this, m_listWidget, formNames);
+    m_ui.setupUi(this, m_listWidget, FormNames);
     m_listWidget->setActions(actions);
     connect(m_listWidget, &EditActionsWidget::changed, this, [this] { setChanged(true); });
     setChanged(false);

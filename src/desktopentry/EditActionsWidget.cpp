@@ -14,7 +14,7 @@ namespace VelUI {
 
 namespace {
 
-const ListEditorForm::Names formNames = {
+const ListEditorForm::Names FormNames = {
     "EditActionsWidget",
     QT_TRANSLATE_NOOP("EditActionsWidget", "Form"),
     QT_TRANSLATE_NOOP("EditActionsWidget", "Add..."),
@@ -26,7 +26,7 @@ const ListEditorForm::Names formNames = {
 
 VelUIDesktopAction actionOf(const QListWidgetItem *item)
 {
-    return item->data(Qt::UserRole).value<VelUIDesktopAction>();
+    return item->data(EditActionsWidget::ActionRole).value<VelUIDesktopAction>();
 }
 
 } // namespace
@@ -36,7 +36,7 @@ EditActionsWidget::EditActionsWidget(QWidget *parent)
     , m_addTitle(tr("Add action"))
     , m_editTitle(tr("Edit action"))
 {
-    m_ui.setupUi(this, formNames);
+    m_ui.setupUi(this, FormNames);
     connect(m_ui.addButton, &QPushButton::clicked, this, &EditActionsWidget::addAction);
     connect(m_ui.editButton, &QPushButton::clicked, this, &EditActionsWidget::editAction);
     connect(m_ui.deleteButton, &QPushButton::clicked, this, &EditActionsWidget::deleteActions);
@@ -70,7 +70,7 @@ void EditActionsWidget::setTexts(const QString &addTitle, const QString &editTit
 void EditActionsWidget::appendItem(const VelUIDesktopAction &action)
 {
     auto *item = new QListWidgetItem(action.getId(), m_ui.listWidget);
-    item->setData(Qt::UserRole, QVariant::fromValue(action));
+    item->setData(ActionRole, QVariant::fromValue(action));
 }
 
 void EditActionsWidget::addAction()
@@ -92,7 +92,7 @@ void EditActionsWidget::editAction()
     dialog->setWindowTitle(m_editTitle);
     if (!dialog.run() || !m_ui.listWidget->currentItem())
         return;
-    m_ui.listWidget->currentItem()->setData(Qt::UserRole, QVariant::fromValue(dialog->action()));
+    m_ui.listWidget->currentItem()->setData(ActionRole, QVariant::fromValue(dialog->action()));
     Q_EMIT changed();
 }
 

@@ -20,12 +20,15 @@ namespace VelUI {
 /// A list of actions that is edited with buttons.
 ///
 /// An item shows the id that its action had when the list was filled and carries the action
-/// under Qt::UserRole.
+/// under ActionRole.
 class EditActionsWidget : public QWidget
 {
     Q_OBJECT
 
 public:
+    /// The role under which an item of the list carries its action.
+    static constexpr int ActionRole = Qt::UserRole;
+
     explicit EditActionsWidget(QWidget *parent = nullptr);
 
     void setActions(const QList<VelUIDesktopAction> &actions);

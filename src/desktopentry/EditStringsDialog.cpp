@@ -9,7 +9,7 @@ namespace VelUI {
 
 namespace {
 
-const ListDialogForm::Names formNames = {
+const ListDialogForm::Names FormNames = {
     "EditStringsDialog",
     QT_TRANSLATE_NOOP("EditStringsDialog", "Strings"),
 };
@@ -20,7 +20,7 @@ EditStringsDialog::EditStringsDialog(const QStringList &strings, QWidget *parent
     : QDialog(parent)
     , m_listWidget(new EditableListWidget(this))
 {
-    m_ui.setupUi(this, m_listWidget, formNames);
+    m_ui.setupUi(this, m_listWidget, FormNames);
     m_listWidget->setStrings(strings);
     connect(m_listWidget, &EditableListWidget::changed, this, [this] { setChanged(true); });
     setChanged(false);

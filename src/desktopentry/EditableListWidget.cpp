@@ -11,7 +11,7 @@ namespace VelUI {
 
 namespace {
 
-const ListEditorForm::Names formNames = {
+const ListEditorForm::Names FormNames = {
     "EditableListWidget",
     QT_TRANSLATE_NOOP("EditableListWidget", "Form"),
     QT_TRANSLATE_NOOP("EditableListWidget", "Add..."),
@@ -30,7 +30,7 @@ EditableListWidget::EditableListWidget(QWidget *parent)
     , m_editTitle(tr("Edit string"))
     , m_editLabel(tr("String:"))
 {
-    m_ui.setupUi(this, formNames);
+    m_ui.setupUi(this, FormNames);
     connect(m_ui.addButton, &QPushButton::clicked, this, &EditableListWidget::addAction);
     connect(m_ui.editButton, &QPushButton::clicked, this, &EditableListWidget::editAction);
     connect(m_ui.deleteButton, &QPushButton::clicked, this, &EditableListWidget::deleteActions);
@@ -70,9 +70,9 @@ void EditableListWidget::setInputFunction(InputFunction function)
 
 void EditableListWidget::addAction()
 {
-    const QPointer<EditableListWidget> alive(this);
+    const QPointer<EditableListWidget> self(this);
     const QString text = m_inputFunction(this, m_addTitle, m_addLabel, QLineEdit::Normal, QString());
-    if (!alive || text.isEmpty())
+    if (!self || text.isEmpty())
         return;
     m_ui.listWidget->addItem(text);
     updateButtonsAvailability();
@@ -83,10 +83,10 @@ void EditableListWidget::editAction()
 {
     if (!m_ui.listWidget->currentItem())
         return;
-    const QPointer<EditableListWidget> alive(this);
+    const QPointer<EditableListWidget> self(this);
     const QString current = m_ui.listWidget->currentItem()->text();
     const QString text = m_inputFunction(this, m_editTitle, m_editLabel, QLineEdit::Normal, current);
-    if (!alive || text.isEmpty() || !m_ui.listWidget->currentItem())
+    if (!self || text.isEmpty() || !m_ui.listWidget->currentItem())
         return;
     m_ui.listWidget->currentItem()->setText(text);
     Q_EMIT changed();

@@ -12,7 +12,7 @@ namespace VelUI {
 
 /// A field for an icon's name, with a button that shows the icon and lets the user choose one.
 ///
-/// Typing changes the name only; the picture follows setIcon() and the user's choice.
+/// Typing changes the name only; the button follows setIcon() and the user's choice.
 class IconEdit : public QWidget
 {
     Q_OBJECT
@@ -20,7 +20,7 @@ class IconEdit : public QWidget
 public:
     explicit IconEdit(QWidget *parent = nullptr);
 
-    /// Sets the name and the picture; emits nothing.
+    /// Sets the name and the icon on the button; emits nothing.
     void setIcon(const QString &icon);
     QString icon() const;
     /// Disables the button; the line for the name stays as it is.

@@ -58,10 +58,10 @@ void PathEdit::setText(const QString &text)
 
 void PathEdit::selectPathButtonClicked()
 {
-    const QPointer<PathEdit> alive(this);
+    const QPointer<PathEdit> self(this);
     const QString chosen =
         QFileDialog::getOpenFileName(this, tr("Choose application exec path"), QStringLiteral("/usr/bin"));
-    if (alive && !chosen.isNull())
+    if (self && !chosen.isNull())
         setText(chosen);
 }
 

@@ -21,7 +21,7 @@ struct PropsRow
 {
     using Form = VelDesktopEntryPropsWidgetPrivate;
 
-    enum class Label { Plain, Required, Localised };
+    enum class Label { Plain, Required, Localized };
     using ShownFor = EntryTypeRules::ShownFor;
 
     Label kind;

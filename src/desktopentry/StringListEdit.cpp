@@ -13,7 +13,7 @@ namespace VelUI {
 
 namespace {
 
-const ListLineForm::Names formNames = {
+const ListLineForm::Names FormNames = {
     "StringListEdit",
     "stringListShow",
     "editStringsButton",
@@ -26,14 +26,13 @@ const ListLineForm::Names formNames = {
 StringListEdit::StringListEdit(QWidget *parent)
     : QWidget(parent)
 {
-    m_ui.setupUi(this, formNames);
+    m_ui.setupUi(this, FormNames);
     connect(m_ui.button, &QToolButton::clicked, this, &StringListEdit::editStrings);
 }
 
 void StringListEdit::setStrings(const QStringList &strings)
 {
-    if (m_strings != strings)
-        m_strings = strings;
+    m_strings = strings;
     m_ui.show(m_strings);
 }
 

@@ -6,7 +6,7 @@
 #include "ActionListEdit.h"
 #include "FormLayout.h"
 #include "IconEdit.h"
-#include "LocalisedLabel.h"
+#include "LocalizedLabel.h"
 #include "MimeTypeInput.h"
 #include "NamedField.h"
 #include "PathEdit.h"
@@ -84,7 +84,7 @@ void VelDesktopEntryPropsWidgetPrivate::build()
 void VelDesktopEntryPropsWidgetPrivate::addRow(const PropsRow &row)
 {
     const QString label = tr(row.label);
-    const int number = row.add(*this, row.kind == Label::Localised ? localisedLabel(label) : label);
+    const int number = row.add(*this, row.kind == Label::Localized ? localizedLabel(label) : label);
     if (row.kind == Label::Required)
         layout->setRowLabelBold(number);
     if (row.number)

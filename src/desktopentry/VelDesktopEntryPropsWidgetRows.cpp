@@ -93,7 +93,7 @@ PropsRow withShowInChoice(PropsRow row)
 // Whoever adds a key adds a line here and a field to the class.
 const std::vector<PropsRow> &VelDesktopEntryPropsWidgetPrivate::rows()
 {
-    constexpr Label plain = Label::Plain, required = Label::Required, local = Label::Localised;
+    constexpr Label plain = Label::Plain, required = Label::Required, local = Label::Localized;
     constexpr ShownFor all = ShownFor::All, application = ShownFor::Applications;
     using F = Form;
     using E = Entry;

@@ -133,9 +133,9 @@ void VelDesktopEntryPropsWidgetPrivate::typeChosen(int index)
     const QString chosen = typeBox->itemData(index).toString();
     if (chosen.isEmpty() || chosen == type)
         return;
-    const QPointer<Form> alive(this);
+    const QPointer<Form> self(this);
     const bool isConfirmed = confirmTypeChange();
-    if (!alive)
+    if (!self)
         return;
     if (!isConfirmed) {
         selectType();
@@ -154,11 +154,11 @@ bool VelDesktopEntryPropsWidgetPrivate::confirmTypeChange()
         q);
     box->setDefaultButton(QMessageBox::No);
 
-    const QPointer<Form> alive(this);
+    const QPointer<Form> self(this);
     QComboBox *const orphan = isAskingForType ? nullptr : typeBox;
     isAskingForType = true;
     const int answer = box.exec();
-    if (alive)
+    if (self)
         isAskingForType = !orphan;
     else if (orphan)
         orphan->deleteLater();

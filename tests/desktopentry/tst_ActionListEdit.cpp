@@ -27,7 +27,7 @@ private Q_SLOTS:
     void showsTheIds();
     void hidesTheButtonWhenReadOnly();
     void takesTheAcceptedActions();
-    void keepsTheActionsWhenCancelled();
+    void keepsTheActionsWhenCanceled();
     void givesItsTextsToTheDialogs();
 };
 
@@ -94,7 +94,7 @@ void tst_ActionListEdit::takesTheAcceptedActions()
     QCOMPARE(changed.count(), 1);
 }
 
-void tst_ActionListEdit::keepsTheActionsWhenCancelled()
+void tst_ActionListEdit::keepsTheActionsWhenCanceled()
 {
     ActionListEdit edit;
     edit.setActions(actions({"a", "b"}));

@@ -27,9 +27,9 @@ private Q_SLOTS:
     void carriesTheActionsInTheItems();
     void addsAnActionThatWasFilledIn();
     void cannotAddAnActionWithoutFillingIt();
-    void addsNothingWhenCancelled();
+    void addsNothingWhenCanceled();
     void editsTheCurrentAction();
-    void leavesTheActionWhenCancelled();
+    void leavesTheActionWhenCanceled();
     void opensAnItemWithoutActionAsAnEmptyOne();
     void editsNothingWithoutACurrentItem();
     void namesTheDialogsByTheTextsGiven();
@@ -118,7 +118,7 @@ void tst_EditActionsWidget::cannotAddAnActionWithoutFillingIt()
     QVERIFY(widget.actions().isEmpty());
 }
 
-void tst_EditActionsWidget::addsNothingWhenCancelled()
+void tst_EditActionsWidget::addsNothingWhenCanceled()
 {
     EditActionsWidget widget;
     QSignalSpy changed(&widget, &EditActionsWidget::changed);
@@ -155,7 +155,7 @@ void tst_EditActionsWidget::editsTheCurrentAction()
     QCOMPARE(list->item(1)->text(), QStringLiteral("other"));
 }
 
-void tst_EditActionsWidget::leavesTheActionWhenCancelled()
+void tst_EditActionsWidget::leavesTheActionWhenCanceled()
 {
     EditActionsWidget widget;
     widget.setActions(actions({"a"}));

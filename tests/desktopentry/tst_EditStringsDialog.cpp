@@ -43,7 +43,7 @@ private Q_SLOTS:
     void enablesOkAfterAnyChange_data();
     void enablesOkAfterAnyChange();
     void countsAMoveThereAndBackAsAChange();
-    void leavesOkWhenThePromptIsCancelled();
+    void leavesOkWhenThePromptIsCanceled();
     void passesTheTextsAndTheFunctionOn();
     void acceptsAndRejectsByItsButtons();
 };
@@ -102,7 +102,7 @@ void tst_EditStringsDialog::countsAMoveThereAndBackAsAChange()
     QVERIFY(okButton(&dialog)->isEnabled());
 }
 
-void tst_EditStringsDialog::leavesOkWhenThePromptIsCancelled()
+void tst_EditStringsDialog::leavesOkWhenThePromptIsCanceled()
 {
     EditStringsDialog dialog(abc);
     ModalDriver modal;

@@ -213,7 +213,7 @@ void tst_EditableListWidget::addsWhatWasTyped()
 void tst_EditableListWidget::addsNothingForAnEmptyAnswer_data()
 {
     QTest::addColumn<QString>("answer");
-    QTest::newRow("cancelled") << QString();
+    QTest::newRow("canceled") << QString();
     QTest::newRow("nothing typed") << QStringLiteral("");
 }
 

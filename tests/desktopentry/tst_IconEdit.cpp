@@ -23,7 +23,7 @@ class tst_IconEdit : public TestCase
 private Q_SLOTS:
     void initTestCase();
     void laysOutTheLineBeforeTheButton();
-    void setsTextAndPictureWithoutASignal();
+    void setsTextAndIconWithoutASignal();
     void takesWhatTheButtonReports();
     void takesTheIconThatTheUserChoosesInTheChooser();
     void typingChangesTheNameOnly();
@@ -51,7 +51,7 @@ void tst_IconEdit::laysOutTheLineBeforeTheButton()
     QCOMPARE(button->iconSize(), 32);
 }
 
-void tst_IconEdit::setsTextAndPictureWithoutASignal()
+void tst_IconEdit::setsTextAndIconWithoutASignal()
 {
     IconEdit edit;
     QSignalSpy changed(&edit, &IconEdit::iconChanged);

@@ -19,7 +19,7 @@ private Q_SLOTS:
     void turnsAnExtensionIntoItsType();
     void takesTheFirstTypeOfAnExtension();
     void asksWithTheTextsGiven();
-    void givesNothingWhenCancelled();
+    void givesNothingWhenCanceled();
 };
 
 void tst_MimeTypeInput::turnsAnExtensionIntoItsType_data()
@@ -71,7 +71,7 @@ void tst_MimeTypeInput::asksWithTheTextsGiven()
     QCOMPARE(prompt.text, QStringLiteral("before"));
 }
 
-void tst_MimeTypeInput::givesNothingWhenCancelled()
+void tst_MimeTypeInput::givesNothingWhenCanceled()
 {
     ModalDriver modal;
     answerPrompt(modal, QString());

@@ -26,7 +26,7 @@ private Q_SLOTS:
     void keepsTextsOfAnyKind_data();
     void keepsTextsOfAnyKind();
     void takesTheChosenFile();
-    void changesNothingWhenTheChoiceIsCancelled();
+    void changesNothingWhenTheChoiceIsCanceled();
     void givesTheKeysToTheLine();
 };
 
@@ -121,7 +121,7 @@ void tst_PathEdit::takesTheChosenFile()
     QCOMPARE(changed.count(), 1);
 }
 
-void tst_PathEdit::changesNothingWhenTheChoiceIsCancelled()
+void tst_PathEdit::changesNothingWhenTheChoiceIsCanceled()
 {
     PathEdit edit;
     edit.setText(QStringLiteral("before"));

@@ -42,7 +42,7 @@ private Q_SLOTS:
     void clearsWithoutASignal();
     void hidesTheButtonWhenReadOnly();
     void takesTheAcceptedList();
-    void keepsTheListWhenCancelled();
+    void keepsTheListWhenCanceled();
     void namesTheDialogByTheTitle();
     void givesItsTextsToTheDialog_data();
     void givesItsTextsToTheDialog();
@@ -154,7 +154,7 @@ void tst_StringListEdit::takesTheAcceptedList()
     QCOMPARE(changed.count(), 1);
 }
 
-void tst_StringListEdit::keepsTheListWhenCancelled()
+void tst_StringListEdit::keepsTheListWhenCanceled()
 {
     StringListEdit edit;
     edit.setStrings({QStringLiteral("a")});

@@ -26,7 +26,7 @@ private Q_SLOTS:
     void switchesTheListsWhenCopying();
     void marksACopyAsAChange();
     void copiesNothingFromAFileThatDoesNotLoad();
-    void copiesNothingWhenThePickerIsCancelled();
+    void copiesNothingWhenThePickerIsCanceled();
     void survivesItsDeletionBehindThePicker();
 
 private:
@@ -133,7 +133,7 @@ void tst_VelDesktopEntryEditDialogCopying::copiesNothingFromAFileThatDoesNotLoad
     QVERIFY(!dialog.isWindowModified());
 }
 
-void tst_VelDesktopEntryEditDialogCopying::copiesNothingWhenThePickerIsCancelled()
+void tst_VelDesktopEntryEditDialogCopying::copiesNothingWhenThePickerIsCanceled()
 {
     const QString file = write(QStringLiteral("a.desktop"), plainApplication);
     VelDesktopEntryEditDialog dialog;

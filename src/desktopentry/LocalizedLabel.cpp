@@ -1,13 +1,13 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "LocalisedLabel.h"
+#include "LocalizedLabel.h"
 
 #include <velcore/language.h>
 
 namespace VelUI {
 
-QString localisedLabel(const QString &label)
+QString localizedLabel(const QString &label)
 {
     return label + QStringLiteral(" [") + QString::fromStdString(velLanguageCode()) + QLatin1Char(']');
 }

@@ -8,6 +8,6 @@
 namespace VelUI {
 
 /// The label of the field that holds a key in the user's language: "Name" gives "Name [de]".
-QString localisedLabel(const QString &label);
+QString localizedLabel(const QString &label);
 
 } // namespace VelUI
