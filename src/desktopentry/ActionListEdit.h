@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "ListLineForm.h"
+#include "fields/ListLineForm.h"
 
 #include <frame/DesktopEntryRecord.h>
 

@@ -4,13 +4,13 @@
 #include "ActionPropsDialog.h"
 
 #include "FieldValue.h"
-#include "FormLayout.h"
-#include "IconEdit.h"
-#include "LocalizedLabel.h"
-#include "NamedField.h"
-#include "PathEdit.h"
-#include "ShowInChoice.h"
-#include "StringListEdit.h"
+#include "fields/FormLayout.h"
+#include "fields/IconEdit.h"
+#include "fields/LocalizedLabel.h"
+#include "fields/NamedField.h"
+#include "fields/PathEdit.h"
+#include "fields/ShowInChoice.h"
+#include "fields/StringListEdit.h"
 
 #include <QDialogButtonBox>
 #include <QLineEdit>

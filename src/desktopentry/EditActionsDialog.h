@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "ListDialogForm.h"
+#include "fields/ListDialogForm.h"
 
 #include <frame/DesktopEntryRecord.h>
 

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "ListEditorForm.h"
+#include "fields/ListEditorForm.h"
 
 #include <frame/DesktopEntryRecord.h>
 

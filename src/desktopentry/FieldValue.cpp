@@ -4,9 +4,9 @@
 #include "FieldValue.h"
 
 #include "ActionListEdit.h"
-#include "IconEdit.h"
-#include "PathEdit.h"
-#include "StringListEdit.h"
+#include "fields/IconEdit.h"
+#include "fields/PathEdit.h"
+#include "fields/StringListEdit.h"
 
 #include <QCheckBox>
 #include <QLineEdit>

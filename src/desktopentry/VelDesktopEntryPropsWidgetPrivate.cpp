@@ -4,14 +4,14 @@
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
 #include "ActionListEdit.h"
-#include "FormLayout.h"
-#include "IconEdit.h"
-#include "LocalizedLabel.h"
-#include "MimeTypeInput.h"
-#include "NamedField.h"
-#include "PathEdit.h"
-#include "ShowInChoice.h"
-#include "StringListEdit.h"
+#include "fields/FormLayout.h"
+#include "fields/IconEdit.h"
+#include "fields/LocalizedLabel.h"
+#include "fields/MimeTypeInput.h"
+#include "fields/NamedField.h"
+#include "fields/PathEdit.h"
+#include "fields/ShowInChoice.h"
+#include "fields/StringListEdit.h"
 
 #include <VelDesktopEntryPropsWidget.h>
 

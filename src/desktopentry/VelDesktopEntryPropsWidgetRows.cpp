@@ -7,11 +7,11 @@
 
 #include "ActionListEdit.h"
 #include "FieldValue.h"
-#include "FormLayout.h"
-#include "IconEdit.h"
-#include "NamedField.h"
-#include "PathEdit.h"
-#include "StringListEdit.h"
+#include "fields/FormLayout.h"
+#include "fields/IconEdit.h"
+#include "fields/NamedField.h"
+#include "fields/PathEdit.h"
+#include "fields/StringListEdit.h"
 
 #include <QCheckBox>
 

@@ -6,8 +6,8 @@
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
 #include "EntryTypeRules.h"
-#include "FormLayout.h"
-#include "NamedField.h"
+#include "fields/FormLayout.h"
+#include "fields/NamedField.h"
 
 #include <VelDesktopEntryPropsWidget.h>
 #include <frame/GuardedDialog.h>

@@ -4,7 +4,7 @@
 #include "FormDriving.h"
 #include "TestCase.h"
 
-#include <desktopentry/MimeTypeInput.h>
+#include <desktopentry/fields/MimeTypeInput.h>
 
 #include <QMimeDatabase>
 
