@@ -73,4 +73,14 @@ void ActionListEdit::editActions()
     Q_EMIT changed();
 }
 
+QList<VelUIDesktopAction> fieldValue(const ActionListEdit *field)
+{
+    return field->actions();
+}
+
+void setFieldValue(ActionListEdit *field, const QList<VelUIDesktopAction> &value)
+{
+    field->setActions(value);
+}
+
 } // namespace VelUI

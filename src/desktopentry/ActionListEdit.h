@@ -41,4 +41,8 @@ private:
     QString m_editTitle;
 };
 
+/// The value of the field as a row of a form reads and writes it.
+QList<VelUIDesktopAction> fieldValue(const ActionListEdit *field);
+void setFieldValue(ActionListEdit *field, const QList<VelUIDesktopAction> &value);
+
 } // namespace VelUI

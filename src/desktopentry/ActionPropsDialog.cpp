@@ -3,12 +3,12 @@
 
 #include "ActionPropsDialog.h"
 
-#include "FieldValue.h"
 #include "fields/FormLayout.h"
 #include "fields/IconEdit.h"
 #include "fields/LocalizedLabel.h"
 #include "fields/NamedField.h"
 #include "fields/PathEdit.h"
+#include "fields/PlainFields.h"
 #include "fields/ShowInChoice.h"
 #include "fields/StringListEdit.h"
 

@@ -6,11 +6,11 @@
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
 #include "ActionListEdit.h"
-#include "FieldValue.h"
 #include "fields/FormLayout.h"
 #include "fields/IconEdit.h"
 #include "fields/NamedField.h"
 #include "fields/PathEdit.h"
+#include "fields/PlainFields.h"
 #include "fields/StringListEdit.h"
 
 #include <QCheckBox>

@@ -55,4 +55,14 @@ void IconEdit::slotIconChanged(const QString &newIcon)
     Q_EMIT iconChanged(newIcon);
 }
 
+QString fieldValue(const IconEdit *field)
+{
+    return field->icon();
+}
+
+void setFieldValue(IconEdit *field, const QString &value)
+{
+    field->setIcon(value);
+}
+
 } // namespace VelUI

@@ -38,4 +38,8 @@ private:
     KIconButton *m_button;
 };
 
+/// The value of the field as a row of a form reads and writes it.
+QString fieldValue(const IconEdit *field);
+void setFieldValue(IconEdit *field, const QString &value);
+
 } // namespace VelUI

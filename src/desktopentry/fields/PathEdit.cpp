@@ -65,4 +65,14 @@ void PathEdit::selectPathButtonClicked()
         setText(chosen);
 }
 
+QString fieldValue(const PathEdit *field)
+{
+    return field->text();
+}
+
+void setFieldValue(PathEdit *field, const QString &value)
+{
+    field->setText(value);
+}
+
 } // namespace VelUI

@@ -35,4 +35,8 @@ private:
     QToolButton *m_button;
 };
 
+/// The value of the field as a row of a form reads and writes it.
+QString fieldValue(const PathEdit *field);
+void setFieldValue(PathEdit *field, const QString &value);
+
 } // namespace VelUI

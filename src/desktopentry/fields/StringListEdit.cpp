@@ -85,4 +85,14 @@ void StringListEdit::editStrings()
     Q_EMIT changed();
 }
 
+QStringList fieldValue(const StringListEdit *field)
+{
+    return field->strings();
+}
+
+void setFieldValue(StringListEdit *field, const QStringList &value)
+{
+    field->setStrings(value);
+}
+
 } // namespace VelUI

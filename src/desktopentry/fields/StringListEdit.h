@@ -50,4 +50,8 @@ private:
     InputFunction m_inputFunction = nullptr;
 };
 
+/// The value of the field as a row of a form reads and writes it.
+QStringList fieldValue(const StringListEdit *field);
+void setFieldValue(StringListEdit *field, const QStringList &value);
+
 } // namespace VelUI
