@@ -64,28 +64,11 @@ void ActionPropsDialog::addRows(FormLayout *layout)
     layout->addRow(tr("Icon"), m_icon);
     m_localIcon = makeField<IconEdit>("localIconEdit", this);
     layout->addRow(localizedLabel(tr("Icon")), m_localIcon);
-    addShowInRows(layout);
+    m_showIn = new ShowInChoice({tr("Only show in"), tr("Not show in"), tr("Add desktop environment:"),
+                                 tr("Edit desktop environment:")},
+                                layout);
     m_exec = makeField<PathEdit>("execEdit", this);
     layout->setRowLabelBold(layout->addRow(tr("Exec"), m_exec));
-}
-
-void ActionPropsDialog::addShowInRows(FormLayout *layout)
-{
-    m_onlyShowInButton = new RowRadioButton(tr("Only show in"), this);
-    m_onlyShowInButton->setObjectName(QStringLiteral("onlyShowInButton"));
-    m_onlyShowIn = makeField<StringListEdit>("onlyShowInEdit", this);
-    m_onlyShowIn->setTexts(tr("Only show in"), tr("Only show in"), tr("Add desktop environment:"),
-                           tr("Only show in"), tr("Edit desktop environment:"));
-    layout->addRow(m_onlyShowInButton, m_onlyShowIn);
-
-    m_notShowInButton = new RowRadioButton(tr("Not show in"), this);
-    m_notShowInButton->setObjectName(QStringLiteral("notShowInButton"));
-    m_notShowIn = makeField<StringListEdit>("notShowInEdit", this);
-    m_notShowIn->setTexts(tr("Not show in"), tr("Not show in"), tr("Add desktop environment:"),
-                          tr("Not show in"), tr("Edit desktop environment:"));
-    layout->addRow(m_notShowInButton, m_notShowIn);
-
-    ShowInChoice{m_onlyShowInButton, m_onlyShowIn, m_notShowInButton, m_notShowIn}.connectUp(this);
 }
 
 void ActionPropsDialog::load(const VelUIDesktopAction &action)
@@ -95,21 +78,19 @@ void ActionPropsDialog::load(const VelUIDesktopAction &action)
     setFieldValue(m_localName, action.getLocalName());
     setFieldValue(m_icon, action.getIcon());
     setFieldValue(m_localIcon, action.getLocalIcon());
+    m_showIn->load(action);
     setFieldValue(m_exec, action.getExec());
-    ShowInChoice{m_onlyShowInButton, m_onlyShowIn, m_notShowInButton, m_notShowIn}.load(
-        action.getOnlyShowIn(), action.getNotShowIn());
 }
 
 void ActionPropsDialog::connectChanges()
 {
     const auto mark = [this] { setChanged(true); };
-    const auto lines = findChildren<QLineEdit *>();
-    for (QLineEdit *line : lines)
+    for (QLineEdit *line : findChildren<QLineEdit *>())
         connect(line, &QLineEdit::textEdited, this, mark);
     for (IconEdit *icon : {m_icon, m_localIcon})
         connect(icon, &IconEdit::iconChanged, this, mark);
     connect(m_exec, &PathEdit::changed, this, mark);
-    for (StringListEdit *list : {m_onlyShowIn, m_notShowIn})
+    for (StringListEdit *list : findChildren<StringListEdit *>())
         connect(list, &StringListEdit::changed, this, mark);
 }
 
@@ -120,11 +101,8 @@ VelUIDesktopAction ActionPropsDialog::action() const
     action.setLocalName(m_localName->text());
     action.setIcon(m_icon->icon());
     action.setLocalIcon(m_localIcon->icon());
+    m_showIn->save(&action);
     action.setExec(m_exec->text());
-    if (m_onlyShowInButton->isChecked())
-        action.setOnlyShowIn(m_onlyShowIn->strings());
-    else
-        action.setNotShowIn(m_notShowIn->strings());
     return action;
 }
 

@@ -9,14 +9,13 @@
 
 class QDialogButtonBox;
 class QLineEdit;
-class QRadioButton;
 
 namespace VelUI {
 
 class FormLayout;
 class IconEdit;
 class PathEdit;
-class StringListEdit;
+class ShowInChoice;
 
 /// Edits one action; Ok waits for a change and for an id, a name and a command.
 class ActionPropsDialog : public QDialog
@@ -35,7 +34,6 @@ public Q_SLOTS:
 private:
     void build();
     void addRows(FormLayout *layout);
-    void addShowInRows(FormLayout *layout);
     void load(const VelUIDesktopAction &action);
     void connectChanges();
 
@@ -43,12 +41,9 @@ private:
     QLineEdit *m_id = nullptr;
     QLineEdit *m_name = nullptr;
     QLineEdit *m_localName = nullptr;
-    QRadioButton *m_onlyShowInButton = nullptr;
-    StringListEdit *m_onlyShowIn = nullptr;
-    QRadioButton *m_notShowInButton = nullptr;
-    StringListEdit *m_notShowIn = nullptr;
     IconEdit *m_icon = nullptr;
     IconEdit *m_localIcon = nullptr;
+    ShowInChoice *m_showIn = nullptr;
     PathEdit *m_exec = nullptr;
 };
 

@@ -20,6 +20,7 @@
 #include <QComboBox>
 #include <QHBoxLayout>
 #include <QLineEdit>
+#include <QRadioButton>
 #include <QScrollArea>
 #include <QStyle>
 #include <QToolButton>
@@ -77,7 +78,6 @@ void VelDesktopEntryPropsWidgetPrivate::build()
         addRow(row);
     layout->setRowStretch(layout->rowCount(), 1);
 
-    ShowInChoice{onlyShowInButton, onlyShowIn, notShowInButton, notShowIn}.connectUp(this);
     setListTexts();
 }
 
@@ -108,25 +108,16 @@ int VelDesktopEntryPropsWidgetPrivate::addUrlRow(const QString &label)
     return layout->addRow(label, line);
 }
 
-int VelDesktopEntryPropsWidgetPrivate::addShowInRow(const QString &label, QRadioButton **button,
-                                                    StringListEdit **list)
+int VelDesktopEntryPropsWidgetPrivate::addShowInRows(const QString &label)
 {
-    *button = new RowRadioButton(label, content);
-    *list = new StringListEdit(content);
-    const bool first = !notShowInButton;
-    (*button)->setObjectName(first ? QStringLiteral("onlyShowInButton") : QStringLiteral("notShowInButton"));
-    (*list)->setObjectName(first ? QStringLiteral("onlyShowInEdit") : QStringLiteral("notShowInEdit"));
-    return layout->addRow(*button, *list);
+    const int first = layout->rowCount();
+    showIn = new ShowInChoice(
+        {label, tr("Not show in"), tr("Add desktop environment:"), tr("Edit desktop environment:")}, layout);
+    return first;
 }
 
 void VelDesktopEntryPropsWidgetPrivate::setListTexts()
 {
-    const QString only = tr("Only show in");
-    const QString no = tr("Not show in");
-    const QString addDesktop = tr("Add desktop environment:");
-    const QString editDesktop = tr("Edit desktop environment:");
-    onlyShowIn->setTexts(only, only, addDesktop, only, editDesktop);
-    notShowIn->setTexts(no, no, addDesktop, no, editDesktop);
     const QString mimeLabel = tr("MIME type or file name extension:");
     mimeType->setTexts(tr("MIME type"), tr("Add MIME type"), mimeLabel, tr("Edit MIME type"), mimeLabel);
     mimeType->setInputFunction(askForMimeType);
@@ -153,7 +144,6 @@ void VelDesktopEntryPropsWidgetPrivate::connectChanges()
     connect(actions, &ActionListEdit::changed, q, changed);
 
     connect(typeBox, QOverload<int>::of(&QComboBox::currentIndexChanged), this, &Form::typeChosen);
-    connect(onlyShowInButton, &QRadioButton::toggled, this, [this] { showInSwitched = true; });
     connect(urlInfoButton, &QToolButton::clicked, q, [this] { Q_EMIT q->requestedURLInfo(url->text()); });
     connect(qApp, &QApplication::focusChanged, this,
             [this](QWidget *, QWidget *focused) { keepInView(focused); });
@@ -185,29 +175,6 @@ void VelDesktopEntryPropsWidgetPrivate::saveTo(VelUIDesktopEntry *entry) const
         if (row.save && isShown(row.shownFor))
             row.save(*this, entry);
     }
-}
-
-void VelDesktopEntryPropsWidgetPrivate::loadShowIn(const VelUIDesktopEntry &entry)
-{
-    ShowInChoice{onlyShowInButton, onlyShowIn, notShowInButton, notShowIn}.load(entry.getOnlyShowIn(),
-                                                                                entry.getNotShowIn());
-    showInSwitched = false;
-}
-
-void VelDesktopEntryPropsWidgetPrivate::saveShowIn(VelUIDesktopEntry *entry) const
-{
-    if (onlyShowInButton->isChecked()) {
-        entry->setOnlyShowIn(onlyShowIn->strings());
-        entry->setNotShowIn({});
-        return;
-    }
-    // An entry that holds both lists keeps them, unless something else was chosen: here, or
-    // in the other entry that the form was filled from.
-    const bool keepsBoth = !showInSwitched && !entry->getNotShowIn().isEmpty()
-        && onlyShowIn->strings() == entry->getOnlyShowIn();
-    entry->setNotShowIn(notShowIn->strings());
-    if (!keepsBoth)
-        entry->setOnlyShowIn({});
 }
 
 void VelDesktopEntryPropsWidgetPrivate::setReadOnly(bool on)

@@ -13,7 +13,6 @@
 class QCheckBox;
 class QComboBox;
 class QLineEdit;
-class QRadioButton;
 class QScrollArea;
 class QToolButton;
 class VelDesktopEntryPropsWidget;
@@ -23,6 +22,7 @@ class ActionListEdit;
 class FormLayout;
 class IconEdit;
 class PathEdit;
+class ShowInChoice;
 class StringListEdit;
 } // namespace VelUI
 
@@ -43,9 +43,7 @@ public:
 
     int addTypeRow(const QString &label);
     int addUrlRow(const QString &label);
-    int addShowInRow(const QString &label, QRadioButton **button, VelUI::StringListEdit **list);
-    void loadShowIn(const VelUIDesktopEntry &entry);
-    void saveShowIn(VelUIDesktopEntry *entry) const;
+    int addShowInRows(const QString &label);
 
     bool eventFilter(QObject *watched, QEvent *event) override;
 
@@ -66,10 +64,7 @@ public:
     QLineEdit *localComment = nullptr;
     QCheckBox *noDisplay = nullptr;
     QCheckBox *hidden = nullptr;
-    QRadioButton *onlyShowInButton = nullptr;
-    VelUI::StringListEdit *onlyShowIn = nullptr;
-    QRadioButton *notShowInButton = nullptr;
-    VelUI::StringListEdit *notShowIn = nullptr;
+    VelUI::ShowInChoice *showIn = nullptr;
     VelUI::IconEdit *icon = nullptr;
     VelUI::IconEdit *localIcon = nullptr;
     VelUI::PathEdit *exec = nullptr;
@@ -97,7 +92,6 @@ public:
     int urlRow = 0;
     bool readOnly = false;
     bool showURLInfoButton = false;
-    bool showInSwitched = false; // since the last loading
     bool isAskingForType = false;
 
 private:

@@ -11,6 +11,7 @@
 #include "fields/NamedField.h"
 #include "fields/PathEdit.h"
 #include "fields/PlainFields.h"
+#include "fields/ShowInChoice.h"
 #include "fields/StringListEdit.h"
 
 #include <QCheckBox>
@@ -71,20 +72,12 @@ PropsRow urlRowEntry(const char *label)
     return entry;
 }
 
-PropsRow showInRowEntry(const char *label, QRadioButton *Form::*button, StringListEdit *Form::*list)
+PropsRow showInRows(const char *label)
 {
     PropsRow row{Label::Plain, label, ShownFor::All, nullptr, {}, {}, {}, {}, {}};
-    row.add = [button, list](Form &form, const QString &text) {
-        return form.addShowInRow(text, &(form.*button), &(form.*list));
-    };
-    return row;
-}
-
-// The two lists are one choice: the row of the second loads and saves both.
-PropsRow withShowInChoice(PropsRow row)
-{
-    row.load = [](Form &form, const Entry &entry) { form.loadShowIn(entry); };
-    row.save = [](const Form &form, Entry *entry) { form.saveShowIn(entry); };
+    row.add = [](Form &form, const QString &text) { return form.addShowInRows(text); };
+    row.load = [](Form &form, const Entry &entry) { form.showIn->load(entry); };
+    row.save = [](const Form &form, Entry *entry) { form.showIn->save(entry); };
     return row;
 }
 
@@ -115,8 +108,7 @@ const std::vector<PropsRow> &VelDesktopEntryPropsWidgetPrivate::rows()
         row(local, QT_TR_NOOP("Comment"), all, "localCommentEdit", &F::localComment, &E::getLocalComment, &E::setLocalComment),
         row(plain, QT_TR_NOOP("No display"), all, "noDisplayCheckBox", &F::noDisplay, &E::getNoDisplay, &E::setNoDisplay),
         row(plain, QT_TR_NOOP("Hidden"), all, "hiddenCheckBox", &F::hidden, &E::getHidden, &E::setHidden),
-        showInRowEntry(QT_TR_NOOP("Only show in"), &F::onlyShowInButton, &F::onlyShowIn),
-        withShowInChoice(showInRowEntry(QT_TR_NOOP("Not show in"), &F::notShowInButton, &F::notShowIn)),
+        showInRows(QT_TR_NOOP("Only show in")),
         row(plain, QT_TR_NOOP("MIME type"), application, "mimeTypeEdit", &F::mimeType, &E::getMimeType, &E::setMimeType, &F::mimeTypeRow),
         row(plain, QT_TR_NOOP("Categories"), application, "categoriesEdit", &F::categories, &E::getCategories, &E::setCategories, &F::categoriesRow),
         row(plain, QT_TR_NOOP("Keywords"), application, "keywordsEdit", &F::keywords, &E::getKeywords, &E::setKeywords, &F::keywordsRow),
