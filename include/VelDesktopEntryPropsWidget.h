@@ -9,6 +9,8 @@
 #include <QStringList>
 #include <QWidget>
 
+#include <memory>
+
 class VelDesktopEntryPropsWidgetPrivate;
 class VelUIDesktopEntry;
 
@@ -97,5 +99,5 @@ Q_SIGNALS:
 
 private:
     Q_DISABLE_COPY(VelDesktopEntryPropsWidget)
-    VelDesktopEntryPropsWidgetPrivate *const d;
+    const std::unique_ptr<VelDesktopEntryPropsWidgetPrivate> d;
 };

@@ -7,34 +7,32 @@
 
 #include <frame/DesktopEntryRecord.h>
 
-#include <QString>
-
-#include <functional>
-
-class QWidget;
-class VelDesktopEntryPropsWidgetPrivate;
-
 namespace VelUI {
 
-/// One row of the properties form: one key of an entry.
-struct PropsRow
-{
-    using Form = VelDesktopEntryPropsWidgetPrivate;
+class FormLayout;
 
-    enum class Label { Plain, Required, Localized };
+/// One row of the properties form: where the form has it, and the key of an entry that it shows.
+class PropsRow
+{
+public:
     using ShownFor = EntryTypeRules::ShownFor;
 
-    Label kind;
-    const char *label; ///< an English text in the context of the form
-    ShownFor shownFor;
-    int Form::*number; ///< where the row number is kept; null where the field is the whole row
+    /// The row \a number of \a layout.
+    PropsRow(ShownFor shownFor, FormLayout *layout, int number);
+    virtual ~PropsRow();
 
-    /// Makes the field and appends the row; gives the row number.
-    std::function<int(Form &, const QString &label)> add;
-    std::function<QWidget *(const Form &)> field;
-    std::function<void(Form &, const VelUIDesktopEntry &)> load;
-    std::function<void(const Form &, VelUIDesktopEntry *)> save;
-    std::function<void(Form &)> clear;
+    ShownFor shownFor() const;
+    virtual void setVisible(bool visible);
+
+    virtual void load(const VelUIDesktopEntry &entry) = 0;
+    virtual void save(VelUIDesktopEntry *entry) const = 0;
+    virtual void clear() = 0;
+
+private:
+    Q_DISABLE_COPY(PropsRow)
+    const ShownFor m_shownFor;
+    FormLayout *const m_layout;
+    const int m_number;
 };
 
 } // namespace VelUI

@@ -3,36 +3,93 @@
 
 #include <VelDesktopEntryPropsWidget.h>
 
+#include "ActionListEdit.h"
+#include "EntryTypeRules.h"
+#include "UrlRow.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
+#include "fields/IconEdit.h"
+#include "fields/PathEdit.h"
+#include "fields/StringListEdit.h"
 
+#include <QCheckBox>
+#include <QLineEdit>
+#include <QRadioButton>
 #include <QScrollArea>
+
+using namespace VelUI;
+
+namespace {
+
+// A line that shows a list is never written in.
+bool showsList(const QLineEdit *line)
+{
+    return qobject_cast<const StringListEdit *>(line->parentWidget())
+        || qobject_cast<const ActionListEdit *>(line->parentWidget());
+}
+
+template <typename Edit>
+void setAllReadOnly(const QWidget *content, bool readOnly)
+{
+    for (Edit *edit : content->findChildren<Edit *>())
+        edit->setReadOnly(readOnly);
+}
+
+template <typename Button>
+void setAllDisabled(const QWidget *content, bool disabled)
+{
+    for (Button *button : content->findChildren<Button *>())
+        button->setDisabled(disabled);
+}
+
+} // namespace
 
 VelDesktopEntryPropsWidget::VelDesktopEntryPropsWidget(QWidget *parent)
     : QWidget(parent)
-    , d(new VelDesktopEntryPropsWidgetPrivate(this))
+    , d(std::make_unique<VelDesktopEntryPropsWidgetPrivate>(this))
 {
+    setType(EntryTypeRules::Application, {});
 }
 
 VelDesktopEntryPropsWidget::~VelDesktopEntryPropsWidget() = default;
 
 void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList &allowedTypes)
 {
-    d->setType(type, allowedTypes);
+    if (d->typeChooser.setType(type, allowedTypes))
+        d->rows.showFor(type);
 }
 
 void VelDesktopEntryPropsWidget::loadFrom(const VelUIDesktopEntry &entry)
 {
-    d->loadFrom(entry);
+    setType(entry.getType(), d->typeChooser.allowedTypes());
+    if (entry.isValid())
+        d->rows.load(entry, d->typeChooser.type());
 }
 
 void VelDesktopEntryPropsWidget::saveTo(VelUIDesktopEntry *entry)
 {
-    d->saveTo(entry);
+    if (!entry)
+        return;
+    entry->setType(d->typeChooser.type());
+    d->rows.save(entry, d->typeChooser.type());
 }
 
 void VelDesktopEntryPropsWidget::setReadOnly(bool readOnly)
 {
-    d->setReadOnly(readOnly);
+    if (readOnly == d->readOnly)
+        return;
+    d->readOnly = readOnly;
+    d->typeChooser.setReadOnly(readOnly);
+    const QWidget *const content = d->scrollArea->widget();
+    for (QLineEdit *line : content->findChildren<QLineEdit *>()) {
+        if (!showsList(line))
+            line->setReadOnly(readOnly);
+    }
+    setAllReadOnly<IconEdit>(content, readOnly);
+    setAllReadOnly<PathEdit>(content, readOnly);
+    setAllReadOnly<StringListEdit>(content, readOnly);
+    setAllReadOnly<ActionListEdit>(content, readOnly);
+    setAllDisabled<QCheckBox>(content, readOnly);
+    setAllDisabled<QRadioButton>(content, readOnly);
 }
 
 void VelDesktopEntryPropsWidget::setFrameStyle(int style)
@@ -42,5 +99,5 @@ void VelDesktopEntryPropsWidget::setFrameStyle(int style)
 
 void VelDesktopEntryPropsWidget::setShowURLInfoButton(bool show)
 {
-    d->setShowURLInfoButton(show);
+    d->rows.urlRow()->setInfoButtonWanted(show);
 }

@@ -1,0 +1,70 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "PropsRow.h"
+
+#include <QCoreApplication>
+
+#include <memory>
+#include <vector>
+
+namespace VelUI {
+
+class StringListEdit;
+class UrlRow;
+
+/// The rows of the properties form below the one of the type, in their order.
+///
+/// The source has the table: a line for each key.
+class PropsTable
+{
+    Q_DECLARE_TR_FUNCTIONS(VelDesktopEntryPropsWidgetPrivate)
+
+public:
+    /// Appends the rows to \a layout.
+    explicit PropsTable(FormLayout *layout);
+    ~PropsTable();
+
+    /// Shows the rows for an entry of \a type; hides and empties the others.
+    void showFor(const QString &type);
+    /// Fills the rows that are shown for the type of \a entry.
+    void load(const VelUIDesktopEntry &entry, const QString &type);
+    void save(VelUIDesktopEntry *entry, const QString &type) const;
+
+    UrlRow *urlRow() const;
+
+private:
+    Q_DISABLE_COPY(PropsTable)
+
+    // The label of a row; a bold one marks a key that an entry must have.
+    struct Label
+    {
+        Label(const QString &labelText, bool bold = false)
+            : text(labelText)
+            , isBold(bold)
+        {
+        }
+        QString text;
+        bool isBold;
+    };
+
+    static Label required(const QString &text);
+    static void setCategoryTexts(StringListEdit *field);
+    static void setKeywordTexts(StringListEdit *field);
+    static void setMimeTypeTexts(StringListEdit *field);
+
+    void build();
+    void addUrl();
+    void addShowIn();
+    template <typename Field, typename Getter, typename Setter>
+    Field *add(const Label &label, PropsRow::ShownFor shownFor, const char *objectName, Getter getter,
+               Setter setter);
+
+    FormLayout *const m_layout;
+    std::vector<std::unique_ptr<PropsRow>> m_rows;
+    UrlRow *m_urlRow = nullptr;
+};
+
+} // namespace VelUI
