@@ -4,7 +4,7 @@
 #include "VelMenuDialog.h"
 
 #include "VelMenuView.h"
-#include "WmCommand.h"
+#include "MenuUpdateCommand.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
@@ -51,7 +51,7 @@ public:
     VelMenuView *view = nullptr;
     QDialogButtonBox *buttonBox = nullptr;
     bool anyItemSelectable = false;
-    int menuKind = WmCommand::NoKind;
+    int menuKind = MenuUpdateCommand::NoKind;
     QToolBar *toolBar = nullptr;
 
     VelMenuDialog *q;
@@ -134,7 +134,7 @@ VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bo
     , d(new VelMenuDialogPrivate(this))
 {
     const QString shownDir = dir.isEmpty() ? startMenuDir() : dir;
-    d->menuKind = WmCommand::kindOf(shownDir);
+    d->menuKind = MenuUpdateCommand::kindOf(shownDir);
 
     auto *layout = new QVBoxLayout(this);
     d->view = new VelMenuView(shownDir, iconSize, editable, this);
@@ -204,10 +204,10 @@ QString VelMenuDialog::selectedItemExec(const QString &filePath, const QString &
 
 bool VelMenuDialog::updateWM()
 {
-    const QByteArray command = WmCommand::forKind(d->menuKind);
+    const QByteArray command = MenuUpdateCommand::forKind(d->menuKind);
     if (command.isEmpty())
         return false;
-    if (WmCommand::send(command))
+    if (MenuUpdateCommand::send(command))
         return true;
     MessageBox::show(this, QMessageBox::Warning, tr("Warning"), tr("Can't send command to vel-wm"));
     return false;

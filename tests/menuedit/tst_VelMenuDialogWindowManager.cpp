@@ -6,7 +6,7 @@
 #include "VelMenuDialog.h"
 #include "WindowManager.h"
 
-#include <menuedit/WmCommand.h>
+#include <menuedit/MenuUpdateCommand.h>
 #include <velcore/dirs.h>
 
 #include <memory>
@@ -54,8 +54,8 @@ void tst_VelMenuDialogWindowManager::choosesTheCommandByTheDirectory()
     QString asked = path(QStringLiteral("config/")) + dir;
     if (dir == QLatin1String("desktop"))
         asked = QString::fromStdString(GetVelDir(VelDir::Desktop));
-    QCOMPARE(WmCommand::kindOf(asked), kind);
-    QCOMPARE(WmCommand::forKind(kind), command);
+    QCOMPARE(MenuUpdateCommand::kindOf(asked), kind);
+    QCOMPARE(MenuUpdateCommand::forKind(kind), command);
 }
 
 void tst_VelMenuDialogWindowManager::takesTheFirstKindThatADirectoryIs()
@@ -68,12 +68,12 @@ void tst_VelMenuDialogWindowManager::takesTheFirstKindThatADirectoryIs()
         file.write("XDG_DESKTOP_DIR=\"" + QFile::encodeName(dir) + "\"\n");
     };
     desktopAt(startMenu());
-    QCOMPARE(WmCommand::kindOf(startMenu()), 4);
+    QCOMPARE(MenuUpdateCommand::kindOf(startMenu()), 4);
     const QString toolBar = path(QStringLiteral("config/toolbar"));
     desktopAt(toolBar);
-    QCOMPARE(WmCommand::kindOf(toolBar), 6);
+    QCOMPARE(MenuUpdateCommand::kindOf(toolBar), 6);
     QVERIFY(QFile::remove(config + QLatin1String("/user-dirs.dirs")));
-    QCOMPARE(WmCommand::kindOf(toolBar), 17);
+    QCOMPARE(MenuUpdateCommand::kindOf(toolBar), 17);
 }
 
 void tst_VelMenuDialogWindowManager::tellsTheWindowManagerWhenItGoes_data()

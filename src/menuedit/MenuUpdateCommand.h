@@ -9,7 +9,7 @@
 /**
  * The commands that tell the window manager which of its menus was edited.
  */
-namespace WmCommand {
+namespace MenuUpdateCommand {
 
 /// The kind of a directory that is no standard one.
 constexpr int NoKind = -1;
@@ -23,4 +23,4 @@ QByteArray forKind(int kind);
 /// Sends a command over the application's display; whether the window manager has got it.
 bool send(const QByteArray &command);
 
-} // namespace WmCommand
+} // namespace MenuUpdateCommand

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "WmCommand.h"
+#include "MenuUpdateCommand.h"
 
 #include <velcore/dirs.h>
 
@@ -12,20 +12,20 @@
 
 namespace {
 
-constexpr VelDir kinds[] = {VelDir::StartMenu, VelDir::Desktop, VelDir::ToolBar};
+constexpr VelDir Kinds[] = {VelDir::StartMenu, VelDir::Desktop, VelDir::ToolBar};
 
 } // namespace
 
-int WmCommand::kindOf(const QString &dir)
+int MenuUpdateCommand::kindOf(const QString &dir)
 {
-    for (const VelDir kind : kinds) {
+    for (const VelDir kind : Kinds) {
         if (dir == QString::fromStdString(GetVelDir(kind)))
             return static_cast<int>(kind);
     }
     return NoKind;
 }
 
-QByteArray WmCommand::forKind(int kind)
+QByteArray MenuUpdateCommand::forKind(int kind)
 {
     switch (kind) {
     case static_cast<int>(VelDir::StartMenu):
@@ -39,7 +39,7 @@ QByteArray WmCommand::forKind(int kind)
     }
 }
 
-bool WmCommand::send(const QByteArray &command)
+bool MenuUpdateCommand::send(const QByteArray &command)
 {
     return SendCommandToWM(QX11Info::display(), command.constData());
 }
