@@ -32,7 +32,7 @@ class VelUIDesktopEntry;
 class VELUIEXTRA_EXPORT VelMimeTypeIconProvider : public QFileIconProvider
 {
 public:
-    /// Reads the built-in pictures of a folder and a file from the desktop's standard directory;
+    /// Reads the built-in pixmaps of a folder and a file from the desktop's standard directory;
     /// where they are missing, the icons that fall back on them are null.
     VelMimeTypeIconProvider();
     ~VelMimeTypeIconProvider() override;
@@ -49,7 +49,7 @@ public:
      * The icon of a file or folder.
      *
      * @param info tells the path and its kind, as far as it has remembered them
-     * @return the icon; null when neither the theme nor the built-in pictures have one
+     * @return the icon; null when neither the theme nor the built-in pixmaps have one
      */
     QIcon icon(const QFileInfo &info) const override;
 
@@ -62,7 +62,7 @@ public:
     QString type(const QFileInfo &info) const override;
 
 protected:
-    /// The names of the emblems to lay on an icon.
+    /// The names of the emblems to overlay an icon with.
     using Emblems = QMap<Qt::Corner, QString>;
 
     /**
@@ -70,7 +70,7 @@ protected:
      * than its icon and would read it twice.
      *
      * @param entry the record of a file whose name ends in ".desktop"
-     * @param emblems laid on every icon but that of a separator
+     * @param emblems overlaid on every icon but that of a separator
      * @return the same as icon() for that file
      */
     QIcon desktopEntryIcon(const VelUIDesktopEntry &entry, const Emblems &emblems) const;

@@ -7,30 +7,30 @@
 
 namespace {
 
-constexpr quint32 literalListPosition = 12;
-constexpr quint32 suffixTreePosition = 16;
-constexpr quint32 globListPosition = 20;
-constexpr quint32 entrySize = 12;
-constexpr int longestEnd = 256;
+constexpr quint32 LiteralListPosition = 12;
+constexpr quint32 SuffixTreePosition = 16;
+constexpr quint32 GlobListPosition = 20;
+constexpr quint32 EntrySize = 12;
+constexpr int LongestSuffix = 256;
 
 } // namespace
 
 MimeCacheReader::MimeCacheReader(const QByteArray &cache)
     : m_cache(cache)
-    , m_nodesLeft(cache.size() / int(entrySize))
+    , m_nodesLeft(cache.size() / int(EntrySize))
 {
 }
 
 bool MimeCacheReader::visitPatterns(const Visitor &visit)
 {
-    if (m_cache.size() < int(globListPosition) + 4)
+    if (m_cache.size() < int(GlobListPosition) + 4)
         return false;
     const quint32 version = number(0);
     if (version != 0x10001 && version != 0x10002)
         return false;
-    visitList(number(literalListPosition), visit);
-    visitList(number(globListPosition), visit);
-    const quint32 tree = number(suffixTreePosition);
+    visitList(number(LiteralListPosition), visit);
+    visitList(number(GlobListPosition), visit);
+    const quint32 tree = number(SuffixTreePosition);
     visitTree(number(tree), number(tree + 4), QString(), visit);
     return m_valid;
 }
@@ -59,7 +59,7 @@ void MimeCacheReader::visitList(quint32 offset, const Visitor &visit)
 {
     const quint32 count = number(offset);
     for (quint32 i = 0; i < count && m_valid; ++i) {
-        const quint32 entry = offset + 4 + entrySize * i;
+        const quint32 entry = offset + 4 + EntrySize * i;
         const QString pattern = text(number(entry));
         number(entry + 8); // has to be there
         if (m_valid)
@@ -67,18 +67,18 @@ void MimeCacheReader::visitList(quint32 offset, const Visitor &visit)
     }
 }
 
-void MimeCacheReader::visitTree(quint32 count, quint32 offset, const QString &end, const Visitor &visit)
+void MimeCacheReader::visitTree(quint32 count, quint32 offset, const QString &suffix, const Visitor &visit)
 {
     for (quint32 i = 0; i < count && m_valid; ++i) {
-        const quint32 entry = offset + entrySize * i;
+        const quint32 entry = offset + EntrySize * i;
         const quint32 character = number(entry);
         const quint32 last = number(entry + 8);
-        if (--m_nodesLeft < 0 || character > 0xffff || end.size() > longestEnd) {
+        if (--m_nodesLeft < 0 || character > 0xffff || suffix.size() > LongestSuffix) {
             m_valid = false;
         } else if (character == 0) {
-            visit(QLatin1Char('*') + end);
+            visit(QLatin1Char('*') + suffix);
         } else {
-            visitTree(number(entry + 4), last, QChar(ushort(character)) + end, visit);
+            visitTree(number(entry + 4), last, QChar(ushort(character)) + suffix, visit);
         }
     }
 }

@@ -19,14 +19,14 @@ public:
 
     explicit MimeCacheReader(const QByteArray &cache);
 
-    /// Calls \a visit with every pattern; false when the file is broken or of another version.
+    /// Calls \a visit with every pattern; false when the file is malformed or of another version.
     bool visitPatterns(const Visitor &visit);
 
 private:
     quint32 number(quint32 offset);
     QString text(quint32 offset);
     void visitList(quint32 offset, const Visitor &visit);
-    void visitTree(quint32 count, quint32 offset, const QString &end, const Visitor &visit);
+    void visitTree(quint32 count, quint32 offset, const QString &suffix, const Visitor &visit);
 
     const QByteArray m_cache;
     int m_nodesLeft; // no sane file has more; ends a tree that bites its own tail

@@ -59,9 +59,9 @@ bool MimePatterns::addCache(const QByteArray &cache)
 void MimePatterns::addPattern(const QString &pattern)
 {
     const QString lower = pattern.toLower();
-    const QString end = lower.mid(1);
-    if (lower.startsWith(QLatin1Char('*')) && !end.isEmpty() && !hasWildcard(end))
-        addEnd(end);
+    const QString suffix = lower.mid(1);
+    if (lower.startsWith(QLatin1Char('*')) && !suffix.isEmpty() && !hasWildcard(suffix))
+        addSuffix(suffix);
     else if (!hasWildcard(lower))
         m_literals.insert(lower);
     else {
@@ -97,22 +97,22 @@ bool MimePatterns::hasTraitOfOther(const QString &name) const
                        [&name](const Trait &trait) { return trait.isOf(name); });
 }
 
-void MimePatterns::addEnd(const QString &end)
+void MimePatterns::addSuffix(const QString &suffix)
 {
     int node = 0;
-    for (int i = end.size() - 1; i >= 0; --i) {
-        int child = childOf(node, end.at(i));
+    for (int i = suffix.size() - 1; i >= 0; --i) {
+        int child = childOf(node, suffix.at(i));
         if (child < 0) {
             child = m_nodes.size();
             Node added;
-            added.character = end.at(i);
+            added.character = suffix.at(i);
             added.nextSibling = m_nodes.at(node).firstChild;
             m_nodes.append(added);
             m_nodes[node].firstChild = child;
         }
         node = child;
     }
-    m_nodes[node].isEnd = true;
+    m_nodes[node].isSuffix = true;
 }
 
 int MimePatterns::childOf(int node, QChar character) const
@@ -145,10 +145,10 @@ bool MimePatterns::mayMatchOtherPattern(const QString &name) const
     return !match.isValid() || match.hasMatch(); // a name that is no valid UTF-16 cannot be told
 }
 
-int MimePatterns::decidingEnd(const QString &name) const
+int MimePatterns::decidingSuffix(const QString &name) const
 {
     const QString lower = name.toLower();
-    // A character whose small form is longer than itself: the ends could not be compared.
+    // A character whose small form is longer than itself: the suffixes could not be compared.
     if (lower.size() != name.size())
         return 0;
     int length = 0;
@@ -157,7 +157,7 @@ int MimePatterns::decidingEnd(const QString &name) const
         node = childOf(node, lower.at(i));
         if (node < 0)
             break;
-        if (m_nodes.at(node).isEnd)
+        if (m_nodes.at(node).isSuffix)
             length = lower.size() - i;
     }
     if (length == 0 || length == name.size() || m_literals.contains(lower))

@@ -14,8 +14,8 @@
  * The file name patterns of the MIME database, as far as needed to tell which names the
  * database cannot tell apart.
  *
- * Nearly all patterns are a "*" and the end of a name. Two names that no other pattern may
- * match, and that share the longest of these ends, match the same patterns; so the database
+ * Nearly all patterns are a "*" and the suffix of a name. Two names that no other pattern may
+ * match, and that share the longest of these suffixes, match the same patterns; so the database
  * takes them for the same type as long as it does not look at the contents.
  */
 class MimePatterns
@@ -28,16 +28,16 @@ public:
      */
     bool addCache(const QByteArray &cache);
 
-    /// To be called when all caches were added, before decidingEnd().
+    /// To be called when all caches were added, before decidingSuffix().
     void finish();
 
     /**
-     * The length of the end of \a name that decides which patterns match it.
+     * The length of the suffix of \a name that decides which patterns match it.
      *
      * @return at least 1, less than the length of \a name; 0 when no pattern matches, or one
      *         that is not of the plain kind may match
      */
-    int decidingEnd(const QString &name) const;
+    int decidingSuffix(const QString &name) const;
 
 private:
     struct Node
@@ -45,7 +45,7 @@ private:
         QChar character;
         int firstChild = -1;
         int nextSibling = -1;
-        bool isEnd = false; // a pattern begins here
+        bool isSuffix = false; // a pattern begins here
     };
 
     // What every name has that a pattern of another kind matches, and that is cheap to look for:
@@ -63,11 +63,11 @@ private:
     void addPattern(const QString &pattern);
     static Trait traitOf(const QString &pattern);
     bool hasTraitOfOther(const QString &name) const;
-    void addEnd(const QString &end);
+    void addSuffix(const QString &suffix);
     int childOf(int node, QChar character) const;
     bool mayMatchOtherPattern(const QString &name) const;
 
-    QVector<Node> m_nodes{Node()}; // the ends, read backwards, in lower case
+    QVector<Node> m_nodes{Node()}; // the suffixes, read backwards, in lower case
     QSet<QString> m_literals; // in lower case
     QStringList m_otherPatterns;
     QVector<Trait> m_otherTraits; // in lower case

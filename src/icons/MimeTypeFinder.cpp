@@ -13,7 +13,7 @@
 
 namespace {
 
-constexpr qint64 longestMemory = 1000; // milliseconds
+constexpr qint64 LongestMemory = 1000; // milliseconds
 
 /// Stands for the contents of a file and tells whether anyone wanted to see them.
 class WatchedContents : public QIODevice
@@ -100,11 +100,11 @@ QMimeType MimeTypeFinder::typeOfRegularFile(const QFileInfo &info)
 
 QMimeType MimeTypeFinder::typeByName(const QString &name)
 {
-    const int length = m_patterns->decidingEnd(name);
+    const int length = m_patterns->decidingSuffix(name);
     if (length == 0)
         return QMimeType();
-    const QString end = name.right(length);
-    const auto known = m_types.constFind(end);
+    const QString suffix = name.right(length);
+    const auto known = m_types.constFind(suffix);
     if (known != m_types.constEnd())
         return *known;
 
@@ -112,13 +112,13 @@ QMimeType MimeTypeFinder::typeByName(const QString &name)
     QMimeType type = QMimeDatabase().mimeTypeForFileNameAndData(name, &contents);
     if (contents.wereAskedFor())
         type = QMimeType();
-    m_types.insert(end, type);
+    m_types.insert(suffix, type);
     return type;
 }
 
 void MimeTypeFinder::refresh()
 {
-    if (m_age.isValid() && m_age.elapsed() < longestMemory)
+    if (m_age.isValid() && m_age.elapsed() < LongestMemory)
         return;
     m_age.start();
     m_types.clear();

@@ -44,6 +44,6 @@ private:
     QElapsedTimer m_age;
     QString m_stamp; // of the files that the patterns came from
     std::unique_ptr<MimePatterns> m_patterns; // null when there is no short way
-    QHash<QString, QMimeType> m_types; // by the end of the name; invalid where the contents count
+    QHash<QString, QMimeType> m_types; // by the suffix of the name; invalid where the contents count
     QMimeType m_directoryType;
 };

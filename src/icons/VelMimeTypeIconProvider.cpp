@@ -25,7 +25,7 @@ QIcon builtInIcon(const QStringList &names)
     const QString directory = QString::fromStdString(GetVelDir(VelDir::Pictures));
     QIcon icon;
     for (const QString &name : names) {
-        // A missing file would make an icon that is not null and has no picture.
+        // A missing file would make an icon that is not null and has no pixmap.
         if (QFile::exists(directory + name))
             icon.addFile(directory + name);
     }
@@ -33,21 +33,21 @@ QIcon builtInIcon(const QStringList &names)
 }
 
 /// A rule across the middle, two pixels high.
-QPixmap separatorPicture(int size)
+QPixmap separatorPixmap(int size)
 {
-    QPixmap picture(size, size);
-    picture.fill(Qt::transparent);
-    QPainter painter(&picture);
+    QPixmap pixmap(size, size);
+    pixmap.fill(Qt::transparent);
+    QPainter painter(&pixmap);
     painter.drawLine(0, size / 2 - 1, size, size / 2 - 1);
     painter.drawLine(0, size / 2, size, size / 2);
-    return picture;
+    return pixmap;
 }
 
 QIcon drawnSeparator()
 {
     QIcon icon;
     for (const int size : {16, 22, 32, 48, 64, 128})
-        icon.addPixmap(separatorPicture(size));
+        icon.addPixmap(separatorPixmap(size));
     return icon;
 }
 

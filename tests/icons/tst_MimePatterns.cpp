@@ -144,7 +144,7 @@ void tst_MimePatterns::survivesBrokenNumbers()
                 continue;
             }
             patterns.finish();
-            const int end = patterns.decidingEnd(name);
+            const int end = patterns.decidingSuffix(name);
             QVERIFY2(end >= 0 && end < name.size(), qPrintable(QString::number(offset)));
         }
     }
@@ -213,7 +213,7 @@ void tst_MimePatterns::findsTheEndThatDecides()
     MimePatterns patterns;
     QVERIFY(patterns.addCache(sampleCache()));
     patterns.finish();
-    QTEST(patterns.decidingEnd(name), "length");
+    QTEST(patterns.decidingSuffix(name), "length");
 }
 
 void tst_MimePatterns::takesTheLongestEnd()
@@ -227,9 +227,9 @@ void tst_MimePatterns::takesTheLongestEnd()
     QVERIFY(patterns.addCache(gz.bytes()));
     QVERIFY(patterns.addCache(tarGz.bytes()));
     patterns.finish();
-    QCOMPARE(patterns.decidingEnd(QStringLiteral("a.tar.gz")), 7);
-    QCOMPARE(patterns.decidingEnd(QStringLiteral("a.ar.gz")), 3);
-    QCOMPARE(patterns.decidingEnd(QStringLiteral("a.tar.GZ")), 7);
+    QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.tar.gz")), 7);
+    QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.ar.gz")), 3);
+    QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.tar.GZ")), 7);
 }
 
 void tst_MimePatterns::joinsSeveralCaches()
@@ -241,9 +241,9 @@ void tst_MimePatterns::joinsSeveralCaches()
     QVERIFY(patterns.addCache(sampleCache()));
     QVERIFY(patterns.addCache(more.bytes()));
     patterns.finish();
-    QCOMPARE(patterns.decidingEnd(QStringLiteral("a.foo")), 4);
-    QCOMPARE(patterns.decidingEnd(QStringLiteral("a.desktop")), 8);
-    QCOMPARE(patterns.decidingEnd(QStringLiteral("x-a.desktop")), 0);
+    QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.foo")), 4);
+    QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.desktop")), 8);
+    QCOMPARE(patterns.decidingSuffix(QStringLiteral("x-a.desktop")), 0);
 }
 
 VEL_TEST_GUILESS_MAIN(tst_MimePatterns)
