@@ -4,7 +4,9 @@
 #include "MenuTree.h"
 
 #include <frame/DesktopEntryRecord.h>
-#include <menuedit/EntryName.h>
+#include <frame/EntryPath.h>
+#include <menuedit/EntryDisplay.h>
+#include <menuedit/ItemOrder.h>
 #include <menuedit/SortOrder.h>
 
 #include <QDateTime>
@@ -12,40 +14,40 @@
 #include <QFileInfo>
 #include <QSet>
 
-#include <algorithm>
 #include <optional>
 
 namespace {
 
-struct Child
+/// A child of a folder with what decides its place.
+class Child
 {
-    MenuItem item;
-    QDateTime modified;
-    SortOrder::Mention mention;
+public:
+    Child() = default;
+    Child(const MenuItem &item, const QFileInfo &info, const SortOrder::Mention &mention)
+        : m_item(item)
+        , m_fileName(info.fileName())
+        , m_modified(info.lastModified().toMSecsSinceEpoch())
+        , m_mention(mention)
+    {
+    }
+
+    const MenuItem &item() const { return m_item; }
+
+    const QString &fileName() const { return m_fileName; }
+    const QString &name() const { return m_item.name; }
+    bool isFolder() const { return m_item.kind == MenuItem::Folder; }
+    qint64 modified() const { return m_modified; }
+    SortOrder::Places placesAgainst(const Child &other) const
+    {
+        return SortOrder::places(m_mention, other.m_mention);
+    }
+
+private:
+    MenuItem m_item;
+    QString m_fileName;
+    qint64 m_modified = 0;
+    SortOrder::Mention m_mention;
 };
-
-bool isHidden(const VelUIDesktopEntry &record)
-{
-    VelUIDesktopEntry::DisplayableError error = 0;
-    return !record.isDisplayable(&error) && (error == 1 || error == 3);
-}
-
-// The order in which two children of one folder are shown.
-bool isBefore(const Child &left, const Child &right)
-{
-    const SortOrder::Places places = SortOrder::places(left.mention, right.mention);
-    if (places.left != places.right)
-        return places.left < places.right;
-    const bool leftIsFolder = left.item.kind == MenuItem::Folder;
-    if (leftIsFolder != (right.item.kind == MenuItem::Folder))
-        return leftIsFolder;
-    return QString::localeAwareCompare(left.item.name, right.item.name) < 0;
-}
-
-bool isLater(const Child &left, const Child &right)
-{
-    return left.modified > right.modified;
-}
 
 MenuItem plainFile(const QFileInfo &info)
 {
@@ -59,7 +61,7 @@ MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
 {
     MenuItem item;
     item.path = info.absoluteFilePath();
-    item.name = EntryName::of(record);
+    item.name = EntryDisplay::shownName(record);
     item.icon = record.getIcon();
     item.exec = record.getExec();
     item.kind = item.exec == QLatin1String("VELWM_SEPARATOR") ? MenuItem::Separator : MenuItem::Entry;
@@ -76,10 +78,10 @@ std::optional<MenuItem> itemOf(const QFileInfo &info, QSet<QString> *above)
             return {};
         return readFolder(info, above);
     }
-    if (!info.fileName().endsWith(QLatin1String(".desktop")))
+    if (!EntryPath::isEntry(info.fileName()))
         return plainFile(info);
     const VelUIDesktopEntry record(info.absoluteFilePath());
-    if (isHidden(record))
+    if (EntryDisplay::isHidden(record))
         return {};
     return entry(info, record);
 }
@@ -90,7 +92,7 @@ QVector<Child> childrenOf(const QString &path, const SortOrder::Index &order, QS
     for (const QFileInfo &info : QDir(path).entryInfoList(QDir::AllEntries | QDir::NoDotAndDotDot)) {
         const std::optional<MenuItem> item = itemOf(info, above);
         if (item)
-            children.append({*item, info.lastModified(), order.mention(info.fileName())});
+            children.append({*item, info, order.mention(info.fileName())});
     }
     return children;
 }
@@ -102,10 +104,10 @@ MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above)
     item.path = folder.absoluteFilePath();
     item.name = folder.fileName();
     QStringList sortOrder;
-    const QString own = item.path + QStringLiteral("/.directory");
+    const QString own = EntryPath::recordFileOf(item.path);
     if (QFileInfo::exists(own)) {
         const VelUIDesktopEntry record(own);
-        item.name = EntryName::of(record);
+        item.name = EntryDisplay::shownName(record);
         item.icon = record.getIcon();
         sortOrder = record.getSortOrder();
     }
@@ -115,10 +117,9 @@ MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above)
     QVector<Child> children = childrenOf(item.path, SortOrder::Index(sortOrder), above);
     above->remove(canonical);
 
-    const bool byTime = folder.fileName() == QLatin1String("recents");
-    std::stable_sort(children.begin(), children.end(), byTime ? isLater : isBefore);
+    ItemOrder::sort(ItemOrder::ruleOf(folder.fileName()), children);
     for (const Child &child : qAsConst(children))
-        item.children.append(child.item);
+        item.children.append(child.item());
     return item;
 }
 

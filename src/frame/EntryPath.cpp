@@ -15,6 +15,11 @@ bool EntryPath::isEntry(const QString &path)
     return path.endsWith(EntrySuffix);
 }
 
+QString EntryPath::entryNamed(const QString &stem)
+{
+    return stem + EntrySuffix;
+}
+
 bool EntryPath::isRecordFile(const QString &path)
 {
     return path.endsWith(RecordFileSuffix);

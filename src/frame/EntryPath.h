@@ -16,6 +16,9 @@ namespace EntryPath {
 /// Whether \a path is that of an entry: its name ends in ".desktop".
 bool isEntry(const QString &path);
 
+/// The file name of an entry that is called \a stem.
+QString entryNamed(const QString &stem);
+
 /// Whether \a path is that of the record file of a folder.
 bool isRecordFile(const QString &path);
 

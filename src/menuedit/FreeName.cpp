@@ -5,6 +5,8 @@
 
 #include "OnDisk.h"
 
+#include <frame/EntryPath.h>
+
 namespace FreeName {
 
 Name first(Kind kind, const std::function<bool(const QString &)> &taken)
@@ -13,7 +15,7 @@ Name first(Kind kind, const std::function<bool(const QString &)> &taken)
         const QString number = n == 0 ? QString() : QString::number(n);
         const QString fileName = kind == Kind::Folder
             ? QLatin1String("group") + number
-            : QLatin1String("shortcut") + number + QLatin1String(".desktop");
+            : EntryPath::entryNamed(QLatin1String("shortcut") + number);
         if (!taken(fileName))
             return {fileName, number};
     }

@@ -3,8 +3,8 @@
 
 #include "VelMenuDialog.h"
 
-#include "VelMenuView.h"
 #include "MenuUpdateCommand.h"
+#include "VelMenuView.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>

@@ -3,11 +3,12 @@
 
 #include "VelMenuModel.h"
 
-#include "EntryName.h"
+#include "EntryDisplay.h"
 #include "FolderWatch.h"
 #include "VelMimeTypeIconProvider.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
 
 #include <QCoreApplication>
 #include <QDir>
@@ -21,9 +22,6 @@
 #include <sys/stat.h>
 
 namespace {
-
-const QLatin1String DirectorySuffix("/.directory");
-const QLatin1String EntrySuffix(".desktop");
 
 // The filter that the base class begins with.
 const QDir::Filters DefaultFilter = QDir::AllEntries | QDir::NoDotAndDotDot | QDir::AllDirs;
@@ -93,7 +91,7 @@ public:
     using VelMimeTypeIconProvider::icon;
     QIcon icon(const QFileInfo &info) const override
     {
-        if (!m_model || !info.fileName().endsWith(EntrySuffix) || info.isSymLink() || !info.isFile())
+        if (!m_model || !EntryPath::isEntry(info.fileName()) || info.isSymLink() || !info.isFile())
             return VelMimeTypeIconProvider::icon(info);
         const QString path = info.filePath();
         const FileStamp stamp(path);
@@ -250,10 +248,9 @@ void VelMenuModel::setItemName(const QString &path, const QString &name)
 
 bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 {
-    QString file = path;
-    if (isFolder && QFileInfo::exists(path + DirectorySuffix))
-        file += DirectorySuffix;
-    if (!file.endsWith(EntrySuffix) && !file.endsWith(DirectorySuffix))
+    const QString recordFile = EntryPath::recordFileOf(path);
+    const QString file = isFolder && QFileInfo::exists(recordFile) ? recordFile : path;
+    if (!EntryPath::isEntry(file) && !EntryPath::isRecordFile(file))
         return false;
 
     const auto known = m_readAlong.find(file);
@@ -273,12 +270,7 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 
 VelMenuModel::ItemInfo VelMenuModel::itemInfo(const VelUIDesktopEntry &entry, const QString &file)
 {
-    ItemInfo info{EntryName::of(entry), false};
-    // Codes 1 and 3 hide; an entry that is left out of menus for another reason can be edited.
-    VelUIDesktopEntry::DisplayableError reason = 0;
-    if (file.endsWith(EntrySuffix) && !entry.isDisplayable(&reason))
-        info.isHidden = (reason & ~2) == 1;
-    return info;
+    return {EntryDisplay::shownName(entry), EntryPath::isEntry(file) && EntryDisplay::isHidden(entry)};
 }
 
 // Keeps what an entry says beside its icon, no longer than until the event loop turns.
@@ -329,7 +321,7 @@ bool VelMenuModel::isHidden(const QModelIndex &index) const
 // index would make one.
 void VelMenuModel::refreshRow(const QString &path)
 {
-    const QString rowPath = path.endsWith(DirectorySuffix) ? QFileInfo(path).absolutePath() : path;
+    const QString rowPath = EntryPath::describedBy(path);
     const QFileInfo info(rowPath);
     if (info.fileName().startsWith(QLatin1Char('.')) || !info.exists()) {
         m_editedRows.remove(rowPath);

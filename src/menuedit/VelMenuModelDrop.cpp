@@ -8,6 +8,7 @@
 #include "VelMenuModel.h"
 #include "VelMenuView.h"
 
+#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 
 #include <QDir>
@@ -181,7 +182,7 @@ bool VelMenuModel::carryOut(const Drop &drop)
         tellAtItem(drop.target, failureText(possible, drop.action));
         return false;
     }
-    const FileSnapshot directoryFile(QDir(drop.targetDir).filePath(QStringLiteral(".directory")));
+    const FileSnapshot directoryFile(EntryPath::recordFileOf(drop.targetDir));
     if (drop.row != -1 && !fixSortOrder(drop))
         return false;
     if (!(drop.action == Qt::LinkAction ? link(drop) : transfer(drop))) {

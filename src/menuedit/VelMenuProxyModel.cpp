@@ -6,6 +6,7 @@
 #include "VelMenuModel.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
 
 #include <QDateTime>
 #include <QFileInfo>
@@ -23,7 +24,7 @@ struct VelMenuProxyModel::Folder
 {
     QString path;
     bool isInMenu; ///< and so are all its children
-    bool isRecents;
+    ItemOrder::Rule rule;
     std::optional<SortOrder::Index> order;
 };
 
@@ -37,6 +38,40 @@ struct VelMenuProxyModel::Row
     std::optional<qint64> modified;
     std::optional<SortOrder::Mention> mention;
     std::optional<QString> displayName;
+};
+
+/// A row as the order of items asks about it.
+class VelMenuProxyModel::Item
+{
+public:
+    Item(const VelMenuProxyModel &proxy, Row &row, const QModelIndex &index)
+        : m_proxy(proxy)
+        , m_row(row)
+        , m_index(index)
+    {
+    }
+
+    qint64 modified() const { return m_proxy.modifiedOf(m_row, m_index); }
+    bool isFolder() const { return m_row.isFolder; }
+    const QString &name() const { return m_proxy.displayNameOf(m_row, m_index); }
+
+    SortOrder::Places placesAgainst(const Item &other) const
+    {
+        Folder &folder = *m_row.folder;
+        if (!folder.order)
+            m_proxy.readOrder(folder);
+        if (folder.order->isEmpty())
+            return {};
+        // A sort compares siblings only; for others the list of the left one's folder counts.
+        return other.m_row.folder == &folder
+            ? SortOrder::places(m_proxy.mentionOf(m_row), m_proxy.mentionOf(other.m_row))
+            : SortOrder::places(m_proxy.mentionOf(m_row), folder.order->mention(other.m_row.fileName));
+    }
+
+private:
+    const VelMenuProxyModel &m_proxy;
+    Row &m_row;
+    const QModelIndex &m_index;
 };
 
 VelMenuProxyModel::VelMenuProxyModel(QObject *parent)
@@ -106,32 +141,11 @@ bool VelMenuProxyModel::lessThan(const QModelIndex &left, const QModelIndex &rig
     Row &rightRow = rowOf(right);
     if (!leftRow.isInMenu)
         return false;
-    if (leftRow.folder->isRecents) {
-        const qint64 leftTime = modifiedOf(leftRow, left);
-        const qint64 rightTime = modifiedOf(rightRow, right);
-        if (leftTime == rightTime)
-            needFileOrder();
-        return leftTime < rightTime;
-    }
-
-    Folder &folder = *leftRow.folder;
-    if (!folder.order)
-        readOrder(folder);
-    if (!folder.order->isEmpty()) {
-        // A sort compares siblings only; for others the list of the left one's folder counts.
-        const SortOrder::Places places = rightRow.folder == &folder
-            ? SortOrder::places(mentionOf(leftRow), mentionOf(rightRow))
-            : SortOrder::places(mentionOf(leftRow), folder.order->mention(rightRow.fileName));
-        if (places.left != places.right)
-            return places.right < places.left;
-    }
-    if (leftRow.isFolder != rightRow.isFolder)
-        return rightRow.isFolder;
-    const int order =
-        QString::localeAwareCompare(displayNameOf(leftRow, left), displayNameOf(rightRow, right));
-    if (order == 0)
+    const ItemOrder::Rule rule = leftRow.folder->rule;
+    const int comparison = ItemOrder::compare(rule, Item(*this, leftRow, left), Item(*this, rightRow, right));
+    if (comparison == 0)
         needFileOrder();
-    return order >= 0;
+    return ItemOrder::isBelow(rule, comparison);
 }
 
 // As long as no two rows of a folder are equal, it does not matter in which order they come.
@@ -141,7 +155,7 @@ void VelMenuProxyModel::beginOrdering() const
     m_files->setKeepsOrder(m_needsFileOrder);
 }
 
-// Equal rows stand in the order of the files or, where they are equal by name, in its reverse.
+// The order of equal rows begins with that of the files.
 void VelMenuProxyModel::needFileOrder() const
 {
     if (m_needsFileOrder)
@@ -184,7 +198,7 @@ VelMenuProxyModel::Folder &VelMenuProxyModel::folderOf(const QModelIndex &index)
         return known->second;
     const QString path = m_files->filePath(parent);
     Folder folder{path, path.startsWith(m_menuDirectory),
-                  parent.data(QFileSystemModel::FileNameRole) == QLatin1String("recents"), std::nullopt};
+                  ItemOrder::ruleOf(parent.data(QFileSystemModel::FileNameRole).toString()), std::nullopt};
     return m_folders.emplace(parent.internalId(), std::move(folder)).first->second;
 }
 
@@ -194,7 +208,7 @@ QStringList VelMenuProxyModel::sortOrderOf(const QString &folderPath) const
     if (known != sortOrders.constEnd())
         return *known;
     QStringList list;
-    const QString file = folderPath + QLatin1String("/.directory");
+    const QString file = EntryPath::recordFileOf(folderPath);
     if (QFileInfo::exists(file))
         list = VelUIDesktopEntry(file).getSortOrder();
     sortOrders.insert(folderPath, list);

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "ItemOrder.h"
 #include "SortOrder.h"
 
 #include <QHash>
@@ -45,6 +46,7 @@ public:
 private:
     struct Folder;
     struct Row;
+    class Item;
 
     void watch(QAbstractItemModel *model);
     void dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight);

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "EntryName.h"
+#include "EntryDisplay.h"
 #include "FreeName.h"
 #include "OnDisk.h"
 #include "SortOrder.h"
@@ -12,6 +12,7 @@
 #include "VelMenuViewPrivate.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
 
@@ -21,21 +22,12 @@
 
 #include <algorithm>
 
-namespace {
-
-QString recordFileOf(const QString &folder)
-{
-    return folder + QLatin1String("/.directory");
-}
-
-} // namespace
-
 bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelIndex &folder)
 {
     const QString path = folder.isValid() ? d->model->filePath(folder) : QString();
     if (path.isEmpty())
         return false;
-    VelUIDesktopEntry record(recordFileOf(path));
+    VelUIDesktopEntry record(EntryPath::recordFileOf(path));
     if (!record.load()) {
         record.setType(QStringLiteral("Directory"));
         record.setName(QStringLiteral("Group"));
@@ -137,7 +129,7 @@ bool VelMenuViewPrivate::writeNew(const QString &path, bool folder, const QStrin
 {
     if (folder)
         QDir().mkpath(path);
-    const QString recordPath = folder ? recordFileOf(path) : path;
+    const QString recordPath = folder ? EntryPath::recordFileOf(path) : path;
     VelUIDesktopEntry record(recordPath);
     record.setType(folder ? QStringLiteral("Directory") : QStringLiteral("Application"));
     record.setName((folder ? QStringLiteral("Group") : QStringLiteral("Shortcut")) + number);
@@ -145,7 +137,7 @@ bool VelMenuViewPrivate::writeNew(const QString &path, bool folder, const QStrin
     record.setIcon(folder ? QStringLiteral("folder") : QStringLiteral("application-x-executable"));
     if (!record.save())
         return false;
-    model->setItemName(recordPath, EntryName::of(record));
+    model->setItemName(recordPath, EntryDisplay::shownName(record));
     return true;
 }
 
@@ -157,7 +149,7 @@ bool VelMenuViewPrivate::offerNew(const QString &path, bool folder)
     if (edit(path))
         return true;
     if (folder) {
-        QFile::remove(recordFileOf(path));
+        QFile::remove(EntryPath::recordFileOf(path));
         QDir().rmdir(path);
     } else {
         QFile::remove(path);
@@ -179,8 +171,8 @@ bool VelMenuViewPrivate::edit(const QString &item)
     if (item.isEmpty())
         return false;
     const bool isFolder = QFileInfo(item).isDir();
-    const QString path = isFolder ? recordFileOf(item) : item;
-    if (!isFolder && !path.endsWith(QLatin1String(".desktop"))) {
+    const QString path = isFolder ? EntryPath::recordFileOf(item) : item;
+    if (!isFolder && !EntryPath::isEntry(path)) {
         MessageBox::show(q, QMessageBox::Warning, VelMenuView::tr("Warning"),
                          VelMenuView::tr("Can't edit non desktop file"));
         return false;

@@ -72,7 +72,9 @@ struct RuleHeader
 
 const RuleHeader ruleHeaders[] = {
     {"apps/vel-menuprint", "src/menuedit/SortOrder.h"},
-    {"apps/vel-menuprint", "src/menuedit/EntryName.h"},
+    {"apps/vel-menuprint", "src/menuedit/ItemOrder.h"},
+    {"apps/vel-menuprint", "src/menuedit/EntryDisplay.h"},
+    {"apps/vel-menuprint", "src/frame/EntryPath.h"},
     {"apps/vel-menuprint", "src/frame/DesktopEntryRecord.h"},
 };
 

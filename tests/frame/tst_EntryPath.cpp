@@ -12,6 +12,7 @@ class tst_EntryPath : public TestCase
 private Q_SLOTS:
     void tellsEntriesByTheEndOfTheirName_data();
     void tellsEntriesByTheEndOfTheirName();
+    void namesEntries();
     void tellsRecordFilesByTheirWholeName_data();
     void tellsRecordFilesByTheirWholeName();
     void leadsFromAFolderToItsRecordFileAndBack();
@@ -33,6 +34,12 @@ void tst_EntryPath::tellsEntriesByTheEndOfTheirName()
 {
     QFETCH(QString, path);
     QTEST(EntryPath::isEntry(path), "isEntry");
+}
+
+void tst_EntryPath::namesEntries()
+{
+    QCOMPARE(EntryPath::entryNamed(QStringLiteral("editor")), QStringLiteral("editor.desktop"));
+    QVERIFY(EntryPath::isEntry(EntryPath::entryNamed(QString())));
 }
 
 void tst_EntryPath::tellsRecordFilesByTheirWholeName_data()
