@@ -4,28 +4,32 @@
 #pragma once
 
 #include <QFileSystemModel>
-#include <QHash>
-#include <QMap>
 #include <QPointer>
-#include <QSet>
 #include <QString>
 #include <QStringList>
 
+#include <memory>
+
 class FolderWatch;
+class MenuIconProvider;
+class RowCache;
 class VelMenuView;
-class VelUIDesktopEntry;
 
 /**
  * The files and folders of a menu directory, under the names that the menu shows.
  *
- * Tells which entries are to be hidden (role Qt::UserRole) and carries out drops. A name is
- * read from disk once and kept until forgetItemInfo() is called for it.
+ * Tells which entries are to be hidden and carries out drops. A name is read from disk once and
+ * kept until forgetItemInfo() is called for it, or its row goes. A row that was shown once is
+ * shown again without a look at the disk.
  */
 class VelMenuModel : public QFileSystemModel
 {
     Q_OBJECT
 
 public:
+    /// Whether an entry is to be hidden.
+    static constexpr int HiddenRole = Qt::UserRole;
+
     /// \a view is called back after drops; null is allowed. It is not owned.
     VelMenuModel(const QString &rootDir, VelMenuView *view, QObject *parent);
     ~VelMenuModel() override;
@@ -34,7 +38,6 @@ public:
     QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
     int columnCount(const QModelIndex &parent = QModelIndex()) const override;
     QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
-    bool setData(const QModelIndex &index, const QVariant &value, int role = Qt::EditRole) override;
     bool dropMimeData(const QMimeData *data, Qt::DropAction action, int row, int column,
                       const QModelIndex &parent) override;
     Qt::ItemFlags flags(const QModelIndex &index) const override;
@@ -46,6 +49,8 @@ public:
 
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);
+    /// To be told that the folder at \a path has a record file now, if it had none.
+    void noteRecordFile(const QString &path);
     /// Shows \a path as \a name, without reading the file.
     void setItemName(const QString &path, const QString &name);
 
@@ -61,24 +66,16 @@ Q_SIGNALS:
     void changed();
 
 private:
-    class IconProvider;
-    class IconProviderKeeper;
     struct Drop;
-    /// What is read of an entry.
-    struct ItemInfo
-    {
-        QString name;
-        bool isHidden;
-    };
 
-    static ItemInfo itemInfo(const VelUIDesktopEntry &entry, const QString &file);
     bool loadItemInfo(const QString &path, bool isFolder) const;
-    void readAlong(const QString &path, const VelUIDesktopEntry &entry);
     QString pathOf(const QModelIndex &index) const;
     QVariant displayName(const QModelIndex &index) const;
     bool isHidden(const QModelIndex &index) const;
 
     void refreshRow(const QString &path);
+    void beginRemoval(const QModelIndex &parent, int first, int last);
+    void endRemoval();
     void completeDataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
                              const QVector<int> &roles);
 
@@ -95,17 +92,15 @@ private:
     VelMenuView *view;
     QString rootDir;
     FolderWatch *m_watch;
-    mutable QMap<QString, QString> itemNames;
-    mutable QMap<QString, bool> hiddenItems;
-    // Rows that were edited here: the base class keeps the icon it has, this model asks anew.
-    QSet<QString> m_editedRows;
-    // What was read while the base class asked for icons, until it has told of the rows.
-    mutable QHash<QString, ItemInfo> m_readAlong;
+    std::shared_ptr<RowCache> m_cache;
+    // The base class uses the provider to its own end, which is behind that of this class.
+    QPointer<MenuIconProvider> m_icons;
+    // The paths of the rows that are about to go.
+    QStringList m_going;
     bool m_isCompleting = false;
     bool m_keepsOrder = true;
     bool m_isFiltered = false;
     bool m_isOrderLost = false;
     // The base class forgets to tell the files in a renamed folder where they are now.
     bool m_wasRenamed = false;
-    QPointer<IconProviderKeeper> m_keeper;
 };

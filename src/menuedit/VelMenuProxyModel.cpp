@@ -126,7 +126,7 @@ void VelMenuProxyModel::invalidateSortOrder(const QString &folderPath)
 
 bool VelMenuProxyModel::filterAcceptsRow(int sourceRow, const QModelIndex &sourceParent) const
 {
-    if (sourceModel()->index(sourceRow, 0, sourceParent).data(Qt::UserRole).toBool())
+    if (sourceModel()->index(sourceRow, 0, sourceParent).data(VelMenuModel::HiddenRole).toBool())
         return false;
     return QSortFilterProxyModel::filterAcceptsRow(sourceRow, sourceParent);
 }

@@ -38,6 +38,7 @@ bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelI
     const int place = d->listChildren(folder, row, &children);
     record.setSortOrder(SortOrder::rewritten(children, name, place));
     record.save();
+    d->model->noteRecordFile(path);
     return true;
 }
 

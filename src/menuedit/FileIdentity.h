@@ -1,0 +1,32 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+/**
+ * What tells that a file is still the same: its place on disk, its size and its times.
+ */
+class FileIdentity
+{
+public:
+    /// Of no file.
+    FileIdentity() = default;
+    /// Of the file at \a path as it is now; of no file when there is none. Follows links.
+    explicit FileIdentity(const QString &path);
+
+    bool operator==(const FileIdentity &other) const;
+
+    bool isRegularFile() const { return m_isRegularFile; }
+    /// Whether the last change is long enough ago that another would have another time.
+    bool isSettled() const;
+
+private:
+    quint64 m_device = 0;
+    quint64 m_inode = 0;
+    qint64 m_size = 0;
+    qint64 m_modified = 0; // nanoseconds, as the next one
+    qint64 m_changed = 0;
+    bool m_isRegularFile = false;
+};

@@ -1,0 +1,89 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuIconProvider.h"
+
+#include "EntryDisplay.h"
+#include "FileIdentity.h"
+#include "RowCache.h"
+#include "VelMimeTypeIconProvider.h"
+
+#include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
+
+#include <QFileInfo>
+
+#include <utility>
+
+namespace {
+
+class Provider : public VelMimeTypeIconProvider
+{
+public:
+    explicit Provider(std::shared_ptr<RowCache> cache)
+        : m_cache(std::move(cache))
+    {
+    }
+
+    using VelMimeTypeIconProvider::icon;
+    QIcon icon(const QFileInfo &info) const override
+    {
+        const QString path = rowPathOf(info);
+        const bool isEntry = EntryPath::isEntry(path) && !info.isSymLink() && info.isFile();
+        const QIcon icon = isEntry ? entryIcon(path) : VelMimeTypeIconProvider::icon(info);
+        m_cache->noteListed(path, icon);
+        return icon;
+    }
+
+    // The file model asks for the icon and at once for the type.
+    QString type(const QFileInfo &info) const override
+    {
+        const QString regularFile = std::exchange(m_regularFile, QString());
+        return !regularFile.isEmpty() && regularFile == rowPathOf(info) ? regularFileType(info)
+                                                                        : VelMimeTypeIconProvider::type(info);
+    }
+
+private:
+    static bool isDotFile(const QString &path)
+    {
+        return path.mid(path.lastIndexOf(QLatin1Char('/')) + 1).startsWith(QLatin1Char('.'));
+    }
+
+    // What the file model was asked about by its path has the root's "/" twice.
+    static QString rowPathOf(const QFileInfo &info)
+    {
+        const QString path = info.filePath();
+        return path.startsWith(QLatin1String("//")) ? path.mid(1) : path;
+    }
+
+    QIcon entryIcon(const QString &path) const
+    {
+        const FileIdentity identity(path);
+        m_regularFile = identity.isRegularFile() ? path : QString();
+        const std::optional<QIcon> known = m_cache->icon(path, identity);
+        if (known)
+            return *known;
+        const VelUIDesktopEntry entry(path);
+        if (!m_cache->display(path))
+            m_cache->prefetch(path, {EntryDisplay::shownName(entry), EntryDisplay::isHidden(entry)});
+        const QIcon icon = desktopEntryIcon(entry, {});
+        // A dot file has no row with which its icon would be forgotten.
+        if (identity.isSettled() && !isDotFile(path))
+            m_cache->setIcon(path, identity, icon);
+        return icon;
+    }
+
+    const std::shared_ptr<RowCache> m_cache;
+    // The file that was just looked at for its icon, if it is a regular one.
+    mutable QString m_regularFile;
+};
+
+} // namespace
+
+MenuIconProvider::MenuIconProvider(const std::shared_ptr<RowCache> &cache, QObject *parent)
+    : QObject(parent)
+    , m_provider(std::make_unique<Provider>(cache))
+{
+}
+
+MenuIconProvider::~MenuIconProvider() = default;
