@@ -5,6 +5,8 @@
 
 #include "EntryDisplay.h"
 #include "FolderWatch.h"
+#include "MenuClipboard.h"
+#include "MenuDrop.h"
 #include "MenuIconProvider.h"
 #include "RowCache.h"
 
@@ -27,9 +29,9 @@ constexpr int BaseColumns = 4;
 
 } // namespace
 
-VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *menuView, QObject *parent)
+VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *view, QObject *parent)
     : QFileSystemModel(parent)
-    , view(menuView)
+    , m_dropHost(MenuDropHost::create(view, parent))
     , rootDir(rootDirectory)
     , m_watch(new FolderWatch(this))
     , m_cache(std::make_shared<RowCache>())
@@ -91,6 +93,42 @@ void VelMenuModel::sort(int column, Qt::SortOrder order)
     m_isOrderLost = isOwnCall && !m_keepsOrder && !m_isFiltered;
     if (!m_isOrderLost)
         QFileSystemModel::sort(column, order);
+}
+
+bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, int row, int column,
+                                const QModelIndex &parent)
+{
+    Q_UNUSED(column)
+    if (parent.row() < 0 || parent.column() < 0 || !parent.model() || !data || !data->hasUrls()
+        || action == Qt::IgnoreAction)
+        return false;
+    const QStringList sources = MenuClipboard::localPaths(data);
+    if (sources.isEmpty() || sources.constFirst().isEmpty())
+        return false;
+    const QPointer<VelMenuModel> self(this);
+    const DropResult result =
+        MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent}).carryOut();
+    if (!self)
+        return false;
+    if (result.isDone)
+        takeIn(result);
+    m_dropHost->finished(result);
+    if (result.isDone)
+        Q_EMIT changed();
+    return result.isDone;
+}
+
+void VelMenuModel::takeIn(const DropResult &result)
+{
+    if (result.sortAnew)
+        noteRecordFile(filePath(result.folder));
+    for (const QString &source : result.moved)
+        forgetItemInfo(source);
+    // Every file has its row at once, whether or not its folder is being watched already.
+    for (const QString &target : result.targets) {
+        if (QFileInfo::exists(target))
+            index(target);
+    }
 }
 
 void VelMenuModel::setKeepsOrder(bool keeps)

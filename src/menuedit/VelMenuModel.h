@@ -11,9 +11,11 @@
 #include <memory>
 
 class FolderWatch;
+class MenuDropHost;
 class MenuIconProvider;
 class RowCache;
 class VelMenuView;
+struct DropResult;
 
 /**
  * The files and folders of a menu directory, under the names that the menu shows.
@@ -30,7 +32,7 @@ public:
     /// Whether an entry is to be hidden.
     static constexpr int HiddenRole = Qt::UserRole;
 
-    /// \a view is called back after drops; null is allowed. It is not owned.
+    /// \a view answers for drops, see MenuDropHost; null is allowed. It is not owned.
     VelMenuModel(const QString &rootDir, VelMenuView *view, QObject *parent);
     ~VelMenuModel() override;
 
@@ -66,8 +68,6 @@ Q_SIGNALS:
     void changed();
 
 private:
-    struct Drop;
-
     bool loadItemInfo(const QString &path, bool isFolder) const;
     QString pathOf(const QModelIndex &index) const;
     QVariant displayName(const QModelIndex &index) const;
@@ -78,18 +78,9 @@ private:
     void endRemoval();
     void completeDataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
                              const QVector<int> &roles);
+    void takeIn(const DropResult &result);
 
-    bool dropIntoOwnFolder(const Drop &drop);
-    bool dropIntoOtherFolder(const Drop &drop);
-    bool mayOverwrite(const QString &target);
-    bool fixSortOrder(const Drop &drop);
-    bool carryOut(const Drop &drop);
-    bool transfer(const Drop &drop);
-    bool link(const Drop &drop);
-    void finish(const Drop &drop, bool sortAnew);
-    void tellAtItem(const QString &path, const QString &text);
-
-    VelMenuView *view;
+    std::unique_ptr<MenuDropHost> m_dropHost;
     QString rootDir;
     FolderWatch *m_watch;
     std::shared_ptr<RowCache> m_cache;

@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "EntryDisplay.h"
+#include "FolderOrder.h"
 #include "FreeName.h"
-#include "OnDisk.h"
-#include "SortOrder.h"
+#include "ShownOrder.h"
 #include "VelDesktopEntryEditDialog.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
@@ -27,37 +27,9 @@ bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelI
     const QString path = folder.isValid() ? d->model->filePath(folder) : QString();
     if (path.isEmpty())
         return false;
-    VelUIDesktopEntry record(EntryPath::recordFileOf(path));
-    if (!record.load()) {
-        record.setType(QStringLiteral("Directory"));
-        record.setName(QStringLiteral("Group"));
-        record.setLocalName(tr("Group"));
-    }
-
-    QStringList children;
-    const int place = d->listChildren(folder, row, &children);
-    record.setSortOrder(SortOrder::rewritten(children, name, place));
-    record.save();
+    FolderOrder::write(path, ShownOrder::with(*d->proxy, name, row, folder));
     d->model->noteRecordFile(path);
     return true;
-}
-
-int VelMenuViewPrivate::listChildren(const QModelIndex &folder, int row, QStringList *names) const
-{
-    // The row of a file that went stands for a moment longer.
-    const std::optional<QSet<QString>> present = OnDisk::namesIn(model->filePath(folder));
-    const QModelIndex shown = proxy->mapFromSource(folder);
-    const int count = proxy->rowCount(shown);
-    int place = -1;
-    for (int i = 0; i < count; ++i) {
-        const QModelIndex child = proxy->mapToSource(proxy->index(i, 0, shown));
-        if (child.row() == row)
-            place = names->size();
-        const QString name = child.data(QFileSystemModel::FileNameRole).toString();
-        if (!present || present->contains(name))
-            names->append(name);
-    }
-    return row == model->rowCount(folder) ? names->size() : place;
 }
 
 void VelMenuView::fixSortOrderInDir(const QModelIndex &item, bool up)

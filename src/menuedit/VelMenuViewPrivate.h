@@ -91,9 +91,6 @@ public:
     /// Goes on to the next match that is still there; false when there is none.
     bool showNextMatch();
 
-    /// Lists the children of \a folder that are there, in the order shown, and tells the place
-    /// in that list of the child at the source row \a row: its end for the row count, else -1.
-    int listChildren(const QModelIndex &folder, int row, QStringList *names) const;
     void moveSelected(bool up);
     /// Writes the record of a new item; false when it cannot be saved.
     bool writeNew(const QString &path, bool folder, const QString &number);

@@ -1,0 +1,167 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuDrop.h"
+
+#include "FolderOrder.h"
+#include "FolderWatch.h"
+#include "OnDisk.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QFileSystemModel>
+#include <QMimeData>
+#include <QPointer>
+#include <QUrl>
+
+namespace {
+
+QString failureText(const FileTransfer::Result &result, Qt::DropAction action)
+{
+    switch (result.failure) {
+    case FileTransfer::Failure::None:
+        break;
+    case FileTransfer::Failure::SourceGone:
+        return QFileSystemModel::tr("%1 does not exist.").arg(result.path);
+    case FileTransfer::Failure::TargetExists:
+        return QFileSystemModel::tr("%1 exists and was left as it is.").arg(result.path);
+    case FileTransfer::Failure::IntoItself:
+        return QFileSystemModel::tr("%1 cannot be put into itself.").arg(result.path);
+    case FileTransfer::Failure::NotWritable:
+        return QFileSystemModel::tr("%1 cannot be written.").arg(result.path);
+    case FileTransfer::Failure::Failed:
+        return (action == Qt::MoveAction ? QFileSystemModel::tr("Can't move %1: %2")
+                                         : QFileSystemModel::tr("Can't copy %1: %2"))
+            .arg(result.path, result.reason);
+    }
+    return QString();
+}
+
+FileTransfer::Action transferAction(Qt::DropAction action)
+{
+    return action == Qt::MoveAction ? FileTransfer::Action::Move : FileTransfer::Action::Copy;
+}
+
+} // namespace
+
+MenuDrop::MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &host, const Request &request)
+    : m_model(model)
+    , m_watch(watch)
+    , m_host(host)
+    , m_request(request)
+    , m_folder(model.filePath(request.folder))
+{
+    for (const QString &source : request.sources)
+        m_targets.append(QDir(m_folder).filePath(QFileInfo(source).fileName()));
+}
+
+DropResult MenuDrop::carryOut()
+{
+    if (FileTransfer::liesIn(m_request.sources.constFirst(), m_folder))
+        return reorder();
+    if (m_model.isReadOnly())
+        return {};
+    if (QFileInfo::exists(m_targets.constFirst()) && !confirm())
+        return {};
+    return bringIn();
+}
+
+// What lies in the folder already only takes another place in its order.
+DropResult MenuDrop::reorder()
+{
+    // What is gone must not be listed.
+    if (!OnDisk::exists(m_request.sources.constFirst()))
+        return refused({FileTransfer::Failure::SourceGone, m_targets.constFirst(), QString()});
+    if (m_request.action == Qt::MoveAction)
+        write(
+            m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder));
+    return done(true);
+}
+
+DropResult MenuDrop::bringIn()
+{
+    const FileTransfer::Result possible = FileTransfer::check(m_request.sources, m_folder);
+    if (!possible.succeeded())
+        return refused(possible);
+    const bool isListed = m_request.row != -1;
+    std::optional<QStringList> order;
+    if (isListed)
+        order =
+            m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder);
+    if (m_request.action == Qt::LinkAction) {
+        if (!link())
+            return {};
+    } else {
+        const FileTransfer::Result result = transfer();
+        if (!result.succeeded())
+            return refused(result);
+    }
+    write(order);
+    return done(isListed);
+}
+
+// Asks before a file that exists, and keeps the place that was meant when rows come and go.
+bool MenuDrop::confirm()
+{
+    const int row = m_request.row;
+    const bool isLast = row == m_model.rowCount(m_request.folder);
+    const bool isBefore = row >= 0 && row < m_model.rowCount(m_request.folder);
+    const QPersistentModelIndex following =
+        isBefore ? m_model.index(row, 0, m_request.folder) : QModelIndex();
+    const QPointer<QFileSystemModel> model(&m_model);
+    if (!m_host.confirmOverwrite(m_targets.constFirst()) || !model || !m_request.folder.isValid())
+        return false;
+    if (row != -1)
+        m_request.row = isLast ? m_model.rowCount(m_request.folder) : following.row();
+    return true;
+}
+
+FileTransfer::Result MenuDrop::transfer()
+{
+    const QStringList released =
+        m_request.action == Qt::MoveAction ? m_watch.release(m_request.sources) : QStringList();
+    const FileTransfer::Result result =
+        FileTransfer::transfer(m_request.sources, m_folder, transferAction(m_request.action));
+    // What could not be moved is still there.
+    m_watch.watchAgain(released);
+    return result;
+}
+
+bool MenuDrop::link()
+{
+    QList<QUrl> urls;
+    for (const QString &source : m_request.sources)
+        urls.append(QUrl::fromLocalFile(source));
+    QMimeData data;
+    data.setUrls(urls);
+    return m_model.QFileSystemModel::dropMimeData(&data, m_request.action, m_request.row, 0,
+                                                  m_request.folder);
+}
+
+// A list that cannot be saved leaves the drop done.
+void MenuDrop::write(const std::optional<QStringList> &order) const
+{
+    if (order)
+        FolderOrder::write(m_folder, *order);
+}
+
+DropResult MenuDrop::done(bool sortAnew) const
+{
+    DropResult result;
+    result.isDone = true;
+    result.folder = m_request.folder;
+    result.targets = m_targets;
+    if (m_request.action == Qt::MoveAction)
+        result.moved = m_request.sources;
+    result.sortAnew = sortAnew;
+    return result;
+}
+
+DropResult MenuDrop::refused(const FileTransfer::Result &result) const
+{
+    DropResult refusal;
+    refusal.complaint = failureText(result, m_request.action);
+    refusal.folder = m_request.folder;
+    refusal.targets = m_targets;
+    return refusal;
+}

@@ -1,0 +1,60 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QPersistentModelIndex>
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <optional>
+
+class QObject;
+class VelMenuView;
+
+/**
+ * What came of a drop.
+ */
+struct DropResult
+{
+    bool isDone = false; ///< whether everything is where it was dropped
+    QString complaint; ///< what the user is to hear of a drop that was not done; may be empty
+    QPersistentModelIndex folder; ///< in the file model
+    QStringList targets; ///< the paths of all files in the folder; the first is the one dropped first
+    QStringList moved; ///< the paths at which files were before
+    bool sortAnew = false; ///< whether the order of the folder may have changed
+};
+
+/**
+ * What a drop has to ask of those who show the menu, and tells them.
+ */
+class MenuDropHost
+{
+public:
+    /**
+     * Returns the host that answers for \a view; null for a model that nobody shows.
+     *
+     * @param owner the parent of the model, over which questions are asked if it is a widget
+     */
+    static std::unique_ptr<MenuDropHost> create(VelMenuView *view, QObject *owner);
+
+    virtual ~MenuDropHost() = default;
+
+    /**
+     * Asks the user about a \a target that exists; whether to go on. An event loop runs meanwhile,
+     * in which the model and this object may be deleted.
+     *
+     * A Yes overwrites nothing: what is still there when the files are transferred is left as it
+     * is. The question tells that the name is taken before anything was tried, and while it
+     * stands the user can make room for what was dropped.
+     */
+    virtual bool confirmOverwrite(const QString &target) = 0;
+
+    /// The list for \a folder of the file model as it is shown, with \a name before the child at
+    /// the source row \a row; nothing where nobody shows an order.
+    virtual std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) = 0;
+
+    /// Shows what came of the drop.
+    virtual void finished(const DropResult &result) = 0;
+};

@@ -1,0 +1,87 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuDropHost.h"
+#include "ShownOrder.h"
+#include "VelMenuView.h"
+
+#include <frame/GuardedDialog.h>
+
+#include <QFileInfo>
+#include <QFileSystemModel>
+#include <QMessageBox>
+#include <QSortFilterProxyModel>
+#include <QToolTip>
+
+namespace {
+
+/// Answers for a view, if there is one.
+class ViewDropHost : public MenuDropHost
+{
+public:
+    ViewDropHost(VelMenuView *view, QObject *owner)
+        : m_view(view)
+        , m_owner(owner)
+    {
+    }
+
+    // The box is made by hand: the static function would add a No button to show its default.
+    // Nothing of this object is touched when it is closed.
+    bool confirmOverwrite(const QString &target) override
+    {
+        GuardedDialog<QMessageBox> box(QMessageBox::Question, QFileSystemModel::tr("Attention"),
+                                       QFileSystemModel::tr("%1 already exists. Overwrite?").arg(target),
+                                       QMessageBox::Yes, qobject_cast<QWidget *>(m_owner));
+        box->setDefaultButton(QMessageBox::No);
+        return box.exec() != QMessageBox::No;
+    }
+
+    std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) override
+    {
+        if (!m_view)
+            return std::nullopt;
+        return ShownOrder::with(*proxy(), name, row, folder);
+    }
+
+    void finished(const DropResult &result) override
+    {
+        if (!m_view)
+            return;
+        if (!result.complaint.isEmpty())
+            tellAt(result.targets.constFirst(), result.complaint);
+        if (!result.isDone)
+            return;
+        if (result.sortAnew)
+            m_view->invalidateSortOrder(result.folder);
+        m_view->showAndSelect(result.targets.constFirst());
+        m_view->setActionsEnabled();
+    }
+
+private:
+    const QSortFilterProxyModel *proxy() const
+    {
+        return qobject_cast<const QSortFilterProxyModel *>(m_view->model());
+    }
+
+    // Tells without a window: the user goes on undisturbed, the item tells why nothing happened.
+    void tellAt(const QString &path, const QString &text) const
+    {
+        QModelIndex shown;
+        const auto *files = qobject_cast<const QFileSystemModel *>(proxy()->sourceModel());
+        if (QFileInfo::exists(path))
+            shown = proxy()->mapFromSource(files->index(path));
+        const QRect area = shown.isValid() ? m_view->visualRect(shown) : QRect();
+        const QPoint place = area.isValid() ? area.bottomLeft() : m_view->viewport()->rect().center();
+        QToolTip::showText(m_view->viewport()->mapToGlobal(place), text, m_view->viewport());
+    }
+
+    VelMenuView *const m_view;
+    QObject *const m_owner;
+};
+
+} // namespace
+
+std::unique_ptr<MenuDropHost> MenuDropHost::create(VelMenuView *view, QObject *owner)
+{
+    return std::make_unique<ViewDropHost>(view, owner);
+}
