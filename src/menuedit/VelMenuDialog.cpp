@@ -4,6 +4,7 @@
 #include "VelMenuDialog.h"
 
 #include "MenuUpdateCommand.h"
+#include "StartMenu.h"
 #include "VelMenuView.h"
 
 #include <frame/DesktopEntryRecord.h>
@@ -11,7 +12,6 @@
 #include <frame/EntryPath.h>
 #include <frame/MessageBox.h>
 
-#include <velcore/dirs.h>
 #include <velintegration/help.h>
 
 #include <QAbstractProxyModel>
@@ -31,11 +31,6 @@ namespace {
 QString sizeGroup()
 {
     return QStringLiteral("VelMenuDialog");
-}
-
-QString startMenuDir()
-{
-    return QString::fromStdString(GetVelDir(VelDir::StartMenu));
 }
 
 } // namespace
@@ -88,7 +83,7 @@ void VelMenuDialogPrivate::buildToolBar()
     toolBar->addSeparator();
     for (const char *name : {"upAction", "downAction"})
         addAction(name);
-    if (view->menuDir() == startMenuDir()) {
+    if (view->menuDir() == StartMenu::directory()) {
         toolBar->addSeparator();
         addAction("recreateAction");
     }
@@ -133,7 +128,7 @@ VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bo
     : QDialog(parent, f)
     , d(new VelMenuDialogPrivate(this))
 {
-    const QString shownDir = dir.isEmpty() ? startMenuDir() : dir;
+    const QString shownDir = dir.isEmpty() ? StartMenu::directory() : dir;
     d->menuKind = MenuUpdateCommand::kindOf(shownDir);
 
     auto *layout = new QVBoxLayout(this);

@@ -3,31 +3,19 @@
 
 #include "VelMenuView.h"
 
-#include "TreeLoader.h"
+#include "EntryExecution.h"
+#include "ItemClipboard.h"
+#include "MenuClipboard.h"
+#include "MenuReordering.h"
+#include "StartMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuViewPrivate.h"
-#include "WaitCursor.h"
-
-#include <frame/MessageBox.h>
-
-#include <velcore/dirs.h>
-#include <velintegration/startmenu.h>
 
 #include <QContextMenuEvent>
-#include <QFile>
+#include <QDropEvent>
+#include <QMenu>
 #include <QPointer>
-#include <QProcess>
-#include <QTimer>
-
-namespace {
-
-QString startMenuDir()
-{
-    return QString::fromStdString(GetVelDir(VelDir::StartMenu));
-}
-
-} // namespace
 
 VelMenuView::VelMenuView(QWidget *parent)
     : VelMenuView(QString(), -1, false, parent)
@@ -36,27 +24,21 @@ VelMenuView::VelMenuView(QWidget *parent)
 
 VelMenuView::VelMenuView(const QString &menuDir, int iconSize, bool editable, QWidget *parent)
     : QTreeView(parent)
-    , d(new VelMenuViewPrivate(this))
 {
     init(menuDir, iconSize, editable, parent);
 }
 
 VelMenuView::~VelMenuView()
 {
-    // Destroying a QProcess would kill what the user has just started.
-    const auto processes = findChildren<QProcess *>(QString(), Qt::FindDirectChildrenOnly);
-    for (QProcess *process : processes)
-        process->setParent(nullptr);
-    d->clear();
+    EntryExecution::release(this);
+    d.reset();
 }
 
 void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWidget *parent)
 {
     if (parent && parent != parentWidget())
         setParent(parent);
-    d->clear();
-    d->menuDir = menuDir.isEmpty() ? startMenuDir() : menuDir;
-    d->editable = editable;
+    d.reset(new VelMenuViewPrivate(this, menuDir, editable));
 
     setDefaultDropAction(Qt::MoveAction);
     setHeaderHidden(true);
@@ -64,114 +46,185 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
     if (iconSize != -1)
         setIconSize(QSize(iconSize, iconSize));
     setDragDropMode(editable ? QAbstractItemView::DragDrop : QAbstractItemView::NoDragDrop);
-
-    d->proxy = new VelMenuProxyModel(this);
-    d->buildModel();
-    d->watchRows();
-    setModel(d->proxy);
-    d->showRoot();
-    setSortingEnabled(true);
-    if (editable)
-        d->makeEditable();
-    connect(selectionModel(), &QItemSelectionModel::selectionChanged, this, &VelMenuView::setActionsEnabled);
-    connect(selectionModel(), &QItemSelectionModel::selectionChanged, this,
-            &VelMenuView::selectionChangedSlot);
+    d->show();
 }
 
 QString VelMenuView::menuDir() const
 {
-    return d->menuDir;
+    return d->menu.directory();
 }
 
 QModelIndex VelMenuView::selectedItem() const
 {
-    const QModelIndexList selected =
-        selectionModel() ? selectionModel()->selectedIndexes() : QModelIndexList();
-    return selected.isEmpty() ? QModelIndex() : d->proxy->mapToSource(selected.constFirst());
+    return d->selection.item();
 }
 
 QString VelMenuView::selectedPath() const
 {
-    const QModelIndex item = selectedItem();
-    return item.isValid() ? d->model->filePath(item) : QString();
+    return d->selection.path();
 }
 
 void VelMenuView::showAndSelect(const QString &path)
 {
-    d->clearSelection();
-    const QModelIndex index = d->proxyIndex(path);
-    if (!index.isValid())
-        return;
-    if (index.parent().isValid())
-        expand(index.parent());
-    d->selectOnly(index);
-    QTimer::singleShot(0, this, [this, path] {
-        const QModelIndex again = d->proxyIndex(path);
-        if (again.isValid())
-            scrollTo(again);
-    });
-}
-
-void VelMenuView::invalidateSortOrder(const QModelIndex &sourceIndex)
-{
-    d->proxy->invalidateSortOrder(d->model->filePath(sourceIndex));
-}
-
-void VelMenuView::contextMenuEvent(QContextMenuEvent *event)
-{
-    if (!d->editable || !selectionModel()) {
-        event->ignore();
-        return;
-    }
-    setActionsEnabled();
-    d->editMenu->exec(event->globalPos());
-}
-
-void VelMenuView::slotExe()
-{
-    const QString path = selectedPath();
-    if (path.isEmpty())
-        return;
-    const QString program = QStringLiteral("vel-open");
-    const QStringList arguments{QStringLiteral("--exec"), path};
-    auto *process = new QProcess(this);
-    connect(process, QOverload<int, QProcess::ExitStatus>::of(&QProcess::finished), process,
-            &QObject::deleteLater);
-    process->setProcessChannelMode(QProcess::ForwardedChannels);
-    process->setStandardInputFile(QProcess::nullDevice());
-    process->start(program, arguments);
-    if (process->waitForStarted(2000))
-        return;
-    delete process;
-    MessageBox::show(this, QMessageBox::Warning, tr("Warning"),
-                     tr("Can't start:\n%1 %2").arg(program, arguments.join(QLatin1Char(' '))));
-}
-
-void VelMenuView::slotRecreate()
-{
-    const QPointer<VelMenuView> self(this);
-    const auto answer = MessageBox::show(this, QMessageBox::Question, tr("Warning"),
-                                         tr("All previous shortcuts\nwill be lost. Are you sure?"),
-                                         QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok);
-    if (!self || answer == QMessageBox::Cancel)
-        return;
-    {
-        const WaitCursor waiting;
-        if (!CreateStartMenu(QFile::encodeName(startMenuDir()).constData(), nullptr))
-            qWarning("VelMenuView: can't create the start menu");
-    }
-    if (!self)
-        return;
-    d->clearSelection();
-    // The old directory is gone together with what the model watched.
-    d->buildModel();
-    d->showRoot();
-    clearFindResults();
-    setActionsEnabled();
-    Q_EMIT changed();
+    d->selection.show(path);
 }
 
 void VelMenuView::selectionChangedSlot()
 {
     Q_EMIT selectionChanged(selectedPath());
+}
+
+void VelMenuView::setActionsEnabled()
+{
+    if (d->actions)
+        d->actions->update(d->menu, selectedItem());
+}
+
+void VelMenuView::contextMenuEvent(QContextMenuEvent *event)
+{
+    if (!d->actions || !selectionModel()) {
+        event->ignore();
+        return;
+    }
+    setActionsEnabled();
+    d->actions->menu()->exec(event->globalPos());
+}
+
+void VelMenuView::clearFindResults()
+{
+    d->find.clear();
+}
+
+bool VelMenuView::findAndSelect(bool next)
+{
+    return d->find.find(next);
+}
+
+void VelMenuView::slotFind()
+{
+    d->find.ask();
+}
+
+void VelMenuView::slotFindNext()
+{
+    findAndSelect(true);
+}
+
+bool VelMenuView::createNew(bool folder)
+{
+    return d->editing.createNew(folder ? FreeName::Kind::Folder : FreeName::Kind::Entry);
+}
+
+void VelMenuView::slotDirNew()
+{
+    createNew(true);
+}
+
+void VelMenuView::slotFileNew()
+{
+    createNew(false);
+}
+
+bool VelMenuView::slotEdit()
+{
+    return d->editing.edit(selectedPath());
+}
+
+void VelMenuView::slotDel()
+{
+    d->editing.remove(selectedPath());
+}
+
+bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelIndex &folder)
+{
+    return MenuReordering::list(d->menu, name, row, folder);
+}
+
+void VelMenuView::fixSortOrderInDir(const QModelIndex &item, bool up)
+{
+    MenuReordering::move(d->menu, item, up);
+}
+
+void VelMenuView::invalidateSortOrder(const QModelIndex &sourceIndex)
+{
+    d->menu.proxy().invalidateSortOrder(d->menu.files().filePath(sourceIndex));
+}
+
+void VelMenuView::slotUp()
+{
+    d->moveSelected(true);
+}
+
+void VelMenuView::slotDown()
+{
+    d->moveSelected(false);
+}
+
+void VelMenuView::FillClipboard(QModelIndex item, Qt::DropAction action)
+{
+    ItemClipboard::put(d->menu.files(), item, action);
+}
+
+void VelMenuView::slotCut()
+{
+    if (selectedItem().isValid())
+        FillClipboard(selectedItem(), Qt::MoveAction);
+    setActionsEnabled();
+}
+
+void VelMenuView::slotCopy()
+{
+    if (selectedItem().isValid())
+        FillClipboard(selectedItem(), Qt::CopyAction);
+    setActionsEnabled();
+}
+
+void VelMenuView::slotPaste()
+{
+    const QPointer<VelMenuView> self(this);
+    if (ItemClipboard::paste(d->menu.files(), selectedItem()) && self)
+        setActionsEnabled();
+}
+
+QString VelMenuView::dndFormat(const QMimeData *mimeData) const
+{
+    return MenuClipboard::format(mimeData);
+}
+
+QList<QUrl> VelMenuView::dndUrls(const QMimeData *mimeData, const QString &format) const
+{
+    return MenuClipboard::urls(mimeData, format);
+}
+
+void VelMenuView::dropEvent(QDropEvent *event)
+{
+    const QPointer<VelMenuView> self(this);
+    const Qt::DropAction action =
+        ItemClipboard::askForAction(this, viewport()->mapToGlobal(event->posF().toPoint()));
+    if (!self)
+        return;
+    event->setDropAction(action);
+    QTreeView::dropEvent(event);
+    if (event->isAccepted() && self) {
+        // The base tells the source the action that was proposed, not the one carried out. In place
+        // of one that the source does not allow, the event takes the proposed one both times.
+        event->setDropAction(action);
+        event->accept();
+    }
+}
+
+void VelMenuView::slotExe()
+{
+    const QString path = selectedPath();
+    if (!path.isEmpty())
+        EntryExecution::start(this, path);
+}
+
+void VelMenuView::slotRecreate()
+{
+    const QPointer<VelMenuView> self(this);
+    if (!StartMenu::recreate(this) || !self)
+        return;
+    d->showAnew();
+    Q_EMIT changed();
 }

@@ -3,105 +3,119 @@
 
 #include "VelMenuViewPrivate.h"
 
-#include "TreeLoader.h"
+#include "MenuReordering.h"
+#include "StartMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuView.h"
 
-#include <QFileInfo>
+#include <QAction>
+#include <QClipboard>
+#include <QGuiApplication>
 #include <QItemSelectionModel>
-#include <QTimer>
+#include <QMenu>
 
-VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view)
+VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directory, bool isEditable)
     : q(view)
+    , menu(directory.isEmpty() ? StartMenu::directory() : directory, isEditable, view, view)
+    , selection(view, menu)
+    , find(view, menu, selection)
+    , editing(view, menu, selection, find)
 {
 }
 
-VelMenuViewPrivate::~VelMenuViewPrivate() = default;
-
-void VelMenuViewPrivate::clear()
+VelMenuViewPrivate::~VelMenuViewPrivate()
 {
-    if (!model)
-        return;
     QObject::disconnect(q, &QAbstractItemView::doubleClicked, q, &VelMenuView::slotEdit);
-    delete editMenu;
-    editMenu = nullptr;
-    for (QAction **action :
-         {&cutAction, &copyAction, &pasteAction, &dirNewAction, &fileNewAction, &editAction, &deleteAction,
-          &executeAction, &upAction, &downAction, &recreateAction, &findAction, &findNextAction})
-        *action = nullptr;
-    findResults.clear();
-    findPos = -1;
-    findText.clear();
-    awaited.clear();
-    QItemSelectionModel *selection = q->selectionModel();
+    const std::unique_ptr<QItemSelectionModel> former(q->selectionModel());
     q->setModel(nullptr);
-    delete selection;
-    delete proxy;
-    proxy = nullptr;
-    loader.reset();
-    model.reset();
 }
 
-void VelMenuViewPrivate::buildModel()
+void VelMenuViewPrivate::show()
 {
-    std::unique_ptr<VelMenuModel> former = std::move(model);
-    model = std::make_unique<VelMenuModel>(menuDir, q, nullptr);
-    loader = std::make_unique<TreeLoader>(model.get());
-    if (editable) {
-        model->setReadOnly(false);
-        QObject::connect(model.get(), &VelMenuModel::changed, q, &VelMenuView::changed);
-    }
-    proxy->setSourceModel(model.get());
-}
-
-void VelMenuViewPrivate::showRoot()
-{
-    q->setRootIndex(proxy->mapFromSource(model->index(menuDir)));
-    hideTopLevel();
-}
-
-void VelMenuViewPrivate::watchRows()
-{
-    QObject::connect(
-        proxy, &QAbstractItemModel::rowsAboutToBeRemoved, q,
-        [this](const QModelIndex &parent, int first, int last) { leaveRows(parent, first, last); });
-    QObject::connect(proxy, &QAbstractItemModel::rowsRemoved, q, [this] { hideTopLevel(); });
-    QObject::connect(proxy, &QAbstractItemModel::modelReset, q, [this] { hideTopLevel(); });
-    QObject::connect(proxy, &QAbstractItemModel::rowsInserted, q, [this](const QModelIndex &parent) {
+    connectFiles();
+    QObject::connect(&menu.proxy(), &QAbstractItemModel::rowsRemoved, q, [this] { hideTopLevel(); });
+    QObject::connect(&menu.proxy(), &QAbstractItemModel::modelReset, q, [this] { hideTopLevel(); });
+    QObject::connect(&menu.proxy(), &QAbstractItemModel::rowsInserted, q, [this](const QModelIndex &parent) {
         if (!parent.isValid())
             hideTopLevel();
-        // Not from here: looking for the item may bring in further rows.
-        if (!awaited.isEmpty())
-            QTimer::singleShot(0, q, [this] { selectAwaited(); });
     });
+    q->setModel(&menu.proxy());
+    showRoot();
+    q->setSortingEnabled(true);
+    if (menu.isEditable())
+        makeEditable();
+    QObject::connect(&editing, &MenuEditing::changed, q, &VelMenuView::changed);
+    QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
+                     &VelMenuView::setActionsEnabled);
+    QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
+                     &VelMenuView::selectionChangedSlot);
 }
 
-void VelMenuViewPrivate::leaveRows(const QModelIndex &parent, int first, int last)
+void VelMenuViewPrivate::showAnew()
 {
-    const QModelIndex current = q->currentIndex();
-    if (!current.isValid() || current.parent() != parent || current.row() < first || current.row() > last)
-        return;
-    // A listing that is older than the item takes its row away for a moment.
-    const QString path = q->selectedPath();
-    if (!path.isEmpty() && QFileInfo::exists(path))
-        awaited = path;
-    QModelIndex neighbour = proxy->index(last + 1, 0, parent);
-    if (!neighbour.isValid() && first > 0)
-        neighbour = proxy->index(first - 1, 0, parent);
-    q->selectionModel()->setCurrentIndex(neighbour, QItemSelectionModel::NoUpdate);
+    selection.clear();
+    menu.build();
+    connectFiles();
+    showRoot();
+    find.clear();
+    q->setActionsEnabled();
 }
 
-void VelMenuViewPrivate::selectAwaited()
+void VelMenuViewPrivate::moveSelected(bool up)
 {
-    if (awaited.isEmpty())
+    const QModelIndex item = selection.item();
+    if (!item.isValid())
         return;
-    const QModelIndex index = QFileInfo::exists(awaited) ? proxyIndex(awaited) : QModelIndex();
-    if (index.isValid() && !q->selectionModel()->hasSelection()) {
-        selectOnly(index);
-        q->scrollTo(index);
-    }
-    awaited.clear();
+    MenuReordering::move(menu, item, up);
+    find.clear();
+    q->setActionsEnabled();
+    Q_EMIT q->changed();
+}
+
+void VelMenuViewPrivate::makeEditable()
+{
+    actions = std::make_unique<MenuActions>(q, menu.directory() == StartMenu::directory());
+    connectActions();
+    q->setActionsEnabled();
+    QObject::connect(q, &QAbstractItemView::doubleClicked, q, &VelMenuView::slotEdit);
+    QObject::connect(QGuiApplication::clipboard(), &QClipboard::dataChanged, actions->menu(),
+                     [view = q] { view->setActionsEnabled(); });
+    q->setDropIndicatorShown(true);
+}
+
+void VelMenuViewPrivate::connectActions()
+{
+    const auto connectTo = [this](MenuActions::Action action, auto slot) {
+        if (actions->action(action))
+            QObject::connect(actions->action(action), &QAction::triggered, q, slot);
+    };
+    connectTo(MenuActions::NewFolder, &VelMenuView::slotDirNew);
+    connectTo(MenuActions::NewEntry, &VelMenuView::slotFileNew);
+    connectTo(MenuActions::Edit, &VelMenuView::slotEdit);
+    connectTo(MenuActions::Delete, &VelMenuView::slotDel);
+    connectTo(MenuActions::Execute, &VelMenuView::slotExe);
+    connectTo(MenuActions::Find, &VelMenuView::slotFind);
+    connectTo(MenuActions::FindNext, &VelMenuView::slotFindNext);
+    connectTo(MenuActions::Cut, &VelMenuView::slotCut);
+    connectTo(MenuActions::Copy, &VelMenuView::slotCopy);
+    connectTo(MenuActions::Paste, &VelMenuView::slotPaste);
+    connectTo(MenuActions::Recreate, &VelMenuView::slotRecreate);
+    connectTo(MenuActions::Up, &VelMenuView::slotUp);
+    connectTo(MenuActions::Down, &VelMenuView::slotDown);
+}
+
+void VelMenuViewPrivate::connectFiles()
+{
+    if (menu.isEditable())
+        QObject::connect(&menu.files(), &VelMenuModel::changed, q, &VelMenuView::changed);
+}
+
+// None when the directory does not exist.
+void VelMenuViewPrivate::showRoot()
+{
+    q->setRootIndex(menu.proxy().mapFromSource(menu.files().index(menu.directory())));
+    hideTopLevel();
 }
 
 // Without its root the tree would show the file system instead of nothing. While there is a root,
@@ -109,30 +123,8 @@ void VelMenuViewPrivate::selectAwaited()
 void VelMenuViewPrivate::hideTopLevel()
 {
     const bool isRootless = !q->rootIndex().isValid();
-    for (int row = 0; row < proxy->rowCount(); ++row) {
+    for (int row = 0; row < menu.proxy().rowCount(); ++row) {
         if (q->isRowHidden(row, QModelIndex()) != isRootless)
             q->setRowHidden(row, QModelIndex(), isRootless);
     }
-}
-
-QModelIndex VelMenuViewPrivate::proxyIndex(const QString &path) const
-{
-    const QModelIndex index = proxy->mapFromSource(model->index(path));
-    const QModelIndex root = q->rootIndex();
-    for (QModelIndex above = index.parent(); above.isValid() && root.isValid(); above = above.parent()) {
-        if (above == root)
-            return index;
-    }
-    return {};
-}
-
-void VelMenuViewPrivate::selectOnly(const QModelIndex &index)
-{
-    clearSelection();
-    q->selectionModel()->setCurrentIndex(index, QItemSelectionModel::Select);
-}
-
-void VelMenuViewPrivate::clearSelection()
-{
-    q->selectionModel()->clearSelection();
 }

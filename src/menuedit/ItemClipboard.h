@@ -1,0 +1,30 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <Qt>
+
+class QModelIndex;
+class QPoint;
+class QWidget;
+class VelMenuModel;
+
+/**
+ * Cut, copy, paste and the question that a drop begins with. Items are those of the file model.
+ */
+namespace ItemClipboard {
+
+/// Puts \a item on the clipboard, cut when \a action is Qt::MoveAction; empties the clipboard
+/// first, and leaves it so for an invalid item.
+void put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action);
+
+/// Moves or copies what is on the clipboard into the folder \a item or to the place of the file
+/// \a item; whether something was moved, which it is only once. An event loop may run in it.
+bool paste(VelMenuModel &files, const QModelIndex &item);
+
+/// Asks in a menu at the global \a position what is to be done with dropped files;
+/// Qt::IgnoreAction for nothing. The \a view may go away meanwhile.
+Qt::DropAction askForAction(QWidget *view, const QPoint &position);
+
+} // namespace ItemClipboard

@@ -1,0 +1,142 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuActions.h"
+
+#include "MenuClipboard.h"
+#include "ShownMenu.h"
+#include "VelMenuModel.h"
+#include "VelMenuProxyModel.h"
+
+#include <QAction>
+#include <QClipboard>
+#include <QCoreApplication>
+#include <QFileInfo>
+#include <QGuiApplication>
+#include <QIcon>
+#include <QMenu>
+
+namespace {
+
+struct Description
+{
+    const char *name;
+    const char *icon; // in the theme; may be empty
+    const char *text;
+};
+
+// In the order of MenuActions::Action.
+constexpr Description Descriptions[] = {
+    {"dirNewAction", "folder-new", QT_TRANSLATE_NOOP("VelMenuView", "New folder")},
+    {"fileNewAction", "document-new", QT_TRANSLATE_NOOP("VelMenuView", "New entry")},
+    {"editAction", "document-properties", QT_TRANSLATE_NOOP("VelMenuView", "Edit")},
+    {"deleteAction", "edit-delete", QT_TRANSLATE_NOOP("VelMenuView", "Delete")},
+    {"executeAction", "", QT_TRANSLATE_NOOP("VelMenuView", "Execute")},
+    {"findAction", "edit-find", QT_TRANSLATE_NOOP("VelMenuView", "Find")},
+    {"findNextAction", "", QT_TRANSLATE_NOOP("VelMenuView", "Find Next")},
+    {"cutAction", "edit-cut", QT_TRANSLATE_NOOP("VelMenuView", "Cut")},
+    {"copyAction", "edit-copy", QT_TRANSLATE_NOOP("VelMenuView", "Copy")},
+    {"pasteAction", "edit-paste", QT_TRANSLATE_NOOP("VelMenuView", "Paste")},
+    {"recreateAction", "velmenuedit", QT_TRANSLATE_NOOP("VelMenuView", "Default menu...")},
+    {"upAction", "go-up", QT_TRANSLATE_NOOP("VelMenuView", "Up")},
+    {"downAction", "go-down", QT_TRANSLATE_NOOP("VelMenuView", "Down")},
+};
+
+QKeySequence keyOf(MenuActions::Action action)
+{
+    switch (action) {
+    case MenuActions::NewEntry:
+        return QKeySequence::New;
+    case MenuActions::Edit:
+        return Qt::Key_Space;
+    case MenuActions::Delete:
+        return QKeySequence::Delete;
+    case MenuActions::Execute:
+        return QKeySequence(QStringLiteral("Ctrl+E"));
+    case MenuActions::Find:
+        return QKeySequence::Find;
+    case MenuActions::FindNext:
+        return QKeySequence::FindNext;
+    case MenuActions::Cut:
+        return QKeySequence::Cut;
+    case MenuActions::Copy:
+        return QKeySequence::Copy;
+    case MenuActions::Paste:
+        return QKeySequence::Paste;
+    default:
+        return QKeySequence();
+    }
+}
+
+ActionState stateOf(const ShownMenu &menu, const QModelIndex &item)
+{
+    ActionState::Selection selection;
+    selection.any = item.isValid();
+    if (selection.any) {
+        const QFileInfo info(menu.files().filePath(item));
+        const QModelIndex shown = menu.proxy().mapFromSource(item);
+        selection.writable = QFileInfo(info.isDir() ? info.filePath() : info.absolutePath()).isWritable();
+        selection.filesOnClipboard =
+            !MenuClipboard::format(QGuiApplication::clipboard()->mimeData()).isEmpty();
+        selection.row = shown.row();
+        selection.count = menu.proxy().rowCount(shown.parent());
+    }
+    return ActionState::of(selection);
+}
+
+} // namespace
+
+MenuActions::MenuActions(QWidget *view, bool isStartMenu)
+    : m_menu(std::make_unique<QMenu>(QCoreApplication::translate("VelMenuView", "Edit"), view))
+    , m_actions(Down + 1, nullptr)
+{
+    for (const Action action : {NewFolder, NewEntry, Edit, Delete})
+        add(view, action);
+    m_menu->addSeparator();
+    for (const Action action : {Execute, Find, FindNext})
+        add(view, action);
+    m_menu->addSeparator();
+    for (const Action action : {Cut, Copy, Paste})
+        add(view, action);
+    m_menu->addSeparator();
+    if (isStartMenu)
+        add(view, Recreate);
+    m_menu->addSeparator();
+    add(view, Up);
+    add(view, Down);
+}
+
+MenuActions::~MenuActions() = default;
+
+void MenuActions::add(QWidget *view, Action which)
+{
+    const Description &description = Descriptions[which];
+    const QLatin1String icon(description.icon);
+    QAction *action = m_menu->addAction(icon.isEmpty() ? QIcon() : QIcon::fromTheme(icon),
+                                        QCoreApplication::translate("VelMenuView", description.text));
+    action->setObjectName(QLatin1String(description.name));
+    action->setShortcut(keyOf(which));
+    // Space must go on to press the buttons around the tree.
+    action->setShortcutContext(Qt::WidgetShortcut);
+    view->addAction(action);
+    m_actions[which] = action;
+}
+
+void MenuActions::enable(Action which, bool isEnabled)
+{
+    m_actions.at(which)->setEnabled(isEnabled);
+}
+
+void MenuActions::update(const ShownMenu &menu, const QModelIndex &item)
+{
+    const ActionState state = stateOf(menu, item);
+    enable(NewFolder, state.create);
+    enable(NewEntry, state.create);
+    for (const Action action : {Edit, Delete, Execute, Cut, Copy})
+        enable(action, state.edit);
+    enable(Paste, state.paste);
+    enable(Up, state.up);
+    enable(Down, state.down);
+    if (m_actions.at(Recreate))
+        enable(Recreate, true);
+}

@@ -1,0 +1,61 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "ActionState.h"
+
+#include <QVector>
+
+#include <memory>
+
+class QAction;
+class QMenu;
+class QModelIndex;
+class QWidget;
+class ShownMenu;
+
+/**
+ * The edit actions of a view and the menu that holds them: what they are called, their keys and
+ * when they are enabled. Whoever makes them connects them.
+ */
+class MenuActions
+{
+public:
+    enum Action {
+        NewFolder,
+        NewEntry,
+        Edit,
+        Delete,
+        Execute,
+        Find,
+        FindNext,
+        Cut,
+        Copy,
+        Paste,
+        Recreate,
+        Up,
+        Down,
+    };
+
+    /// Makes the menu and adds its actions to \a view as well, with one to recreate the menu for
+    /// the start menu only.
+    MenuActions(QWidget *view, bool isStartMenu);
+    ~MenuActions();
+    MenuActions(const MenuActions &) = delete;
+    MenuActions &operator=(const MenuActions &) = delete;
+
+    QMenu *menu() const { return m_menu.get(); }
+    /// Null for what is not offered.
+    QAction *action(Action which) const { return m_actions.at(which); }
+
+    /// Enables what makes sense for \a item of the file model, or without one.
+    void update(const ShownMenu &menu, const QModelIndex &item);
+
+private:
+    void add(QWidget *view, Action which);
+    void enable(Action which, bool isEnabled);
+
+    std::unique_ptr<QMenu> m_menu;
+    QVector<QAction *> m_actions;
+};

@@ -1,0 +1,37 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuReordering.h"
+
+#include "FolderOrder.h"
+#include "ShownMenu.h"
+#include "ShownOrder.h"
+#include "VelMenuModel.h"
+#include "VelMenuProxyModel.h"
+
+#include <algorithm>
+
+bool MenuReordering::list(const ShownMenu &menu, const QString &name, int row, const QModelIndex &folder)
+{
+    const QString path = folder.isValid() ? menu.files().filePath(folder) : QString();
+    if (path.isEmpty())
+        return false;
+    FolderOrder::write(path, ShownOrder::with(menu.proxy(), name, row, folder));
+    menu.files().noteRecordFile(path);
+    return true;
+}
+
+void MenuReordering::move(const ShownMenu &menu, const QModelIndex &item, bool up)
+{
+    if (!item.isValid())
+        return;
+    const QModelIndex shown = menu.proxy().mapFromSource(item);
+    const QModelIndex folder = shown.parent();
+    const QModelIndex sourceFolder = item.parent();
+    const int target = up ? shown.row() - 1 : shown.row() + 2;
+    int row = menu.files().rowCount(sourceFolder);
+    if (target < menu.proxy().rowCount(folder))
+        row = menu.proxy().mapToSource(menu.proxy().index(std::max(target, 0), 0, folder)).row();
+    list(menu, item.data(QFileSystemModel::FileNameRole).toString(), row, sourceFolder);
+    menu.proxy().invalidateSortOrder(menu.files().filePath(sourceFolder));
+}

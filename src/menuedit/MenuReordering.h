@@ -1,0 +1,22 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+class QModelIndex;
+class QString;
+class ShownMenu;
+
+/**
+ * Writing the order of a folder after the user's wishes. Items are those of the file model.
+ */
+namespace MenuReordering {
+
+/// Lists \a name in \a folder before the child at the source row \a row; see ShownOrder::with().
+/// False when there is no such folder; a list that cannot be saved is not noticed.
+bool list(const ShownMenu &menu, const QString &name, int row, const QModelIndex &folder);
+
+/// Moves \a item by one place up or down, and shows the new order.
+void move(const ShownMenu &menu, const QModelIndex &item, bool up);
+
+} // namespace MenuReordering

@@ -1,0 +1,28 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ShownMenu.h"
+
+#include "TreeLoader.h"
+#include "VelMenuModel.h"
+#include "VelMenuProxyModel.h"
+
+ShownMenu::ShownMenu(const QString &directory, bool isEditable, VelMenuView *view, QObject *parent)
+    : m_directory(directory)
+    , m_isEditable(isEditable)
+    , m_view(view)
+    , m_proxy(std::make_unique<VelMenuProxyModel>(parent))
+{
+    build();
+}
+
+ShownMenu::~ShownMenu() = default;
+
+void ShownMenu::build()
+{
+    const std::unique_ptr<VelMenuModel> former = std::move(m_files);
+    m_files = std::make_unique<VelMenuModel>(m_directory, m_view, nullptr);
+    m_loader = std::make_unique<TreeLoader>(m_files.get());
+    m_files->setReadOnly(!m_isEditable);
+    m_proxy->setSourceModel(m_files.get());
+}

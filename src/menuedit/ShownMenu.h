@@ -1,0 +1,48 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+#include <memory>
+
+class QObject;
+class TreeLoader;
+class VelMenuModel;
+class VelMenuProxyModel;
+class VelMenuView;
+
+/**
+ * One menu directory as a view shows it: the model of its files, the sorting model above that,
+ * and the loader that reads folders which were never opened.
+ */
+class ShownMenu
+{
+public:
+    /// Shows \a directory in \a view, which also is \a parent, the owner of the sorting model.
+    ShownMenu(const QString &directory, bool isEditable, VelMenuView *view, QObject *parent);
+    ~ShownMenu();
+    ShownMenu(const ShownMenu &) = delete;
+    ShownMenu &operator=(const ShownMenu &) = delete;
+
+    /// As it was given.
+    const QString &directory() const { return m_directory; }
+    bool isEditable() const { return m_isEditable; }
+
+    VelMenuModel &files() const { return *m_files; }
+    VelMenuProxyModel &proxy() const { return *m_proxy; }
+    TreeLoader &loader() const { return *m_loader; }
+
+    /// Builds the model of the files under the sorting model. To be called again when the
+    /// directory was replaced: what the model watched is gone then.
+    void build();
+
+private:
+    const QString m_directory;
+    const bool m_isEditable;
+    VelMenuView *const m_view;
+    std::unique_ptr<VelMenuModel> m_files;
+    std::unique_ptr<TreeLoader> m_loader;
+    std::unique_ptr<VelMenuProxyModel> m_proxy;
+};

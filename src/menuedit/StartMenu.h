@@ -1,0 +1,26 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+class QWidget;
+
+/**
+ * The desktop's start menu.
+ */
+namespace StartMenu {
+
+/// Where it is, whether or not there is one.
+QString directory();
+
+/**
+ * Builds the default menu anew after asking over \a asker, which may go away meanwhile. When the
+ * menu cannot be built, the old one stays and a warning is logged.
+ *
+ * @return whether the user wanted it
+ */
+bool recreate(QWidget *asker);
+
+} // namespace StartMenu
