@@ -105,5 +105,5 @@ public Q_SLOTS:
     void helpSlot();
 
 private:
-    std::unique_ptr<VelMenuDialogPrivate> d;
+    const std::unique_ptr<VelMenuDialogPrivate> d;
 };

@@ -47,7 +47,7 @@ bool wouldContainItself(const QFileInfo &source, const QString &canonicalDirecto
     return source.isDir() && !source.isSymLink() && isBelow(canonicalDirectory, source.canonicalFilePath());
 }
 
-std::error_code carryOut(const Pair &pair, Action action)
+std::error_code transferOne(const Pair &pair, Action action)
 {
     const TreeCopy::Path source = native(pair.source);
     const TreeCopy::Path target = native(pair.target);
@@ -117,7 +117,7 @@ Result transfer(const QStringList &sources, const QString &targetDirectory, Acti
         if (liesIn(source, targetDirectory))
             continue;
         const Pair pair{source, targetOf(source, targetDirectory)};
-        const std::error_code error = carryOut(pair, action);
+        const std::error_code error = transferOne(pair, action);
         if (error) {
             takeBack(done, action);
             const Failure failure = failureOf(error);

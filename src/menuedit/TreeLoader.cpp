@@ -8,11 +8,14 @@
 #include <QFileSystemModel>
 #include <QTimer>
 
+#include <iterator>
+
 TreeLoader::TreeLoader(QFileSystemModel *model, QObject *parent)
     : QObject(parent)
     , m_model(model)
 {
     connect(model, &QFileSystemModel::directoryLoaded, this, &TreeLoader::folderLoaded);
+    connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &TreeLoader::forgetFolders);
     connect(model, &QObject::destroyed, this, [this] {
         if (m_loop)
             m_loop->quit();
@@ -68,6 +71,18 @@ void TreeLoader::folderLoaded(const QString &path)
     visitChildren(folder);
     if (m_loop && m_pending.isEmpty())
         m_loop->quit();
+}
+
+void TreeLoader::forgetFolders(const QModelIndex &parent, int first, int last)
+{
+    for (int row = first; row <= last; ++row) {
+        const QString path = m_model->filePath(m_model->index(row, 0, parent));
+        if (!m_loaded.remove(path))
+            continue;
+        const QString below = path + QLatin1Char('/');
+        for (auto folder = m_loaded.begin(); folder != m_loaded.end();)
+            folder = folder->startsWith(below) ? m_loaded.erase(folder) : std::next(folder);
+    }
 }
 
 void TreeLoader::visit(const QModelIndex &folder)

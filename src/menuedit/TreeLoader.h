@@ -42,6 +42,7 @@ public:
 
 private:
     void folderLoaded(const QString &path);
+    void forgetFolders(const QModelIndex &parent, int first, int last);
     void visit(const QModelIndex &folder);
     void visitChildren(const QModelIndex &folder);
     bool leadsAbove(const QString &path) const;
