@@ -1,0 +1,275 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "TestCase.h"
+
+#include <menuedit/FolderWatch.h>
+#include <menuedit/MenuDrop.h>
+
+#include <QFileSystemModel>
+
+#include <functional>
+#include <memory>
+
+#include <sys/stat.h>
+
+namespace {
+
+/// Answers as it was told to, and remembers what it was asked.
+class Host : public MenuDropHost
+{
+public:
+    bool confirmOverwrite(const QString &target) override
+    {
+        questions.append(target);
+        return answer ? answer() : true;
+    }
+
+    std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) override
+    {
+        if (!hasOrder)
+            return std::nullopt;
+        places.append(QStringLiteral("%1 before %2 in %3").arg(name).arg(row).arg(folder.data().toString()));
+        return QStringList{QStringLiteral("*"), name};
+    }
+
+    void finished(const DropResult &) override { QFAIL("is told by the model"); }
+
+    std::function<bool()> answer;
+    bool hasOrder = true;
+    QStringList questions;
+    QStringList places;
+};
+
+} // namespace
+
+class tst_MenuDrop : public TestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init();
+    void cleanup();
+
+    void movesAndLists();
+    void copiesAndListsNothingOnTheFolder();
+    void writesNoOrderWhereNobodyShowsOne();
+    void writesTheOrderOnlyWhenTheFilesAreThere();
+    void onlyReordersInTheOwnFolder();
+    void leavesTheOrderOfACopyInTheOwnFolder();
+    void doesNothingInAReadOnlyModel();
+    void asksOnlyAboutTheFirstTarget();
+    void doesNothingWithoutAYes();
+    void refusesATargetThatIsStillThereAfterAYes();
+    void goesOnWhenTheTargetIsGoneAfterAYes();
+    void doesNothingWhenTheModelGoesWhileItAsks();
+    void tellsWhatFailed();
+
+private:
+    DropResult drop(const QStringList &files, Qt::DropAction action, int row);
+    QByteArray record() const { return read(path(QStringLiteral("to/.directory"))); }
+
+    std::unique_ptr<QFileSystemModel> m_model;
+    FolderWatch *m_watch = nullptr;
+    Host m_host;
+};
+
+namespace {
+
+const QByteArray Record = "[Desktop Entry]\nType=Directory\nName=To\n";
+
+} // namespace
+
+void tst_MenuDrop::init()
+{
+    TestCase::init();
+    for (const char *name : {"to/a", "from/x", "from/y"})
+        write(QString::fromUtf8(name), name);
+    write(QStringLiteral("to/.directory"), Record);
+    m_host = Host();
+    m_model = std::make_unique<QFileSystemModel>();
+    m_watch = new FolderWatch(m_model.get());
+    m_model->setReadOnly(false);
+    m_model->setRootPath(path(QStringLiteral("to")));
+    QTRY_COMPARE(m_model->rowCount(m_model->index(path(QStringLiteral("to")))), 1);
+}
+
+void tst_MenuDrop::cleanup()
+{
+    m_model.reset();
+    TestCase::cleanup();
+}
+
+DropResult tst_MenuDrop::drop(const QStringList &files, Qt::DropAction action, int row)
+{
+    QStringList sources;
+    for (const QString &file : files)
+        sources.append(path(file));
+    const QModelIndex folder = m_model->index(path(QStringLiteral("to")));
+    return MenuDrop(*m_model, *m_watch, m_host, {sources, action, row, folder}).carryOut();
+}
+
+void tst_MenuDrop::movesAndLists()
+{
+    const DropResult result = drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::MoveAction, 0);
+
+    QVERIFY(result.isDone);
+    QVERIFY(result.sortAnew);
+    QCOMPARE(result.complaint, QString());
+    QCOMPARE(result.targets, (QStringList{path(QStringLiteral("to/x")), path(QStringLiteral("to/y"))}));
+    QCOMPARE(result.moved, (QStringList{path(QStringLiteral("from/x")), path(QStringLiteral("from/y"))}));
+    QCOMPARE(m_host.places, QStringList{QStringLiteral("x before 0 in to")});
+    QCOMPARE(record(), Record + "SortOrder=*;x;\n");
+    QVERIFY(!QFile::exists(path(QStringLiteral("from/y"))));
+    QVERIFY(m_host.questions.isEmpty());
+}
+
+void tst_MenuDrop::copiesAndListsNothingOnTheFolder()
+{
+    const DropResult result = drop({QStringLiteral("from/x")}, Qt::CopyAction, -1);
+
+    QVERIFY(result.isDone);
+    QVERIFY(!result.sortAnew);
+    QVERIFY(result.moved.isEmpty());
+    QVERIFY(m_host.places.isEmpty());
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::writesNoOrderWhereNobodyShowsOne()
+{
+    m_host.hasOrder = false;
+
+    QVERIFY(drop({QStringLiteral("from/x")}, Qt::CopyAction, 0).isDone);
+
+    QCOMPARE(record(), Record);
+}
+
+// Not even for a moment: the record file stays the same file.
+void tst_MenuDrop::writesTheOrderOnlyWhenTheFilesAreThere()
+{
+    struct stat before = {};
+    const QByteArray recordFile = QFile::encodeName(path(QStringLiteral("to/.directory")));
+    QCOMPARE(stat(recordFile.constData(), &before), 0);
+    // Such a thing cannot be copied.
+    QVERIFY(mkfifo(QFile::encodeName(path(QStringLiteral("from/pipe"))).constData(), 0600) == 0);
+
+    const DropResult result =
+        drop({QStringLiteral("from/x"), QStringLiteral("from/pipe")}, Qt::CopyAction, 0);
+
+    QVERIFY(!result.isDone);
+    QVERIFY(!result.complaint.isEmpty());
+    QVERIFY(!QFile::exists(path(QStringLiteral("to/x"))));
+    struct stat after = {};
+    QCOMPARE(stat(recordFile.constData(), &after), 0);
+    QCOMPARE(after.st_ino, before.st_ino);
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::onlyReordersInTheOwnFolder()
+{
+    const DropResult result = drop({QStringLiteral("to/a")}, Qt::MoveAction, 1);
+
+    QVERIFY(result.isDone);
+    QVERIFY(result.sortAnew);
+    QCOMPARE(m_host.places, QStringList{QStringLiteral("a before 1 in to")});
+    QCOMPARE(record(), Record + "SortOrder=*;a;\n");
+    QVERIFY(QFile::exists(path(QStringLiteral("to/a"))));
+}
+
+void tst_MenuDrop::leavesTheOrderOfACopyInTheOwnFolder()
+{
+    const DropResult result = drop({QStringLiteral("to/a")}, Qt::CopyAction, 0);
+
+    QVERIFY(result.isDone);
+    QVERIFY(m_host.places.isEmpty());
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::doesNothingInAReadOnlyModel()
+{
+    m_model->setReadOnly(true);
+
+    QVERIFY(!drop({QStringLiteral("from/x")}, Qt::MoveAction, 0).isDone);
+
+    QVERIFY(QFile::exists(path(QStringLiteral("from/x"))));
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::asksOnlyAboutTheFirstTarget()
+{
+    write(QStringLiteral("to/y"), "old");
+
+    const DropResult result = drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::MoveAction, 0);
+
+    QVERIFY(!result.isDone);
+    QVERIFY(m_host.questions.isEmpty());
+    QCOMPARE(result.complaint,
+             QStringLiteral("%1 exists and was left as it is.").arg(path(QStringLiteral("to/y"))));
+    QVERIFY(QFile::exists(path(QStringLiteral("from/x"))));
+}
+
+void tst_MenuDrop::doesNothingWithoutAYes()
+{
+    write(QStringLiteral("to/x"), "old");
+    m_host.answer = [] { return false; };
+
+    const DropResult result = drop({QStringLiteral("from/x")}, Qt::MoveAction, 0);
+
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint, QString());
+    QCOMPARE(m_host.questions, QStringList{path(QStringLiteral("to/x"))});
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::refusesATargetThatIsStillThereAfterAYes()
+{
+    const QString target = write(QStringLiteral("to/x"), "old");
+
+    const DropResult result = drop({QStringLiteral("from/x")}, Qt::MoveAction, 0);
+
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint, QStringLiteral("%1 exists and was left as it is.").arg(target));
+    QCOMPARE(read(target), QByteArray("old"));
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::goesOnWhenTheTargetIsGoneAfterAYes()
+{
+    const QString target = write(QStringLiteral("to/x"), "old");
+    m_host.answer = [&target] { return QFile::remove(target); };
+
+    QVERIFY(drop({QStringLiteral("from/x")}, Qt::MoveAction, 0).isDone);
+
+    QCOMPARE(read(target), QByteArray("from/x"));
+    QCOMPARE(record(), Record + "SortOrder=*;x;\n");
+}
+
+void tst_MenuDrop::doesNothingWhenTheModelGoesWhileItAsks()
+{
+    const QString target = write(QStringLiteral("to/x"), "old");
+    m_host.answer = [this, &target] {
+        m_model.reset();
+        return QFile::remove(target);
+    };
+
+    QVERIFY(!drop({QStringLiteral("from/x")}, Qt::MoveAction, 0).isDone);
+
+    QVERIFY(!QFile::exists(target));
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::tellsWhatFailed()
+{
+    DropResult result = drop({QStringLiteral("from/missing")}, Qt::MoveAction, 0);
+    QCOMPARE(result.complaint,
+             QStringLiteral("%1 does not exist.").arg(path(QStringLiteral("from/missing"))));
+    QCOMPARE(result.targets, QStringList{path(QStringLiteral("to/missing"))});
+
+    result = drop({QStringLiteral("to/missing")}, Qt::MoveAction, 0);
+    QCOMPARE(result.complaint, QStringLiteral("%1 does not exist.").arg(path(QStringLiteral("to/missing"))));
+    QCOMPARE(record(), Record);
+}
+
+VEL_TEST_MAIN(tst_MenuDrop)
+
+#include "tst_MenuDrop.moc"
