@@ -12,6 +12,7 @@
 #include <frame/EntryPath.h>
 
 #include <QFileInfo>
+#include <QPointer>
 
 #include <utility>
 
@@ -20,14 +21,16 @@ namespace {
 class Provider : public VelMimeTypeIconProvider
 {
 public:
-    explicit Provider(std::shared_ptr<RowCache> cache)
-        : m_cache(std::move(cache))
+    explicit Provider(RowCache *cache)
+        : m_cache(cache)
     {
     }
 
     using VelMimeTypeIconProvider::icon;
     QIcon icon(const QFileInfo &info) const override
     {
+        if (!m_cache)
+            return VelMimeTypeIconProvider::icon(info);
         const QString path = rowPathOf(info);
         const bool isEntry = EntryPath::isEntry(path) && !info.isSymLink() && info.isFile();
         const QIcon icon = isEntry ? entryIcon(path) : VelMimeTypeIconProvider::icon(info);
@@ -73,14 +76,14 @@ private:
         return icon;
     }
 
-    const std::shared_ptr<RowCache> m_cache;
+    const QPointer<RowCache> m_cache;
     // The file that was just looked at for its icon, if it is a regular one.
     mutable QString m_regularFile;
 };
 
 } // namespace
 
-MenuIconProvider::MenuIconProvider(const std::shared_ptr<RowCache> &cache, QObject *parent)
+MenuIconProvider::MenuIconProvider(RowCache *cache, QObject *parent)
     : QObject(parent)
     , m_provider(std::make_unique<Provider>(cache))
 {

@@ -22,8 +22,8 @@ class MenuIconProvider : public QObject
     Q_OBJECT
 
 public:
-    /// Remembers in \a cache.
-    MenuIconProvider(const std::shared_ptr<RowCache> &cache, QObject *parent);
+    /// Remembers in \a cache, and nothing once that is gone.
+    MenuIconProvider(RowCache *cache, QObject *parent);
     ~MenuIconProvider() override;
 
     /// The provider; it lives as long as this object.

@@ -10,8 +10,10 @@
 RowCache::RowCache()
 {
     m_prefetchEnd.setSingleShot(true);
-    QObject::connect(&m_prefetchEnd, &QTimer::timeout, &m_prefetchEnd, [this] { m_prefetched.clear(); });
+    connect(&m_prefetchEnd, &QTimer::timeout, this, [this] { m_prefetched.clear(); });
 }
+
+RowCache::~RowCache() = default;
 
 std::optional<RowCache::Display> RowCache::display(const QString &path) const
 {

@@ -8,6 +8,7 @@
 #include <QHash>
 #include <QIcon>
 #include <QMap>
+#include <QObject>
 #include <QSet>
 #include <QString>
 #include <QTimer>
@@ -18,10 +19,13 @@
  * What a menu model remembers of its rows, by their paths; looks at no file.
  *
  * It is there so that a row that was read once is shown without a look at the disk, and it holds
- * nothing of a row that went: that is forgotten with forgetTree().
+ * nothing of a row that went: that is forgotten with forgetTree(). An object, so that the icon
+ * provider notices when it is gone.
  */
-class RowCache
+class RowCache : public QObject
 {
+    Q_OBJECT
+
 public:
     /// How a row is shown.
     struct Display
@@ -31,6 +35,7 @@ public:
     };
 
     RowCache();
+    ~RowCache() override;
 
     /// How \a path is shown, if that is known; the name may be empty.
     std::optional<Display> display(const QString &path) const;

@@ -34,8 +34,8 @@ VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *view, QObj
     , m_dropHost(MenuDropHost::create(view, parent))
     , rootDir(rootDirectory)
     , m_watch(new FolderWatch(this))
-    , m_cache(std::make_shared<RowCache>())
-    , m_icons(new MenuIconProvider(m_cache, QCoreApplication::instance()))
+    , m_cache(std::make_unique<RowCache>())
+    , m_icons(new MenuIconProvider(m_cache.get(), QCoreApplication::instance()))
 {
     setIconProvider(m_icons->provider());
     connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);

@@ -83,7 +83,7 @@ private:
     std::unique_ptr<MenuDropHost> m_dropHost;
     QString rootDir;
     FolderWatch *m_watch;
-    std::shared_ptr<RowCache> m_cache;
+    std::unique_ptr<RowCache> m_cache;
     // The base class uses the provider to its own end, which is behind that of this class.
     QPointer<MenuIconProvider> m_icons;
     // The paths of the rows that are about to go.
