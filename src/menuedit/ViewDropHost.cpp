@@ -38,9 +38,8 @@ public:
 
     std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) override
     {
-        if (!m_view)
-            return std::nullopt;
-        return ShownOrder::with(*proxy(), name, row, folder);
+        const QSortFilterProxyModel *shown = m_view ? proxy() : nullptr;
+        return shown ? std::optional<QStringList>(ShownOrder::with(*shown, name, row, folder)) : std::nullopt;
     }
 
     void finished(const DropResult &result) override
@@ -67,8 +66,9 @@ private:
     void tellAt(const QString &path, const QString &text) const
     {
         QModelIndex shown;
-        const auto *files = qobject_cast<const QFileSystemModel *>(proxy()->sourceModel());
-        if (QFileInfo::exists(path))
+        const auto *files =
+            proxy() ? qobject_cast<const QFileSystemModel *>(proxy()->sourceModel()) : nullptr;
+        if (files && QFileInfo::exists(path))
             shown = proxy()->mapFromSource(files->index(path));
         const QRect area = shown.isValid() ? m_view->visualRect(shown) : QRect();
         const QPoint place = area.isValid() ? area.bottomLeft() : m_view->viewport()->rect().center();
