@@ -1,198 +1,34 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "HouseRules.h"
+#include "SourceFiles.h"
 #include "TestCase.h"
 
 #include <QDir>
-#include <QDirIterator>
-#include <QFile>
-#include <QFileInfo>
 
 namespace {
 
-const QString sourceDir = QStringLiteral(VEL_SOURCE_DIR);
-
-// A folder of the house and the folders whose files its own may include. A folder may always
-// include its own files; "include" stands for the public headers, "platform" for the public
-// headers of all three platform libraries.
-struct Rule
+bool isPublicHeader(const QString &file)
 {
-    const char *folder;
-    QStringList allowed;
-};
-
-const QVector<Rule> &rules()
-{
-    static const auto text = [](const char *list) {
-        return QString::fromLatin1(list).split(QLatin1Char(' '));
-    };
-    static const QVector<Rule> all{
-        {"platform/rules", {}},
-        {"platform/velcore", {}},
-        {"platform/veluiaux", text("platform/rules platform/velcore/include")},
-        {"platform/velintegration",
-         text("platform/rules platform/velcore/include platform/veluiaux/include")},
-        {"platform/programs", text("platform platform/rules")},
-        {"include", {}},
-        {"src/frame", text("platform")},
-        {"src/settings", text("include")},
-        {"src/widgets", text("include")},
-        {"src/icons", text("include src/frame platform")},
-        {"src/shortcuts", text("include src/frame platform")},
-        {"src/desktopentry", text("include src/frame platform")},
-        {"src/menuedit", text("include src/frame platform")},
-        {"apps", text("include platform")},
-        {"designer", text("include")},
-        {"examples", text("include platform")},
-    };
-    return all;
+    return SourceFiles::isBelow(file, QStringLiteral("include"));
 }
 
-// Which subsystem a public header belongs to. Across subsystems only these arrows exist, and only
-// from a .cpp file: the menu view opens the entry editor, the entry editor opens the menu dialog,
-// and the menu model shows the icons of the provider.
-struct Door
+// The public header of one subsystem is included in another through a door alone.
+bool isAllowedHeader(const HouseRules &rules, const QString &folder, const QString &includer,
+                     const QString &header)
 {
-    const char *from;
-    const char *header;
-};
-
-const Door doors[] = {
-    {"src/menuedit", "VelDesktopEntryEditDialog.h"},
-    {"src/desktopentry", "VelMenuDialog.h"},
-    {"src/menuedit", "VelMimeTypeIconProvider.h"},
-};
-
-// A program that makes no window may link the internal objects, for the rules alone.
-struct RuleHeader
-{
-    const char *program;
-    const char *header;
-};
-
-const RuleHeader ruleHeaders[] = {
-    {"apps/vel-menuprint", "src/menuedit/SortOrder.h"},
-    {"apps/vel-menuprint", "src/menuedit/ItemOrder.h"},
-    {"apps/vel-menuprint", "src/menuedit/EntryDisplay.h"},
-    {"apps/vel-menuprint", "src/frame/EntryPath.h"},
-    {"apps/vel-menuprint", "src/frame/DesktopEntryRecord.h"},
-};
-
-QString subsystemOf(const QString &publicHeader)
-{
-    const QString source = QFileInfo(publicHeader).completeBaseName();
-    for (const Rule &rule : rules()) {
-        const QString folder = QString::fromLatin1(rule.folder);
-        if (folder.startsWith(QLatin1String("src/"))
-            && QFile::exists(sourceDir + QLatin1Char('/') + folder + QLatin1Char('/') + source
-                             + QStringLiteral(".cpp")))
-            return folder;
-    }
-    return QString();
+    const bool isOwn = SourceFiles::isBelow(SourceFiles::unitOf(header), folder);
+    return isOwn || rules.isDoor(includer, header);
 }
 
-struct Include
+bool isAllowed(const HouseRules &rules, const QString &folder, const QString &includer, const QString &file)
 {
-    QString file; // of ours, relative to the source folder; empty for what is not ours
-    QString written;
-    int line;
-};
-
-QString relative(const QString &path)
-{
-    return QDir(sourceDir).relativeFilePath(QDir::cleanPath(path));
-}
-
-// The file of ours that an include names, tried in the order in which the compiler would.
-QString resolve(const QString &includer, const QString &written)
-{
-    QStringList candidates{QFileInfo(includer).absolutePath(), sourceDir + QStringLiteral("/src"),
-                           sourceDir + QStringLiteral("/include"), sourceDir + QStringLiteral("/apps")};
-    candidates << sourceDir + QStringLiteral("/platform/rules");
-    for (const char *library : {"velcore", "veluiaux", "velintegration"}) {
-        candidates << sourceDir + QStringLiteral("/platform/%1/include").arg(QLatin1String(library))
-                   << sourceDir + QStringLiteral("/platform/%1").arg(QLatin1String(library));
-    }
-    for (const QString &candidate : qAsConst(candidates)) {
-        const QString path = candidate + QLatin1Char('/') + written;
-        if (QFileInfo(path).isFile())
-            return relative(path);
-    }
-    return QString();
-}
-
-QVector<Include> includesOf(const QString &path)
-{
-    QVector<Include> includes;
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly))
-        return includes;
-    static const QRegularExpression pattern(QStringLiteral("^\\s*#\\s*include\\s*[<\"]([^>\"]+)[>\"]"));
-    int number = 0;
-    while (!file.atEnd()) {
-        ++number;
-        const QRegularExpressionMatch match = pattern.match(QString::fromUtf8(file.readLine()));
-        if (match.hasMatch())
-            includes.append({resolve(path, match.captured(1)), match.captured(1), number});
-    }
-    return includes;
-}
-
-QStringList sourcesBelow(const QString &folder)
-{
-    QStringList files;
-    QDirIterator iterator(sourceDir + QLatin1Char('/') + folder,
-                          {QStringLiteral("*.h"), QStringLiteral("*.cpp"), QStringLiteral("*.c")},
-                          QDir::Files, QDirIterator::Subdirectories);
-    while (iterator.hasNext())
-        files.append(iterator.next());
-    files.sort();
-    return files;
-}
-
-bool isBelow(const QString &file, const QString &folder)
-{
-    return file.startsWith(folder + QLatin1Char('/'));
-}
-
-bool isPlatformHeader(const QString &file)
-{
-    return file.startsWith(QLatin1String("platform/"))
-        && file.section(QLatin1Char('/'), 2, 2) == QLatin1String("include");
-}
-
-bool isAllowedFolder(const Rule &rule, const QString &file)
-{
-    if (isBelow(file, QString::fromLatin1(rule.folder)))
+    if (rules.isRuleHeader(includer, file))
         return true;
-    for (const QString &folder : rule.allowed) {
-        if (folder == QLatin1String("platform") ? isPlatformHeader(file) : isBelow(file, folder))
-            return true;
-    }
-    return false;
-}
-
-bool isOpenDoor(const QString &folder, const QString &includer, const QString &header)
-{
-    if (subsystemOf(header) == folder)
-        return true;
-    if (!includer.endsWith(QLatin1String(".cpp")))
-        return false;
-    for (const Door &door : doors) {
-        if (folder == QLatin1String(door.from)
-            && header == QLatin1String("include/") + QLatin1String(door.header))
-            return true;
-    }
-    return false;
-}
-
-bool isRuleHeader(const QString &includer, const QString &header)
-{
-    for (const RuleHeader &rule : ruleHeaders) {
-        if (isBelow(includer, QString::fromLatin1(rule.program)) && header == QLatin1String(rule.header))
-            return true;
-    }
-    return false;
+    if (folder.startsWith(QLatin1String("src/")) && isPublicHeader(file))
+        return isAllowedHeader(rules, folder, includer, file);
+    return rules.allowsFolder(folder, file);
 }
 
 } // namespace
@@ -206,34 +42,29 @@ private Q_SLOTS:
     void everyArrowIsAllowed_data();
     void everyArrowIsAllowed();
     void everySourceFolderHasARule();
+    void everyWordOfTheTableIsUnderstood();
     void platformCoreKnowsNoQt();
     void recordsAreReachedThroughTheirInterface();
     void reportsAnArrowThatIsNotAllowed();
+    void reportsAWordThatIsNotUnderstood();
 };
 
 void tst_IncludeRules::everyArrowIsAllowed_data()
 {
-    QTest::addColumn<int>("index");
-    for (int i = 0; i < rules().size(); ++i)
-        QTest::newRow(rules().at(i).folder) << i;
+    QTest::addColumn<QString>("folder");
+    for (const QString &folder : HouseRules::inForce().folders())
+        QTest::newRow(qPrintable(folder)) << folder;
 }
 
 void tst_IncludeRules::everyArrowIsAllowed()
 {
-    QFETCH(int, index);
-    const Rule &rule = rules().at(index);
-    const QString folder = QString::fromLatin1(rule.folder);
+    QFETCH(QString, folder);
+    const QStringList files = SourceFiles::below(folder);
+    QVERIFY(!files.isEmpty());
     QStringList wrong;
-    for (const QString &path : sourcesBelow(folder)) {
-        const QString includer = relative(path);
-        for (const Include &include : includesOf(path)) {
-            if (include.file.isEmpty())
-                continue;
-            bool allowed = isAllowedFolder(rule, include.file) || isRuleHeader(includer, include.file);
-            if (allowed && isBelow(include.file, QStringLiteral("include"))
-                && folder.startsWith(QLatin1String("src/")))
-                allowed = isOpenDoor(folder, includer, include.file);
-            if (!allowed)
+    for (const QString &includer : files) {
+        for (const SourceFiles::Include &include : SourceFiles::includesOf(includer)) {
+            if (!include.file.isEmpty() && !isAllowed(HouseRules::inForce(), folder, includer, include.file))
                 wrong.append(
                     QStringLiteral("%1:%2 includes %3").arg(includer).arg(include.line).arg(include.file));
         }
@@ -243,59 +74,73 @@ void tst_IncludeRules::everyArrowIsAllowed()
 
 void tst_IncludeRules::everySourceFolderHasARule()
 {
+    const QStringList ruled = HouseRules::inForce().folders();
     for (const QString &parent : {QStringLiteral("src"), QStringLiteral("platform")}) {
         const QStringList folders =
-            QDir(sourceDir + QLatin1Char('/') + parent).entryList(QDir::Dirs | QDir::NoDotAndDotDot);
+            QDir(SourceFiles::absolute(parent)).entryList(QDir::Dirs | QDir::NoDotAndDotDot);
         QVERIFY(!folders.isEmpty());
         for (const QString &name : folders) {
             const QString folder = parent + QLatin1Char('/') + name;
-            if (sourcesBelow(folder).isEmpty())
-                continue;
-            const auto isThisFolder = [&folder](const Rule &rule) {
-                return folder == QLatin1String(rule.folder);
-            };
-            QVERIFY2(std::any_of(rules().begin(), rules().end(), isThisFolder), qPrintable(folder));
+            if (!SourceFiles::below(folder).isEmpty())
+                QVERIFY2(ruled.contains(folder), qPrintable(folder));
         }
     }
+    for (const char *folder : {"include", "apps", "examples", "designer"})
+        QVERIFY2(ruled.contains(QLatin1String(folder)), folder);
+}
+
+void tst_IncludeRules::everyWordOfTheTableIsUnderstood()
+{
+    const QStringList errors = HouseRules::inForce().errors();
+    QVERIFY2(errors.isEmpty(), qPrintable(errors.join(QLatin1Char('\n'))));
 }
 
 void tst_IncludeRules::platformCoreKnowsNoQt()
 {
-    const QStringList files = sourcesBelow(QStringLiteral("platform/velcore"));
+    const QStringList files = SourceFiles::below(QStringLiteral("platform/velcore"));
     QVERIFY(!files.isEmpty());
-    for (const QString &path : files) {
-        for (const Include &include : includesOf(path))
-            QVERIFY2(!include.written.startsWith(QLatin1Char('Q')),
-                     qPrintable(relative(path) + include.written));
+    for (const QString &file : files) {
+        for (const SourceFiles::Include &include : SourceFiles::includesOf(file))
+            QVERIFY2(!include.written.startsWith(QLatin1Char('Q')), qPrintable(file + include.written));
     }
 }
 
 void tst_IncludeRules::recordsAreReachedThroughTheirInterface()
 {
-    for (const QString &path : sourcesBelow(QStringLiteral("src"))) {
-        if (isBelow(relative(path), QStringLiteral("src/frame")))
+    for (const QString &file : SourceFiles::below(QStringLiteral("src"))) {
+        if (SourceFiles::isBelow(file, QStringLiteral("src/frame")))
             continue;
-        for (const Include &include : includesOf(path))
-            QVERIFY2(!include.written.startsWith(QLatin1String("veluiaux/VelUIDesktop")),
-                     qPrintable(relative(path)));
+        for (const SourceFiles::Include &include : SourceFiles::includesOf(file))
+            QVERIFY2(!include.written.startsWith(QLatin1String("veluiaux/VelUIDesktop")), qPrintable(file));
     }
 }
 
 void tst_IncludeRules::reportsAnArrowThatIsNotAllowed()
 {
-    const auto rule = std::find_if(rules().begin(), rules().end(),
-                                   [](const Rule &each) { return !qstrcmp(each.folder, "src/menuedit"); });
-    QVERIFY(rule != rules().end());
-    QVERIFY(isAllowedFolder(*rule, QStringLiteral("src/frame/DesktopEntryRecord.h")));
-    QVERIFY(isAllowedFolder(*rule, QStringLiteral("platform/velcore/include/velcore/dirs.h")));
-    QVERIFY(!isAllowedFolder(*rule, QStringLiteral("platform/velcore/environment.h")));
-    QVERIFY(!isAllowedFolder(*rule, QStringLiteral("src/desktopentry/FormLayout.h")));
-    QVERIFY(!isOpenDoor(QStringLiteral("src/menuedit"), QStringLiteral("src/menuedit/VelMenuView.h"),
-                        QStringLiteral("include/VelDesktopEntryEditDialog.h")));
-    QVERIFY(isOpenDoor(QStringLiteral("src/menuedit"), QStringLiteral("src/menuedit/VelMenuView.cpp"),
+    const HouseRules &rules = HouseRules::inForce();
+    const QString menuedit = QStringLiteral("src/menuedit");
+    const QString view = QStringLiteral("src/menuedit/VelMenuView.cpp");
+    QVERIFY(isAllowed(rules, menuedit, view, QStringLiteral("src/frame/DesktopEntryRecord.h")));
+    QVERIFY(isAllowed(rules, menuedit, view, QStringLiteral("platform/velcore/include/velcore/dirs.h")));
+    QVERIFY(!isAllowed(rules, menuedit, view, QStringLiteral("platform/velcore/environment.h")));
+    QVERIFY(!isAllowed(rules, menuedit, view, QStringLiteral("src/desktopentry/FormLayout.h")));
+    QVERIFY(isAllowed(rules, menuedit, view, QStringLiteral("include/VelMenuView.h")));
+    QVERIFY(isAllowed(rules, menuedit, view, QStringLiteral("include/VelDesktopEntryEditDialog.h")));
+    QVERIFY(!isAllowed(rules, menuedit, QStringLiteral("src/menuedit/VelMenuView.h"),
                        QStringLiteral("include/VelDesktopEntryEditDialog.h")));
-    QVERIFY(!isOpenDoor(QStringLiteral("src/desktopentry"), QStringLiteral("src/desktopentry/FormLayout.cpp"),
-                        QStringLiteral("include/VelDesktopEntryEditDialog2.h")));
+    QVERIFY(!isAllowed(rules, menuedit, view, QStringLiteral("include/EditShortcutsDialog.h")));
+    QVERIFY(!isAllowed(rules, QStringLiteral("apps"), QStringLiteral("apps/vel-gallery/main.cpp"),
+                       QStringLiteral("src/menuedit/SortOrder.h")));
+}
+
+void tst_IncludeRules::reportsAWordThatIsNotUnderstood()
+{
+    const HouseRules rules(QStringLiteral("| folder | is | may include |\n|---|---|---|\n"
+                                          "| `src/a`, `src/b` | two | frame, cellar |\n"));
+    QCOMPARE(rules.folders(), (QStringList{QStringLiteral("src/a"), QStringLiteral("src/b")}));
+    QCOMPARE(rules.errors().size(), 1);
+    QVERIFY(rules.allowsFolder(QStringLiteral("src/b"), QStringLiteral("src/frame/x.h")));
+    QVERIFY(!rules.allowsFolder(QStringLiteral("src/b"), QStringLiteral("src/cellar/x.h")));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_IncludeRules)
