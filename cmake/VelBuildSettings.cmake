@@ -10,7 +10,7 @@ set(VEL_PLATFORM "bundled" CACHE STRING
     "Which platform libraries to use: \"bundled\" builds those under platform/, \"system\" takes installed ones")
 set_property(CACHE VEL_PLATFORM PROPERTY STRINGS bundled system)
 set(VEL_TRANSLATIONS_DIR "/usr/share/vel/translations" CACHE STRING
-    "Directory of the translation catalogues; empty switches the look-up off")
+    "Directory of the translation catalogs; empty switches the look-up off")
 set(VEL_SANITIZE "" CACHE STRING "Sanitizers to build with, for instance \"address,undefined\"")
 
 if(NOT VEL_PLATFORM MATCHES "^(bundled|system)$")
@@ -31,7 +31,7 @@ set(CMAKE_POSITION_INDEPENDENT_CODE ON)
 set(CMAKE_AUTOMOC ON)
 set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
 
-# Libraries and programs side by side: a program run from the build tree finds its neighbours.
+# Libraries and programs side by side: a program run from the build tree finds its neighbors.
 set(CMAKE_RUNTIME_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/bin")
 set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/lib")
 set(CMAKE_ARCHIVE_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/lib")

@@ -145,7 +145,7 @@ public:
     /**
      * Creates a folder or an entry beside or in the selected item and opens the editor on it.
      *
-     * When the editor is cancelled, what was created is taken away again.
+     * When the editor is canceled, what was created is taken away again.
      *
      * @param folder whether to create a folder instead of an entry
      * @return whether the item was made and kept

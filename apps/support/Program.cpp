@@ -15,7 +15,7 @@
 
 namespace {
 
-bool loadCatalogue(const QString &name, const QString &directory)
+bool loadCatalog(const QString &name, const QString &directory)
 {
     // Without a directory Qt would look in the working directory.
     if (directory.isEmpty())
@@ -36,16 +36,16 @@ void Program::describe(const QString &name)
     QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));
 }
 
-void Program::loadCatalogues()
+void Program::loadCatalogs()
 {
     // The buttons of message boxes and what the command line's parser says.
-    loadCatalogue(QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
+    loadCatalog(QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
 
     const QString name = QStringLiteral("veluiextra-tools");
     const QString besideProgram =
         QCoreApplication::applicationDirPath() + QLatin1String("/../share/vel/translations");
-    if (!loadCatalogue(name, besideProgram))
-        loadCatalogue(name, QStringLiteral(VEL_TRANSLATIONS_DIR));
+    if (!loadCatalog(name, besideProgram))
+        loadCatalog(name, QStringLiteral(VEL_TRANSLATIONS_DIR));
 }
 
 bool Program::mayWantNoWindow(int argc, char **argv)

@@ -25,11 +25,11 @@ void describe(const QString &name);
  * Makes the programs' and Qt's own texts speak the user's language; goes after the application object,
  * which owns the translators.
  *
- * The programs' catalogue is taken from the directory "../share/vel/translations" beside the program,
+ * The programs' catalog is taken from the directory "../share/vel/translations" beside the program,
  * so that a program works from any prefix, else from the library's fixed directory. Without a
- * catalogue the texts stay English.
+ * catalog the texts stay English.
  */
-void loadCatalogues();
+void loadCatalogs();
 
 /// Whether help or the version may be asked for, which are to be had without a display.
 bool mayWantNoWindow(int argc, char **argv);
@@ -60,7 +60,7 @@ template <typename Application, typename Parse, typename Run>
 int runAs(int &argc, char **argv, int wrongUsage, Parse parse, Run run)
 {
     Application application(argc, argv);
-    loadCatalogues();
+    loadCatalogs();
     const auto options = parse();
     return options.error.isEmpty() ? run(options) : fail(options.error, wrongUsage);
 }

@@ -18,7 +18,7 @@ private Q_SLOTS:
     void showsHelpAndVersionWithoutADisplay_data();
     void showsHelpAndVersionWithoutADisplay();
     void saysThatItCannotOpenAMissingFile();
-    void endsWithOneWhenCancelled();
+    void endsWithOneWhenCanceled();
     void leavesTheFileWhenNothingWasChanged();
     void createsAnEntryThatRuns();
     void takesATemplate();
@@ -137,7 +137,7 @@ void tst_vel_entryedit::saysThatItCannotOpenAMissingFile()
     QCOMPARE(program.readAllStandardError(), "vel-entryedit: cannot open " + missing.toLocal8Bit() + '\n');
 }
 
-void tst_vel_entryedit::endsWithOneWhenCancelled()
+void tst_vel_entryedit::endsWithOneWhenCanceled()
 {
     const QByteArray bytes = "[Desktop Entry]\nType=Application\nName=a\nExec=true\n";
     const QString file = write(QStringLiteral("a.desktop"), bytes);

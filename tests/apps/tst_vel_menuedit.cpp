@@ -32,7 +32,7 @@ private Q_SLOTS:
     void warnsWhenNobodyIsTold();
     void picksAnEntry_data();
     void picksAnEntry();
-    void picksNothingWhenCancelled();
+    void picksNothingWhenCanceled();
     void showsTheDirectoryGivenUnderItsName();
     void editsUnlessToldToLookOnly_data();
     void editsUnlessToldToLookOnly();
@@ -316,7 +316,7 @@ void tst_vel_menuedit::picksAnEntry()
     QCOMPARE(program.readAllStandardOutput(), QFile::encodeName(entry) + '\n' + command);
 }
 
-void tst_vel_menuedit::picksNothingWhenCancelled()
+void tst_vel_menuedit::picksNothingWhenCanceled()
 {
     write(QStringLiteral("menu/a.desktop"), "[Desktop Entry]\nType=Application\nName=A\nExec=true\n");
     QProcess program;

@@ -57,10 +57,10 @@ private Q_SLOTS:
     void putsANewItemIntoTheSelectedFolderOrBesideTheSelectedFile();
     void showsANewEntryAsItWasEdited();
     void doesNotListANewItem();
-    void leavesNothingOfACancelledItem_data();
-    void leavesNothingOfACancelledItem();
-    void leavesWhatOthersPutIntoACancelledFolder();
-    void selectsNothingAfterACancelledCreation();
+    void leavesNothingOfACanceledItem_data();
+    void leavesNothingOfACanceledItem();
+    void leavesWhatOthersPutIntoACanceledFolder();
+    void selectsNothingAfterACanceledCreation();
     void keepsAFolderWhoseRecordCannotBeWritten();
     void goesAwayWhileANewItemIsEdited();
     void editsTheSelectedEntry();
@@ -204,7 +204,7 @@ void tst_VelMenuViewEdit::doesNotListANewItem()
     QCOMPARE(read(menu() + QLatin1String("/.directory")), before);
 }
 
-void tst_VelMenuViewEdit::leavesNothingOfACancelledItem_data()
+void tst_VelMenuViewEdit::leavesNothingOfACanceledItem_data()
 {
     QTest::addColumn<bool>("folder");
     QTest::addColumn<bool>("editorSaved");
@@ -214,7 +214,7 @@ void tst_VelMenuViewEdit::leavesNothingOfACancelledItem_data()
     QTest::newRow("folder that the editor wrote") << true << true;
 }
 
-void tst_VelMenuViewEdit::leavesNothingOfACancelledItem()
+void tst_VelMenuViewEdit::leavesNothingOfACanceledItem()
 {
     QFETCH(bool, folder);
     QFETCH(bool, editorSaved);
@@ -233,7 +233,7 @@ void tst_VelMenuViewEdit::leavesNothingOfACancelledItem()
     QCOMPARE(changes.count(), 1);
 }
 
-void tst_VelMenuViewEdit::leavesWhatOthersPutIntoACancelledFolder()
+void tst_VelMenuViewEdit::leavesWhatOthersPutIntoACanceledFolder()
 {
     VelMenuView view(menu(), -1, true);
     ModalDriver modal;
@@ -245,7 +245,7 @@ void tst_VelMenuViewEdit::leavesWhatOthersPutIntoACancelledFolder()
     QCOMPARE(everythingIn(menu()).join(QLatin1Char(' ')), QStringLiteral("group group/mine.desktop"));
 }
 
-void tst_VelMenuViewEdit::selectsNothingAfterACancelledCreation()
+void tst_VelMenuViewEdit::selectsNothingAfterACanceledCreation()
 {
     const QString a = writeLetters("ab").constFirst();
     VelMenuView view(menu(), -1, true);

@@ -17,7 +17,7 @@ class tst_VelMenuViewFind : public FindTestCase
 
 private Q_SLOTS:
     void doesNothingWithoutAText();
-    void doesNothingAfterACancelledQuestion();
+    void doesNothingAfterACanceledQuestion();
     void offersTheLastTextAgain();
     void findsAnywhereInShownNamesWithoutRegardToCase_data();
     void findsAnywhereInShownNamesWithoutRegardToCase();
@@ -48,7 +48,7 @@ void tst_VelMenuViewFind::doesNothingWithoutAText()
     QVERIFY(modal.finished());
 }
 
-void tst_VelMenuViewFind::doesNothingAfterACancelledQuestion()
+void tst_VelMenuViewFind::doesNothingAfterACanceledQuestion()
 {
     const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
     VelMenuView view(menu(), -1, true);

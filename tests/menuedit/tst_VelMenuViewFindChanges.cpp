@@ -68,7 +68,7 @@ void tst_VelMenuViewFindChanges::goesOnBehindTheMatchShownWhenOneBeforeItVanishe
 void tst_VelMenuViewFindChanges::searchesAnewAfterAnEditingOperation_data()
 {
     QTest::addColumn<QString>("operation");
-    for (const char *operation : {"up", "delete", "cancelled creation"})
+    for (const char *operation : {"up", "delete", "canceled creation"})
         QTest::newRow(operation) << QString::fromLatin1(operation);
 }
 

@@ -24,7 +24,7 @@ class tst_VelMenuViewInit : public EditTestCase
 private Q_SLOTS:
     void init();
     void keepsANewEntryThatIsAcceptedAfterwards();
-    void takesANewEntryBackThatIsCancelledAfterwards();
+    void takesANewEntryBackThatIsCanceledAfterwards();
     void deletesNothing();
     void pastesNothing();
     void forgetsWhatWasSearched();
@@ -56,7 +56,7 @@ void tst_VelMenuViewInit::keepsANewEntryThatIsAcceptedAfterwards()
     QVERIFY(QFile::exists(menu() + QLatin1String("/shortcut.desktop")));
 }
 
-void tst_VelMenuViewInit::takesANewEntryBackThatIsCancelledAfterwards()
+void tst_VelMenuViewInit::takesANewEntryBackThatIsCanceledAfterwards()
 {
     VelMenuView view(menu(), -1, true);
     ModalDriver modal;

@@ -163,14 +163,14 @@ void tst_startmenu::namesEveryFolderInAllLanguages()
     QCOMPARE(VelUIDesktopEntry(file).getLocalName(), chinese);
     const QByteArray bytes = read(file);
     const QString prefix = QStringLiteral("libveluiextra_");
-    const QStringList catalogues =
+    const QStringList catalogs =
         QDir(QStringLiteral(VEL_SOURCE_DIR "/translations")).entryList({prefix + QStringLiteral("*.ts")});
-    QVERIFY(!catalogues.isEmpty());
-    for (const QString &catalogue : catalogues) {
-        const QByteArray language = catalogue.mid(prefix.size()).chopped(3).toUtf8();
+    QVERIFY(!catalogs.isEmpty());
+    for (const QString &catalog : catalogs) {
+        const QByteArray language = catalog.mid(prefix.size()).chopped(3).toUtf8();
         QVERIFY2(bytes.count("\nName[" + language + "]=") == 1, language.constData());
     }
-    QCOMPARE(bytes.count("\nName["), catalogues.size());
+    QCOMPARE(bytes.count("\nName["), catalogs.size());
 }
 
 void tst_startmenu::givesEveryFolderAnIconOfItsOwn()

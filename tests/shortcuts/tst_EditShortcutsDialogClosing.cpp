@@ -21,7 +21,7 @@ private Q_SLOTS:
     void closesUnaskedWhileNothingIsChanged();
     void asksBeforeItCloses_data();
     void asksBeforeItCloses();
-    void staysOpenWhenClosingIsCancelled();
+    void staysOpenWhenClosingIsCanceled();
     void survivesTheDeletionOfTheCurrentAction();
     void survivesItsDeletionInsideAMessage();
     void survivesItsDeletionOnOk();
@@ -128,7 +128,7 @@ void tst_EditShortcutsDialogClosing::asksBeforeItCloses()
     QTEST(pendingKey("open"), "key");
 }
 
-void tst_EditShortcutsDialogClosing::staysOpenWhenClosingIsCancelled()
+void tst_EditShortcutsDialogClosing::staysOpenWhenClosingIsCanceled()
 {
     m_dialog->show();
     select("open");

@@ -229,7 +229,7 @@ void tst_ShortcutPersistence::savesTheKeysInForce()
     model.saveKeys(m_settings.get(), QString());
     QCOMPARE(m_settings->value(str("a")), QVariant(str("F2")));
 
-    // Cancelled edits.
+    // Canceled edits.
     model.setKeySequence(model.index(0, 0, model.index(0, 0)), f3);
     model.resetShortcuts();
     model.saveKeys(m_settings.get(), QString());

@@ -18,19 +18,19 @@ private Q_SLOTS:
     void isTakenFromBesideTheProgram();
     void isTakenFromTheFixedDirectoryElse();
     void ofTheProgramGoesBeforeTheFixedDirectory();
-    void staysEnglishWithoutACatalogue();
+    void staysEnglishWithoutACatalog();
     void reachesTheHelp();
     void reachesTheTextsOfQt();
 
 private:
-    /// Copies the compiled catalogue of \a from into \a directory as that of \a to.
-    void installCatalogue(const QString &directory, const QString &from, const QString &to);
+    /// Copies the compiled catalog of \a from into \a directory as that of \a to.
+    void installCatalog(const QString &directory, const QString &from, const QString &to);
     /// What the copied program says on standard error about an unknown format.
     QString complaint(const QString &language);
     QString run(const QString &language, const QStringList &arguments, bool errors);
 };
 
-void tst_ProgramLanguage::installCatalogue(const QString &directory, const QString &from, const QString &to)
+void tst_ProgramLanguage::installCatalog(const QString &directory, const QString &from, const QString &to)
 {
     QVERIFY(QDir().mkpath(directory));
     QVERIFY(QFile::copy(QStringLiteral(VEL_COMPILED_DIR "/veluiextra-tools_%1.qm").arg(from),
@@ -78,34 +78,34 @@ void tst_ProgramLanguage::isTakenFromBesideTheProgram()
 {
     QFETCH(QString, language);
     QFETCH(QString, expected);
-    installCatalogue(path(QStringLiteral("prefix/share/vel/translations")), language, language);
+    installCatalog(path(QStringLiteral("prefix/share/vel/translations")), language, language);
     QCOMPARE(complaint(language), QStringLiteral("vel-menuprint: %1\n").arg(expected));
 }
 
 void tst_ProgramLanguage::isTakenFromTheFixedDirectoryElse()
 {
-    installCatalogue(path(QStringLiteral("fixed")), QStringLiteral("de"), QStringLiteral("de"));
+    installCatalog(path(QStringLiteral("fixed")), QStringLiteral("de"), QStringLiteral("de"));
     QCOMPARE(complaint(QStringLiteral("de")), QStringLiteral("vel-menuprint: unbekanntes Format: xyz\n"));
 }
 
 void tst_ProgramLanguage::ofTheProgramGoesBeforeTheFixedDirectory()
 {
-    installCatalogue(path(QStringLiteral("prefix/share/vel/translations")), QStringLiteral("de"),
-                     QStringLiteral("de"));
-    installCatalogue(path(QStringLiteral("fixed")), QStringLiteral("fr"), QStringLiteral("de"));
+    installCatalog(path(QStringLiteral("prefix/share/vel/translations")), QStringLiteral("de"),
+                   QStringLiteral("de"));
+    installCatalog(path(QStringLiteral("fixed")), QStringLiteral("fr"), QStringLiteral("de"));
     QCOMPARE(complaint(QStringLiteral("de")), QStringLiteral("vel-menuprint: unbekanntes Format: xyz\n"));
 }
 
-void tst_ProgramLanguage::staysEnglishWithoutACatalogue()
+void tst_ProgramLanguage::staysEnglishWithoutACatalog()
 {
-    installCatalogue(path(QStringLiteral("fixed")), QStringLiteral("fr"), QStringLiteral("fr"));
+    installCatalog(path(QStringLiteral("fixed")), QStringLiteral("fr"), QStringLiteral("fr"));
     QCOMPARE(complaint(QStringLiteral("de")), QStringLiteral("vel-menuprint: unknown format: xyz\n"));
 }
 
 void tst_ProgramLanguage::reachesTheHelp()
 {
-    installCatalogue(path(QStringLiteral("prefix/share/vel/translations")), QStringLiteral("de"),
-                     QStringLiteral("de"));
+    installCatalog(path(QStringLiteral("prefix/share/vel/translations")), QStringLiteral("de"),
+                   QStringLiteral("de"));
     const QString help = run(QStringLiteral("de"), {QStringLiteral("--help")}, false);
     QVERIFY2(help.contains(QStringLiteral("Gibt einen Menüordner in seiner Reihenfolge aus.")),
              qPrintable(help));

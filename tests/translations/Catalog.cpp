@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "Catalogue.h"
+#include "Catalog.h"
 
 #include <QFile>
 #include <QXmlStreamReader>
@@ -56,30 +56,30 @@ QString Message::line() const
     return line;
 }
 
-Catalogue Catalogue::read(const QString &path)
+Catalog Catalog::read(const QString &path)
 {
-    Catalogue catalogue;
+    Catalog catalog;
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly)) {
-        catalogue.error = path + QLatin1String(": ") + file.errorString();
-        return catalogue;
+        catalog.error = path + QLatin1String(": ") + file.errorString();
+        return catalog;
     }
     QXmlStreamReader xml(&file);
     if (xml.readNextStartElement() && xml.name() == QLatin1String("TS")) {
-        catalogue.language = xml.attributes().value(QLatin1String("language")).toString();
+        catalog.language = xml.attributes().value(QLatin1String("language")).toString();
         while (xml.readNextStartElement()) {
             if (xml.name() == QLatin1String("context"))
-                readContext(&xml, &catalogue.messages);
+                readContext(&xml, &catalog.messages);
             else
                 xml.skipCurrentElement();
         }
     }
     if (xml.hasError())
-        catalogue.error = path + QLatin1String(": ") + xml.errorString();
-    return catalogue;
+        catalog.error = path + QLatin1String(": ") + xml.errorString();
+    return catalog;
 }
 
-QStringList Catalogue::lines() const
+QStringList Catalog::lines() const
 {
     QStringList lines;
     for (const Message &message : messages)

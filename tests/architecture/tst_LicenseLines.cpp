@@ -6,9 +6,9 @@
 #include <QDir>
 #include <QDirIterator>
 
-// Every file says whose it is and under which licence; pictures and lists of data are covered by
-// the licence of the project.
-class tst_LicenceLines : public TestCase
+// Every file says whose it is and under which license; pictures and lists of data are covered by
+// the license of the project.
+class tst_LicenseLines : public TestCase
 {
     Q_OBJECT
 
@@ -17,14 +17,14 @@ private Q_SLOTS:
     void standInEveryFile();
 };
 
-void tst_LicenceLines::standInEveryFile_data()
+void tst_LicenseLines::standInEveryFile_data()
 {
     QTest::addColumn<QString>("pattern");
     for (const char *pattern : {"*.cpp", "*.h", "CMakeLists.txt", "*.cmake", "*.svg"})
         QTest::newRow(pattern) << QString::fromLatin1(pattern);
 }
 
-void tst_LicenceLines::standInEveryFile()
+void tst_LicenseLines::standInEveryFile()
 {
     QFETCH(QString, pattern);
     const QDir source(QStringLiteral(VEL_SOURCE_DIR));
@@ -48,6 +48,6 @@ void tst_LicenceLines::standInEveryFile()
     QVERIFY2(without.isEmpty(), qPrintable(without.join(QLatin1Char('\n'))));
 }
 
-VEL_TEST_GUILESS_MAIN(tst_LicenceLines)
+VEL_TEST_GUILESS_MAIN(tst_LicenseLines)
 
-#include "tst_LicenceLines.moc"
+#include "tst_LicenseLines.moc"

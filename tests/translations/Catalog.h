@@ -7,7 +7,7 @@
 #include <QStringList>
 #include <QVector>
 
-/// One text of a catalogue's source file.
+/// One text of a catalog's source file.
 struct Message
 {
     QString context;
@@ -20,14 +20,14 @@ struct Message
     QString line() const;
 };
 
-/// A catalogue's source file.
-struct Catalogue
+/// A catalog's source file.
+struct Catalog
 {
     QString language;
     QVector<Message> messages;
     QString error; ///< empty when the file could be read
 
-    static Catalogue read(const QString &path);
+    static Catalog read(const QString &path);
 
     /// The lines of all texts, sorted.
     QStringList lines() const;

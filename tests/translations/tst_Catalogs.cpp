@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "Catalogue.h"
+#include "Catalog.h"
 #include "TestCase.h"
 
 #include <QDir>
@@ -89,25 +89,25 @@ QString difference(const QStringList &expected, const QStringList &actual)
 
 } // namespace
 
-class tst_Catalogues : public TestCase
+class tst_Catalogs : public TestCase
 {
     Q_OBJECT
 
 private Q_SLOTS:
     void existForEveryLanguageAndForNoOther();
 
-    void haveEveryTextFinished_data() { addCatalogues(); }
+    void haveEveryTextFinished_data() { addCatalogs(); }
     void haveEveryTextFinished();
-    void keepWhatIsNoWord_data() { addCatalogues(); }
+    void keepWhatIsNoWord_data() { addCatalogs(); }
     void keepWhatIsNoWord();
-    void keepBlanksLinesAndEndings_data() { addCatalogues(); }
+    void keepBlanksLinesAndEndings_data() { addCatalogs(); }
     void keepBlanksLinesAndEndings();
     void giveEachMnemonicOncePerMenu_data();
     void giveEachMnemonicOncePerMenu();
     void knowTheMenuOfEveryMnemonic();
-    void compileWithoutAComplaint_data() { addCatalogues(); }
+    void compileWithoutAComplaint_data() { addCatalogs(); }
     void compileWithoutAComplaint();
-    void translateWhenCompiled_data() { addCatalogues(); }
+    void translateWhenCompiled_data() { addCatalogs(); }
     void translateWhenCompiled();
 
     void haveTheTextsOfTheSources_data();
@@ -117,11 +117,11 @@ private Q_SLOTS:
     void makeAnIdOfPlainLetters();
 
 private:
-    void addCatalogues();
-    Catalogue extract(const QStringList &folders);
+    void addCatalogs();
+    Catalog extract(const QStringList &folders);
 };
 
-void tst_Catalogues::addCatalogues()
+void tst_Catalogs::addCatalogs()
 {
     QTest::addColumn<QString>("name");
     QTest::addColumn<QString>("language");
@@ -131,7 +131,7 @@ void tst_Catalogues::addCatalogues()
     }
 }
 
-void tst_Catalogues::existForEveryLanguageAndForNoOther()
+void tst_Catalogs::existForEveryLanguageAndForNoOther()
 {
     QStringList expected;
     for (const QString &name : names) {
@@ -142,22 +142,22 @@ void tst_Catalogues::existForEveryLanguageAndForNoOther()
     QCOMPARE(folder.entryList({QStringLiteral("*.ts")}, QDir::Files, QDir::Name), expected);
 }
 
-void tst_Catalogues::haveEveryTextFinished()
+void tst_Catalogs::haveEveryTextFinished()
 {
     QFETCH(QString, name);
     QFETCH(QString, language);
-    const Catalogue catalogue = Catalogue::read(sourcePath(name, language));
-    QCOMPARE(catalogue.error, QString());
-    QCOMPARE(catalogue.language, language);
-    QVERIFY(!catalogue.messages.isEmpty());
-    for (const Message &message : catalogue.messages) {
+    const Catalog catalog = Catalog::read(sourcePath(name, language));
+    QCOMPARE(catalog.error, QString());
+    QCOMPARE(catalog.language, language);
+    QVERIFY(!catalog.messages.isEmpty());
+    for (const Message &message : catalog.messages) {
         QVERIFY2(message.type.isEmpty(), qPrintable(message.line()));
         QVERIFY2(!message.translation.trimmed().isEmpty(), qPrintable(message.line()));
     }
 }
 
 // Marks that are filled in, and what a program or a file format reads.
-void tst_Catalogues::keepWhatIsNoWord()
+void tst_Catalogs::keepWhatIsNoWord()
 {
     QFETCH(QString, name);
     QFETCH(QString, language);
@@ -165,18 +165,18 @@ void tst_Catalogues::keepWhatIsNoWord()
         QStringLiteral("%[0-9n]|--[a-z]+[a-z-]*|</?[a-z]+>|<a "
                        "href=\"[^\"]*\">|https://[a-z.]+|vel-wm|VEL_COMMAND|openbox|json"
                        "|\\[Desktop Entry\\]|Desktop Entry Standard|Actions\\b(?=[\\s\\x{a0}]*['»”“\"」])"));
-    for (const Message &message : Catalogue::read(sourcePath(name, language)).messages) {
+    for (const Message &message : Catalog::read(sourcePath(name, language)).messages) {
         QVERIFY2(found(message.translation, pattern) == found(message.source, pattern),
                  qPrintable(message.line() + QLatin1Char('\n') + message.translation));
     }
 }
 
-void tst_Catalogues::keepBlanksLinesAndEndings()
+void tst_Catalogs::keepBlanksLinesAndEndings()
 {
     QFETCH(QString, name);
     QFETCH(QString, language);
     static const QRegularExpression outer(QStringLiteral("^\\s+|\\s+$"));
-    for (const Message &message : Catalogue::read(sourcePath(name, language)).messages) {
+    for (const Message &message : Catalog::read(sourcePath(name, language)).messages) {
         const QByteArray where = qPrintable(message.line() + QLatin1Char('\n') + message.translation);
         QVERIFY2(found(message.translation, outer) == found(message.source, outer), where);
         QVERIFY2(message.translation.count(QLatin1Char('\n')) == message.source.count(QLatin1Char('\n')),
@@ -186,7 +186,7 @@ void tst_Catalogues::keepBlanksLinesAndEndings()
     }
 }
 
-void tst_Catalogues::giveEachMnemonicOncePerMenu_data()
+void tst_Catalogs::giveEachMnemonicOncePerMenu_data()
 {
     QTest::addColumn<QString>("language");
     QTest::newRow("en") << QString();
@@ -194,15 +194,15 @@ void tst_Catalogues::giveEachMnemonicOncePerMenu_data()
         QTest::newRow(qPrintable(language)) << language;
 }
 
-void tst_Catalogues::giveEachMnemonicOncePerMenu()
+void tst_Catalogs::giveEachMnemonicOncePerMenu()
 {
     QFETCH(QString, language);
     const QString read = language.isEmpty() ? QStringLiteral("de") : language;
     for (const QString &name : names) {
-        const Catalogue catalogue = Catalogue::read(sourcePath(name, read));
+        const Catalog catalog = Catalog::read(sourcePath(name, read));
         for (const QStringList &menu : together()) {
             QHash<QChar, QString> taken;
-            for (const Message &message : catalogue.messages) {
+            for (const Message &message : catalog.messages) {
                 if (!menu.contains(message.source))
                     continue;
                 const QString text = language.isEmpty() ? message.source : message.translation;
@@ -216,11 +216,11 @@ void tst_Catalogues::giveEachMnemonicOncePerMenu()
 }
 
 // A new text with a mnemonic has to be entered with the others of its menu or page.
-void tst_Catalogues::knowTheMenuOfEveryMnemonic()
+void tst_Catalogs::knowTheMenuOfEveryMnemonic()
 {
     for (const QString &name : names) {
         for (const QString &language : languages()) {
-            for (const Message &message : Catalogue::read(sourcePath(name, language)).messages) {
+            for (const Message &message : Catalog::read(sourcePath(name, language)).messages) {
                 const bool known =
                     std::any_of(together().begin(), together().end(),
                                 [&](const QStringList &menu) { return menu.contains(message.source); });
@@ -231,14 +231,14 @@ void tst_Catalogues::knowTheMenuOfEveryMnemonic()
     }
 }
 
-void tst_Catalogues::compileWithoutAComplaint()
+void tst_Catalogs::compileWithoutAComplaint()
 {
     QFETCH(QString, name);
     QFETCH(QString, language);
     QProcess lrelease;
     lrelease.setProcessChannelMode(QProcess::MergedChannels);
     lrelease.start(QStringLiteral(VEL_LRELEASE),
-                   {sourcePath(name, language), QStringLiteral("-qm"), path(QStringLiteral("catalogue.qm"))});
+                   {sourcePath(name, language), QStringLiteral("-qm"), path(QStringLiteral("catalog.qm"))});
     QVERIFY(lrelease.waitForFinished());
     QCOMPARE(lrelease.exitCode(), 0);
     const QString said = QString::fromUtf8(lrelease.readAll());
@@ -247,13 +247,13 @@ void tst_Catalogues::compileWithoutAComplaint()
     QVERIFY2(!said.contains(QLatin1String("Warning"), Qt::CaseInsensitive), qPrintable(said));
 }
 
-void tst_Catalogues::translateWhenCompiled()
+void tst_Catalogs::translateWhenCompiled()
 {
     QFETCH(QString, name);
     QFETCH(QString, language);
     QTranslator translator;
     QVERIFY(translator.load(name + QLatin1Char('_') + language, QStringLiteral(VEL_COMPILED_DIR)));
-    for (const Message &message : Catalogue::read(sourcePath(name, language)).messages) {
+    for (const Message &message : Catalog::read(sourcePath(name, language)).messages) {
         QCOMPARE(translator.translate(message.context.toUtf8().constData(),
                                       message.source.toUtf8().constData(),
                                       message.comment.toUtf8().constData()),
@@ -262,7 +262,7 @@ void tst_Catalogues::translateWhenCompiled()
 }
 
 // What lupdate finds in the folders; it has to find it without a complaint.
-Catalogue tst_Catalogues::extract(const QStringList &folders)
+Catalog tst_Catalogs::extract(const QStringList &folders)
 {
     const QString file = path(QStringLiteral("extracted.ts"));
     QStringList arguments{QStringLiteral("-silent"), QStringLiteral("-no-obsolete"),
@@ -272,16 +272,16 @@ Catalogue tst_Catalogues::extract(const QStringList &folders)
     arguments << QStringLiteral("-ts") << file;
     QProcess lupdate;
     lupdate.start(QStringLiteral(VEL_LUPDATE), arguments);
-    Catalogue catalogue;
+    Catalog catalog;
     if (!lupdate.waitForFinished() || lupdate.exitCode() != 0)
-        catalogue.error = QStringLiteral("lupdate failed");
+        catalog.error = QStringLiteral("lupdate failed");
     else
-        catalogue = Catalogue::read(file);
-    catalogue.error += QString::fromUtf8(lupdate.readAllStandardError());
-    return catalogue;
+        catalog = Catalog::read(file);
+    catalog.error += QString::fromUtf8(lupdate.readAllStandardError());
+    return catalog;
 }
 
-void tst_Catalogues::haveTheTextsOfTheSources_data()
+void tst_Catalogs::haveTheTextsOfTheSources_data()
 {
     QTest::addColumn<QString>("name");
     QTest::addColumn<QString>("sources");
@@ -289,20 +289,20 @@ void tst_Catalogues::haveTheTextsOfTheSources_data()
     QTest::newRow("programs") << names.at(1) << QStringLiteral("apps");
 }
 
-void tst_Catalogues::haveTheTextsOfTheSources()
+void tst_Catalogs::haveTheTextsOfTheSources()
 {
     QFETCH(QString, name);
     QFETCH(QString, sources);
-    const Catalogue extracted = extract({sources, QStringLiteral("include")});
+    const Catalog extracted = extract({sources, QStringLiteral("include")});
     QCOMPARE(extracted.error, QString());
     for (const QString &language : languages()) {
-        const QStringList lines = Catalogue::read(sourcePath(name, language)).lines();
+        const QStringList lines = Catalog::read(sourcePath(name, language)).lines();
         QVERIFY2(lines == extracted.lines(),
                  qPrintable(language + QLatin1Char('\n') + difference(lines, extracted.lines())));
     }
 }
 
-void tst_Catalogues::listEveryTextOfTheLibrary()
+void tst_Catalogs::listEveryTextOfTheLibrary()
 {
     QStringList listed;
     for (const QByteArray &line :
@@ -311,18 +311,18 @@ void tst_Catalogues::listEveryTextOfTheLibrary()
             listed.append(QString::fromUtf8(line));
     }
     listed.sort();
-    const Catalogue extracted = extract({QStringLiteral("src"), QStringLiteral("include")});
+    const Catalog extracted = extract({QStringLiteral("src"), QStringLiteral("include")});
     QCOMPARE(extracted.error, QString());
     QVERIFY2(extracted.lines() == listed, qPrintable(difference(listed, extracted.lines())));
 }
 
 // The id of a new action becomes part of a group's name, which the format wants in plain letters.
-void tst_Catalogues::makeAnIdOfPlainLetters()
+void tst_Catalogs::makeAnIdOfPlainLetters()
 {
     static const QRegularExpression plain(QStringLiteral("^[A-Za-z0-9-]+$"));
     for (const QString &language : languages()) {
         int seen = 0;
-        for (const Message &message : Catalogue::read(sourcePath(names.at(0), language)).messages) {
+        for (const Message &message : Catalog::read(sourcePath(names.at(0), language)).messages) {
             if (message.source != QLatin1String("newAction"))
                 continue;
             ++seen;
@@ -332,6 +332,6 @@ void tst_Catalogues::makeAnIdOfPlainLetters()
     }
 }
 
-VEL_TEST_GUILESS_MAIN(tst_Catalogues)
+VEL_TEST_GUILESS_MAIN(tst_Catalogs)
 
-#include "tst_Catalogues.moc"
+#include "tst_Catalogs.moc"
