@@ -100,7 +100,7 @@ QString VelDesktopEntryEditDialogPrivate::unsuitableText(VelUIDesktopEntry::Suit
     case Unsuitable::ProgramNotExecutable:
     case Unsuitable::ProgramNotInPath:
         return tr("can't find executable");
-    case Unsuitable::TryExecPathMissing:
+    case Unsuitable::TryExecMissing:
     case Unsuitable::TryExecNotInPath:
         return tr("can't find try executable");
     case Unsuitable::UrlMissing:

@@ -11,7 +11,7 @@ constexpr int NoExec = 1;
 constexpr int ProgramMissing = 2;
 constexpr int ProgramNotExecutable = 3;
 constexpr int ProgramNotInPath = 4;
-constexpr int TryExecPathMissing = 5;
+constexpr int TryExecMissing = 5;
 constexpr int TryExecNotInPath = 6;
 constexpr int UrlMissing = 7;
 

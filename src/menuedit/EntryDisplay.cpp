@@ -4,14 +4,7 @@
 #include "EntryDisplay.h"
 
 #include <frame/DesktopEntryRecord.h>
-
-namespace {
-
-// Why a record says that it is not to be displayed, as far as it matters here.
-constexpr VelUIDesktopEntry::DisplayableError MarkedAsDeleted = 1;
-constexpr VelUIDesktopEntry::DisplayableError MeantForOtherDesktops = 3;
-
-} // namespace
+#include <frame/Undisplayable.h>
 
 QString EntryDisplay::shownName(const VelUIDesktopEntry &entry)
 {
@@ -28,5 +21,6 @@ QString EntryDisplay::shownName(const VelUIDesktopEntry &entry)
 bool EntryDisplay::isHidden(const VelUIDesktopEntry &entry)
 {
     VelUIDesktopEntry::DisplayableError reason = 0;
-    return !entry.isDisplayable(&reason) && (reason == MarkedAsDeleted || reason == MeantForOtherDesktops);
+    return !entry.isDisplayable(&reason)
+        && (reason == Undisplayable::Hidden || reason == Undisplayable::ForOtherDesktops);
 }

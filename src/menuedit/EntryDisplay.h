@@ -22,7 +22,8 @@ QString shownName(const VelUIDesktopEntry &entry);
 
 /**
  * Whether the menu leaves \a entry out: it is marked as deleted, or is not meant for this desktop.
- * An entry that is left out of menus for any other reason is shown, so that it can be edited.
+ * An entry that is left out of menus for any other reason is shown, so that it can be edited; so is
+ * one with `NoDisplay` that is meant for another desktop, as the first reason counts.
  */
 bool isHidden(const VelUIDesktopEntry &entry);
 

@@ -4,7 +4,7 @@
 #include "VelMenuView.h"
 
 #include "EntryExecution.h"
-#include "ItemClipboard.h"
+#include "ItemTransfer.h"
 #include "MenuClipboard.h"
 #include "MenuReordering.h"
 #include "StartMenu.h"
@@ -162,7 +162,7 @@ void VelMenuView::slotDown()
 
 void VelMenuView::FillClipboard(QModelIndex item, Qt::DropAction action)
 {
-    ItemClipboard::put(d->menu.files(), item, action);
+    ItemTransfer::put(d->menu.files(), item, action);
 }
 
 void VelMenuView::slotCut()
@@ -182,7 +182,7 @@ void VelMenuView::slotCopy()
 void VelMenuView::slotPaste()
 {
     const QPointer<VelMenuView> self(this);
-    if (ItemClipboard::paste(d->menu.files(), selectedItem()) && self)
+    if (ItemTransfer::paste(d->menu.files(), selectedItem()) && self)
         setActionsEnabled();
 }
 
@@ -200,7 +200,7 @@ void VelMenuView::dropEvent(QDropEvent *event)
 {
     const QPointer<VelMenuView> self(this);
     const Qt::DropAction action =
-        ItemClipboard::askForAction(this, viewport()->mapToGlobal(event->posF().toPoint()));
+        ItemTransfer::askForDropAction(this, viewport()->mapToGlobal(event->posF().toPoint()));
     if (!self)
         return;
     event->setDropAction(action);

@@ -25,7 +25,9 @@ public:
     {
     }
 
-    // The box is made by hand: the static function would add a No button to show its default.
+    // The box has the one button Yes, which Escape and closing press as well; a No comes only from
+    // a program that ends the box with it. It is made by hand: the static function would add a No
+    // button to show its default.
     // Nothing of this object is touched when it is closed.
     bool confirmOverwrite(const QString &target) override
     {

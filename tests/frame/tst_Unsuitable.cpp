@@ -28,7 +28,7 @@ void tst_Unsuitable::namesTheCodesOfTheRecords_data()
     QTest::newRow("program that PATH lacks") << application + "Exec=no-such-program-anywhere\n"
                                              << Unsuitable::ProgramNotInPath;
     QTest::newRow("no such TryExec") << application + "Exec=/bin/sh\nTryExec=/nowhere/program\n"
-                                     << Unsuitable::TryExecPathMissing;
+                                     << Unsuitable::TryExecMissing;
     QTest::newRow("TryExec that PATH lacks")
         << application + "Exec=/bin/sh\nTryExec=no-such-program-anywhere\n"
         << Unsuitable::TryExecNotInPath;

@@ -13,7 +13,7 @@ class VelMenuModel;
 /**
  * Cut, copy, paste and the question that a drop begins with. Items are those of the file model.
  */
-namespace ItemClipboard {
+namespace ItemTransfer {
 
 /// Puts \a item on the clipboard, cut when \a action is Qt::MoveAction; empties the clipboard
 /// first, and leaves it so for an invalid item.
@@ -25,6 +25,6 @@ bool paste(VelMenuModel &files, const QModelIndex &item);
 
 /// Asks in a menu at the global \a position what is to be done with dropped files;
 /// Qt::IgnoreAction for nothing. The \a view may go away meanwhile.
-Qt::DropAction askForAction(QWidget *view, const QPoint &position);
+Qt::DropAction askForDropAction(QWidget *view, const QPoint &position);
 
-} // namespace ItemClipboard
+} // namespace ItemTransfer

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "ItemClipboard.h"
+#include "ItemTransfer.h"
 
 #include "MenuClipboard.h"
 #include "VelMenuModel.h"
@@ -13,7 +13,7 @@
 #include <QMenu>
 #include <QPointer>
 
-void ItemClipboard::put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action)
+void ItemTransfer::put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action)
 {
     QClipboard *clipboard = QGuiApplication::clipboard();
     clipboard->clear();
@@ -21,7 +21,7 @@ void ItemClipboard::put(const VelMenuModel &files, const QModelIndex &item, Qt::
         clipboard->setMimeData(new MenuClipboard::ItemData(files.filePath(item), action));
 }
 
-bool ItemClipboard::paste(VelMenuModel &files, const QModelIndex &item)
+bool ItemTransfer::paste(VelMenuModel &files, const QModelIndex &item)
 {
     if (!item.isValid())
         return false;
@@ -42,7 +42,7 @@ bool ItemClipboard::paste(VelMenuModel &files, const QModelIndex &item)
     return true;
 }
 
-Qt::DropAction ItemClipboard::askForAction(QWidget *view, const QPoint &position)
+Qt::DropAction ItemTransfer::askForDropAction(QWidget *view, const QPoint &position)
 {
     const QPointer<QMenu> menu(new QMenu(view));
     const QAction *move = menu->addAction(QCoreApplication::translate("VelMenuView", "Move"));
