@@ -42,8 +42,12 @@ public:
     QString type(const QFileInfo &info) const override
     {
         const QString regularFile = std::exchange(m_regularFile, QString());
-        return !regularFile.isEmpty() && regularFile == rowPathOf(info) ? regularFileType(info)
-                                                                        : VelMimeTypeIconProvider::type(info);
+        const QString name = !regularFile.isEmpty() && regularFile == rowPathOf(info)
+            ? regularFileType(info)
+            : VelMimeTypeIconProvider::type(info);
+        // It makes no row for a file without a type, and every file is without where no MIME types
+        // are installed.
+        return name.isEmpty() ? QStringLiteral("application/octet-stream") : name;
     }
 
 private:
