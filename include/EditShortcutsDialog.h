@@ -20,7 +20,9 @@ class ShortcutsModel;
  * It shows the groups and shortcuts of a ShortcutsModel. For the current one the user keeps
  * the default key or records another one by pressing it, up to four chords long. A recorded
  * key is refused, with a message that names the holder, when a global shortcut of the desktop
- * has it (see VelKeyServer::checkForGlobalShortcut()) or another shortcut of the model.
+ * has it (see VelKeyServer::checkForGlobalShortcut()) or another shortcut of the model. A key
+ * press records nothing when the key only modifies, locks, composes or is dead, and when the key
+ * could not be read again after it was saved.
  *
  * These checks see equal sequences, not prefixes: "Ctrl+K" is accepted beside
  * "Ctrl+K, Ctrl+C". Qt then waits for the second chord before it triggers the first.

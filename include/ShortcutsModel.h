@@ -167,7 +167,7 @@ public Q_SLOTS:
      * Writes the keys in force of all shortcuts, one string in portable text form for each name.
      *
      * Edits that were not committed are not saved. What the settings hold under other names
-     * stays.
+     * stays, as does what they hold for a key whose text would not read back as that key.
      *
      * @param settings where to save; not kept; whether it worked is told by its status()
      * @param settingsGroup the group of the settings to write to; empty for none

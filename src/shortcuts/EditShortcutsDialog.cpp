@@ -115,7 +115,7 @@ void EditShortcutsDialog::keyPressEvent(QKeyEvent *event)
 
 bool EditShortcutsDialog::eventFilter(QObject *watched, QEvent *event)
 {
-    if (watched == d->form.keyWidget)
-        d->watchKeyEditor(*event);
+    if (watched == d->form.keyWidget && d->watchKeyEditor(*event))
+        return true;
     return QDialog::eventFilter(watched, event);
 }

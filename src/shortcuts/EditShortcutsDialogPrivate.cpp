@@ -13,6 +13,7 @@
 #include <QDialogButtonBox>
 #include <QFocusEvent>
 #include <QGroupBox>
+#include <QKeyEvent>
 #include <QKeySequenceEdit>
 #include <QLabel>
 #include <QPushButton>
@@ -80,27 +81,28 @@ void EditShortcutsDialogPrivate::showNoShortcut()
 // Puts a key into the key editor without the editor announcing it; ends a recording.
 void EditShortcutsDialogPrivate::showKey(const QKeySequence &key)
 {
-    m_isRecording = false;
+    m_recording.stop();
     const QSignalBlocker blocker(form.keyWidget);
     form.keyWidget->setKeySequence(key);
 }
 
-void EditShortcutsDialogPrivate::watchKeyEditor(const QEvent &event)
+bool EditShortcutsDialogPrivate::watchKeyEditor(const QEvent &event)
 {
-    if (event.type() == QEvent::KeyPress) {
-        m_isRecording = true;
-    } else if (event.type() == QEvent::FocusOut
-               && static_cast<const QFocusEvent &>(event).reason() != Qt::PopupFocusReason) {
+    if (event.type() == QEvent::KeyPress || event.type() == QEvent::KeyRelease)
+        return m_recording.withholds(static_cast<const QKeyEvent &>(event));
+    if (event.type() == QEvent::FocusOut
+        && static_cast<const QFocusEvent &>(event).reason() != Qt::PopupFocusReason) {
         // The editor itself would wait a second for one more chord, while the user goes on to
         // another row or to Ok.
         endRecording();
     }
+    return false;
 }
 
 // Takes the key recorded so far; when there is none, the editor shows the old one again.
 void EditShortcutsDialogPrivate::endRecording()
 {
-    if (!m_isRecording)
+    if (!m_recording.isActive())
         return;
     const QKeySequence key = form.keyWidget->keySequence();
     const bool hasKey = !key.isEmpty() && form.treeView->isShortcutCurrent();
@@ -111,14 +113,14 @@ void EditShortcutsDialogPrivate::endRecording()
 
 void EditShortcutsDialogPrivate::enterKey(const QKeySequence &key)
 {
-    if ((key.isEmpty() && m_isRecording) || key == form.treeView->currentKeySequence() || !m_model)
+    if ((key.isEmpty() && m_recording.isActive()) || key == form.treeView->currentKeySequence() || !m_model)
         return;
-    if (!KeySequences::isKnown(key)) {
-        // A key of the keyboard that Qt has no name for.
+    if (!KeySequences::survivesSaving(key)) {
+        // A key that Qt has no name for, for instance.
         showKey(form.treeView->currentKeySequence());
         return;
     }
-    m_isRecording = false;
+    m_recording.stop();
     const ShortcutConflict conflict = ShortcutConflict::find(*m_model, key);
     if (conflict.kind != ShortcutConflict::None) {
         refuseKey(key, conflict);

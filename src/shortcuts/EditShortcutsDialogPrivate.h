@@ -4,6 +4,7 @@
 #pragma once
 
 #include "EditShortcutsForm.h"
+#include "KeyRecording.h"
 #include "ShortcutsModel.h"
 
 #include <QCoreApplication>
@@ -40,8 +41,8 @@ public:
     /// No shortcut is current.
     void showNoShortcut();
 
-    /// Watches a recording: \a event goes to the key editor.
-    void watchKeyEditor(const QEvent &event);
+    /// Watches a recording: \a event goes to the key editor, unless this says that it must not.
+    bool watchKeyEditor(const QEvent &event);
     /// Makes \a key the pending one of the current shortcut, or refuses it with a message, in
     /// which the dialog may go.
     void enterKey(const QKeySequence &key);
@@ -68,9 +69,7 @@ private:
 
     QDialog *const m_dialog;
     const QPointer<ShortcutsModel> m_model;
-    /// From a key press in the key editor until it is done. An empty key that it announces
-    /// meanwhile is no key that the user chose.
-    bool m_isRecording = false;
+    KeyRecording m_recording;
     /// Ends the connections: widgets and model may outlive this object.
     const QObject m_context;
 };

@@ -45,7 +45,7 @@ void ShortcutsModel::loadKeys(QSettings *settings, QString settingsGroup)
     const QStringList names = settings->childKeys();
     for (const QString &name : names) {
         const QString text = settings->value(name, QVariant()).toString();
-        m_loadedKeys.insert(name, KeySequences::fromText(text, QKeySequence::NativeText));
+        m_loadedKeys.insert(name, KeySequences::fromSavedText(text));
     }
 }
 
@@ -60,6 +60,9 @@ void ShortcutsModel::saveKeys(QSettings *settings, QString settingsGroup)
             if (it->isEmpty())
                 continue;
             const QKeySequence key = it->constFirst()->objectKeySequence();
+            // Its text would be another key the next time.
+            if (!KeySequences::survivesSaving(key))
+                continue;
             settings->setValue(it.key(), key.toString(QKeySequence::PortableText));
             m_loadedKeys.insert(it.key(), key);
         }

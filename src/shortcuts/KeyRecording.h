@@ -1,0 +1,28 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+class QKeyEvent;
+
+/**
+ * How far the recording of a key has come, by the events on their way to the key editor.
+ *
+ * It begins with the press of a modifier or of a chord, and lasts until it is stopped.
+ */
+class KeyRecording
+{
+public:
+    /// Takes note of a key event; tells whether the key editor must not see it.
+    bool withholds(const QKeyEvent &event);
+
+    /// Whether a key was pressed. An empty key that the editor announces meanwhile is no key
+    /// that the user chose.
+    bool isActive() const { return m_isActive; }
+
+    /// It ended or was dropped.
+    void stop();
+
+private:
+    bool m_isActive = false;
+};
