@@ -22,9 +22,24 @@ bool KeyRecording::withholds(const QKeyEvent &event)
 {
     if (movesTheFocus(event))
         return false;
+    if (isRepeated(event))
+        return true;
     if (!RecordedKey::isModifier(event.key()) && !RecordedKey::isChord(event.key(), event.modifiers()))
         return true;
     m_isActive = m_isActive || event.type() == QEvent::KeyPress;
+    return false;
+}
+
+// A held key comes as releases and presses. Where Qt has not yet seen the press when it handles
+// the release, it does not call them repeated; that they come at the same time gives them away.
+bool KeyRecording::isRepeated(const QKeyEvent &event)
+{
+    if (event.isAutoRepeat())
+        return true;
+    if (event.type() == QEvent::KeyPress)
+        return event.timestamp() != 0 && event.timestamp() == m_releaseTime && event.key() == m_releasedKey;
+    m_releaseTime = event.timestamp();
+    m_releasedKey = event.key();
     return false;
 }
 

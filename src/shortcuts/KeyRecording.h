@@ -8,7 +8,8 @@ class QKeyEvent;
 /**
  * How far the recording of a key has come, by the events on their way to the key editor.
  *
- * It begins with the press of a modifier or of a chord, and lasts until it is stopped.
+ * It begins with the press of a modifier or of a chord, and lasts until it is stopped. A key that
+ * is held is pressed once.
  */
 class KeyRecording
 {
@@ -24,5 +25,9 @@ public:
     void stop();
 
 private:
+    bool isRepeated(const QKeyEvent &event);
+
     bool m_isActive = false;
+    unsigned long m_releaseTime = 0; // in milliseconds, by the clock of the events
+    int m_releasedKey = 0;
 };

@@ -5,6 +5,7 @@
 
 #include "RecordingTestCase.h"
 
+#include <QKeyEvent>
 #include <QProcess>
 #include <QSettings>
 
@@ -44,6 +45,9 @@ private Q_SLOTS:
     void keepsAKeyWithSuperOverARestart();
     void recordsWhatAKeyGivesWithAltGr();
     void goesOnRecordingAfterAKeyThatIsNoChord();
+    void recordsAHeldKeyOnce();
+    void keepsTheFirstChordWhileTheSecondIsHeld();
+    void knowsAHeldKeyThatIsNotCalledRepeated();
 };
 
 void tst_RecordedKeys::recordsNothingForAKeyThatIsNoChord_data()
@@ -145,6 +149,45 @@ void tst_RecordedKeys::goesOnRecordingAfterAKeyThatIsNoChord()
     record("open");
     XDoTool::run(str("key ctrl+k key Caps_Lock key Caps_Lock key ctrl+d"));
     QTRY_COMPARE(pendingKey("open"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
+}
+
+void tst_RecordedKeys::recordsAHeldKeyOnce()
+{
+    record("open");
+    XDoTool::run(str("keydown ctrl keydown j sleep 1.2 keyup j keyup ctrl"));
+    QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_J));
+    QTRY_COMPARE(pendingKey("open"), QKeySequence(Qt::CTRL | Qt::Key_J));
+
+    // Without a modifier too.
+    record("save");
+    XDoTool::run(str("keydown F8 sleep 1.2 keyup F8"));
+    QTRY_COMPARE(pendingKey("save"), QKeySequence(Qt::Key_F8));
+}
+
+void tst_RecordedKeys::keepsTheFirstChordWhileTheSecondIsHeld()
+{
+    record("open");
+    XDoTool::run(str("key ctrl+k keydown ctrl keydown d sleep 1.5 keyup d keyup ctrl"));
+    QTRY_COMPARE(pendingKey("open"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
+    QVERIFY(keysStay());
+    QCOMPARE(keyWidget()->keySequence(), pendingKey("open"));
+}
+
+void tst_RecordedKeys::knowsAHeldKeyThatIsNotCalledRepeated()
+{
+    record("open");
+    const auto send = [this](QEvent::Type type, unsigned long time) {
+        QKeyEvent event(type, Qt::Key_D, Qt::ControlModifier);
+        event.setTimestamp(time);
+        QCoreApplication::sendEvent(keyWidget(), &event);
+    };
+    send(QEvent::KeyPress, 1000);
+    send(QEvent::KeyRelease, 1660);
+    send(QEvent::KeyPress, 1660);
+    send(QEvent::KeyRelease, 1700);
+    QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_D));
+    send(QEvent::KeyPress, 1701);
+    QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_D, Qt::CTRL | Qt::Key_D));
 }
 
 VEL_TEST_MAIN(tst_RecordedKeys)
