@@ -31,7 +31,9 @@ class ShortcutsModel;
  * force. Cancel, Escape and closing the window without applying throw them away. The dialog
  * saves nothing: call ShortcutsModel::saveKeys() after it was accepted.
  *
- * While something is changed the buttons Ok and Reset are enabled.
+ * While something is changed the buttons Ok and Reset are enabled. A key counts as a change from
+ * its first chord on; it is entered when the focus leaves, when the window is closed and with Ok,
+ * and dropped with Cancel.
  */
 class VELUIEXTRA_EXPORT EditShortcutsDialog : public QDialog
 {
@@ -57,6 +59,15 @@ public:
 
     /// Hides the dialog with the result Rejected; throws away what is changed.
     void reject() override;
+    /**
+     * Hides the dialog.
+     *
+     * @param result with Accepted a key that is being recorded is entered first, and the dialog
+     *               stays when it is refused; with Rejected the edits are thrown away
+     */
+    void done(int result) override;
+    /// Shows or hides the dialog; hiding it drops a key that is being recorded.
+    void setVisible(bool visible) override;
 
 public Q_SLOTS:
     /**

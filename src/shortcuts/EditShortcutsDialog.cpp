@@ -60,6 +60,8 @@ void EditShortcutsDialog::processButtonBox(QAbstractButton *button)
 
 void EditShortcutsDialog::slotAccept()
 {
+    if (!d->settle())
+        return;
     const QPointer<EditShortcutsDialog> self(this);
     d->commit();
     // The host hears of its new keys and may close its windows, this one too.
@@ -83,8 +85,31 @@ void EditShortcutsDialog::reject()
         QDialog::reject();
 }
 
+void EditShortcutsDialog::done(int result)
+{
+    if (result == Accepted) {
+        if (!d->settle())
+            return;
+    } else if (result == Rejected && d->isChanged()) {
+        d->discard();
+    }
+    QDialog::done(result);
+}
+
+void EditShortcutsDialog::setVisible(bool visible)
+{
+    // Before the key editor loses the focus, which would take the key.
+    if (!visible)
+        d->dropRecording();
+    QDialog::setVisible(visible);
+}
+
 void EditShortcutsDialog::closeEvent(QCloseEvent *event)
 {
+    if (!d->settle()) {
+        event->ignore();
+        return;
+    }
     if (d->isChanged()) {
         const QPointer<EditShortcutsDialog> self(this);
         const QMessageBox::StandardButton answer =

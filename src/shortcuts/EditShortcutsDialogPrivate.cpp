@@ -9,6 +9,7 @@
 
 #include <frame/MessageBox.h>
 
+#include <QApplication>
 #include <QDialog>
 #include <QDialogButtonBox>
 #include <QFocusEvent>
@@ -20,6 +21,15 @@
 #include <QRadioButton>
 #include <QSignalBlocker>
 
+#include <utility>
+
+namespace {
+
+// How often a message looks whether a button of the mouse is still held, in milliseconds.
+constexpr int MouseWait = 20;
+
+} // namespace
+
 EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts)
     : form(dialog)
     , m_dialog(dialog)
@@ -28,6 +38,9 @@ EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(QDialog *dialog, Shortcut
     fillTree();
     setChanged(false);
     connectKeys();
+    m_messageTimer.setSingleShot(true);
+    m_messageTimer.setInterval(MouseWait);
+    QObject::connect(&m_messageTimer, &QTimer::timeout, &m_context, [this] { showMessage(); });
 }
 
 void EditShortcutsDialogPrivate::fillTree()
@@ -49,9 +62,8 @@ void EditShortcutsDialogPrivate::connectKeys()
         QObject::connect(m_model, &QObject::destroyed, &m_context, [this] { showNoShortcut(); });
 
     QObject::connect(form.keyWidget, &QKeySequenceEdit::keySequenceChanged, &m_context,
-                     [this](const QKeySequence &key) { enterKey(key); });
-    QObject::connect(form.keyWidget, &QKeySequenceEdit::editingFinished, &m_context,
-                     [this] { endRecording(); });
+                     [this](const QKeySequence &key) { enterKey(QKeySequence(key)); });
+    QObject::connect(form.keyWidget, &QKeySequenceEdit::editingFinished, &m_context, [this] { settle(); });
     QObject::connect(form.defaultKeyRB, &QRadioButton::toggled, &m_context, [this] { enterDefaultKey(); });
     // Last: the dialog takes events as soon as it has this object.
     form.keyWidget->installEventFilter(m_dialog);
@@ -75,13 +87,17 @@ void EditShortcutsDialogPrivate::showShortcut(const QKeySequence &defaultKey, co
 
 void EditShortcutsDialogPrivate::showNoShortcut()
 {
+    dropRecording();
     form.groupBox->setEnabled(false);
 }
 
-// Puts a key into the key editor without the editor announcing it; ends a recording.
+// Puts a key into the key editor without the editor announcing it; drops a recording.
 void EditShortcutsDialogPrivate::showKey(const QKeySequence &key)
 {
+    const bool hadChord = m_recording.hasChord();
     m_recording.stop();
+    if (hadChord)
+        enableChangeButtons(m_wasChanged);
     const QSignalBlocker blocker(form.keyWidget);
     form.keyWidget->setKeySequence(key);
 }
@@ -89,14 +105,40 @@ void EditShortcutsDialogPrivate::showKey(const QKeySequence &key)
 bool EditShortcutsDialogPrivate::watchKeyEditor(const QEvent &event)
 {
     if (event.type() == QEvent::KeyPress || event.type() == QEvent::KeyRelease)
-        return m_recording.withholds(static_cast<const QKeyEvent &>(event));
-    if (event.type() == QEvent::FocusOut
-        && static_cast<const QFocusEvent &>(event).reason() != Qt::PopupFocusReason) {
-        // The editor itself would wait a second for one more chord, while the user goes on to
-        // another row or to Ok.
-        endRecording();
-    }
+        return record(static_cast<const QKeyEvent &>(event));
+    if (event.type() == QEvent::FocusOut)
+        leaveKeyEditor(static_cast<const QFocusEvent &>(event).reason());
     return false;
+}
+
+// The first chord is a change: Ok can be pressed before the editor is done with the key.
+bool EditShortcutsDialogPrivate::record(const QKeyEvent &event)
+{
+    const bool hadChord = m_recording.hasChord();
+    const bool isWithheld = m_recording.withholds(event);
+    if (m_recording.hasChord() && !hadChord) {
+        m_wasChanged = isChanged();
+        enableChangeButtons(true);
+    }
+    return isWithheld;
+}
+
+// The editor itself would wait a second for one more chord, while the user goes on to another
+// row or to Ok.
+void EditShortcutsDialogPrivate::leaveKeyEditor(Qt::FocusReason reason)
+{
+    if (reason == Qt::PopupFocusReason)
+        return;
+    if (QApplication::focusWidget() == form.buttonBox->button(QDialogButtonBox::Cancel)) {
+        dropRecording();
+        return;
+    }
+    endRecording();
+    // A message that opens while a button is pressed would keep the release from it.
+    if (reason == Qt::MouseFocusReason)
+        m_messageTimer.start();
+    else
+        showMessage();
 }
 
 // Takes the key recorded so far; when there is none, the editor shows the old one again.
@@ -104,46 +146,85 @@ void EditShortcutsDialogPrivate::endRecording()
 {
     if (!m_recording.isActive())
         return;
-    const QKeySequence key = form.keyWidget->keySequence();
-    const bool hasKey = !key.isEmpty() && form.treeView->isShortcutCurrent();
-    showKey(hasKey ? key : form.treeView->currentKeySequence());
-    if (hasKey)
-        enterKey(key);
+    if (m_recording.hasChord() && form.treeView->isShortcutCurrent())
+        finish(form.keyWidget->keySequence());
+    else
+        dropKey();
 }
 
 void EditShortcutsDialogPrivate::enterKey(const QKeySequence &key)
 {
-    if ((key.isEmpty() && m_recording.isActive()) || key == form.treeView->currentKeySequence() || !m_model)
+    // What the editor announces when a recording begins.
+    if (key.isEmpty() && m_recording.isActive())
         return;
-    if (!KeySequences::survivesSaving(key)) {
-        // A key that Qt has no name for, for instance.
-        showKey(form.treeView->currentKeySequence());
-        return;
-    }
-    m_recording.stop();
-    const ShortcutConflict conflict = ShortcutConflict::find(*m_model, key);
-    if (conflict.kind != ShortcutConflict::None) {
-        refuseKey(key, conflict);
-        return;
-    }
-    if (!form.treeView->isShortcutCurrent()) {
-        // A recording that outlived its row.
-        showKey(QKeySequence());
-        return;
-    }
-    setPendingKey(key);
+    finish(key);
+    showMessage();
 }
 
-void EditShortcutsDialogPrivate::refuseKey(const QKeySequence &key, const ShortcutConflict &conflict)
+// Nothing is enabled and disabled on the way: a button that has the focus would lose it.
+void EditShortcutsDialogPrivate::finish(const QKeySequence &key)
 {
+    const bool hadChord = m_recording.hasChord();
+    m_recording.stop();
+    if (m_model && key != form.treeView->currentKeySequence() && takeKey(key))
+        return;
+    if (hadChord)
+        enableChangeButtons(m_wasChanged);
+    dropKey();
+}
+
+bool EditShortcutsDialogPrivate::settle()
+{
+    endRecording();
+    return showMessage();
+}
+
+void EditShortcutsDialogPrivate::dropRecording()
+{
+    m_message.clear();
+    if (m_recording.isActive())
+        dropKey();
+}
+
+void EditShortcutsDialogPrivate::dropKey()
+{
+    showKey(form.treeView->currentKeySequence());
+}
+
+// Makes a key the pending one, unless a message or nothing at all has to say why not.
+bool EditShortcutsDialogPrivate::takeKey(const QKeySequence &key)
+{
+    // Not a key that Qt has no name for; and a recording may have outlived its row.
+    if (!KeySequences::survivesSaving(key) || refuseTakenKey(key) || !form.treeView->isShortcutCurrent())
+        return false;
+    setPendingKey(key);
+    return true;
+}
+
+bool EditShortcutsDialogPrivate::refuseTakenKey(const QKeySequence &key)
+{
+    const ShortcutConflict conflict = ShortcutConflict::find(*m_model, key);
+    if (conflict.kind == ShortcutConflict::None)
+        return false;
     const QString text = conflict.kind == ShortcutConflict::Global
         ? tr("Shortcut '%1' is already used for global action '%2'.")
         : tr("Shortcut '%1' is already used for action '%2'. Please try another.");
-    const QPointer<QDialog> self(m_dialog);
-    MessageBox::show(m_dialog, QMessageBox::Critical, tr("Shortcuts conflict"),
-                     text.arg(key.toString(QKeySequence::PortableText), conflict.holder));
-    if (self)
-        showKey(form.treeView->currentKeySequence());
+    m_message = text.arg(key.toString(QKeySequence::PortableText), conflict.holder);
+    return true;
+}
+
+// Returns whether there was nothing to tell; otherwise the dialog may have gone with the message.
+bool EditShortcutsDialogPrivate::showMessage()
+{
+    if (m_message.isEmpty())
+        return true;
+    if (QGuiApplication::mouseButtons() != Qt::NoButton) {
+        m_messageTimer.start();
+        return false;
+    }
+    const QString text = std::exchange(m_message, QString());
+    MessageBox::show(m_dialog, QMessageBox::Critical, tr("Shortcuts conflict"), text);
+    return false;
 }
 
 void EditShortcutsDialogPrivate::enterDefaultKey()
@@ -176,6 +257,12 @@ bool EditShortcutsDialogPrivate::isChanged() const
 }
 
 void EditShortcutsDialogPrivate::setChanged(bool changed)
+{
+    m_wasChanged = changed;
+    enableChangeButtons(changed || m_recording.hasChord());
+}
+
+void EditShortcutsDialogPrivate::enableChangeButtons(bool changed)
 {
     form.buttonBox->button(QDialogButtonBox::Ok)->setEnabled(changed);
     form.buttonBox->button(QDialogButtonBox::Reset)->setEnabled(changed);
@@ -210,6 +297,7 @@ void EditShortcutsDialogPrivate::commit()
 
 void EditShortcutsDialogPrivate::discard()
 {
+    dropRecording();
     if (m_model)
         m_model->resetShortcuts();
     setChanged(false);

@@ -10,11 +10,12 @@
 #include <QCoreApplication>
 #include <QKeySequence>
 #include <QPointer>
+#include <QTimer>
 
 class QAbstractButton;
 class QDialog;
 class QEvent;
-struct ShortcutConflict;
+class QKeyEvent;
 
 /**
  * What the shortcuts dialog does with keys: it follows one from the field where it is recorded,
@@ -43,6 +44,11 @@ public:
 
     /// Watches a recording: \a event goes to the key editor, unless this says that it must not.
     bool watchKeyEditor(const QEvent &event);
+    /// Takes the key that is being recorded, before the dialog closes or accepts; false when it
+    /// is refused with a message, in which the dialog may go.
+    bool settle();
+    /// Forgets the key that is being recorded, and a message about the last one.
+    void dropRecording();
     /// Makes \a key the pending one of the current shortcut, or refuses it with a message, in
     /// which the dialog may go.
     void enterKey(const QKeySequence &key);
@@ -62,14 +68,24 @@ private:
     void fillTree();
     void connectKeys();
     void showKey(const QKeySequence &key);
+    bool record(const QKeyEvent &event);
+    void leaveKeyEditor(Qt::FocusReason reason);
     void endRecording();
-    void refuseKey(const QKeySequence &key, const ShortcutConflict &conflict);
+    void dropKey();
+    void finish(const QKeySequence &key);
+    bool takeKey(const QKeySequence &key);
+    bool refuseTakenKey(const QKeySequence &key);
+    bool showMessage();
+    void enableChangeButtons(bool changed);
     void setPendingKey(const QKeySequence &key);
     QKeySequence shownDefaultKey() const;
 
     QDialog *const m_dialog;
     const QPointer<ShortcutsModel> m_model;
     KeyRecording m_recording;
+    bool m_wasChanged = false; // without the key that is being recorded
+    QString m_message; // about a refused key, until it is shown
+    QTimer m_messageTimer; // shows it when the mouse is up again
     /// Ends the connections: widgets and model may outlive this object.
     const QObject m_context;
 };

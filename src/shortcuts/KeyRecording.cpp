@@ -24,9 +24,13 @@ bool KeyRecording::withholds(const QKeyEvent &event)
         return false;
     if (isRepeated(event))
         return true;
-    if (!RecordedKey::isModifier(event.key()) && !RecordedKey::isChord(event.key(), event.modifiers()))
+    const bool isModifier = RecordedKey::isModifier(event.key());
+    if (!isModifier && !RecordedKey::isChord(event.key(), event.modifiers()))
         return true;
-    m_isActive = m_isActive || event.type() == QEvent::KeyPress;
+    if (event.type() == QEvent::KeyPress) {
+        m_isActive = true;
+        m_hasChord = m_hasChord || !isModifier;
+    }
     return false;
 }
 
@@ -46,4 +50,5 @@ bool KeyRecording::isRepeated(const QKeyEvent &event)
 void KeyRecording::stop()
 {
     m_isActive = false;
+    m_hasChord = false;
 }

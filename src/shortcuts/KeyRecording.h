@@ -20,6 +20,8 @@ public:
     /// Whether a key was pressed. An empty key that the editor announces meanwhile is no key
     /// that the user chose.
     bool isActive() const { return m_isActive; }
+    /// Whether a chord was pressed.
+    bool hasChord() const { return m_hasChord; }
 
     /// It ended or was dropped.
     void stop();
@@ -28,6 +30,7 @@ private:
     bool isRepeated(const QKeyEvent &event);
 
     bool m_isActive = false;
+    bool m_hasChord = false;
     unsigned long m_releaseTime = 0; // in milliseconds, by the clock of the events
     int m_releasedKey = 0;
 };
