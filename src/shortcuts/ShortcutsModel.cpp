@@ -8,7 +8,6 @@
 #include "ShortcutObject.h"
 
 #include <QCoreApplication>
-#include <QSet>
 
 #include <iterator>
 #include <utility>
@@ -17,6 +16,16 @@ namespace {
 
 // The internal id of group rows; that of a shortcut is the row of its group.
 constexpr quintptr GroupId = ~quintptr(0);
+
+// The destructor of an object may delete what others wrap, or what it wraps itself; then these
+// ask the model to be deleted.
+void deleteOnce(IShortcutObject *object, const ShortcutsModel *model)
+{
+    if (!object)
+        return;
+    object->disconnect(model);
+    delete object;
+}
 
 } // namespace
 
@@ -28,16 +37,13 @@ ShortcutsModel::ShortcutsModel(QSettings *settings, QString settingsGroup, QObje
 
 ShortcutsModel::~ShortcutsModel()
 {
-    QSet<IShortcutObject *> objects;
-    for (const Group &group : qAsConst(m_groups)) {
-        for (const Objects &list : group) {
-            for (IShortcutObject *object : list)
-                objects.insert(object);
-        }
-    }
+    QVector<QPointer<IShortcutObject>> objects;
+    for (int group = 0; group < m_groups.size(); ++group)
+        objects += objectsOf(group);
     m_groups.clear();
     m_groupNames.clear();
-    qDeleteAll(objects);
+    for (const QPointer<IShortcutObject> &object : qAsConst(objects))
+        deleteOnce(object, this);
 }
 
 void ShortcutsModel::registerShortcut(const QString &name, QShortcut *shortcut, const QString &text,
@@ -86,7 +92,7 @@ void ShortcutsModel::remove(IShortcutObject *object)
     const QString name = object->name();
     for (int group = 0; group < m_groups.size(); ++group)
         entry(group, name).removeAll(object);
-    delete object;
+    deleteOnce(object, this);
     announceRows();
 }
 
