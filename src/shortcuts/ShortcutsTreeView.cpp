@@ -47,6 +47,7 @@ void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
         shortcuts->installEventFilter(this);
         connect(shortcuts, &QObject::destroyed, this, [this] { setModel(nullptr); });
         hideEmptyRows(*shortcuts);
+        m_groups = shortcuts->rowCount();
     }
 }
 
@@ -182,16 +183,29 @@ void ShortcutsTreeView::refreshRows()
     }
     hideEmptyRows(*shortcuts);
     scheduleDelayedItemsLayout();
+    for (; m_groups < shortcuts->rowCount(); ++m_groups)
+        expand(shortcuts->index(m_groups, 0));
     if (currentIndex().isValid() && isRowHidden(currentIndex().row(), currentIndex().parent()))
         selectionModel()->clear();
 }
 
 void ShortcutsTreeView::hideEmptyRows(const ShortcutsModel &shortcuts)
 {
+    QVector<int> emptyRows(shortcuts.rowCount());
     const auto rows = ShortcutRows::empty(shortcuts);
     for (const auto &[group, row] : rows) {
-        const QModelIndex parent = shortcuts.index(group, 0);
-        setRowHidden(row, parent, true);
-        m_hidden.append(shortcuts.index(row, 0, parent));
+        hideRow(shortcuts.index(row, 0, shortcuts.index(group, 0)));
+        ++emptyRows[group];
     }
+    for (int group = 0; group < emptyRows.size(); ++group) {
+        const QModelIndex header = shortcuts.index(group, 0);
+        if (emptyRows.at(group) == shortcuts.rowCount(header))
+            hideRow(header);
+    }
+}
+
+void ShortcutsTreeView::hideRow(const QModelIndex &index)
+{
+    setRowHidden(index.row(), index.parent(), true);
+    m_hidden.append(index);
 }

@@ -13,7 +13,8 @@ class ShortcutsModel;
 /**
  * The groups and shortcuts of a ShortcutsModel; tells which one is current and with which keys.
  *
- * Rows whose shortcut is gone are hidden. With a model of another kind it is a plain tree.
+ * Rows whose shortcut is gone are hidden, and groups of such rows alone. A group that is registered
+ * later comes open. With a model of another kind it is a plain tree.
  */
 class ShortcutsTreeView : public QTreeView
 {
@@ -54,9 +55,11 @@ private:
     void refreshRowsLater();
     void refreshRows();
     void hideEmptyRows(const ShortcutsModel &shortcuts);
+    void hideRow(const QModelIndex &index);
     QVector<QModelIndex> widestItems(const ShortcutsModel &shortcuts) const;
     int indentationOf(const QModelIndex &index) const;
 
     QVector<QPersistentModelIndex> m_hidden;
+    int m_groups = 0; // those that were there at the last look; later ones come open
     bool m_isRefreshPending = false;
 };

@@ -41,6 +41,26 @@ class tst_ShortcutsThatGo : public DialogTestCase
 private Q_SLOTS:
     void deletesEachObjectOnceWhenObjectsDeleteActions();
     void deletesAnObjectOnceThatAsksForItAgain();
+    void hidesAGroupWhoseLastShortcutWent();
+    void showsAGroupAgainThatIsUsedAgain();
+    void hidesAGroupThatIsEmptyWhenTheDialogOpens();
+    void leavesTheHeaderOfAGroupThatGoes();
+    void opensAGroupThatIsRegisteredLater();
+    void leavesAGroupClosedThatTheUserClosed();
+
+private:
+    bool isShown(const QModelIndex &index) const { return !tree()->visualRect(index).isEmpty(); }
+    // The groups that are seen.
+    QStringList shownGroups() const
+    {
+        QStringList names;
+        for (QModelIndex index = tree()->indexAt({1, 1}); index.isValid();
+             index = tree()->indexBelow(index)) {
+            if (!index.parent().isValid())
+                names.append(index.siblingAtColumn(0).data().toString());
+        }
+        return names;
+    }
 };
 
 void tst_ShortcutsThatGo::deletesEachObjectOnceWhenObjectsDeleteActions()
@@ -62,6 +82,66 @@ void tst_ShortcutsThatGo::deletesAnObjectOnceThatAsksForItAgain()
     QSignalSpy spy(object, &QObject::destroyed);
     Q_EMIT object->deleteMe();
     QCOMPARE(spy.count(), 1);
+}
+
+void tst_ShortcutsThatGo::hidesAGroupWhoseLastShortcutWent()
+{
+    m_dialog->show();
+    QTRY_COMPARE(shownGroups(), QStringList({str("File"), str("Edit")}));
+    delete copy;
+    QTRY_VERIFY(!isShown(m_model->index(0, 0, m_model->index(1, 0))));
+    QCOMPARE(shownGroups(), QStringList({str("File"), str("Edit")}));
+    delete cut;
+    QTRY_COMPARE(shownGroups(), QStringList({str("File")}));
+    QVERIFY(isShown(row("open")));
+}
+
+void tst_ShortcutsThatGo::showsAGroupAgainThatIsUsedAgain()
+{
+    m_dialog->show();
+    delete copy;
+    delete cut;
+    QTRY_COMPARE(shownGroups(), QStringList({str("File")}));
+    addAction("paste", "Edit", QKeySequence());
+    QTRY_COMPARE(shownGroups(), QStringList({str("File"), str("Edit")}));
+    QVERIFY(isShown(row("paste")));
+}
+
+void tst_ShortcutsThatGo::hidesAGroupThatIsEmptyWhenTheDialogOpens()
+{
+    delete copy;
+    delete cut;
+    EditShortcutsDialog dialog(m_model.get());
+    auto *view = dialog.findChild<ShortcutsTreeView *>(str("treeView"));
+    QVERIFY(view->isRowHidden(1, QModelIndex()));
+    QVERIFY(!view->isRowHidden(0, QModelIndex()));
+}
+
+void tst_ShortcutsThatGo::leavesTheHeaderOfAGroupThatGoes()
+{
+    m_dialog->show();
+    tree()->setCurrentIndex(m_model->index(1, 0));
+    delete copy;
+    delete cut;
+    QTRY_VERIFY(!tree()->currentIndex().isValid());
+}
+
+void tst_ShortcutsThatGo::opensAGroupThatIsRegisteredLater()
+{
+    m_dialog->show();
+    addAction("zoom", "View", QKeySequence());
+    QTRY_VERIFY(isShown(row("zoom")));
+    QVERIFY(tree()->isExpanded(m_model->index(2, 0)));
+}
+
+void tst_ShortcutsThatGo::leavesAGroupClosedThatTheUserClosed()
+{
+    m_dialog->show();
+    tree()->collapse(m_model->index(1, 0));
+    addAction("paste", "Edit", QKeySequence());
+    addAction("zoom", "View", QKeySequence());
+    QTRY_VERIFY(isShown(row("zoom")));
+    QVERIFY(!isShown(row("paste")));
 }
 
 VEL_TEST_MAIN(tst_ShortcutsThatGo)
