@@ -59,7 +59,10 @@ void EditShortcutsDialogPrivate::connectKeys()
     QObject::connect(form.treeView, &ShortcutsTreeView::currentItemIsNotShortcut, &m_context,
                      [this] { showNoShortcut(); });
     if (m_model)
-        QObject::connect(m_model, &QObject::destroyed, &m_context, [this] { showNoShortcut(); });
+        QObject::connect(m_model, &QObject::destroyed, &m_context, [this] {
+            showNoShortcut();
+            setChanged(false);
+        });
 
     QObject::connect(form.keyWidget, &QKeySequenceEdit::keySequenceChanged, &m_context,
                      [this](const QKeySequence &key) { enterKey(QKeySequence(key)); });
@@ -253,7 +256,7 @@ void EditShortcutsDialogPrivate::setPendingKey(const QKeySequence &key)
 
 bool EditShortcutsDialogPrivate::isChanged() const
 {
-    return form.buttonBox->button(QDialogButtonBox::Ok)->isEnabled();
+    return m_model && form.buttonBox->button(QDialogButtonBox::Ok)->isEnabled();
 }
 
 void EditShortcutsDialogPrivate::setChanged(bool changed)

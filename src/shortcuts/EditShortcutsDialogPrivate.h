@@ -32,7 +32,8 @@ public:
     /// Builds the form on \a dialog and shows \a shortcuts, which may be null, in it.
     EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts);
 
-    /// Whether there is something to apply: the Ok button is the one record of that.
+    /// Whether there is something to apply, and a model that takes it: the Ok button is the one
+    /// record of that.
     bool isChanged() const;
     /// Enables or disables the buttons Ok and Reset.
     void setChanged(bool changed);

@@ -47,6 +47,7 @@ private Q_SLOTS:
     void leavesTheHeaderOfAGroupThatGoes();
     void opensAGroupThatIsRegisteredLater();
     void leavesAGroupClosedThatTheUserClosed();
+    void asksNothingWhenTheModelIsGone();
 
 private:
     bool isShown(const QModelIndex &index) const { return !tree()->visualRect(index).isEmpty(); }
@@ -142,6 +143,18 @@ void tst_ShortcutsThatGo::leavesAGroupClosedThatTheUserClosed()
     addAction("zoom", "View", QKeySequence());
     QTRY_VERIFY(isShown(row("zoom")));
     QVERIFY(!isShown(row("paste")));
+}
+
+void tst_ShortcutsThatGo::asksNothingWhenTheModelIsGone()
+{
+    const ModalDriver modal;
+    m_dialog->show();
+    m_dialog->setChanged(true);
+    m_model.reset();
+    QVERIFY(!isChanged());
+    m_dialog->setChanged(true);
+    QVERIFY(m_dialog->close());
+    QVERIFY(modal.finished());
 }
 
 VEL_TEST_MAIN(tst_ShortcutsThatGo)
