@@ -4,13 +4,14 @@
 #include <VelRadioGroupBox.h>
 
 #include "RadioGroupBoxAccessible.h"
+#include "RadioGroupBoxPainter.h"
 
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QPointer>
 #include <QStyle>
-#include <QStyleOption>
+#include <QStyleOptionGroupBox>
 
 #include <cmath>
 
@@ -22,9 +23,6 @@ public:
 
 namespace {
 
-// The distance that the common style leaves between the frame and the indicator.
-constexpr int FrameGap = 4;
-
 // QPointF::toPoint() takes -0.5 to 0, which would lie inside.
 QPoint wholePixels(const QPointF &position)
 {
@@ -35,88 +33,6 @@ bool isPressKey(const QKeyEvent *event)
 {
     return event->key() == Qt::Key_Space || event->key() == Qt::Key_Select;
 }
-
-// Draws one group box with the style of its widget.
-class GroupBoxPainter
-{
-public:
-    GroupBoxPainter(QPainter *painter, const QStyleOptionGroupBox &option, const QWidget *widget)
-        : m_painter(painter)
-        , m_option(option)
-        , m_widget(widget)
-        , m_style(widget->style())
-        , m_indicator(rectOf(QStyle::SC_GroupBoxCheckBox))
-        , m_label(rectOf(QStyle::SC_GroupBoxLabel))
-    {
-    }
-
-    void drawFrame()
-    {
-        QStyleOptionFrame frame;
-        frame.QStyleOption::operator=(m_option);
-        frame.features = m_option.features;
-        frame.lineWidth = m_option.lineWidth;
-        frame.midLineWidth = m_option.midLineWidth;
-        frame.rect = rectOf(QStyle::SC_GroupBoxFrame);
-
-        QRegion outline(m_option.rect);
-        if (!m_option.text.isEmpty()) {
-            const bool leftToRight = m_option.direction == Qt::LeftToRight;
-            outline -= m_indicator.united(m_label).adjusted(leftToRight ? -FrameGap : 0, 0,
-                                                            leftToRight ? 0 : FrameGap, 0);
-        }
-        m_painter->save();
-        m_painter->setClipRegion(outline);
-        m_style->drawPrimitive(QStyle::PE_FrameGroupBox, &frame, m_painter, m_widget);
-        m_painter->restore();
-    }
-
-    void drawTitle()
-    {
-        if (m_option.text.isEmpty())
-            return;
-        int flags = int(Qt::TextShowMnemonic) | int(Qt::AlignHCenter) | int(m_option.textAlignment);
-        if (!m_style->styleHint(QStyle::SH_UnderlineShortcut, &m_option, m_widget))
-            flags |= Qt::TextHideMnemonic;
-        const bool ownColor = m_option.textColor.isValid();
-        if (ownColor)
-            m_painter->setPen(m_option.textColor);
-        m_style->drawItemText(m_painter, m_label, flags, m_option.palette,
-                              m_option.state & QStyle::State_Enabled, m_option.text,
-                              ownColor ? QPalette::NoRole : QPalette::WindowText);
-    }
-
-    void drawFocus()
-    {
-        if (!(m_option.state & QStyle::State_HasFocus))
-            return;
-        QStyleOptionFocusRect focus;
-        focus.QStyleOption::operator=(m_option);
-        focus.rect = m_indicator.united(m_label);
-        m_style->drawPrimitive(QStyle::PE_FrameFocusRect, &focus, m_painter, m_widget);
-    }
-
-    void drawIndicator()
-    {
-        QStyleOptionButton button;
-        button.QStyleOption::operator=(m_option);
-        button.rect = m_indicator;
-        m_style->drawPrimitive(QStyle::PE_IndicatorRadioButton, &button, m_painter, m_widget);
-    }
-
-private:
-    QRect rectOf(QStyle::SubControl part) const
-    {
-        return m_style->subControlRect(QStyle::CC_GroupBox, &m_option, part, m_widget);
-    }
-
-    QPainter *const m_painter;
-    const QStyleOptionGroupBox &m_option;
-    const QWidget *const m_widget;
-    QStyle *const m_style;
-    const QRect m_indicator;
-    const QRect m_label;
-};
 
 } // namespace
 
@@ -264,7 +180,7 @@ void VelRadioGroupBox::paintEvent(QPaintEvent *event)
     QStyleOptionGroupBox option;
     initStyleOption(&option);
     QPainter painter(this);
-    GroupBoxPainter groupBox(&painter, option, this);
+    RadioGroupBoxPainter groupBox(&painter, option, this);
     groupBox.drawFrame();
     groupBox.drawTitle();
     groupBox.drawFocus();
