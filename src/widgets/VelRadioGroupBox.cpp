@@ -29,6 +29,21 @@ QPoint wholePixels(const QPointF &position)
     return {int(std::lround(position.x())), int(std::lround(position.y()))};
 }
 
+// Whether a press ends before its release: nobody else will tell.
+bool endsPress(const VelRadioGroupBox &box, const QEvent &event)
+{
+    switch (event.type()) {
+    case QEvent::FocusOut:
+        return static_cast<const QFocusEvent &>(event).reason() != Qt::PopupFocusReason;
+    case QEvent::EnabledChange:
+        return !box.isEnabled();
+    case QEvent::Hide:
+        return true;
+    default:
+        return false;
+    }
+}
+
 bool isPressKey(const QKeyEvent *event)
 {
     return event->key() == Qt::Key_Space || event->key() == Qt::Key_Select;
@@ -103,6 +118,10 @@ bool VelRadioGroupBox::hitButtonOrLabel(const QPoint &point) const
 
 bool VelRadioGroupBox::event(QEvent *event)
 {
+    if (d->pressed && endsPress(*this, *event)) {
+        d->pressed = false;
+        update();
+    }
     return QWidget::event(event); // NOLINT(bugprone-parent-virtual-call)
 }
 
@@ -155,6 +174,8 @@ void VelRadioGroupBox::keyPressEvent(QKeyEvent *event)
         QWidget::keyPressEvent(event); // NOLINT(bugprone-parent-virtual-call)
         return;
     }
+    if (event->isAutoRepeat())
+        return;
     d->pressed = true;
     QStyleOptionGroupBox option;
     initStyleOption(&option);
@@ -167,6 +188,8 @@ void VelRadioGroupBox::keyReleaseEvent(QKeyEvent *event)
         QWidget::keyReleaseEvent(event); // NOLINT(bugprone-parent-virtual-call)
         return;
     }
+    if (event->isAutoRepeat())
+        return;
     d->pressed = false;
     const QPointer<VelRadioGroupBox> self(this);
     setChecked(true);
