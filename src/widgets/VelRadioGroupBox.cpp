@@ -3,6 +3,7 @@
 
 #include <VelRadioGroupBox.h>
 
+#include "IdleMnemonic.h"
 #include "RadioGroupBoxAccessible.h"
 #include "RadioGroupBoxPainter.h"
 
@@ -18,7 +19,13 @@
 class VelRadioGroupBoxPrivate
 {
 public:
+    explicit VelRadioGroupBoxPrivate(VelRadioGroupBox *box)
+        : mnemonic(box)
+    {
+    }
+
     bool pressed = false;
+    IdleMnemonic mnemonic;
 };
 
 namespace {
@@ -53,14 +60,14 @@ bool isPressKey(const QKeyEvent *event)
 
 VelRadioGroupBox::VelRadioGroupBox(QWidget *parent)
     : QGroupBox(parent)
-    , d(std::make_unique<VelRadioGroupBoxPrivate>())
+    , d(std::make_unique<VelRadioGroupBoxPrivate>(this))
 {
     init();
 }
 
 VelRadioGroupBox::VelRadioGroupBox(const QString &title, QWidget *parent)
     : QGroupBox(title, parent)
-    , d(std::make_unique<VelRadioGroupBoxPrivate>())
+    , d(std::make_unique<VelRadioGroupBoxPrivate>(this))
 {
     init();
 }
@@ -118,6 +125,7 @@ bool VelRadioGroupBox::hitButtonOrLabel(const QPoint &point) const
 
 bool VelRadioGroupBox::event(QEvent *event)
 {
+    d->mnemonic.watch(*event);
     if (d->pressed && endsPress(*this, *event)) {
         d->pressed = false;
         update();

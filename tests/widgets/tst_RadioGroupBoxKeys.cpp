@@ -82,6 +82,8 @@ private Q_SLOTS:
     void comesUpWhenItIsDisabledWhilePressed();
     void comesUpWhenItIsHiddenWhilePressed();
     void staysDownWhileSpaceIsHeld();
+    void leavesItsLetterToOtherWidgets_data();
+    void leavesItsLetterToOtherWidgets();
 
 private:
     std::unique_ptr<QWidget> m_window;
@@ -176,6 +178,42 @@ void tst_RadioGroupBoxKeys::staysDownWhileSpaceIsHeld()
     XDoTool::run(s("keyup space"));
     QTRY_VERIFY(m_first->isChecked());
     QVERIFY(!m_first->isSunken());
+}
+
+void tst_RadioGroupBoxKeys::leavesItsLetterToOtherWidgets_data()
+{
+    QTest::addColumn<QString>("when");
+    for (const char *when :
+         {"constructed", "set later", "set by name", "set while it is hidden", "made later"})
+        QTest::newRow(when) << s(when);
+}
+
+void tst_RadioGroupBoxKeys::leavesItsLetterToOtherWidgets()
+{
+    QFETCH(QString, when);
+    if (when == s("set later")) {
+        m_second->setTitle(s("&Files"));
+    } else if (when == s("set by name")) {
+        m_second->setProperty("title", s("&Folders"));
+    } else if (when == s("set while it is hidden")) {
+        m_second->hide();
+        m_second->setTitle(s("&Fields"));
+        new QPushButton(s("&Other"), m_window.get());
+        m_second->show();
+    } else if (when == s("made later")) {
+        auto *box = new OpenBox(m_window.get());
+        box->setTitle(s("&Form"));
+        m_window->layout()->addWidget(box);
+        QTRY_VERIFY(box->isVisible());
+    }
+    m_window->grab();
+    QSignalSpy clicked(m_find, &QPushButton::clicked);
+    for (int i = 0; i < 4; ++i) {
+        XDoTool::press(s("alt+f"));
+        QTRY_COMPARE(clicked.count(), i + 1);
+    }
+    QVERIFY(!m_first->isChecked());
+    QVERIFY(!m_second->isChecked());
 }
 
 VEL_TEST_MAIN(tst_RadioGroupBoxKeys)
