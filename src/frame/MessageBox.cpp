@@ -12,6 +12,7 @@ QMessageBox::StandardButton MessageBox::show(QWidget *parent, QMessageBox::Icon 
                                              QMessageBox::StandardButton defaultButton)
 {
     GuardedDialog<QMessageBox> box(icon, title, text, buttons, parent);
+    box->setTextFormat(Qt::PlainText);
     if (defaultButton != QMessageBox::NoButton)
         box->setDefaultButton(defaultButton);
     box.exec();

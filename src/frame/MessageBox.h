@@ -16,6 +16,8 @@ namespace MessageBox {
 /**
  * Shows a box and waits for an answer, as the static functions of QMessageBox do.
  *
+ * The text is plain text: names of files and actions that stand in it may look like rich text.
+ *
  * @return the button pressed; NoButton when \a parent went away meanwhile, after which the
  *         caller must not touch it
  */

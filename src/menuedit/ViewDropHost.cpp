@@ -34,6 +34,7 @@ public:
         GuardedDialog<QMessageBox> box(QMessageBox::Question, QFileSystemModel::tr("Attention"),
                                        QFileSystemModel::tr("%1 already exists. Overwrite?").arg(target),
                                        QMessageBox::Yes, qobject_cast<QWidget *>(m_owner));
+        box->setTextFormat(Qt::PlainText);
         box->setDefaultButton(QMessageBox::No);
         return box.exec() != QMessageBox::No;
     }

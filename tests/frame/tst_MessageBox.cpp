@@ -7,6 +7,7 @@
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
 
+#include <QAbstractButton>
 #include <QDialog>
 
 /// Modal windows that may lose their parent while they are open.
@@ -19,6 +20,7 @@ private Q_SLOTS:
     void answersWithThePressedButton();
     void hasTheDefaultButtonAskedFor();
     void answersWithNoButtonWhenTheParentGoes();
+    void showsTheTextAsItIs();
 
     void runsADialog_data();
     void runsADialog();
@@ -74,6 +76,19 @@ void tst_MessageBox::answersWithNoButtonWhenTheParentGoes()
     QCOMPARE(MessageBox::show(parent, QMessageBox::Question, QStringLiteral("Attention"),
                               QStringLiteral("Go on?"), QMessageBox::Yes | QMessageBox::No),
              QMessageBox::NoButton);
+    QVERIFY(modal.finished());
+}
+
+void tst_MessageBox::showsTheTextAsItIs()
+{
+    const QString text = QStringLiteral("Can't start:\n<b>a</b> &amp; <i>b</i>");
+    ModalDriver modal;
+    modal.answerWith({QMessageBox::Warning, QStringLiteral("Warning"), text}, [](QMessageBox *box) {
+        // Also where the text looks like rich text.
+        QCOMPARE(box->textFormat(), Qt::PlainText);
+        box->button(QMessageBox::Ok)->click();
+    });
+    MessageBox::show(nullptr, QMessageBox::Warning, QStringLiteral("Warning"), text);
     QVERIFY(modal.finished());
 }
 

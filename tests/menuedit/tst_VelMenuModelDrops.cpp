@@ -40,6 +40,7 @@ private Q_SLOTS:
     void putsTheDirectoryFileBack_data();
     void putsTheDirectoryFileBack();
     void takesAwayADirectoryFileThatWasNotThere();
+    void namesTheItemToOverwriteAsItIsWritten();
     void tellsAtTheItemThatItWasLeft();
     void keepsThePlaceWhenRowsGoWhileItAsks_data();
     void keepsThePlaceWhenRowsGoWhileItAsks();
@@ -235,6 +236,24 @@ void tst_VelMenuModelDrops::takesAwayADirectoryFileThatWasNotThere()
     QVERIFY(!drop({QStringLiteral("menu/from/pipe")}, Qt::CopyAction, 0));
 
     QVERIFY(!QFile::exists(path(QStringLiteral("menu/to/.directory"))));
+}
+
+void tst_VelMenuModelDrops::namesTheItemToOverwriteAsItIsWritten()
+{
+    const QString name = QStringLiteral("<b>x<br>");
+    write(QStringLiteral("menu/from/") + name, "new");
+    const QString target = write(QStringLiteral("menu/to/") + name, "old");
+    ModalDriver modal;
+    modal.answerWith({QMessageBox::Question, QStringLiteral("Attention"),
+                      QStringLiteral("%1 already exists. Overwrite?").arg(target), QMessageBox::Yes},
+                     [](QMessageBox *box) {
+                         QCOMPARE(box->textFormat(), Qt::PlainText);
+                         box->button(QMessageBox::Yes)->click();
+                     });
+
+    QVERIFY(!drop({QStringLiteral("menu/from/") + name}, Qt::MoveAction, 0));
+
+    QVERIFY(modal.finished());
 }
 
 void tst_VelMenuModelDrops::tellsAtTheItemThatItWasLeft()

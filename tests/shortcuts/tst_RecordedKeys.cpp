@@ -48,6 +48,7 @@ private Q_SLOTS:
     void recordsAHeldKeyOnce();
     void keepsTheFirstChordWhileTheSecondIsHeld();
     void knowsAHeldKeyThatIsNotCalledRepeated();
+    void namesTheHolderOfAKeyAsItIsWritten();
 };
 
 void tst_RecordedKeys::recordsNothingForAKeyThatIsNoChord_data()
@@ -188,6 +189,19 @@ void tst_RecordedKeys::knowsAHeldKeyThatIsNotCalledRepeated()
     QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_D));
     send(QEvent::KeyPress, 1701);
     QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_D, Qt::CTRL | Qt::Key_D));
+}
+
+void tst_RecordedKeys::namesTheHolderOfAKeyAsItIsWritten()
+{
+    record("open");
+    save->setText(str("<b>Save</b> <i>all</i>"));
+    ModalDriver modal;
+    modal.answerWith(localConflict("F2", "<b>Save</b> <i>all</i>"), [](QMessageBox *box) {
+        QCOMPARE(box->textFormat(), Qt::PlainText);
+        box->button(QMessageBox::Ok)->click();
+    });
+    XDoTool::press(str("F2"));
+    QTRY_VERIFY(modal.finished() && !QApplication::activeModalWidget());
 }
 
 VEL_TEST_MAIN(tst_RecordedKeys)

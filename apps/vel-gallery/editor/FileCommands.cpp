@@ -11,6 +11,14 @@
 
 namespace {
 
+// In plain text: a path may look like rich text.
+void warn(QWidget *parent, const QString &title, const QString &text)
+{
+    QMessageBox box(QMessageBox::Warning, title, text, QMessageBox::Ok, parent);
+    box.setTextFormat(Qt::PlainText);
+    box.exec();
+}
+
 void openFile(QPlainTextEdit *editor)
 {
     const QString path = QFileDialog::getOpenFileName(editor);
@@ -20,7 +28,7 @@ void openFile(QPlainTextEdit *editor)
     if (file.open(QIODevice::ReadOnly))
         editor->setPlainText(QString::fromUtf8(file.readAll()));
     else
-        QMessageBox::warning(editor, EditorTexts::tr("Open"), EditorTexts::tr("Cannot read %1.").arg(path));
+        warn(editor, EditorTexts::tr("Open"), EditorTexts::tr("Cannot read %1.").arg(path));
 }
 
 void saveFile(QPlainTextEdit *editor)
@@ -31,7 +39,7 @@ void saveFile(QPlainTextEdit *editor)
     QSaveFile file(path);
     const QByteArray bytes = editor->toPlainText().toUtf8();
     if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size() || !file.commit())
-        QMessageBox::warning(editor, EditorTexts::tr("Save"), EditorTexts::tr("Cannot write %1.").arg(path));
+        warn(editor, EditorTexts::tr("Save"), EditorTexts::tr("Cannot write %1.").arg(path));
 }
 
 } // namespace
