@@ -226,7 +226,11 @@ bool EditShortcutsDialogPrivate::showMessage()
         return false;
     }
     const QString text = std::exchange(m_message, QString());
+    const QPointer<QDialog> self(m_dialog);
     MessageBox::show(m_dialog, QMessageBox::Critical, tr("Shortcuts conflict"), text);
+    // Meanwhile the host may have given the shortcut another key, or none.
+    if (self)
+        dropKey();
     return false;
 }
 
