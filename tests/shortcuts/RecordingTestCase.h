@@ -31,6 +31,9 @@ protected:
     // Makes the action current and its key editor ready.
     void record(const char *name)
     {
+        // A message may just have closed, and the window manager takes its time.
+        m_dialog->activateWindow();
+        QVERIFY(QTest::qWaitForWindowActive(m_dialog.get()));
         select(name);
         customButton()->setChecked(true);
         keyWidget()->setFocus();
