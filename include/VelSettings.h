@@ -32,8 +32,9 @@ class QSettings;
  * value of "SectionName"; setting it renames the section, removing it drops the header.
  *
  * Writing gives the header, then the keys in sorted order. The format keeps no comments, no blank
- * lines, no order, no header but the last and no key with an empty value; a value that holds a
- * line break is read back as more than one line. A file is replaced as a whole or, when that
+ * lines, no order, no header but the last and no key with an empty value. Each line feed and
+ * carriage return in a key, a value or the section's name is written as a blank, told in one line on
+ * standard error for each value that had any. A file is replaced as a whole or, when that
  * fails, left as it was. Keys that another program changed in the meantime are kept, unless they
  * were changed here as well.
  *

@@ -3,6 +3,8 @@
 
 #include "ThemeRcFormat.h"
 
+#include "LineBreaks.h"
+
 #include <QFileDevice>
 #include <QTextCodec>
 
@@ -158,14 +160,16 @@ void readBytes(const char *begin, const char *end, bool asciiAsIs, QSettings::Se
         readLine(QStringView(QString::fromLocal8Bit(begin, size)), map);
 }
 
-QString sectionLine(const QVariant &name)
+QString sectionLine(const QIODevice &device, const QVariant &value)
 {
-    return QLatin1Char('[') + name.toString() + QLatin1String("]\n");
+    const QString name = value.toString();
+    if (LineBreaks::areIn(name))
+        LineBreaks::tell(device, QStringLiteral("the section's name"));
+    return QLatin1Char('[') + LineBreaks::toBlanks(name) + QLatin1String("]\n");
 }
 
-void appendKey(QString &lines, const QString &key, const QVariant &value)
+void appendLine(QString &lines, const QString &key, const QString &text)
 {
-    const QString text = value.toString();
     const bool hasBlank = text.contains(QLatin1Char(' ')) || text.contains(QLatin1Char('\t'));
     const bool needsQuotes = hasBlank && !isQuoted(QStringView(text));
     lines.append(key).append(QLatin1Char('='));
@@ -175,6 +179,17 @@ void appendKey(QString &lines, const QString &key, const QVariant &value)
     if (needsQuotes)
         lines.append(QLatin1Char('"'));
     lines.append(QLatin1Char('\n'));
+}
+
+void appendKey(QString &lines, const QIODevice &device, const QString &key, const QVariant &value)
+{
+    const QString text = value.toString();
+    if (!LineBreaks::areIn(key) && !LineBreaks::areIn(text)) {
+        appendLine(lines, key, text);
+        return;
+    }
+    LineBreaks::tell(device, QStringLiteral("the line of '%1'").arg(key));
+    appendLine(lines, LineBreaks::toBlanks(key), LineBreaks::toBlanks(text));
 }
 
 } // namespace
@@ -222,7 +237,7 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
     QString lines;
     const auto section = map.constFind(sectionKey());
     if (section != map.constEnd())
-        lines = sectionLine(section.value());
+        lines = sectionLine(device, section.value());
     for (auto it = map.constBegin(); it != map.constEnd(); ++it) {
         if (it == section)
             continue;
@@ -230,7 +245,7 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
             bytes += lines.toLocal8Bit();
             lines.clear();
         }
-        appendKey(lines, it.key(), it.value());
+        appendKey(lines, device, it.key(), it.value());
     }
     bytes += lines.toLocal8Bit();
     return writeThrough(device, bytes);

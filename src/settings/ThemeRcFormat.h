@@ -23,6 +23,9 @@ bool read(QIODevice &device, QSettings::SettingsMap &map);
 
 /**
  * Writes \a map to \a device: the section header, then the keys in the order of the map.
+ *
+ * Each line feed and carriage return in a key, a value or the section's name is written as a
+ * blank, told in one line on standard error for each value that had any.
  * @return false, after a line on standard error, when the device is closed or read-only or when
  * the map is empty; false when the device does not take all of it.
  */

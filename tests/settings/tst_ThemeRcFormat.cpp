@@ -209,6 +209,9 @@ private Q_SLOTS:
     void readsManyLinesOfBothOrders();
     void writesKeys_data();
     void writesKeys();
+    void writesLineBreaksAsBlanks_data();
+    void writesLineBreaksAsBlanks();
+    void namesTheFileWhoseLineBreaksBecomeBlanks();
     void losesOnReadingAndWritingWhatTheFormatDoesNotKeep_data();
     void losesOnReadingAndWritingWhatTheFormatDoesNotKeep();
     void readsAndWritesInTheEncodingOfTheLocale_data();
@@ -381,6 +384,64 @@ void tst_ThemeRcFormat::writesKeys()
     QFETCH(Map, map);
     QFETCH(QByteArray, expected);
     QCOMPARE(writeMap(map), expected);
+}
+
+void tst_ThemeRcFormat::writesLineBreaksAsBlanks_data()
+{
+    QTest::addColumn<Map>("map");
+    QTest::addColumn<QByteArray>("expected");
+    QTest::addColumn<QByteArray>("told");
+    const auto told = [](const QByteArray &place) {
+        return "VelSettings: line breaks in " + place + " are written as blanks\n";
+    };
+
+    QTest::newRow("value that forges a key") << Map{{s("a"), s("x\nb=2")}, {s("c"), 3}}
+                                             << QByteArray("a=\"x b=2\"\nc=3\n") << told("the line of 'a'");
+    QTest::newRow("value that forges a section")
+        << Map{{s("SectionName"), s("Main")}, {s("a"), s("x\n[Other]")}}
+        << QByteArray("[Main]\na=\"x [Other]\"\n") << told("the line of 'a'");
+    QTest::newRow("one blank for each")
+        << Map{{s("a"), s("\nx\r\n\n\ry\r")}} << QByteArray("a=\" x    y \"\n") << told("the line of 'a'");
+    QTest::newRow("quoted value") << Map{{s("a"), s("\"x\ny\"")}} << QByteArray("a=\"x y\"\n")
+                                  << told("the line of 'a'");
+    QTest::newRow("word with a line end")
+        << Map{{s("a"), s("true\n")}} << QByteArray("a=\"true \"\n") << told("the line of 'a'");
+    QTest::newRow("key") << Map{{s("a=1\n[x]\rb"), 2}, {s("c"), 3}} << QByteArray("a=1 [x] b=2\nc=3\n")
+                         << told("the line of 'a=1\\x0a[x]\\x0db'");
+    QTest::newRow("key and value") << Map{{s("a\nb"), s("c\nd")}} << QByteArray("a b=\"c d\"\n")
+                                   << told("the line of 'a\\x0ab'");
+    QTest::newRow("key that acts on a terminal")
+        << Map{{s("\x1b[2J\x7f\u009bm"), s("\n")}} << QByteArray("\x1b[2J\x7f\xc2\x9bm=\" \"\n")
+        << told("the line of '\\x1b[2J\\x7f\\x9bm'");
+    QTest::newRow("section") << Map{{s("SectionName"), s("a]\nb=1\n[c")}, {s("d"), 1}}
+                             << QByteArray("[a] b=1 [c]\nd=1\n") << told("the section's name");
+    QTest::newRow("each is told") << Map{{s("SectionName"), s("\n")}, {s("a"), s("\n")}, {s("b"), s("\r\n")}}
+                                  << QByteArray("[ ]\na=\" \"\nb=\"  \"\n")
+                                  << told("the section's name") + told("the line of 'a'")
+            + told("the line of 'b'");
+}
+
+void tst_ThemeRcFormat::writesLineBreaksAsBlanks()
+{
+    QFETCH(Map, map);
+    QFETCH(QByteArray, expected);
+    QFETCH(QByteArray, told);
+    StderrCapture capture;
+    const QByteArray written = writeMap(map);
+    QCOMPARE(capture.take(), told);
+    QCOMPARE(written, expected);
+}
+
+void tst_ThemeRcFormat::namesTheFileWhoseLineBreaksBecomeBlanks()
+{
+    QFile file(path(s("a\nrc")));
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    StderrCapture capture;
+    const bool result = ThemeRcFormat::write(file, {{s("a"), s("x\ny")}});
+    QCOMPARE(capture.take(),
+             "VelSettings: " + QFile::encodeName(folder())
+                 + "/a\\x0arc: line breaks in the line of 'a' are written as blanks\n");
+    QVERIFY(result);
 }
 
 void tst_ThemeRcFormat::losesOnReadingAndWritingWhatTheFormatDoesNotKeep_data()

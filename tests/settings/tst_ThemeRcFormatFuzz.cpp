@@ -4,6 +4,7 @@
 // Generated inputs against a plain second reader that follows the rules of the format word by
 // word. VEL_TEST_ROUNDS sets how many (default 20000).
 
+#include "StderrCapture.h"
 #include "TestCase.h"
 
 #include <settings/ThemeRcFormat.h>
@@ -71,20 +72,25 @@ Map plainRead(QIODevice &device)
     return map;
 }
 
+QString onOneLine(QString text)
+{
+    return text.replace(QLatin1Char('\n'), QLatin1Char(' ')).replace(QLatin1Char('\r'), QLatin1Char(' '));
+}
+
 QByteArray plainWrite(const Map &map)
 {
     QByteArray bytes;
     if (map.contains(QStringLiteral("SectionName")))
-        bytes += '[' + map.value(QStringLiteral("SectionName")).toString().toLocal8Bit() + "]\n";
+        bytes += '[' + onOneLine(map.value(QStringLiteral("SectionName")).toString()).toLocal8Bit() + "]\n";
     for (auto it = map.constBegin(); it != map.constEnd(); ++it) {
         if (it.key() == QLatin1String("SectionName"))
             continue;
-        QString text = it.value().toString();
+        QString text = onOneLine(it.value().toString());
         const bool quoted =
             text.size() > 1 && text.startsWith(QLatin1Char('"')) && text.endsWith(QLatin1Char('"'));
         if (!quoted && (text.contains(QLatin1Char(' ')) || text.contains(QLatin1Char('\t'))))
             text = QStringLiteral("\"%1\"").arg(text);
-        bytes += QStringLiteral("%1=%2\n").arg(it.key(), text).toLocal8Bit();
+        bytes += QStringLiteral("%1=%2\n").arg(onOneLine(it.key()), text).toLocal8Bit();
     }
     return bytes;
 }
@@ -204,7 +210,10 @@ void tst_ThemeRcFormatFuzz::readsAndWritesGeneratedInputsByTheRules()
 
         QBuffer written;
         written.open(QIODevice::ReadWrite);
-        QVERIFY(ThemeRcFormat::write(written, map));
+        StderrCapture capture; // some lose a carriage return
+        const bool result = ThemeRcFormat::write(written, map);
+        capture.take();
+        QVERIFY(result);
         QVERIFY2(written.data() == plainWrite(map), qPrintable(QStringLiteral("round %1").arg(round)));
     }
 }

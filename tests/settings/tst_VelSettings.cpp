@@ -61,6 +61,7 @@ private Q_SLOTS:
     void touchesNothingWithoutBeingAsked();
     void touchesAFileWhoseNameIsNotAscii();
     void touchesBeforeItLooksForChanges();
+    void writesNoLineBreakOfAValue();
     void renamesTheSection();
     void dropsTheHeaderWithTheSectionName();
     void removesAKey();
@@ -234,6 +235,21 @@ void tst_VelSettings::touchesBeforeItLooksForChanges()
     QCOMPARE(settings.value(s("a")), QVariant(1));
     settings.sync(true);
     QCOMPARE(settings.value(s("a")), QVariant(2));
+}
+
+void tst_VelSettings::writesNoLineBreakOfAValue()
+{
+    const QString file = write(s("rc"), "[Main]\na=1\nz=2\n");
+    StderrCapture capture;
+    {
+        VelSettings settings(file);
+        settings.setValue(s("SectionName"), s("M\n[X]"));
+        settings.setValue(s("b"), s("x\r\nz=3"));
+        settings.setValue(s("c\nz"), 4);
+        settings.sync();
+        QCOMPARE(read(file), QByteArray("[M [X]]\na=1\nb=\"x  z=3\"\nc z=4\nz=2\n"));
+    }
+    QCOMPARE(capture.take().count('\n'), 3);
 }
 
 void tst_VelSettings::renamesTheSection()
