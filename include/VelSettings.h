@@ -34,9 +34,10 @@ class QSettings;
  * Writing gives the header, then the keys in sorted order. The format keeps no comments, no blank
  * lines, no order, no header but the last and no key with an empty value. Each line feed and
  * carriage return in a key, a value or the section's name is written as a blank, told in one line on
- * standard error for each value that had any. A file is replaced as a whole or, when that
- * fails, left as it was. Keys that another program changed in the meantime are kept, unless they
- * were changed here as well.
+ * standard error for each value that had any. A file is replaced as a whole or, when that fails,
+ * left as it was; it also stays as it is while it cannot be read, is larger than LargestFile or would
+ * become so. Keys that another program changed in the meantime are kept, unless they were changed here
+ * as well.
  *
  * A file cannot be emptied: while the last key is removed, nothing is written, and once the object
  * is gone without another key having been set, the file stays as it was.
@@ -54,6 +55,9 @@ class QSettings;
 class VELUIEXTRA_EXPORT VelSettings
 {
 public:
+    /// The most bytes that a file may have; a larger one is not opened.
+    static constexpr qint64 LargestFile = 16 * 1024 * 1024;
+
     /**
      * Opens the file \a path.
      *
@@ -71,9 +75,9 @@ public:
     /**
      * Opens another file in place of the one before, whose changes are written.
      *
-     * A file that does not exist or cannot be read leaves the object as it was. When reading
-     * fails for another reason, the new file is in place all the same. Does not change what
-     * isParsed() returns.
+     * A file that does not exist, cannot be read or is larger than LargestFile leaves the object as it
+     * was; so does a pipe or a device. When reading fails for another reason, the new file is in place
+     * all the same. Does not change what isParsed() returns.
      * @param path path of an existing file.
      * @return whether the file was opened without an error; if not, a critical message is logged
      * unless the file just does not exist.

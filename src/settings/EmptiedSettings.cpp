@@ -3,6 +3,7 @@
 
 #include "EmptiedSettings.h"
 
+#include "SettingsFile.h"
 #include "ThemeRcFormat.h"
 
 #include <QFile>
@@ -23,7 +24,7 @@ QString &keptFile()
 bool copyFile(const QString &path, QIODevice &device)
 {
     QFile file(path);
-    if (!file.open(QIODevice::ReadOnly))
+    if (!file.open(QIODevice::ReadOnly) || !SettingsFile::isReadable(file))
         return false;
     const QByteArray bytes = file.readAll();
     return file.atEnd() && ThemeRcFormat::writeThrough(device, bytes);
@@ -53,7 +54,7 @@ namespace EmptiedSettings {
 
 bool write(QIODevice &device, const QSettings::SettingsMap &map)
 {
-    return keptFile().isEmpty() ? ThemeRcFormat::write(device, map) : copyFile(keptFile(), device);
+    return keptFile().isEmpty() ? SettingsFile::write(device, map) : copyFile(keptFile(), device);
 }
 
 bool isLeft(const QSettings &settings)

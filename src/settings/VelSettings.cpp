@@ -4,7 +4,7 @@
 #include <VelSettings.h>
 
 #include "EmptiedSettings.h"
-#include "ThemeRcFormat.h"
+#include "SettingsFile.h"
 
 #include <QFileInfo>
 #include <QSettings>
@@ -13,6 +13,8 @@
 #include <cstdio>
 
 #include <utime.h>
+
+static_assert(VelSettings::LargestFile == SettingsFile::LargestSize);
 
 namespace {
 
@@ -23,7 +25,7 @@ void registerFormat()
 {
     if (themeRcFormat != QSettings::InvalidFormat)
         return;
-    themeRcFormat = QSettings::registerFormat(QStringLiteral("themerc"), ThemeRcFormat::read,
+    themeRcFormat = QSettings::registerFormat(QStringLiteral("themerc"), SettingsFile::read,
                                               EmptiedSettings::write, Qt::CaseSensitive);
     if (themeRcFormat == QSettings::InvalidFormat)
         std::fprintf(stderr, "VelSettings: custom format %d NOT registered\n", int(themeRcFormat));
@@ -34,6 +36,19 @@ std::unique_ptr<QSettings> openSettings(const QString &path)
     auto settings = std::make_unique<QSettings>(path, themeRcFormat);
     settings->setIniCodec(QTextCodec::codecForLocale());
     return settings;
+}
+
+// Why the file cannot be opened, with "%s" for its path; null when nothing is in the way. A folder
+// is left to QSettings, which refuses it as well.
+const char *obstacle(const QFileInfo &info)
+{
+    if (!info.isReadable())
+        return "Permission Denied for '%s'!";
+    if (!info.isFile() && !info.isDir())
+        return "No regular file: '%s'!";
+    if (info.isFile() && info.size() > VelSettings::LargestFile)
+        return "Too large: '%s'!";
+    return nullptr;
 }
 
 } // namespace
@@ -53,8 +68,8 @@ bool VelSettings::ParseConfigFile(const QString &path)
     const QFileInfo info(path);
     if (!info.exists())
         return false;
-    if (!info.isReadable()) {
-        qCritical("Permission Denied for '%s'!", path.toLocal8Bit().constData());
+    if (const char *const message = obstacle(info)) {
+        qCritical(message, path.toLocal8Bit().constData());
         return false;
     }
     registerFormat();
@@ -63,7 +78,7 @@ bool VelSettings::ParseConfigFile(const QString &path)
     settings = openSettings(info.absoluteFilePath());
     if (EmptiedSettings::isLeft(*settings) && EmptiedSettings::drop(*settings))
         settings = openSettings(info.absoluteFilePath());
-    if (settings->status() != QSettings::NoError) {
+    if (settings->status() != QSettings::NoError || SettingsFile::isUnread(settings->fileName())) {
         qCritical("Cant register format!");
         return false;
     }
@@ -101,6 +116,7 @@ void VelSettings::sync(bool touch)
         return;
     if (touch)
         utime(fileName.toLocal8Bit().constData(), nullptr);
+    const SettingsFile::PipeGuard guard(settings->fileName());
     settings->sync();
 }
 
@@ -108,6 +124,9 @@ void VelSettings::sync(bool touch)
 // the edits of other objects on the file as well.
 void VelSettings::close()
 {
+    if (!settings)
+        return;
+    const SettingsFile::PipeGuard guard(settings->fileName());
     if (mayBeEmptied && settings->allKeys().isEmpty()) {
         if (settings->status() == QSettings::NoError)
             settings->sync();

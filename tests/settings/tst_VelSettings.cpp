@@ -8,6 +8,7 @@
 
 #include <QDateTime>
 #include <QDir>
+#include <QFileInfo>
 #include <QSettings>
 
 #include <type_traits>
@@ -73,6 +74,13 @@ private Q_SLOTS:
     void keepsItsFileNameWhenTheOtherFileGivesAnError();
     void opensAnEmptyFile();
     void opensADirectoryWithoutACrash();
+    void refusesWhatIsNoRegularFile_data();
+    void refusesWhatIsNoRegularFile();
+    void refusesAFileAboveItsLimit();
+    void leavesAFileThatGrewAboveItsLimit();
+    void writesAFileThatWasEmptiedAfterItGrewAboveItsLimit();
+    void writesNoFileAboveItsLimit();
+    void doesNotWaitForAFileThatBecameAPipe();
     void syncsNothingThatGaveAnErrorWhenItWasOpened();
     void sharesChangesBetweenObjectsOnOneFile();
     void registersItsFormatOnceUnderItsExtension();
@@ -369,6 +377,97 @@ void tst_VelSettings::opensADirectoryWithoutACrash()
     QVERIFY(!settings.isParsed());
     QCOMPARE(settings.value(s("a"), 1), QVariant(1));
     settings.sync(true);
+}
+
+void tst_VelSettings::refusesWhatIsNoRegularFile_data()
+{
+    QTest::addColumn<QString>("file");
+    QTest::newRow("pipe") << s("pipe");
+    QTest::newRow("link to a pipe") << s("link");
+    QTest::newRow("device") << s("/dev/zero");
+}
+
+void tst_VelSettings::refusesWhatIsNoRegularFile()
+{
+    QFETCH(QString, file);
+    QCOMPARE(mkfifo(QFile::encodeName(path(s("pipe"))).constData(), 0600), 0);
+    QVERIFY(QFile::link(s("pipe"), path(s("link"))));
+    const QString name = QDir(folder()).filePath(file);
+    expectWarning(s("No regular file: '%1'!").arg(name));
+    VelSettings settings(name);
+    QVERIFY(!settings.isParsed());
+    QCOMPARE(settings.value(s("a"), 1), QVariant(1));
+    settings.setValue(s("a"), 2);
+    settings.sync();
+}
+
+void tst_VelSettings::refusesAFileAboveItsLimit()
+{
+    const QString one = write(s("one"), "a=1\n");
+    const QString file = write(s("rc"), "a=2\n");
+    QVERIFY(QFile::resize(file, VelSettings::LargestFile));
+    VelSettings settings(file);
+    QVERIFY(settings.isParsed());
+    QVERIFY(settings.ParseConfigFile(one));
+
+    QVERIFY(QFile::resize(file, VelSettings::LargestFile + 1));
+    expectWarning(s("Too large: '%1'!").arg(file));
+    QVERIFY(!settings.ParseConfigFile(file));
+    QCOMPARE(settings.value(s("a")), QVariant(1)); // of the one before
+}
+
+void tst_VelSettings::leavesAFileThatGrewAboveItsLimit()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    VelSettings settings(file);
+    write(s("rc"), "a=1\nb=2\n");
+    QVERIFY(QFile::resize(file, VelSettings::LargestFile + 1));
+    settings.setValue(s("c"), 3);
+    settings.sync();
+    settings.sync();
+    QCOMPARE(QFileInfo(file).size(), VelSettings::LargestFile + 1);
+
+    write(s("rc"), "a=1\nb=2\n");
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=1\nb=2\nc=3\n"));
+}
+
+void tst_VelSettings::writesAFileThatWasEmptiedAfterItGrewAboveItsLimit()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    VelSettings settings(file);
+    QVERIFY(QFile::resize(file, VelSettings::LargestFile + 1));
+    settings.setValue(s("c"), 3);
+    settings.sync();
+    write(s("rc"), "");
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("c=3\n"));
+}
+
+void tst_VelSettings::writesNoFileAboveItsLimit()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    VelSettings settings(file);
+    settings.setValue(s("b"), QString(int(VelSettings::LargestFile), QLatin1Char('x')));
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=1\n"));
+    settings.remove(s("b"));
+    settings.setValue(s("c"), 3);
+    settings.sync();
+    QCOMPARE(read(file), QByteArray("a=1\nc=3\n"));
+}
+
+void tst_VelSettings::doesNotWaitForAFileThatBecameAPipe()
+{
+    const QString file = write(s("rc"), "a=1\n");
+    {
+        VelSettings settings(file);
+        settings.setValue(s("b"), 2);
+        QVERIFY(QFile::remove(file));
+        QCOMPARE(mkfifo(QFile::encodeName(file).constData(), 0600), 0);
+        settings.sync();
+    }
+    QVERIFY(S_ISFIFO(statusOf(file).st_mode));
 }
 
 void tst_VelSettings::syncsNothingThatGaveAnErrorWhenItWasOpened()
