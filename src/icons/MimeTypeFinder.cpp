@@ -14,6 +14,7 @@
 namespace {
 
 constexpr qint64 LongestMemory = 1000; // milliseconds
+constexpr qint64 LargestCache = 64 * 1024 * 1024; // a hundred times what is common
 
 /// Stands for the contents of a file and tells whether anyone wanted to see them.
 class WatchedContents : public QIODevice
@@ -49,7 +50,7 @@ QString stampOf(const QStringList &directories)
     bool hasCommonTypes = false;
     for (const QString &directory : directories) {
         const QFileInfo cache(directory + QStringLiteral("/mime.cache"));
-        if (!cache.isFile())
+        if (!cache.isFile() || cache.size() > LargestCache)
             return QString();
         stamp += cache.filePath() + QLatin1Char('|')
             + QString::number(cache.lastModified().toMSecsSinceEpoch()) + QLatin1Char('|')
@@ -139,7 +140,8 @@ void MimeTypeFinder::readPatterns()
     auto patterns = std::make_unique<MimePatterns>();
     for (const QString &directory : directories) {
         QFile file(directory + QStringLiteral("/mime.cache"));
-        if (!file.open(QIODevice::ReadOnly) || !patterns->addCache(file.readAll()))
+        if (!file.open(QIODevice::ReadOnly) || file.size() > LargestCache
+            || !patterns->addCache(file.readAll()))
             return;
     }
     patterns->finish();

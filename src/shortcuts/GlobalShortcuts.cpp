@@ -15,7 +15,9 @@
 #include <cstdio>
 #include <memory>
 
+#include <fcntl.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 // Packages leave out what the conversions need, and some hide the functions behind a library
 // that was built with other conversions; bytes are all that is wanted here.
@@ -29,15 +31,26 @@ struct FileCloser
 {
     void operator()(FILE *file) const { std::fclose(file); }
 };
+using FilePointer = std::unique_ptr<FILE, FileCloser>;
+
+// Only a regular file has a size; opening a pipe must not wait for its writer.
+FilePointer openFile(const QByteArray &name)
+{
+    const int descriptor = ::open(name.constData(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+    if (descriptor < 0)
+        return nullptr;
+    struct stat status = {};
+    const bool isUsable = fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode)
+        && status.st_size <= GlobalShortcuts::LargestFile;
+    FilePointer file(isUsable ? fdopen(descriptor, "rb") : nullptr);
+    if (!file)
+        ::close(descriptor);
+    return file;
+}
 
 bool load(CSimpleIniA &ini, const QString &path)
 {
-    const QByteArray name = path.toLocal8Bit();
-    // Only a regular file has a size; opening a pipe would wait for its writer.
-    struct stat status = {};
-    if (stat(name.constData(), &status) != 0 || !S_ISREG(status.st_mode))
-        return false;
-    const std::unique_ptr<FILE, FileCloser> file(std::fopen(name.constData(), "rb"));
+    const FilePointer file = openFile(path.toLocal8Bit());
     return file && ini.LoadFile(file.get()) >= 0;
 }
 

@@ -9,6 +9,9 @@ class QKeySequence;
 
 namespace GlobalShortcuts {
 
+/// The most bytes that a shortcut file may have; a larger one is not read.
+inline constexpr qint64 LargestFile = 16 * 1024 * 1024;
+
 /// The path of the window manager's shortcut file for this session; empty when there is none.
 QString filePath();
 

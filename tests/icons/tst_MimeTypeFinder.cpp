@@ -6,6 +6,7 @@
 #include <icons/MimeTypeFinder.h>
 
 #include <QDir>
+#include <QElapsedTimer>
 #include <QMimeDatabase>
 #include <QProcess>
 #include <QStandardPaths>
@@ -14,6 +15,20 @@
 #include <sys/stat.h>
 #include <sys/un.h>
 #include <unistd.h>
+
+namespace {
+
+/// The bytes that this process has read; 0 when nobody counts them.
+qint64 readSoFar()
+{
+    QFile counters(QStringLiteral("/proc/self/io"));
+    if (!counters.open(QIODevice::ReadOnly))
+        return 0;
+    const QByteArray first = counters.readLine(); // "rchar: 4711"
+    return first.mid(first.indexOf(' ')).trimmed().toLongLong();
+}
+
+} // namespace
 
 class tst_MimeTypeFinder : public TestCase
 {
@@ -30,6 +45,7 @@ private Q_SLOTS:
     void seesAFileThatBecameAPipe();
     void seesContentsThatChanged();
     void followsTheDatabase();
+    void readsNoHugeCache();
 
 private:
     static QString own(const QString &path)
@@ -345,6 +361,28 @@ void tst_MimeTypeFinder::followsTheDatabase()
 
     QVERIFY(QDir(mime).removeRecursively());
     QTRY_COMPARE_WITH_TIMEOUT(own(path), QStringLiteral("application/x-desktop"), 15000);
+}
+
+void tst_MimeTypeFinder::readsNoHugeCache()
+{
+    const QString usual = QStringLiteral("/usr/share/mime/mime.cache");
+    if (!QFile::exists(usual) || readSoFar() == 0)
+        QSKIP("the system has no cache or does not count what is read");
+    const QString path = write(QStringLiteral("a.desktop"), "text\n");
+    const QString mime = VelTest::TestEnvironment::instance().home() + QStringLiteral("/.local/share/mime");
+    QVERIFY(QDir().mkpath(mime));
+    QVERIFY(QFile::copy(usual, mime + QStringLiteral("/mime.cache")));
+    const qint64 size = 70 * 1024 * 1024;
+    QVERIFY(QFile::resize(mime + QStringLiteral("/mime.cache"), size));
+
+    const qint64 before = readSoFar();
+    QElapsedTimer timer;
+    timer.start();
+    // By then the finder has looked at the caches anew.
+    QTRY_VERIFY((own(path), timer.elapsed() > 1200));
+    QVERIFY2(readSoFar() - before < size / 2, QByteArray::number(readSoFar() - before).constData());
+    QCOMPARE(own(path), qt(path));
+    QVERIFY(QDir(mime).removeRecursively());
 }
 
 VEL_TEST_GUILESS_MAIN(tst_MimeTypeFinder)

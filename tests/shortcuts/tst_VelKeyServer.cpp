@@ -11,6 +11,7 @@
 #include <QMetaEnum>
 
 #include <X11/Xlib.h>
+#include <sys/stat.h>
 
 namespace {
 
@@ -415,7 +416,7 @@ void tst_VelKeyServer::readsTheFileOfTheSession()
 void tst_VelKeyServer::findsNothingWithoutAUsableFile_data()
 {
     QTest::addColumn<QString>("kind");
-    for (const char *kind : {"missing", "directory", "empty", "no section", "garbage"})
+    for (const char *kind : {"missing", "directory", "pipe", "too large", "empty", "no section", "garbage"})
         QTest::newRow(kind) << QString::fromLatin1(kind);
 }
 
@@ -425,6 +426,10 @@ void tst_VelKeyServer::findsNothingWithoutAUsableFile()
     const QString name = QStringLiteral("keyshortcutrc");
     if (kind == QLatin1String("directory"))
         QVERIFY(QDir().mkpath(path(name)));
+    else if (kind == QLatin1String("pipe"))
+        QCOMPARE(mkfifo(QFile::encodeName(path(name)).constData(), 0600), 0);
+    else if (kind == QLatin1String("too large"))
+        QVERIFY(QFile::resize(write(name, "[ShortCutKeys]\nF1=act\n"), 16 * 1024 * 1024 + 1));
     else if (kind == QLatin1String("empty"))
         write(name, QByteArray());
     else if (kind == QLatin1String("no section"))
