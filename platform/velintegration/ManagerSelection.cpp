@@ -24,8 +24,8 @@ struct PropertyOf
 Bool isPropertyChange(Display *, XEvent *event, XPointer argument)
 {
     const auto *wanted = reinterpret_cast<const PropertyOf *>(argument);
-    return event->type == PropertyNotify && event->xproperty.window == wanted->window
-        && event->xproperty.atom == wanted->property;
+    return event->type == PropertyNotify && !event->xproperty.send_event
+        && event->xproperty.window == wanted->window && event->xproperty.atom == wanted->property;
 }
 
 } // namespace
@@ -60,9 +60,7 @@ bool ManagerSelection::acquire(bool replace)
             previous = None; // gone meanwhile
     }
     makeWindow();
-    m_time = serverTime();
-    XSetSelectionOwner(m_display, m_selection, m_window, m_time);
-    if (XGetSelectionOwner(m_display, m_selection) != m_window) {
+    if (!own()) {
         release();
         return false;
     }
@@ -76,28 +74,41 @@ void ManagerSelection::release()
 {
     if (m_window == None)
         return;
+    XErrorTrap trap(m_display); // others may have destroyed it
     XDestroyWindow(m_display, m_window);
-    XSync(m_display, False);
     m_window = None;
 }
 
 void ManagerSelection::makeWindow()
 {
     XSetWindowAttributes attributes = {};
-    attributes.event_mask = PropertyChangeMask;
+    attributes.event_mask = PropertyChangeMask | StructureNotifyMask;
     attributes.override_redirect = True;
     m_window = XCreateWindow(m_display, DefaultRootWindow(m_display), -1, -1, 1, 1, 0, CopyFromParent,
                              InputOnly, CopyFromParent, CWEventMask | CWOverrideRedirect, &attributes);
 }
 
+// Others may destroy the window in between.
+bool ManagerSelection::own()
+{
+    XErrorTrap trap(m_display);
+    if (!fetchServerTime())
+        return false;
+    XSetSelectionOwner(m_display, m_selection, m_window, m_time);
+    return XGetSelectionOwner(m_display, m_selection) == m_window;
+}
+
 // The time stamp of a property change is the one way to ask for the server's time.
-Time ManagerSelection::serverTime()
+bool ManagerSelection::fetchServerTime()
 {
     PropertyOf wanted = {m_window, atom("TIMESTAMP")};
     XChangeProperty(m_display, m_window, wanted.property, XA_INTEGER, 32, PropModeAppend, nullptr, 0);
+    XSync(m_display, False);
     XEvent event;
-    XIfEvent(m_display, &event, isPropertyChange, reinterpret_cast<XPointer>(&wanted));
-    return event.xproperty.time;
+    if (!XCheckIfEvent(m_display, &event, isPropertyChange, reinterpret_cast<XPointer>(&wanted)))
+        return false;
+    m_time = event.xproperty.time;
+    return true;
 }
 
 void ManagerSelection::waitForRelease(Window previous)
@@ -128,10 +139,20 @@ void ManagerSelection::announce()
     XFlush(m_display);
 }
 
-bool ManagerSelection::isLoss(const XEvent &event) const
+ManagerSelection::State ManagerSelection::stateAfter(const XEvent &event)
 {
-    return event.type == SelectionClear && event.xselectionclear.window == m_window
+    const bool isDestruction = event.type == DestroyNotify && event.xdestroywindow.window == m_window;
+    const bool isLoss = event.type == SelectionClear && event.xselectionclear.window == m_window
         && event.xselectionclear.selection == m_selection;
+    if (event.xany.send_event || m_window == None || (!isDestruction && !isLoss))
+        return Unchanged;
+    if (isDestruction)
+        m_window = None;
+    const Window owner = XGetSelectionOwner(m_display, m_selection);
+    if (isDestruction)
+        return owner == None ? Endangered : Taken;
+    // Another client named this window as the owner; when that client ends, so would the selection.
+    return owner == m_window ? Endangered : Taken;
 }
 
 void ManagerSelection::answer(const XSelectionRequestEvent &request)

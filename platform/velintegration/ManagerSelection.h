@@ -14,6 +14,13 @@
 class ManagerSelection
 {
 public:
+    /// What an event tells about the selection.
+    enum State {
+        Unchanged,
+        Taken, ///< another client has it, or took it away
+        Endangered, ///< others have destroyed the window or claimed it; keep() helps
+    };
+
     ManagerSelection(Display *display, const std::string &name);
     ~ManagerSelection();
     ManagerSelection(const ManagerSelection &) = delete;
@@ -31,13 +38,17 @@ public:
     /// Answers a question about the selection.
     void answer(const XSelectionRequestEvent &request);
 
-    /// Whether \a event tells that another client has taken the selection.
-    bool isLoss(const XEvent &event) const;
+    /// What \a event tells; the server is asked, since anybody can send events.
+    State stateAfter(const XEvent &event);
+
+    /// Takes the selection again, with a new window when there is none; false when that fails.
+    bool keep() { return m_window == None ? acquire(false) : own(); }
 
 private:
     Atom atom(const char *name) const;
     void makeWindow();
-    Time serverTime();
+    bool own();
+    bool fetchServerTime();
     void waitForRelease(Window previous);
     void announce();
     bool convert(Window requestor, Atom target, Atom property);

@@ -5,8 +5,11 @@
 
 #include <velintegration/wmcommand.h>
 
+#include "CommandLines.h"
 #include "ManagerSelection.h"
+#include "XErrorTrap.h"
 
+#include <cstdint>
 #include <memory>
 #include <utility>
 
@@ -19,8 +22,15 @@ struct CloseDisplay
     void operator()(Display *display) const { XCloseDisplay(display); }
 };
 
-// Longer than any property can be; the server cuts it to what is there.
-constexpr long WholeProperty = 0x1fffffff;
+// Of the property, in units of four bytes: what is read at a time, and what is read at all.
+constexpr long ChunkLength = 64 * 1024;
+constexpr long LongestProperty = 256 * ChunkLength;
+
+// Milliseconds after which the rest of a line is not waited for any more.
+constexpr std::uint32_t HalfLineLife = 1000;
+
+// How often others may take the window away while events are handled; else that would never end.
+constexpr int MostTimesKept = 16;
 
 } // namespace
 
@@ -38,9 +48,13 @@ public:
             new ManagerSelection(display.get(), VelWmCommand::selectionName(DefaultScreen(display.get()))));
     }
 
+    void processEvents();
     void handle(const XEvent &event);
+    void noteChange(const XPropertyEvent &event);
     void readProperty();
+    unsigned long readChunk(long offset);
     void handOutLines();
+    void keep();
     void lose();
 
     WmCommandReceiver::LineHandler onLine;
@@ -48,49 +62,114 @@ public:
     std::unique_ptr<Display, CloseDisplay> display;
     std::unique_ptr<ManagerSelection> selection;
     Atom property = None;
-    std::string unfinished;
+    CommandLines lines;
+    bool hasNews = false; // the property has changed since it was read
+    Time lastNews = 0;
+    int timesKept = 0;
 };
 
-void WmCommandReceiverPrivate::handle(const XEvent &event)
+// Reads the property once for all of its changes that are known, however many there are.
+void WmCommandReceiverPrivate::processEvents()
 {
-    if (selection->isLoss(event)) {
-        lose();
-    } else if (event.type == SelectionRequest) {
-        selection->answer(event.xselectionrequest);
-    } else if (event.type == PropertyNotify && event.xproperty.window == selection->window()
-               && event.xproperty.atom == property && event.xproperty.state == PropertyNewValue) {
-        readProperty();
-        handOutLines();
+    timesKept = 0;
+    while (XPending(display.get()) > 0) {
+        while (XQLength(display.get()) > 0) {
+            XEvent event;
+            XNextEvent(display.get(), &event);
+            handle(event);
+        }
+        if (hasNews) {
+            readProperty();
+            handOutLines();
+        }
     }
 }
 
-// Reading and deleting is one request: what is appended meanwhile comes with the next event.
+void WmCommandReceiverPrivate::handle(const XEvent &event)
+{
+    if (event.type == PropertyNotify) {
+        noteChange(event.xproperty);
+    } else if (event.type == SelectionRequest) {
+        selection->answer(event.xselectionrequest);
+    } else {
+        const ManagerSelection::State state = selection->stateAfter(event);
+        if (state == ManagerSelection::Endangered)
+            keep();
+        else if (state == ManagerSelection::Taken)
+            lose();
+    }
+}
+
+// The server's time tells how long nothing came, also when it was not looked at for long.
+void WmCommandReceiverPrivate::noteChange(const XPropertyEvent &event)
+{
+    if (event.send_event || event.window != selection->window() || event.atom != property
+        || event.state != PropertyNewValue)
+        return;
+    const auto pause = static_cast<std::uint32_t>(event.time - lastNews); // the time wraps around
+    if (!hasNews && pause > HalfLineLife)
+        lines.dropHalf();
+    hasNews = true;
+    lastNews = event.time;
+}
+
+// Others may destroy the window or cut the property short at any time.
 void WmCommandReceiverPrivate::readProperty()
+{
+    hasNews = false;
+    if (selection->window() == None)
+        return;
+    XErrorTrap trap(display.get());
+    long offset = 0;
+    unsigned long left = 0;
+    do {
+        left = readChunk(offset);
+        offset += ChunkLength;
+    } while (left > 0 && offset < LongestProperty);
+    if (left > 0) {
+        XDeleteProperty(display.get(), selection->window(), property);
+        lines.dropHalf();
+    }
+}
+
+// Reading the last chunk and deleting is one request: what is appended meanwhile comes with the
+// next event. Returns how many bytes lie behind the chunk.
+unsigned long WmCommandReceiverPrivate::readChunk(long offset)
 {
     Atom type = None;
     int format = 0;
     unsigned long count = 0;
     unsigned long left = 0;
     unsigned char *data = nullptr;
-    if (XGetWindowProperty(display.get(), selection->window(), property, 0, WholeProperty, True,
+    if (XGetWindowProperty(display.get(), selection->window(), property, offset, ChunkLength, True,
                            AnyPropertyType, &type, &format, &count, &left, &data)
             != Success
         || !data)
-        return;
+        return 0;
     if (type == XA_STRING && format == 8)
-        unfinished.append(reinterpret_cast<const char *>(data), count);
+        lines.append(reinterpret_cast<const char *>(data), count);
     XFree(data);
+    return left;
 }
 
 void WmCommandReceiverPrivate::handOutLines()
 {
-    std::size_t end = 0;
-    while ((end = unfinished.find('\n')) != std::string::npos) {
-        const std::string line = unfinished.substr(0, end);
-        unfinished.erase(0, end + 1);
+    std::string line;
+    while (lines.take(&line)) {
         if (onLine)
             onLine(line);
     }
+}
+
+// What was in the property went with the window.
+void WmCommandReceiverPrivate::keep()
+{
+    if (selection->window() == None) {
+        hasNews = false;
+        lines.dropHalf();
+    }
+    if (++timesKept > MostTimesKept || !selection->keep())
+        lose();
 }
 
 void WmCommandReceiverPrivate::lose()
@@ -98,7 +177,7 @@ void WmCommandReceiverPrivate::lose()
     readProperty();
     selection->release();
     handOutLines();
-    unfinished.clear();
+    lines.clear();
     if (onLost)
         onLost();
 }
@@ -131,7 +210,7 @@ void WmCommandReceiver::release()
     d->readProperty();
     d->selection->release();
     d->handOutLines();
-    d->unfinished.clear();
+    d->lines.clear();
 }
 
 bool WmCommandReceiver::isOwner() const
@@ -151,9 +230,6 @@ unsigned long WmCommandReceiver::windowId() const
 
 void WmCommandReceiver::processEvents()
 {
-    while (d->display && XPending(d->display.get()) > 0) {
-        XEvent event;
-        XNextEvent(d->display.get(), &event);
-        d->handle(event);
-    }
+    if (d->display)
+        d->processEvents();
 }

@@ -5,6 +5,7 @@
 
 #include <velintegration/velintegration_export.h>
 
+#include <cstddef>
 #include <string>
 
 // The one type of Xlib that is needed; its header would bring macros named None and Bool.
@@ -23,6 +24,9 @@ inline constexpr char selectionPrefix[] = "_VELWM_COMMAND_S";
 
 /// The property that commands are appended to; type STRING, format 8.
 inline constexpr char propertyName[] = "_VELWM_COMMAND";
+
+/// The most bytes of a line, without its line feed; a receiver drops longer lines.
+inline constexpr std::size_t LongestLine = 4096;
 
 /// The name of the selection for \a screen.
 inline std::string selectionName(int screen)

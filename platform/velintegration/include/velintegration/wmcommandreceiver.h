@@ -29,6 +29,13 @@ class WmCommandReceiverPrivate;
  * QObject::connect(&notifier, &QSocketNotifier::activated, [&] { receiver.processEvents(); });
  * \endcode
  *
+ * Each line is handed out, equal ones too, but for a line above VelWmCommand::LongestLine, for the
+ * first part of a line when nothing follows it within a second (whoever sent it may be gone), and
+ * for what lies beyond 64 MiB when so much has come since the last call.
+ *
+ * The selection is lost to a successor alone. When others destroy the window, a new one takes its
+ * place, and windowId() changes.
+ *
  * All calls come from one thread. The callbacks run inside acquire() and processEvents() and
  * may not delete the receiver.
  */
@@ -37,7 +44,7 @@ class VELINTEGRATION_EXPORT WmCommandReceiver
 public:
     /// Called with one line, without its line feed.
     using LineHandler = std::function<void(const std::string &line)>;
-    /// Called when another program has taken the selection.
+    /// Called when another program has taken the selection, or nothing helps to keep it.
     using LostHandler = std::function<void()>;
 
     /**
@@ -54,7 +61,7 @@ public:
     WmCommandReceiver(const WmCommandReceiver &) = delete;
     WmCommandReceiver &operator=(const WmCommandReceiver &) = delete;
 
-    /// Sets what is called when another program has taken the selection.
+    /// Sets what is called when the selection is lost.
     void setLostHandler(LostHandler onLost);
 
     /**
