@@ -3,8 +3,6 @@
 
 #include "Bridge.h"
 
-#include <QProcess>
-#include <QProcessEnvironment>
 #include <QSocketNotifier>
 
 Bridge::Bridge(const BridgeCommands &commands, QObject *parent)
@@ -13,6 +11,10 @@ Bridge::Bridge(const BridgeCommands &commands, QObject *parent)
     , m_receiver([this](const std::string &line) { obey(line); })
 {
     m_receiver.setLostHandler([this] { Q_EMIT lost(); });
+    connect(&m_shells, &Shells::ended, this, [this](const std::string &line) {
+        m_queue.end(line);
+        startWaiting();
+    });
 }
 
 bool Bridge::start(bool replace)
@@ -29,24 +31,37 @@ void Bridge::stop()
     m_receiver.release();
 }
 
+const QString &Bridge::commandFor(const std::string &line) const
+{
+    if (line == "VELWM_UPDATE_STARTMENU")
+        return m_commands.startMenu;
+    if (line == "VELWM_UPDATE_TOOLBAR")
+        return m_commands.toolBar;
+    if (line == "VELWM_UPDATE_SHORTCUT")
+        return m_commands.shortcut;
+    return m_commands.other;
+}
+
 void Bridge::obey(const std::string &line)
 {
-    QString command = m_commands.other;
-    if (line == "VELWM_UPDATE_STARTMENU")
-        command = m_commands.startMenu;
-    else if (line == "VELWM_UPDATE_TOOLBAR")
-        command = m_commands.toolBar;
-    else if (line == "VELWM_UPDATE_SHORTCUT")
-        command = m_commands.shortcut;
-    if (command.isEmpty())
+    if (commandFor(line).isEmpty())
         return;
-
-    QProcess shell;
-    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-    environment.insert(QStringLiteral("VEL_COMMAND"), QString::fromLocal8Bit(line.c_str()));
-    shell.setProcessEnvironment(environment);
-    shell.setProgram(QStringLiteral("/bin/sh"));
-    shell.setArguments({QStringLiteral("-c"), command});
-    if (!shell.startDetached())
+    if (m_queue.add(line)) {
+        startWaiting();
+    } else if (!m_overflowTold) {
+        m_overflowTold = true;
         Q_EMIT failed(QString::fromLocal8Bit(line.c_str()));
+    }
+}
+
+void Bridge::startWaiting()
+{
+    while (const auto line = m_queue.start()) {
+        if (m_shells.start(commandFor(*line), *line))
+            continue;
+        m_queue.end(*line);
+        Q_EMIT failed(QString::fromLocal8Bit(line->c_str()));
+    }
+    if (m_queue.isEmpty())
+        m_overflowTold = false;
 }

@@ -3,6 +3,9 @@
 
 #pragma once
 
+#include "LineQueue.h"
+#include "Shells.h"
+
 #include <velintegration/wmcommandreceiver.h>
 
 #include <QObject>
@@ -20,6 +23,8 @@ struct BridgeCommands
 /**
  * Stands in for the window manager on a desktop whose own one knows nothing of the channel: owns the
  * channel and runs a command for each kind of line.
+ *
+ * Lines that wait for their command are merged when they are equal (see LineQueue).
  */
 class Bridge : public QObject
 {
@@ -36,18 +41,23 @@ public:
      */
     bool start(bool replace);
 
-    /// Gives the channel up.
+    /// Gives the channel up. Commands that run go on, those that still wait do not run.
     void stop();
 
 Q_SIGNALS:
     /// Another program has taken the channel.
     void lost();
-    /// The command for \a line could not be started.
+    /// The command for \a line cannot be run; of lines that come too fast the first is told.
     void failed(const QString &line);
 
 private:
+    const QString &commandFor(const std::string &line) const;
     void obey(const std::string &line);
+    void startWaiting();
 
     const BridgeCommands m_commands;
+    LineQueue m_queue;
+    Shells m_shells;
+    bool m_overflowTold = false;
     WmCommandReceiver m_receiver;
 };

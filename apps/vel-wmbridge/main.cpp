@@ -4,42 +4,18 @@
 // Owns the window manager's command channel and runs a command for each kind of update.
 
 #include "Bridge.h"
+#include "SystemSignal.h"
 
 #include <support/Program.h>
 
 #include <QCommandLineParser>
 #include <QCoreApplication>
-#include <QSocketNotifier>
 
 #include <csignal>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace {
 
 enum ExitStatus { Done = 0, ChannelTaken = 1, CannotStart = 2 };
-
-int signalPipe[2] = {-1, -1};
-
-// Only what is safe inside a signal handler: wakes the event loop up.
-void handleSignal(int)
-{
-    const char byte = 0;
-    const ssize_t written = write(signalPipe[1], &byte, 1);
-    (void)written; // a full pipe does not block and wakes it up as well
-}
-
-void quitOnSignals()
-{
-    // Not for the commands that the bridge runs, and no signal handler may wait.
-    if (pipe2(signalPipe, O_CLOEXEC | O_NONBLOCK) != 0)
-        return; // ended by the signal itself, then; the X server gives the channel up
-    auto *notifier = new QSocketNotifier(signalPipe[0], QSocketNotifier::Read, qApp);
-    QObject::connect(notifier, &QSocketNotifier::activated, qApp, &QCoreApplication::quit);
-    std::signal(SIGTERM, handleSignal);
-    std::signal(SIGINT, handleSignal);
-}
 
 struct Options
 {
@@ -84,12 +60,22 @@ Options parse()
             error};
 }
 
+// A line may hold anything; on a terminal it must not act.
+QString printable(QString line)
+{
+    for (QChar &character : line) {
+        if (character.category() == QChar::Other_Control)
+            character = QLatin1Char('?');
+    }
+    return line;
+}
+
 // Tells of what goes wrong while the bridge runs.
 void report(const Bridge *bridge)
 {
     QObject::connect(bridge, &Bridge::failed, qApp, [](const QString &line) {
-        Program::printError(
-            QCoreApplication::translate("vel-wmbridge", "cannot run the command for %1").arg(line));
+        Program::printError(QCoreApplication::translate("vel-wmbridge", "cannot run the command for %1")
+                                .arg(printable(line)));
     });
     QObject::connect(bridge, &Bridge::lost, qApp, [] {
         Program::printError(
@@ -107,7 +93,8 @@ int run(const Options &options)
             QCoreApplication::translate(
                 "vel-wmbridge", "cannot take the channel: there is no display, or another program has it"),
             ChannelTaken);
-    quitOnSignals();
+    const SystemSignal termination({SIGTERM, SIGINT});
+    QObject::connect(&termination, &SystemSignal::caught, qApp, &QCoreApplication::quit);
     const int status = QCoreApplication::exec();
     bridge.stop();
     return status;

@@ -9,11 +9,19 @@
 #include <QFile>
 #include <QProcess>
 
+#include <memory>
+
 #include <X11/Xlib.h>
 
 #include <signal.h>
 
 namespace {
+
+struct CloseDisplay
+{
+    void operator()(Display *display) const { XCloseDisplay(display); }
+};
+using DisplayPointer = std::unique_ptr<Display, CloseDisplay>;
 
 bool send(const char *command)
 {
@@ -43,6 +51,13 @@ private Q_SLOTS:
     void givesTheChannelUpOnTermination();
     void endsWithoutADisplay();
     void runsCommandsWithoutItsOwnFiles();
+    void mergesEqualLinesThatWait();
+    void runsOtherCommandsBesideOneThatStays();
+    void runsFewCommandsAtATime();
+    void tellsOnceThatTooManyLinesWait();
+    void leavesItsCommandsRunningWhenItEnds();
+    void keepsTheChannelWhenOthersDestroyItsWindow();
+    void keepsTheChannelWhenALossIsOnlySent();
     void refusesUnknownArguments_data();
     void refusesUnknownArguments();
 
@@ -52,6 +67,24 @@ private:
     QString logging(const char *word) const
     {
         return QStringLiteral("echo %1 \"$VEL_COMMAND\" >> '%2'").arg(QLatin1String(word), log());
+    }
+    // Logs its start and, once the gate is open, its end.
+    QString waiting(const char *word) const
+    {
+        return QStringLiteral("[ \"$VEL_COMMAND\" = VELWM_PING ] && exit; %1; "
+                              "until [ -e '%2/gate' ] || [ ! -d '%2' ]; do sleep 0.02; done; %3")
+            .arg(logging(word), folder(), logging("end"));
+    }
+    void openGate() { write(QStringLiteral("gate"), QByteArray()); }
+    QByteArrayList logged() const
+    {
+        QByteArrayList lines = QFile::exists(log()) ? read(log()).split('\n') : QByteArrayList();
+        lines.removeAll(QByteArray());
+        return lines;
+    }
+    static Window owner(Display *display)
+    {
+        return XGetSelectionOwner(display, XInternAtom(display, "_VELWM_COMMAND_S0", False));
     }
 
     QProcess m_bridge;
@@ -189,6 +222,109 @@ void tst_vel_wmbridge::runsCommandsWithoutItsOwnFiles()
     const QByteArrayList known = read(usual).split('\n');
     for (const QByteArray &file : read(log()).split('\n'))
         QVERIFY2(known.contains(file), file.constData());
+}
+
+void tst_vel_wmbridge::mergesEqualLinesThatWait()
+{
+    start({QStringLiteral("--startmenu"), waiting("menu"), QStringLiteral("--toolbar"), logging("bar")});
+    const QByteArray begun("menu VELWM_UPDATE_STARTMENU");
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE(logged(), QByteArrayList{begun});
+
+    // What changed after the first has begun is not lost on it.
+    QVERIFY(send(QByteArray("VELWM_UPDATE_STARTMENU\n").repeated(1000)));
+    QVERIFY(send("VELWM_UPDATE_TOOLBAR\n"));
+    QTRY_VERIFY(logged().contains("bar VELWM_UPDATE_TOOLBAR"));
+    QCOMPARE(logged().count(begun), 1);
+    openGate();
+    QTRY_COMPARE(logged().count("end VELWM_UPDATE_STARTMENU"), 2);
+    QVERIFY(send("VELWM_UPDATE_TOOLBAR\n"));
+    QTRY_COMPARE(logged().count("bar VELWM_UPDATE_TOOLBAR"), 2);
+    QCOMPARE(logged().count(begun), 2);
+}
+
+void tst_vel_wmbridge::runsOtherCommandsBesideOneThatStays()
+{
+    start({QStringLiteral("--startmenu"), waiting("menu"), QStringLiteral("--toolbar"), logging("bar")});
+    for (int i = 1; i <= 3; ++i) {
+        QVERIFY(send("VELWM_UPDATE_STARTMENU\nVELWM_UPDATE_TOOLBAR\n"));
+        QTRY_COMPARE(logged().count("bar VELWM_UPDATE_TOOLBAR"), i);
+    }
+    QCOMPARE(logged().size(), 4);
+}
+
+void tst_vel_wmbridge::runsFewCommandsAtATime()
+{
+    start({QStringLiteral("--other"), waiting("begin")});
+    QByteArray lines;
+    for (int i = 0; i < 20; ++i)
+        lines += "VELWM_" + QByteArray::number(i) + '\n';
+    QVERIFY(send(lines));
+    QTRY_VERIFY(logged().size() >= 4);
+    openGate();
+    QTRY_COMPARE(logged().size(), 40);
+    int running = 0;
+    for (const QByteArray &line : logged()) {
+        running += line.startsWith("begin") ? 1 : -1;
+        QVERIFY(running <= 4);
+    }
+}
+
+void tst_vel_wmbridge::tellsOnceThatTooManyLinesWait()
+{
+    start({QStringLiteral("--other"), waiting("begin")});
+    QByteArray lines;
+    for (int i = 0; i < 100000; ++i)
+        lines += "VELWM_\x1b" + QByteArray::number(i) + '\n';
+    QVERIFY(send(lines));
+    m_bridge.setReadChannel(QProcess::StandardError);
+    QTRY_VERIFY(m_bridge.canReadLine());
+    const QByteArray told = m_bridge.readLine();
+    QVERIFY2(told.startsWith("vel-wmbridge: cannot run the command for VELWM_?2"), told.constData());
+    openGate();
+    // What ran and what waited; the line that start() sends may have been one of them.
+    QTRY_VERIFY_WITH_TIMEOUT(logged().size() >= 2 * 259, 30000);
+    QTRY_VERIFY(logged().size() % 2 == 0);
+    QVERIFY(logged().size() <= 2 * 260);
+    QCOMPARE(m_bridge.readAll(), QByteArray());
+}
+
+void tst_vel_wmbridge::leavesItsCommandsRunningWhenItEnds()
+{
+    start({QStringLiteral("--startmenu"), waiting("menu")});
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE(logged().size(), 1);
+    m_bridge.terminate();
+    QVERIFY(m_bridge.waitForFinished());
+    QCOMPARE(m_bridge.exitStatus(), QProcess::NormalExit);
+    openGate();
+    QTRY_COMPARE(logged().size(), 2);
+}
+
+void tst_vel_wmbridge::keepsTheChannelWhenOthersDestroyItsWindow()
+{
+    start({QStringLiteral("--startmenu"), logging("menu")});
+    const DisplayPointer display(XOpenDisplay(nullptr));
+    const Window window = owner(display.get());
+    XDestroyWindow(display.get(), window);
+    QTRY_VERIFY(owner(display.get()) != None && owner(display.get()) != window);
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE(logged(), QByteArrayList{"menu VELWM_UPDATE_STARTMENU"});
+}
+
+void tst_vel_wmbridge::keepsTheChannelWhenALossIsOnlySent()
+{
+    start({QStringLiteral("--startmenu"), logging("menu")});
+    const DisplayPointer display(XOpenDisplay(nullptr));
+    XEvent event = {};
+    event.xselectionclear.type = SelectionClear;
+    event.xselectionclear.window = owner(display.get());
+    event.xselectionclear.selection = XInternAtom(display.get(), "_VELWM_COMMAND_S0", False);
+    XSendEvent(display.get(), event.xselectionclear.window, False, NoEventMask, &event);
+    XSync(display.get(), False);
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE(logged(), QByteArrayList{"menu VELWM_UPDATE_STARTMENU"});
+    QCOMPARE(m_bridge.state(), QProcess::Running);
 }
 
 void tst_vel_wmbridge::refusesUnknownArguments_data()

@@ -45,7 +45,8 @@ inline std::string selectionName(int screen)
  * afterwards. No event is taken from the display's queue.
  *
  * @param display the connection to send over; stays the caller's
- * @param command the bytes, zero-terminated; lines end with a line feed
+ * @param command the bytes, zero-terminated; lines end with a line feed and are no longer than
+ *        VelWmCommand::LongestLine, or nobody obeys them
  * @return false when \a display or \a command is null, when nobody owns the selection, when
  *         the owner is gone, or when the server refused
  */
