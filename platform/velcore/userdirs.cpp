@@ -5,7 +5,9 @@
 
 #include "environment.h"
 
-#include <fstream>
+#include <velcore/files.h>
+
+#include <sstream>
 
 namespace {
 
@@ -65,8 +67,8 @@ std::string userDesktopDirectory()
 {
     // A shell that reads the file keeps the last assignment.
     std::string desktop;
-    std::ifstream file(xdgConfigHome() + "/user-dirs.dirs");
-    for (std::string line; std::getline(file, line);) {
+    std::istringstream lines(Vel::SmallFile(xdgConfigHome() + "/user-dirs.dirs").bytes());
+    for (std::string line; std::getline(lines, line);) {
         const std::string value = desktopOfLine(line);
         if (!value.empty())
             desktop = value;

@@ -8,6 +8,7 @@
 #include <QDir>
 
 #include <pwd.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 class DirsTest : public TestCase
@@ -35,6 +36,8 @@ private Q_SLOTS:
     void desktopIsInTheHomeWithoutUserDirs();
     void desktopIsTheOneOfUserDirs_data();
     void desktopIsTheOneOfUserDirs();
+    void userDirsAreASmallFile_data();
+    void userDirsAreASmallFile();
     void userDirsLieInTheConfigurationOfTheUser();
     void theUserDataBaseKnowsTheHomeWhenNothingElseDoes();
     void picturesLieInTheDataDirectory();
@@ -186,6 +189,32 @@ void DirsTest::desktopIsTheOneOfUserDirs()
     if (expected.startsWith(QLatin1Char('~')))
         expected.replace(0, 1, folder());
     QCOMPARE(dir(VelDir::Desktop), expected);
+}
+
+void DirsTest::userDirsAreASmallFile_data()
+{
+    QTest::addColumn<QString>("kind");
+    QTest::newRow("named pipe") << QStringLiteral("pipe");
+    QTest::newRow("device") << QStringLiteral("device");
+    QTest::newRow("folder") << QStringLiteral("folder");
+    QTest::newRow("too large") << QStringLiteral("large");
+}
+
+void DirsTest::userDirsAreASmallFile()
+{
+    QFETCH(QString, kind);
+    const QString file = path(QStringLiteral(".config/user-dirs.dirs"));
+    QVERIFY(QDir().mkpath(path(QStringLiteral(".config"))));
+    if (kind == QLatin1String("pipe"))
+        QCOMPARE(mkfifo(QFile::encodeName(file).constData(), 0600), 0);
+    else if (kind == QLatin1String("device"))
+        QVERIFY(QFile::link(QStringLiteral("/dev/zero"), file));
+    else if (kind == QLatin1String("folder"))
+        QVERIFY(QDir().mkpath(file));
+    else
+        write(QStringLiteral(".config/user-dirs.dirs"),
+              "XDG_DESKTOP_DIR=\"/srv/desk\"\n" + QByteArray(1024 * 1024, '#'));
+    QCOMPARE(dir(VelDir::Desktop), path(QStringLiteral("Desktop")));
 }
 
 void DirsTest::userDirsLieInTheConfigurationOfTheUser()

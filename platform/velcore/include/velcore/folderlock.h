@@ -1,0 +1,38 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <velcore/velcore_export.h>
+
+#include <string>
+
+namespace Vel {
+
+/**
+ * Keeps other programs of the desktop from replacing a file of a folder while this one does.
+ *
+ * It is a lock on the folder itself, which leaves nothing behind, also when its holder is killed.
+ * Take it for the moment between a last look at the old file and the renaming of the new one, never
+ * for reading. Who holds a lock must not stop others for good: after a second they go on without.
+ */
+class VELCORE_EXPORT FolderLock
+{
+public:
+    /// Waits for the lock on \a folder, at most a second; no text is the current folder.
+    explicit FolderLock(const std::string &folder);
+    /// Releases the lock.
+    ~FolderLock();
+    FolderLock(const FolderLock &) = delete;
+    FolderLock &operator=(const FolderLock &) = delete;
+
+    /// Whether the lock was got; it was not when others held it for too long, when the folder may
+    /// not be read, and where the file system knows no locks.
+    bool isHeld() const { return m_isHeld; }
+
+private:
+    int m_folder;
+    bool m_isHeld = false;
+};
+
+} // namespace Vel
