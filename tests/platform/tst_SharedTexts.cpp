@@ -7,8 +7,14 @@
 #include <EntryFile.h>
 #include <SharedTexts.h>
 
+#include <QDir>
+#include <QProcess>
+
 #include <fcntl.h>
 #include <sys/stat.h>
+#include <unistd.h>
+
+#include <ctime>
 
 /// The memory of texts that records share.
 class tst_SharedTexts : public TestCase
@@ -18,6 +24,9 @@ class tst_SharedTexts : public TestCase
 private Q_SLOTS:
     void init();
 
+    void settlesWhenALaterChangeIsSureToShow_data();
+    void settlesWhenALaterChangeIsSureToShow();
+    void readsAnewWhatChangedWithinASecond();
     void givesOneTextForAnUnchangedFile();
     void doesNotKeepAFileThatIsTooYoung();
     void doesNotKeepAFileFromTheFuture();
@@ -48,6 +57,120 @@ QByteArray tst_SharedTexts::settled(const QString &name, const QByteArray &bytes
     if (!QTest::qWaitFor(isSettled))
         QTest::qFail("the file does not settle", __FILE__, __LINE__);
     return file;
+}
+
+void tst_SharedTexts::settlesWhenALaterChangeIsSureToShow_data()
+{
+    constexpr qint64 Even = 1600000000LL * 1000000000;
+    constexpr qint64 Odd = Even + 1000000000;
+    constexpr qint64 Millisecond = 1000000;
+    QTest::addColumn<qint64>("modified");
+    QTest::addColumn<qint64>("changed");
+    QTest::addColumn<qint64>("waited"); // since the later of the two
+    QTest::addColumn<bool>("settled");
+    const auto row = [](const char *title, qint64 modified, qint64 changed, qint64 waited, bool settled) {
+        QTest::newRow(title) << modified << changed << waited * Millisecond << settled;
+    };
+    row("fine, young", Odd + 1, Odd + 1, 49, false);
+    row("fine, old enough", Odd + 1, Odd + 1, 50, true);
+    row("whole seconds, young", Odd, Odd, 1999, false);
+    row("whole seconds, old enough", Odd, Odd, 2000, true);
+    row("modification set to a whole second", Odd, Odd + 1, 50, true);
+    row("change at a whole second by chance", Odd + 1, Odd, 50, true);
+    row("even second, young", Even, Even + 10 * Millisecond, 1999, false);
+    row("even second, old enough", Even, Even + 10 * Millisecond, 2000, true);
+    row("from the future", Odd + 1, Odd + 1, -1, false);
+}
+
+void tst_SharedTexts::settlesWhenALaterChangeIsSureToShow()
+{
+    QFETCH(qint64, modified);
+    QFETCH(qint64, changed);
+    QFETCH(qint64, waited);
+    QFETCH(bool, settled);
+    const auto time = [](qint64 nanoseconds) {
+        return timespec{time_t(nanoseconds / 1000000000), long(nanoseconds % 1000000000)};
+    };
+    struct stat status = {};
+    status.st_mtim = time(modified);
+    status.st_ctim = time(changed);
+    QCOMPARE(FileStamp(status).isSettled(qMax(modified, changed) + waited), settled);
+}
+
+namespace {
+
+// A file system that keeps whole seconds; needs root.
+class CoarseFileSystem
+{
+public:
+    explicit CoarseFileSystem(const QString &folder)
+        : m_folder(folder)
+    {
+        QFile image(folder + QStringLiteral(".image"));
+        m_isMounted = ::geteuid() == 0 && QDir().mkpath(folder) && image.open(QIODevice::WriteOnly)
+            && image.resize(2 * 1024 * 1024)
+            && run({QStringLiteral("/sbin/mkfs.ext2"), QStringLiteral("-q"), QStringLiteral("-F"),
+                    QStringLiteral("-I"), QStringLiteral("128"), image.fileName()})
+            && run({QStringLiteral("mount"), QStringLiteral("-o"), QStringLiteral("loop"), image.fileName(),
+                    folder});
+    }
+    ~CoarseFileSystem()
+    {
+        if (m_isMounted)
+            run({QStringLiteral("umount"), m_folder});
+    }
+    Q_DISABLE_COPY(CoarseFileSystem)
+
+    bool isMounted() const { return m_isMounted; }
+
+private:
+    static bool run(QStringList command)
+    {
+        QProcess process;
+        const QString program = command.takeFirst();
+        process.start(program, command);
+        return process.waitForFinished() && process.exitStatus() == QProcess::NormalExit
+            && process.exitCode() == 0;
+    }
+
+    QString m_folder;
+    bool m_isMounted;
+};
+
+qint64 millisecondsOfSecond()
+{
+    timespec now;
+    ::clock_gettime(CLOCK_REALTIME, &now);
+    return now.tv_nsec / 1000000;
+}
+
+} // namespace
+
+void tst_SharedTexts::readsAnewWhatChangedWithinASecond()
+{
+    const CoarseFileSystem coarse(path(QStringLiteral("coarse")));
+    if (!coarse.isMounted())
+        QSKIP("a file system that keeps whole seconds cannot be mounted here");
+    // All within one second: written, old enough for other file systems, read, written again.
+    QVERIFY(QTest::qWaitFor([] { return millisecondsOfSecond() < 100; }));
+    const QByteArray file = QFile::encodeName(write(QStringLiteral("coarse/x"), "[A]\n"));
+    QVERIFY(QTest::qWaitFor([] { return millisecondsOfSecond() >= 300; }));
+    struct stat before;
+    QCOMPARE(::stat(file.constData(), &before), 0);
+    QCOMPARE(EntryFile::read(file)->text->bytes(), std::string_view("[A]\n"));
+    EntryDocument document;
+    document.setPath(file);
+    QVERIFY(document.load());
+    write(QStringLiteral("coarse/x"), "[B]\n");
+    struct stat after;
+    QCOMPARE(::stat(file.constData(), &after), 0);
+    if (!(FileStamp(before) == FileStamp(after)))
+        QSKIP("the machine was too slow to write twice within a second");
+
+    QCOMPARE(EntryFile::read(file)->text->bytes(), std::string_view("[B]\n"));
+    document.setText("B", "Key", QStringLiteral("1"));
+    QVERIFY(document.save());
+    QCOMPARE(read(path(QStringLiteral("coarse/x"))), QByteArray("[B]\nKey=1\n"));
 }
 
 void tst_SharedTexts::givesOneTextForAnUnchangedFile()

@@ -38,24 +38,33 @@ bool readAll(int file, int expected, QByteArray *bytes)
 
 } // namespace
 
-std::optional<FileText> EntryFile::read(const QByteArray &path)
+int EntryFile::open(const QByteArray &path, int flags)
 {
     if (path.isEmpty() || path.contains('\0'))
-        return std::nullopt;
+        return -1;
     // Without O_NONBLOCK a named pipe would wait for a writer.
-    const FileDescriptor file(::open(path.constData(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
+    return ::open(path.constData(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY | flags);
+}
+
+std::optional<FileText> EntryFile::readOpen(int file)
+{
     struct stat status;
-    if (!file.isOpen() || ::fstat(file.get(), &status) != 0 || !S_ISREG(status.st_mode)
-        || status.st_size > LargestSize)
+    if (file < 0 || ::fstat(file, &status) != 0 || !S_ISREG(status.st_mode) || status.st_size > LargestSize)
         return std::nullopt;
 
     FileText result;
     result.stamp = FileStamp(status);
     result.settled = result.stamp.isSettled();
     QByteArray bytes;
-    if (!readAll(file.get(), int(status.st_size), &bytes) || bytes.size() > LargestSize)
+    if (!readAll(file, int(status.st_size), &bytes) || bytes.size() > LargestSize)
         return std::nullopt;
     result.settled = result.settled && bytes.size() == result.stamp.size;
     result.text = std::make_shared<DesktopEntryText>(std::move(bytes));
     return result;
+}
+
+std::optional<FileText> EntryFile::read(const QByteArray &path)
+{
+    const FileDescriptor file(open(path));
+    return readOpen(file.get());
 }

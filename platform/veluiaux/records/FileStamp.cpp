@@ -10,6 +10,7 @@ namespace {
 
 constexpr std::int64_t Second = 1000000000;
 constexpr std::int64_t SettlingTime = Second / 20;
+constexpr std::int64_t CoarseSettlingTime = 2 * Second;
 
 std::int64_t nanoseconds(const timespec &time)
 {
@@ -33,10 +34,18 @@ bool FileStamp::operator==(const FileStamp &other) const
         && changed == other.changed;
 }
 
+bool FileStamp::isSettled(std::int64_t now) const
+{
+    // A second that was written to once can be written to again without another stamp.
+    const bool isWhole = modified % Second == 0 && changed % Second == 0;
+    const bool isEven = modified % (2 * Second) == 0;
+    const std::int64_t latest = now - (isWhole || isEven ? CoarseSettlingTime : SettlingTime);
+    return modified <= latest && changed <= latest;
+}
+
 bool FileStamp::isSettled() const
 {
     timespec now;
     ::clock_gettime(CLOCK_REALTIME, &now);
-    const std::int64_t latest = nanoseconds(now) - SettlingTime;
-    return modified <= latest && changed <= latest;
+    return isSettled(nanoseconds(now));
 }

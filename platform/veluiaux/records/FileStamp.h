@@ -21,6 +21,10 @@ struct FileStamp
 
     bool operator==(const FileStamp &other) const;
 
-    /// Whether a later change is sure to give another stamp: neither time is younger than 50 ms.
+    /// Whether a change after \a now, in nanoseconds since 1970, is sure to give another stamp:
+    /// neither time is younger than 50 ms then, or 2 s where the file system seems to keep whole
+    /// seconds only, or every second one.
+    bool isSettled(std::int64_t now) const;
+    /// The same for this moment.
     bool isSettled() const;
 };
