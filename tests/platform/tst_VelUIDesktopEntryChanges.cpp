@@ -17,6 +17,8 @@ private Q_SLOTS:
     void changesNothingWhenASetterGetsTheGettersValue_data();
     void changesNothingWhenASetterGetsTheGettersValue();
     void doesNotTouchTheFileWhenNothingChanged();
+    void completesALastLineThatLacksHalfItsEnd_data();
+    void completesALastLineThatLacksHalfItsEnd();
     void forgetsAChangeThatWasTakenBack();
     void startsANewFileWithItsGroupAndTheKeysInTheirOrder();
     void writesTheLocalVariantThatTheGetterFound_data();
@@ -263,6 +265,28 @@ void tst_VelUIDesktopEntryChanges::doesNotTouchTheFileWhenNothingChanged()
     QCOMPARE(after.st_ino, before.st_ino);
     QCOMPARE(after.st_mtim.tv_nsec, before.st_mtim.tv_nsec);
     QCOMPARE(after.st_ctim.tv_nsec, before.st_ctim.tv_nsec);
+}
+
+void tst_VelUIDesktopEntryChanges::completesALastLineThatLacksHalfItsEnd_data()
+{
+    QTest::addColumn<QByteArray>("before");
+    QTest::addColumn<QByteArray>("after");
+    QTest::newRow("behind line feeds") << Header + "Name=A\nX-K=k\r" << Header + "Name=A\nX-K=k\r\nIcon=i\n";
+    QTest::newRow("behind both") << QByteArray("[Desktop Entry]\r\nName=A\r\nX-K=k\r")
+                                 << QByteArray("[Desktop Entry]\r\nName=A\r\nX-K=k\r\nIcon=i\r\n");
+    QTest::newRow("two of them") << QByteArray("[Desktop Entry]\r\nX-K=k\r\r")
+                                 << QByteArray("[Desktop Entry]\r\nX-K=k\r\r\nIcon=i\r\n");
+    QTest::newRow("a header") << QByteArray("#c\r\n[Desktop Entry]\r")
+                              << QByteArray("#c\r\n[Desktop Entry]\r\nIcon=i\r\n");
+    QTest::newRow("none of it") << QByteArray("[Desktop Entry]\r\nX-K=k")
+                                << QByteArray("[Desktop Entry]\r\nX-K=k\r\nIcon=i\r\n");
+}
+
+void tst_VelUIDesktopEntryChanges::completesALastLineThatLacksHalfItsEnd()
+{
+    QFETCH(QByteArray, before);
+    QFETCH(QByteArray, after);
+    QCOMPARE(changed(before, [](auto &record) { record.setIcon(QStringLiteral("i")); }), after);
 }
 
 void tst_VelUIDesktopEntryChanges::forgetsAChangeThatWasTakenBack()

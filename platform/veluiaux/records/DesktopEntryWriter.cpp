@@ -255,8 +255,9 @@ QByteArray Writer::join()
             append(old.substr(done, splice.at - done));
             done = splice.at;
         }
+        // The last line may lack its end, or half of it.
         if (splice.isLine && result.size() > begin && !result.endsWith('\n'))
-            append(m_lines.lineEndAt(splice.at));
+            append(result.endsWith('\r') ? "\n" : m_lines.lineEndAt(splice.at));
         append(splice.inserted);
         done = std::max(done, splice.at + splice.removed);
     }
