@@ -115,6 +115,12 @@ int fchmod(int file, mode_t mode) noexcept
     return fails("fchmod", "fchmod") ? -1 : int(::syscall(SYS_fchmod, file, mode));
 }
 
+int fsetxattr(int file, const char *name, const void *value, size_t size, int flags) noexcept
+{
+    return fails("fsetxattr", "fsetxattr") ? -1
+                                           : int(::syscall(SYS_fsetxattr, file, name, value, size, flags));
+}
+
 int rename(const char *from, const char *to) noexcept
 {
     return fails("rename", QByteArray("rename ") + from + " " + to) ? -1

@@ -55,6 +55,7 @@ private Q_SLOTS:
     void writesAFileThatIsGoneWhole();
     void createsAFileWhenThereIsNothingToWrite();
     void savesAgainAfterSaving();
+    void savesThroughNoLinkThatAnotherUserPlanted();
 
 private:
     QString m_file;
@@ -151,10 +152,10 @@ void tst_VelUIDesktopEntrySaving::failsInAFolderThatMayNotBeWritten()
     // Somebody else has to reach the folder.
     const QTemporaryDir outside(QStringLiteral("/tmp/veltest-XXXXXX"));
     QVERIFY(outside.isValid());
-    QCOMPARE(::chmod(qPrintable(outside.path()), 0555), 0);
     const QString file = outside.filePath(QStringLiteral("x.desktop"));
     QVERIFY(QFile::copy(m_file, file));
     QCOMPARE(::chmod(qPrintable(file), 0666), 0);
+    QCOMPARE(::chmod(qPrintable(outside.path()), 0555), 0);
     QVERIFY(asNobody([&file] {
         VelUIDesktopEntry record(file);
         record.setName(QStringLiteral("B"));
@@ -452,6 +453,28 @@ void tst_VelUIDesktopEntrySaving::savesAgainAfterSaving()
     record.setName(QStringLiteral("C"));
     QVERIFY(record.save());
     QCOMPARE(read(m_file), Header + "Name=C\nIcon=j\n");
+}
+
+void tst_VelUIDesktopEntrySaving::savesThroughNoLinkThatAnotherUserPlanted()
+{
+    if (::geteuid() != 0)
+        QSKIP("only root can make a link of another user's");
+    const QTemporaryDir outside(QStringLiteral("/tmp/veltest-XXXXXX"));
+    QCOMPARE(::chmod(qPrintable(outside.path()), 01777), 0);
+    const QString real = outside.filePath(QStringLiteral("real"));
+    const QString link = outside.filePath(QStringLiteral("link.desktop"));
+    QVERIFY(QFile::copy(m_file, real) && QFile::link(real, link));
+    QCOMPARE(::chown(qPrintable(real), 65534, 65534), 0);
+    QCOMPARE(::lchown(qPrintable(link), 12345, 12345), 0);
+    QVERIFY(asNobody([&] {
+        VelUIDesktopEntry record(real);
+        record.setFilePath(link);
+        record.setName(QStringLiteral("B"));
+        return !record.save();
+    }));
+    QCOMPARE(read(real), Header + "Name=A\n");
+    QCOMPARE(everything(outside.path()),
+             (QStringList{QStringLiteral("link.desktop"), QStringLiteral("real")}));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_VelUIDesktopEntrySaving)

@@ -22,18 +22,46 @@ struct Target
     QByteArray path;
     bool exists = false;
     struct stat status = {}; ///< of what exists
+
+    /// The folder of the path; empty for the current one.
+    QByteArray folder() const { return path.left(path.lastIndexOf('/') + 1); }
 };
 
 /// The file that \a path leads to through any symbolic links, which need not exist; none if
-/// they lead in a circle or it cannot be told what is there.
+/// they lead in a circle, one may have been planted by another user (see
+/// Vel::leadsThroughPlantedLink) or it cannot be told what is there.
 std::optional<Target> find(const QByteArray &path);
 
+/// Whether the same file stands at the target, or still none, as when it was found.
+bool isUnchanged(const Target &target);
+
 /**
- * Gives \a target the contents \a bytes; false if that failed.
+ * New contents that stand on disk beside their target, ready to take its place; gone with this
+ * object unless they did.
  *
- * Keeps the permissions (and, where it may, the owner) of an existing file, which has to be a
- * regular one that the caller may write to. Makes no folder.
+ * Keeps the rights of an existing file (see FileRights), which has to be a regular one that the
+ * caller may write to. Makes no folder. Removes, once an hour in each folder, what such
+ * replacements left there when they were killed.
  */
-bool replace(const Target &target, std::string_view bytes);
+class Replacement
+{
+public:
+    Replacement(const Target &target, std::string_view bytes);
+    ~Replacement();
+    Replacement(const Replacement &) = delete;
+    Replacement &operator=(const Replacement &) = delete;
+
+    /// Whether the contents are there; if not, nothing is.
+    bool isReady() const { return m_isReady; }
+    /// Takes the target's place; false if that failed.
+    bool commit();
+
+private:
+    int create(const QByteArray &folder, mode_t mode);
+
+    const QByteArray m_target;
+    QByteArray m_name; ///< empty when there is no such file
+    bool m_isReady = false;
+};
 
 } // namespace AtomicFile

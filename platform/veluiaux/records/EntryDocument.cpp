@@ -265,8 +265,10 @@ bool EntryDocument::replace(const AtomicFile::Target &target, const DesktopEntry
 {
     const QByteArray bytes = DesktopEntryWriter::apply(text, m_changes);
     // A larger one could not be read again.
-    if (bytes.size() > EntryFile::LargestSize
-        || !AtomicFile::replace(target, {bytes.constData(), std::size_t(bytes.size())}))
+    if (bytes.size() > EntryFile::LargestSize)
+        return false;
+    AtomicFile::Replacement replacement(target, {bytes.constData(), std::size_t(bytes.size())});
+    if (!replacement.isReady() || !replacement.commit())
         return false;
     SharedTexts::instance().remove(m_path);
     m_text = std::make_shared<DesktopEntryText>(bytes);
