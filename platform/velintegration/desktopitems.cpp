@@ -4,6 +4,8 @@
 #include <velintegration/desktopitems.h>
 
 #include <velcore/dirs.h>
+#include <velcore/files.h>
+#include <velcore/folderlock.h>
 
 #include <QByteArray>
 #include <QDir>
@@ -15,11 +17,13 @@
 #include <algorithm>
 #include <optional>
 
-#include <fcntl.h>
-#include <sys/file.h>
+#include <sys/xattr.h>
 #include <unistd.h>
 
 namespace {
+
+// So often a saving starts anew because another program was faster.
+constexpr int MostAttempts = 10;
 
 struct Item
 {
@@ -36,6 +40,11 @@ QString configurationRoot()
 QString filePath(const QString &root)
 {
     return root + QLatin1String("/desktopitems");
+}
+
+std::string encoded(const QString &path)
+{
+    return QFile::encodeName(path).toStdString();
 }
 
 std::optional<Item> parsed(const QByteArray &line)
@@ -61,16 +70,13 @@ QByteArray lineOf(const QByteArray &name, int x, int y)
 }
 
 // The lines without their ends; none for a file that does not exist, nothing when it cannot be read.
-std::optional<QList<QByteArray>> readLines(const QString &path)
+std::optional<QList<QByteArray>> linesOf(const Vel::SmallFile &file)
 {
-    QFile file(path);
-    if (!file.exists())
+    if (file.isMissing())
         return QList<QByteArray>();
-    if (!file.open(QIODevice::ReadOnly))
+    if (!file.isRead())
         return {};
-    QByteArray bytes = file.readAll();
-    if (file.error() != QFileDevice::NoError)
-        return {};
+    QByteArray bytes = QByteArray::fromStdString(file.bytes());
     if (bytes.endsWith('\n'))
         bytes.chop(1);
     return bytes.isEmpty() ? QList<QByteArray>() : bytes.split('\n');
@@ -88,56 +94,58 @@ void setPosition(QList<QByteArray> *lines, const QByteArray &name, int x, int y)
     lines->erase(std::remove_if(first + 1, lines->end(), isOurs), lines->end());
 }
 
-// flush() is asked because commit() does not see that a full disk took the buffer in part.
-bool writeLines(const QString &path, const QList<QByteArray> &lines)
+// With an access list the group's bits are its mask, which may allow more than the group itself
+// could do; the new file has no list.
+bool narrowPermissions(QSaveFile *file)
 {
-    QSaveFile file(path);
-    const QByteArray bytes = lines.join('\n') + '\n';
-    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && file.flush()
-        && file.commit();
+    return getxattr(QFile::encodeName(file->fileName()).constData(), "system.posix_acl_access", nullptr, 0)
+        <= 0
+        || file->setPermissions(QFile::ReadOwner | QFile::WriteOwner);
 }
 
-// Holds off other programs that save a position between our reading and our writing.
-class FolderLock
+// flush() is asked because commit() does not see that a full disk took the buffer in part. Synced
+// here, so that the lock is not held for as long as that takes.
+bool writeLines(QSaveFile *file, const QList<QByteArray> &lines)
 {
-public:
-    explicit FolderLock(const QString &folder)
-        : m_descriptor(open(QFile::encodeName(folder).constData(), O_RDONLY | O_DIRECTORY | O_CLOEXEC))
-    {
-        if (m_descriptor >= 0)
-            flock(m_descriptor, LOCK_EX);
-    }
-    ~FolderLock()
-    {
-        if (m_descriptor >= 0)
-            close(m_descriptor);
-    }
-    Q_DISABLE_COPY(FolderLock)
-
-private:
-    int m_descriptor;
-};
+    const QByteArray bytes = lines.join('\n') + '\n';
+    return std::size_t(bytes.size()) <= Vel::SmallFile::LargestSize && file->open(QIODevice::WriteOnly)
+        && narrowPermissions(file) && file->write(bytes) == bytes.size() && file->flush()
+        && fsync(file->handle()) == 0;
+}
 
 } // namespace
 
 bool SaveDesktopItemPosition(const char *fileName, int x, int y)
 {
     const QString root = configurationRoot();
-    if (!fileName || !*fileName || !QDir().mkpath(root))
+    const QString path = filePath(root);
+    if (!fileName || !*fileName || !QDir().mkpath(root) || Vel::leadsThroughPlantedLink(encoded(path)))
         return false;
-    const FolderLock lock(root);
-    std::optional<QList<QByteArray>> lines = readLines(filePath(root));
-    if (!lines)
-        return false;
-    setPosition(&*lines, QByteArray(fileName), x, y);
-    return writeLines(filePath(root), *lines);
+    // Taken only when the new file is on disk: nobody else waits for that. When another program was
+    // faster, all is done once more, now with the lock.
+    std::optional<Vel::FolderLock> lock;
+    for (int attempt = 1;; ++attempt) {
+        const Vel::SmallFile old(encoded(path));
+        std::optional<QList<QByteArray>> lines = linesOf(old);
+        if (!lines)
+            return false;
+        setPosition(&*lines, QByteArray(fileName), x, y);
+        QSaveFile file(path);
+        if (!writeLines(&file, *lines))
+            return false;
+        if (!lock)
+            lock.emplace(encoded(root));
+        if (attempt == MostAttempts || old.isUnchanged())
+            return file.commit();
+    }
 }
 
 bool ReadDesktopItemPosition(const char *fileName, int *x, int *y)
 {
     if (!fileName || !*fileName)
         return false;
-    const std::optional<QList<QByteArray>> lines = readLines(filePath(configurationRoot()));
+    const std::optional<QList<QByteArray>> lines =
+        linesOf(Vel::SmallFile(encoded(filePath(configurationRoot()))));
     if (!lines)
         return false;
     const QByteArray name(fileName);

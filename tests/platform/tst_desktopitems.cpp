@@ -12,6 +12,9 @@
 #include <thread>
 
 #include <sys/resource.h>
+#include <sys/stat.h>
+#include <sys/xattr.h>
+#include <unistd.h>
 
 class DesktopItemsTest : public TestCase
 {
@@ -160,6 +163,66 @@ private Q_SLOTS:
         QCOMPARE(QDir(path(QStringLiteral("config")))
                      .entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
                  QStringList(QStringLiteral("desktopitems")));
+    }
+
+    void leavesWhatIsNoSmallFile_data()
+    {
+        QTest::addColumn<QString>("kind");
+        QTest::newRow("named pipe") << QStringLiteral("pipe");
+        QTest::newRow("device") << QStringLiteral("device");
+        QTest::newRow("too large") << QStringLiteral("large");
+        QTest::newRow("would be too large") << QStringLiteral("full");
+    }
+
+    void leavesWhatIsNoSmallFile()
+    {
+        QFETCH(QString, kind);
+        QVERIFY(QDir().mkpath(path(QStringLiteral("config"))));
+        if (kind == QLatin1String("pipe"))
+            QCOMPARE(mkfifo(QFile::encodeName(file()).constData(), 0600), 0);
+        else if (kind == QLatin1String("device"))
+            QVERIFY(QFile::link(QStringLiteral("/dev/zero"), file()));
+        else
+            write(QStringLiteral("config/desktopitems"),
+                  "1 1 a\n" + QByteArray(1024 * 1024 - (kind == QLatin1String("full") ? 6 : 5), '#'));
+        QVERIFY(!SaveDesktopItemPosition("b", 2, 2));
+        QCOMPARE(position("b"), unknown());
+        QCOMPARE(position("a") == QPoint(1, 1), kind == QLatin1String("full"));
+        QCOMPARE(QDir(path(QStringLiteral("config")))
+                     .entryList(QDir::AllEntries | QDir::System | QDir::Hidden | QDir::NoDotAndDotDot),
+                 QStringList(QStringLiteral("desktopitems")));
+    }
+
+    void followsNoLinkThatAnotherUserPlanted()
+    {
+        if (geteuid() != 0)
+            QSKIP("only root can make a link of another user's");
+        const QTemporaryDir outside(QStringLiteral("/tmp/veltest-XXXXXX"));
+        QCOMPARE(chmod(qPrintable(outside.path()), 01777), 0);
+        qputenv("VEL_CONFIG_HOME", QFile::encodeName(outside.path()));
+        const QString real = write(QStringLiteral("real"), "1 1 a\n");
+        const QString link = outside.filePath(QStringLiteral("desktopitems"));
+        QVERIFY(QFile::link(real, link));
+        QCOMPARE(lchown(qPrintable(link), 12345, 12345), 0);
+        const OrdinaryUser user(folder());
+        QVERIFY(!SaveDesktopItemPosition("b", 2, 2));
+        QCOMPARE(read(real), QByteArray("1 1 a\n"));
+    }
+
+    void givesNobodyMoreRightsThanBefore()
+    {
+        write(QStringLiteral("config/desktopitems"), "1 1 a\n");
+        const QByteArray path = QFile::encodeName(file());
+        // user::rw- user:12345:rw- group::--- mask::rw- other::---, as the system stores it.
+        const unsigned char list[] = {2, 0,  0,   0,   1,   0,   6,  0, 255, 255, 255, 255, 2,   0,  6,
+                                      0, 57, 48,  0,   0,   4,   0,  0, 0,   255, 255, 255, 255, 16, 0,
+                                      6, 0,  255, 255, 255, 255, 32, 0, 0,   0,   255, 255, 255, 255};
+        if (setxattr(path.constData(), "system.posix_acl_access", list, sizeof list, 0) != 0)
+            QSKIP("there are no access lists here");
+        QVERIFY(SaveDesktopItemPosition("b", 2, 2));
+        struct stat status;
+        QCOMPARE(stat(path.constData(), &status), 0);
+        QCOMPARE(uint(status.st_mode & 07777), 0600U);
     }
 
     void losesNothingWhenTwoSaveAtOnce()
