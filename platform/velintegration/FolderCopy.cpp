@@ -4,12 +4,79 @@
 #include "FolderCopy.h"
 
 #include <algorithm>
+#include <array>
+#include <cerrno>
 #include <system_error>
+#include <utility>
 #include <vector>
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace fs = std::filesystem;
 
 namespace {
+
+constexpr mode_t PlainBits = 0777;
+
+class Descriptor
+{
+public:
+    explicit Descriptor(int descriptor)
+        : m_descriptor(descriptor)
+    {
+    }
+    ~Descriptor()
+    {
+        if (m_descriptor >= 0)
+            ::close(m_descriptor);
+    }
+    Descriptor(const Descriptor &) = delete;
+    Descriptor &operator=(const Descriptor &) = delete;
+
+    int get() const { return m_descriptor; }
+    bool close() { return ::close(std::exchange(m_descriptor, -1)) == 0; }
+
+private:
+    int m_descriptor;
+};
+
+bool writeAll(int file, const char *bytes, std::size_t size)
+{
+    while (size > 0) {
+        const ssize_t count = ::write(file, bytes, size);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count <= 0)
+            return false;
+        bytes += count;
+        size -= std::size_t(count);
+    }
+    return true;
+}
+
+bool copyBytes(int from, int to)
+{
+    std::array<char, 1 << 16> buffer;
+    for (;;) {
+        const ssize_t count = ::read(from, buffer.data(), buffer.size());
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count <= 0)
+            return count == 0;
+        if (!writeAll(to, buffer.data(), std::size_t(count)))
+            return false;
+    }
+}
+
+// The permissions of the other folder as far as the umask lets it, and the owner's to fill it.
+bool makeFolder(const fs::path &like, const fs::path &path)
+{
+    struct stat status = {};
+    return ::stat(like.c_str(), &status) == 0
+        && ::mkdir(path.c_str(), (status.st_mode & PlainBits) | S_IRWXU) == 0;
+}
 
 class FolderCopy
 {
@@ -52,7 +119,7 @@ private:
             return copyFile(from, to);
         if (!fs::is_directory(status) || isOpen(from))
             return true;
-        return fs::create_directory(to, error) && copy(from, to);
+        return makeFolder(from, to) && copy(from, to);
     }
 
     bool isOpen(const fs::path &folder) const
@@ -68,11 +135,14 @@ private:
 
 bool copyFile(const fs::path &from, const fs::path &to)
 {
-    std::error_code error;
-    if (!fs::copy_file(from, to, error))
+    // Without O_NONBLOCK a named pipe would wait for a writer.
+    const Descriptor source(::open(from.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
+    struct stat status = {};
+    if (source.get() < 0 || ::fstat(source.get(), &status) != 0 || !S_ISREG(status.st_mode))
         return false;
-    fs::permissions(to, fs::perms::owner_read | fs::perms::owner_write, fs::perm_options::add, error);
-    return !error;
+    const mode_t mode = (status.st_mode & PlainBits) | S_IRUSR | S_IWUSR;
+    Descriptor target(::open(to.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
+    return target.get() >= 0 && copyBytes(source.get(), target.get()) && target.close();
 }
 
 bool copyFolderContents(const fs::path &from, const fs::path &to)

@@ -5,7 +5,8 @@
 
 #include <filesystem>
 
-/// Copies a file, following links; the copy can be written by its owner.
+/// Copies a regular file, following links. The copy has its permissions as far as the umask lets it,
+/// never set-id bits, and can be written by its owner.
 bool copyFile(const std::filesystem::path &from, const std::filesystem::path &to);
 
 /**

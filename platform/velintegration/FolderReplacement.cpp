@@ -3,14 +3,19 @@
 
 #include "FolderReplacement.h"
 
+#include <velcore/files.h>
+
 #include <algorithm>
 #include <cerrno>
 #include <string>
+#include <string_view>
 #include <system_error>
 
 #include <fcntl.h>
 #include <stdio.h>
+#include <sys/file.h>
 #include <sys/stat.h>
+#include <sys/xattr.h>
 #include <unistd.h>
 
 namespace fs = std::filesystem;
@@ -19,16 +24,19 @@ namespace {
 
 constexpr int MostLinks = 40;
 
-// Where a path leads, with all links followed; empty when they lead in a circle.
+// Where a path leads, with all links followed; empty when they lead in a circle or where another
+// user may have wanted it.
 fs::path resolved(const fs::path &path)
 {
     std::error_code error;
-    fs::path result = fs::canonical(path, error);
-    if (!error)
-        return result;
-    result = fs::absolute(path, error);
+    fs::path result = fs::absolute(path, error);
     if (!result.has_filename()) // a trailing "/"
         result = result.parent_path();
+    if (Vel::leadsThroughPlantedLink(result))
+        return {};
+    const fs::path canonical = fs::canonical(result, error);
+    if (!error)
+        return canonical;
     for (int i = 0; i < MostLinks; ++i) {
         if (!fs::is_symlink(fs::symlink_status(result, error)))
             return result;
@@ -62,6 +70,42 @@ void removeAll(const fs::path &folder)
     fs::remove_all(folder, error);
 }
 
+// Whether \a text is made of two numbers with a "-" between them.
+bool isPair(std::string_view text)
+{
+    const std::size_t middle = text.find('-');
+    const auto isNumber = [](std::string_view part) {
+        return !part.empty() && part.find_first_not_of("0123456789") == std::string_view::npos;
+    };
+    return middle != std::string_view::npos && isNumber(text.substr(0, middle))
+        && isNumber(text.substr(middle + 1));
+}
+
+// What the new folder may get of the old one's permissions: none that hold for another owner or
+// group than before.
+mode_t permissionsFor(const struct stat &folder, const struct stat &old, bool hasAccessList)
+{
+    const bool isGroup = folder.st_gid == old.st_gid;
+    mode_t bits = old.st_mode & (S_IRWXU | S_IRWXG | S_IRWXO);
+    // With an access list the group's bits are its mask, and the list goes.
+    if (!isGroup || hasAccessList)
+        bits = (bits & S_IRWXU) | (bits & (bits >> 3) & S_IRWXO) * 011;
+    return isGroup && folder.st_uid == old.st_uid ? bits | (old.st_mode & 07000) : bits;
+}
+
+// Gives a folder the permissions of the one that it is to replace.
+bool takePermissions(const fs::path &folder, const fs::path &old)
+{
+    struct stat status = {};
+    struct stat oldStatus = {};
+    if (stat(old.c_str(), &oldStatus) != 0 || stat(folder.c_str(), &status) != 0)
+        return false;
+    if (status.st_gid != oldStatus.st_gid && lchown(folder.c_str(), uid_t(-1), oldStatus.st_gid) == 0)
+        status.st_gid = oldStatus.st_gid;
+    const bool hasAccessList = getxattr(old.c_str(), "system.posix_acl_access", nullptr, 0) > 0;
+    return chmod(folder.c_str(), permissionsFor(status, oldStatus, hasAccessList)) == 0;
+}
+
 } // namespace
 
 int FolderReplacement::exchangePaths(const char *first, const char *second)
@@ -76,6 +120,8 @@ FolderReplacement::FolderReplacement(const fs::path &target, Exchange exchange)
     std::error_code error;
     const bool isReplaceable = m_target.has_filename()
         && (!pathExists(m_target) || fs::is_directory(fs::symlink_status(m_target, error)));
+    if (isReplaceable)
+        removeLeftovers();
     if (!isReplaceable || !makeParents() || !makeFolder())
         m_folder.clear();
 }
@@ -84,6 +130,8 @@ FolderReplacement::~FolderReplacement()
 {
     if (isOpen())
         removeAll(m_folder);
+    if (m_lock >= 0)
+        close(m_lock);
     std::error_code error;
     for (auto it = m_madeParents.rbegin(); it != m_madeParents.rend(); ++it)
         fs::remove(*it, error);
@@ -103,9 +151,26 @@ bool FolderReplacement::makeParents()
     return true;
 }
 
+std::string FolderReplacement::nameFor(const char *purpose) const
+{
+    return "." + m_target.filename().string() + "." + purpose;
+}
+
+// As long as the target is gone, the old folder is the only one that there is.
+void FolderReplacement::removeLeftovers() const
+{
+    const auto isOurs = [this](std::string_view name) {
+        const auto isOf = [name](const std::string &start) {
+            return name.substr(0, start.size()) == start && isPair(name.substr(start.size()));
+        };
+        return isOf(nameFor("new")) || (isOf(nameFor("old")) && pathExists(m_target));
+    };
+    Vel::removeLeftovers(m_target.parent_path().string(), Vel::Leftover::Folder, isOurs);
+}
+
 fs::path FolderReplacement::freeName(const char *purpose) const
 {
-    const std::string start = "." + m_target.filename().string() + "." + purpose + std::to_string(getpid());
+    const std::string start = nameFor(purpose) + std::to_string(getpid());
     for (int i = 0;; ++i) {
         fs::path path = m_target.parent_path() / (start + "-" + std::to_string(i));
         if (!pathExists(path))
@@ -117,8 +182,13 @@ bool FolderReplacement::makeFolder()
 {
     do {
         m_folder = freeName("new");
-        if (mkdir(m_folder.c_str(), 0777) == 0)
+        if (mkdir(m_folder.c_str(), 0777) == 0) {
+            // Tells that it is in use, however long the building takes.
+            m_lock = open(m_folder.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC);
+            if (m_lock >= 0)
+                flock(m_lock, LOCK_SH | LOCK_NB);
             return true;
+        }
     } while (errno == EEXIST);
     return false;
 }
@@ -135,8 +205,7 @@ bool FolderReplacement::commit()
 
 bool FolderReplacement::replaceOld()
 {
-    struct stat old = {};
-    if (stat(m_target.c_str(), &old) != 0 || chmod(m_folder.c_str(), old.st_mode & 07777) != 0)
+    if (!takePermissions(m_folder, m_target))
         return false;
     if (m_exchange(m_folder.c_str(), m_target.c_str()) != 0) {
         const bool isUnknown = errno == EINVAL || errno == ENOSYS || errno == EOPNOTSUPP;

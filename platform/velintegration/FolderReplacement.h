@@ -4,13 +4,16 @@
 #pragma once
 
 #include <filesystem>
+#include <string>
 #include <vector>
 
 /**
  * A new folder that is built beside another and then takes its place.
  *
- * Missing parents of the target are made; a target that is a link is followed. Unless
- * commit() succeeds, the target is left as it was and all that was made here is removed.
+ * Missing parents of the target are made; a target that is a link is followed, but none that
+ * another user may have planted. Unless commit() succeeds, the target is left as it was and all
+ * that was made here is removed; what a killed program made beside the target is removed by the
+ * next one that is made an hour later.
  */
 class FolderReplacement
 {
@@ -40,10 +43,13 @@ private:
     bool makeFolder();
     bool replaceOld();
     bool replaceInTwoSteps();
+    void removeLeftovers() const;
+    std::string nameFor(const char *purpose) const;
     std::filesystem::path freeName(const char *purpose) const;
 
     std::filesystem::path m_target;
     std::filesystem::path m_folder;
     std::vector<std::filesystem::path> m_madeParents;
     Exchange m_exchange;
+    int m_lock = -1;
 };

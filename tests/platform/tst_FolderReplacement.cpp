@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OrdinaryUser.h"
 #include "TestCase.h"
 
 #include <FolderReplacement.h>
@@ -10,7 +11,12 @@
 #include <cerrno>
 #include <cstdio>
 
-/// What a start menu's tests cannot bring about: file systems that exchange nothing.
+#include <fcntl.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+/// What a start menu's tests cannot bring about: file systems that exchange nothing, other users.
 class FolderReplacementTest : public TestCase
 {
     Q_OBJECT
@@ -89,6 +95,128 @@ private Q_SLOTS:
             fill(replacement);
         }
         QCOMPARE(names(folder()), QStringList());
+    }
+
+    void removesWhatKilledReplacementsLeft_data()
+    {
+        QTest::addColumn<QString>("name");
+        QTest::addColumn<QString>("kind");
+        QTest::addColumn<bool>("stays");
+        const auto row = [](const char *title, const char *name, const char *kind, bool stays) {
+            QTest::newRow(title) << QString::fromLatin1(name) << QString::fromLatin1(kind) << stays;
+        };
+        row("new one", ".menu.new4711-0", "folder", false);
+        row("old one", ".menu.old4711-12", "folder", false);
+        row("old one without a menu", ".menu.old4711-12", "only", true);
+        row("young", ".menu.new4711-0", "young", true);
+        row("in use", ".menu.new4711-0", "locked", true);
+        row("of another user", ".menu.new4711-0", "strange", true);
+        row("file", ".menu.new4711-0", "file", true);
+        row("link", ".menu.new4711-0", "link", true);
+        row("of another menu", ".other.new4711-0", "folder", true);
+        row("no numbers", ".menu.newest", "folder", true);
+        row("one number", ".menu.new4711", "folder", true);
+        row("another purpose", ".menu.bak4711-0", "folder", true);
+        row("more behind", ".menu.new4711-0.x", "folder", true);
+    }
+
+    void removesWhatKilledReplacementsLeft()
+    {
+        QFETCH(QString, name);
+        QFETCH(QString, kind);
+        QFETCH(bool, stays);
+        const QByteArray left = QFile::encodeName(path(name));
+        write(QStringLiteral("elsewhere/kept"), "x");
+        if (kind == QLatin1String("file"))
+            write(name, "x");
+        else if (kind == QLatin1String("link"))
+            QVERIFY(QFile::link(path(QStringLiteral("elsewhere")), path(name)));
+        else
+            write(name + QStringLiteral("/sub/entry"), "x");
+        if (QFileInfo(path(name)).isDir() && kind != QLatin1String("link")) {
+            QVERIFY(QFile::link(path(QStringLiteral("elsewhere")), path(name) + QStringLiteral("/link")));
+            QCOMPARE(chmod((left + "/sub").constData(), 0500), 0);
+        }
+        if (kind != QLatin1String("only"))
+            write(QStringLiteral("menu/old"), "x");
+        if (kind == QLatin1String("strange") && lchown(left.constData(), 12345, 12345) != 0)
+            QSKIP("only root can make a folder of another user's");
+        const timespec old[] = {{1600000000, 0}, {1600000000, 0}};
+        QVERIFY(kind == QLatin1String("young")
+                || utimensat(AT_FDCWD, left.constData(), old, AT_SYMLINK_NOFOLLOW) == 0);
+        const int lock = kind == QLatin1String("locked") ? open(left.constData(), O_RDONLY) : -1;
+        QVERIFY(lock < 0 || flock(lock, LOCK_SH) == 0);
+        FolderReplacement replacement(target());
+        QVERIFY(replacement.isOpen());
+        struct stat status;
+        QCOMPARE(lstat(left.constData(), &status) == 0, stays);
+        QVERIFY(QFile::exists(path(QStringLiteral("elsewhere/kept"))));
+        if (lock >= 0)
+            close(lock);
+        if (stays && S_ISDIR(status.st_mode))
+            chmod((left + "/sub").constData(), 0700);
+    }
+
+    void tellsOthersThatItIsInUse()
+    {
+        FolderReplacement replacement(target());
+        const int folder = open(replacement.folder().c_str(), O_RDONLY);
+        QVERIFY(flock(folder, LOCK_EX | LOCK_NB) != 0);
+        QVERIFY(replacement.commit());
+        close(folder);
+    }
+
+    void followsNoLinkThatAnotherUserPlanted()
+    {
+        if (geteuid() != 0)
+            QSKIP("only root can make a link of another user's");
+        const QTemporaryDir outside(QStringLiteral("/tmp/veltest-XXXXXX"));
+        QCOMPARE(chmod(qPrintable(outside.path()), 01777), 0);
+        const QString link = outside.filePath(QStringLiteral("menu"));
+        write(QStringLiteral("menu/old"), "x");
+        QVERIFY(QFile::link(path(QStringLiteral("menu")), link));
+        QCOMPARE(lchown(qPrintable(link), 12345, 12345), 0);
+        const OrdinaryUser user(folder());
+        for (const char *end : {"", "/"})
+            QVERIFY(!FolderReplacement(link.toStdString() + end).isOpen());
+        QCOMPARE(names(folder()), (QStringList{QStringLiteral("menu"), QStringLiteral("runtime")}));
+    }
+
+    void lendsNobodyTheRightsOfAnotherOwner_data()
+    {
+        QTest::addColumn<uint>("old");
+        QTest::addColumn<uint>("owner");
+        QTest::addColumn<uint>("replaced");
+        QTest::newRow("same owner") << 02775U << 0U << 02775U;
+        QTest::newRow("another owner and group") << 03775U << 12345U << 0755U;
+    }
+
+    void lendsNobodyTheRightsOfAnotherOwner()
+    {
+        QFETCH(uint, old);
+        QFETCH(uint, owner);
+        QFETCH(uint, replaced);
+        write(QStringLiteral("menu/old"), "x");
+        const QByteArray menu = QFile::encodeName(path(QStringLiteral("menu")));
+        if (geteuid() != 0)
+            QSKIP("only root can give a folder away");
+        {
+            const OrdinaryUser user(folder());
+        }
+        owner = owner ? owner : 65534U;
+        QCOMPARE(chown(menu.constData(), owner, owner), 0);
+        QCOMPARE(chmod(menu.constData(), old), 0);
+        QCOMPARE(chmod(qPrintable(folder()), 0777), 0);
+        {
+            // Without handing anything over again.
+            const OrdinaryUser user(path(QStringLiteral("runtime")));
+            FolderReplacement replacement(target());
+            QVERIFY(replacement.isOpen());
+            QVERIFY(replacement.commit());
+        }
+        struct stat status;
+        QCOMPARE(stat(menu.constData(), &status), 0);
+        QCOMPARE(QString::number(status.st_mode & 07777, 8), QString::number(replaced, 8));
     }
 
     void buildsBesideTheTargetOutOfSight()

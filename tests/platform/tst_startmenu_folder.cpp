@@ -12,6 +12,7 @@
 #include <csignal>
 
 #include <sys/resource.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 /// How a start menu takes the place of the old one, and the copy of a template.
@@ -19,9 +20,18 @@ class tst_startmenu_folder : public StartMenuTestCase
 {
     Q_OBJECT
 
+private:
+    static uint modeOf(const QString &file)
+    {
+        struct stat status = {};
+        return stat(QFile::encodeName(file).constData(), &status) == 0 ? status.st_mode & 07777 : 0;
+    }
+
 private Q_SLOTS:
     void entriesAreIndependentCopies();
     void copiesCanBeWritten();
+    void copiesFollowTheUmask();
+    void copiesOfATemplateFollowTheUmask();
     void theSameInputGivesTheSameTree();
     void replacesTheOldMenu();
     void missingParentsAreMade();
@@ -64,6 +74,37 @@ void tst_startmenu_folder::copiesCanBeWritten()
     QVERIFY(create());
     QVERIFY(QFileInfo(inMenu(QStringLiteral("Game/a.desktop"))).permissions() & QFile::WriteOwner);
     QVERIFY(!(QFileInfo(original).permissions() & QFile::WriteOwner));
+}
+
+void tst_startmenu_folder::copiesFollowTheUmask()
+{
+    const QByteArray original = QFile::encodeName(install(QStringLiteral("a.desktop"), "Game;"));
+    QCOMPARE(chmod(original.constData(), 06777), 0);
+    const mode_t previous = umask(022);
+    const bool created = create();
+    umask(previous);
+    QVERIFY(created);
+    QCOMPARE(modeOf(inMenu(QStringLiteral("Game/a.desktop"))), 0755U);
+}
+
+void tst_startmenu_folder::copiesOfATemplateFollowTheUmask()
+{
+    write(QStringLiteral("template/open/a.desktop"), "a");
+    write(QStringLiteral("template/closed/b.desktop"), "b");
+    const auto set = [this](const char *name, mode_t mode) {
+        return chmod(qPrintable(path(QStringLiteral("template/") + QLatin1String(name))), mode) == 0;
+    };
+    QVERIFY(set("open", 07777) && set("open/a.desktop", 0666) && set("closed", 0700)
+            && set("closed/b.desktop", 04600));
+    const mode_t previous = umask(022);
+    const bool created =
+        CreateStartMenu(QFile::encodeName(menu()).constData(), qPrintable(path(QStringLiteral("template"))));
+    umask(previous);
+    QVERIFY(created);
+    QCOMPARE(modeOf(inMenu(QStringLiteral("open"))), 0755U);
+    QCOMPARE(modeOf(inMenu(QStringLiteral("open/a.desktop"))), 0644U);
+    QCOMPARE(modeOf(inMenu(QStringLiteral("closed"))), 0700U);
+    QCOMPARE(modeOf(inMenu(QStringLiteral("closed/b.desktop"))), 0600U);
 }
 
 void tst_startmenu_folder::theSameInputGivesTheSameTree()
