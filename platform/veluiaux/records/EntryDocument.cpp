@@ -6,15 +6,21 @@
 #include "DesktopEntryNames.h"
 #include "DesktopEntryWriter.h"
 #include "EntryFile.h"
+#include "FileDescriptor.h"
 #include "SharedTexts.h"
 
 #include <DesktopEntryValue.h>
 #include <velcore/language.h>
 
+#include <fcntl.h>
+
 #include <mutex>
 #include <utility>
 
 namespace {
+
+// So often a save starts anew because another program was faster.
+constexpr int MostAttempts = 10;
 
 std::string encode(const QString &text)
 {
@@ -243,33 +249,53 @@ bool EntryDocument::save()
     if (m_path.isEmpty())
         return false;
     const std::lock_guard<std::mutex> lock(savingMutex());
-    const auto target = AtomicFile::find(m_path);
-    if (!target)
-        return false;
-    // A file that is gone is written whole, and so is one that this text did not come from.
-    if (!target->exists || (m_read && !isFromPath()))
-        return replace(*target, *m_text);
-    if (m_changes.isEmpty())
-        return true;
-    if (isFromPath() && m_settled && FileStamp(target->status) == m_stamp)
-        return replace(*target, *m_text);
-
-    // Somebody else may have written meanwhile: our changes go into what stands there now.
-    const auto file = EntryFile::read(target->path);
-    if (!file)
-        return false;
-    return replace(*target, file->text->bytes() == m_text->bytes() ? *m_text : *file->text);
+    // Taken only when the new file is on disk: nobody else waits for that. When another program was
+    // faster, all is done once more, now with the lock.
+    std::optional<Vel::FolderLock> folderLock;
+    auto outcome = Outcome::Overtaken;
+    for (int attempt = 1; outcome == Outcome::Overtaken; ++attempt) {
+        const auto target = AtomicFile::find(m_path);
+        outcome = target ? replace(*target, &folderLock, attempt == MostAttempts) : Outcome::Failed;
+    }
+    return outcome == Outcome::Saved;
 }
 
-bool EntryDocument::replace(const AtomicFile::Target &target, const DesktopEntryText &text)
+EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target,
+                                              std::optional<Vel::FolderLock> *folderLock, bool isLast)
 {
-    const QByteArray bytes = DesktopEntryWriter::apply(text, m_changes);
+    // A file that is gone is written whole, and so is one that this text did not come from.
+    const bool isWhole = !target.exists || (m_read && !isFromPath());
+    if (!isWhole && m_changes.isEmpty())
+        return Outcome::Saved;
+    const bool isKnown = isWhole || (isFromPath() && m_settled && FileStamp(target.status) == m_stamp);
+    // Somebody else may have written meanwhile: our changes go into what stands there now. It stays
+    // open until the end, so that no later file can look like this one.
+    const FileDescriptor file(isKnown ? -1 : EntryFile::open(target.path, O_NOFOLLOW));
+    const auto now = isKnown ? FileText{m_text, FileStamp(target.status)} : EntryFile::readOpen(file.get());
+    if (!now)
+        return Outcome::Failed;
+    if (!(now->stamp == FileStamp(target.status)) && !isLast)
+        return Outcome::Overtaken;
+    const bool isSame = now->text->bytes() == m_text->bytes(); // then ours has its index already
+    return replace(target, DesktopEntryWriter::apply(isSame ? *m_text : *now->text, m_changes), folderLock,
+                   isLast);
+}
+
+EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target, const QByteArray &bytes,
+                                              std::optional<Vel::FolderLock> *folderLock, bool isLast)
+{
     // A larger one could not be read again.
     if (bytes.size() > EntryFile::LargestSize)
-        return false;
+        return Outcome::Failed;
     AtomicFile::Replacement replacement(target, {bytes.constData(), std::size_t(bytes.size())});
-    if (!replacement.isReady() || !replacement.commit())
-        return false;
+    if (!replacement.isReady())
+        return Outcome::Failed;
+    if (!*folderLock)
+        folderLock->emplace(target.folder().toStdString());
+    if (!isLast && !AtomicFile::isUnchanged(target))
+        return Outcome::Overtaken;
+    if (!replacement.commit())
+        return Outcome::Failed;
     SharedTexts::instance().remove(m_path);
     m_text = std::make_shared<DesktopEntryText>(bytes);
     // So young a file could change without getting another stamp.
@@ -277,5 +303,5 @@ bool EntryDocument::replace(const AtomicFile::Target &target, const DesktopEntry
     m_read = true;
     m_textPath = m_path;
     m_changes = {};
-    return true;
+    return Outcome::Saved;
 }

@@ -8,6 +8,8 @@
 #include "FileStamp.h"
 #include "GroupValues.h"
 
+#include <velcore/folderlock.h>
+
 #include <QByteArray>
 #include <QString>
 #include <QStringList>
@@ -80,7 +82,12 @@ private:
     void writeLocal(std::string_view group, std::string_view key, const T &value);
 
     bool isFromPath() const { return m_read && m_textPath == m_path; }
-    bool replace(const AtomicFile::Target &target, const DesktopEntryText &text);
+
+    enum class Outcome { Saved, Failed, Overtaken };
+    Outcome replace(const AtomicFile::Target &target, std::optional<Vel::FolderLock> *folderLock,
+                    bool isLast);
+    Outcome replace(const AtomicFile::Target &target, const QByteArray &bytes,
+                    std::optional<Vel::FolderLock> *folderLock, bool isLast);
 
     QByteArray m_path;
     std::shared_ptr<const DesktopEntryText> m_text; ///< never null
