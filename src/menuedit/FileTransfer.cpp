@@ -112,6 +112,7 @@ Result transfer(const QStringList &sources, const QString &targetDirectory, Acti
     Result possible = check(sources, targetDirectory);
     if (!possible.succeeded())
         return possible;
+    TreeCopy::removeLeftovers(native(targetDirectory));
     QVector<Pair> done;
     for (const QString &source : sources) {
         if (liesIn(source, targetDirectory))

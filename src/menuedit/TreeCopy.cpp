@@ -3,15 +3,21 @@
 
 #include "TreeCopy.h"
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <cstdio>
 #include <cstdlib>
+#include <ctime>
+#include <memory>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
+#include <dirent.h>
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -21,7 +27,16 @@ namespace {
 
 namespace fs = std::filesystem;
 
-enum class Times { New, Kept };
+// A copy is a new file of the user's; what is moved stays what it was.
+enum class Kind { Copy, Move };
+
+constexpr std::string_view StagingName = ".velcopy-";
+constexpr std::size_t StagingLetters = 6;
+constexpr time_t LeftoverAge = 60 * 60;
+constexpr mode_t AllBits = 07777;
+constexpr mode_t PlainBits = 0777;
+
+using Stream = std::unique_ptr<DIR, int (*)(DIR *)>;
 
 std::error_code lastError()
 {
@@ -52,24 +67,30 @@ private:
     int m_fd;
 };
 
-// A hidden folder of ours in the target directory, in which a copy is made ready.
+// A hidden folder of ours in the target directory, in which a copy is made ready. The lock on it
+// tells that it is in use, however long the copying takes.
 class StagingFolder
 {
 public:
     explicit StagingFolder(const Path &directory)
     {
-        const std::string pattern = (directory / ".velcopy-XXXXXX").string();
-        std::vector<char> name(pattern.begin(), pattern.end());
-        name.push_back('\0');
-        if (mkdtemp(name.data()))
-            m_path = name.data();
-        else
+        const std::string letters(StagingLetters, 'X');
+        std::string name = (directory / StagingName).string() + letters;
+        if (!mkdtemp(name.data())) {
             m_error = lastError();
+            return;
+        }
+        m_path = name;
+        m_folder = ::open(name.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC);
+        if (m_folder >= 0)
+            ::flock(m_folder, LOCK_SH | LOCK_NB);
     }
     ~StagingFolder()
     {
         if (!m_path.empty())
             removeTree(m_path);
+        if (m_folder >= 0)
+            ::close(m_folder);
     }
     StagingFolder(const StagingFolder &) = delete;
     StagingFolder &operator=(const StagingFolder &) = delete;
@@ -79,6 +100,7 @@ public:
 
 private:
     Path m_path;
+    int m_folder = -1;
     std::error_code m_error;
 };
 
@@ -112,41 +134,74 @@ std::error_code copyContents(int from, int to)
     }
 }
 
-std::error_code copyFile(const Path &source, const Path &target, mode_t mode)
+// What is moved keeps owner and group where it may, and its permissions; but set-id bits lend the
+// rights of the owner, and would lend those of another one.
+bool keepRights(int fd, const struct stat &old)
+{
+    struct stat now = {};
+    if (::fchown(fd, old.st_uid, old.st_gid) != 0 && ::fchown(fd, uid_t(-1), old.st_gid) != 0)
+        errno = 0;
+    if (::fstat(fd, &now) != 0)
+        return false;
+    const bool isSame = now.st_uid == old.st_uid && now.st_gid == old.st_gid;
+    return ::fchmod(fd, old.st_mode & (isSame ? AllBits : PlainBits)) == 0;
+}
+
+std::error_code copyFile(const Path &source, const Path &target, Kind kind)
 {
     // Not blocking: something else may have taken the file's place since it was looked at.
-    const Descriptor from(::open(source.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
-    if (!from.isOpen())
+    const Descriptor from(::open(source.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOFOLLOW));
+    struct stat status = {};
+    if (!from.isOpen() || ::fstat(from.fd(), &status) != 0)
         return lastError();
-    Descriptor to(::open(target.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600));
+    if (!S_ISREG(status.st_mode))
+        return std::make_error_code(std::errc::not_supported);
+    // The system takes the umask off what a new file is made with.
+    const mode_t mode = kind == Kind::Copy ? status.st_mode & PlainBits : S_IRUSR | S_IWUSR;
+    Descriptor to(::open(target.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
     if (!to.isOpen())
         return lastError();
     if (const std::error_code error = copyContents(from.fd(), to.fd()))
         return error;
-    if (::fchmod(to.fd(), mode & 07777) != 0 || ::fsync(to.fd()) != 0 || !to.close())
+    if ((kind == Kind::Move && !keepRights(to.fd(), status)) || ::fsync(to.fd()) != 0 || !to.close())
         return lastError();
     return {};
 }
 
-std::error_code copyTree(const Path &source, const Path &target, Times times);
+std::error_code copyTree(const Path &source, const Path &target, Kind kind);
 
-std::error_code copyFolder(const Path &source, const Path &target, mode_t mode, Times times)
+// Takes away what the owner was given for the time of filling.
+bool finishFolder(const Path &target, const struct stat &source, Kind kind)
 {
-    if (::mkdir(target.c_str(), 0700) != 0)
+    if (kind == Kind::Copy && (source.st_mode & S_IRWXU) == S_IRWXU)
+        return true;
+    const Descriptor folder(::open(target.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC | O_NOFOLLOW));
+    struct stat status = {};
+    if (!folder.isOpen() || ::fstat(folder.fd(), &status) != 0)
+        return false;
+    if (kind == Kind::Move)
+        return keepRights(folder.fd(), source);
+    return ::fchmod(folder.fd(), status.st_mode & AllBits & ~(S_IRWXU & ~source.st_mode)) == 0;
+}
+
+std::error_code copyFolder(const Path &source, const Path &target, const struct stat &status, Kind kind)
+{
+    const mode_t mode = kind == Kind::Copy ? (status.st_mode & PlainBits) | S_IRWXU : S_IRWXU;
+    if (::mkdir(target.c_str(), mode) != 0)
         return lastError();
     std::error_code error;
     fs::directory_iterator it(source, error);
     while (!error && it != fs::directory_iterator()) {
-        if (const std::error_code failed = copyTree(it->path(), target / it->path().filename(), times))
+        if (const std::error_code failed = copyTree(it->path(), target / it->path().filename(), kind))
             return failed;
         it.increment(error);
     }
-    if (!error && ::chmod(target.c_str(), mode & 07777) != 0)
+    if (!error && !finishFolder(target, status, kind))
         return lastError();
     return error;
 }
 
-std::error_code copyTree(const Path &source, const Path &target, Times times)
+std::error_code copyTree(const Path &source, const Path &target, Kind kind)
 {
     struct stat status = {};
     if (::lstat(source.c_str(), &status) != 0)
@@ -155,16 +210,72 @@ std::error_code copyTree(const Path &source, const Path &target, Times times)
     if (S_ISLNK(status.st_mode))
         fs::copy_symlink(source, target, error);
     else if (S_ISREG(status.st_mode))
-        error = copyFile(source, target, status.st_mode);
+        error = copyFile(source, target, kind);
     else if (S_ISDIR(status.st_mode))
-        error = copyFolder(source, target, status.st_mode, times);
+        error = copyFolder(source, target, status, kind);
     else
         error = std::make_error_code(std::errc::not_supported);
-    if (!error && times == Times::Kept) {
+    if (!error && kind == Kind::Move) {
         const std::array<timespec, 2> stamps{status.st_atim, status.st_mtim};
         ::utimensat(AT_FDCWD, target.c_str(), stamps.data(), AT_SYMLINK_NOFOLLOW);
     }
     return error;
+}
+
+std::vector<std::string> namesIn(DIR *folder)
+{
+    std::vector<std::string> names;
+    while (const dirent *entry = ::readdir(folder)) {
+        const std::string_view name = entry->d_name;
+        if (name != "." && name != "..")
+            names.emplace_back(name);
+    }
+    return names;
+}
+
+// A folder that may be read; null for what is none, links included.
+Stream openFolder(int parent, const char *name)
+{
+    const int fd = ::openat(parent, name, O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC);
+    DIR *const stream = fd < 0 ? nullptr : ::fdopendir(fd);
+    if (!stream && fd >= 0)
+        ::close(fd);
+    return Stream(stream, ::closedir);
+}
+
+// By open folders, not by paths: another user may put a link in the place of what was looked at.
+void removeAt(int parent, const std::string &name)
+{
+    if (::unlinkat(parent, name.c_str(), 0) == 0 || errno != EISDIR)
+        return;
+    ::fchmodat(parent, name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
+    if (const Stream folder = openFolder(parent, name.c_str())) {
+        for (const std::string &child : namesIn(folder.get()))
+            removeAt(::dirfd(folder.get()), child);
+    }
+    ::unlinkat(parent, name.c_str(), AT_REMOVEDIR);
+}
+
+bool isStagingName(std::string_view name)
+{
+    if (name.substr(0, StagingName.size()) != StagingName)
+        return false;
+    name.remove_prefix(StagingName.size());
+    return name.size() == StagingLetters && std::all_of(name.begin(), name.end(), [](char c) {
+               return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
+           });
+}
+
+// Whether a copy of this user was killed that made this folder.
+bool isLeftover(int parent, const std::string &name)
+{
+    struct stat status = {};
+    if (!isStagingName(name) || ::fstatat(parent, name.c_str(), &status, AT_SYMLINK_NOFOLLOW) != 0
+        || !S_ISDIR(status.st_mode) || status.st_uid != ::geteuid()
+        || status.st_mtime >= ::time(nullptr) - LeftoverAge)
+        return false;
+    const Stream folder = openFolder(parent, name.c_str());
+    return folder && ::flock(::dirfd(folder.get()), LOCK_EX | LOCK_NB) == 0;
 }
 
 // rename() that fails where the target exists.
@@ -183,12 +294,12 @@ std::error_code renameToNew(const Path &source, const Path &target)
     return {};
 }
 
-std::error_code copyByStaging(const Path &source, const Path &target, Times times)
+std::error_code copyByStaging(const Path &source, const Path &target, Kind kind)
 {
     const StagingFolder staging(target.parent_path());
     if (staging.error())
         return staging.error();
-    if (const std::error_code error = copyTree(source, staging.item(), times))
+    if (const std::error_code error = copyTree(source, staging.item(), kind))
         return error;
     return renameToNew(staging.item(), target);
 }
@@ -224,10 +335,11 @@ std::error_code moveByCopying(const Path &source, const Path &target)
         error = canBeRemoved(source);
     if (error)
         return error;
+    removeLeftovers(source.parent_path());
     const StagingFolder leaving(source.parent_path());
     if (leaving.error())
         return leaving.error();
-    if ((error = copyByStaging(source, target, Times::Kept)))
+    if ((error = copyByStaging(source, target, Kind::Move)))
         return error;
     if ((error = renameToNew(source, leaving.item())))
         removeTree(target);
@@ -260,11 +372,11 @@ std::error_code copy(const Path &source, const Path &target)
     if (error)
         return error;
     if (!fs::is_symlink(fs::symlink_status(source, error)))
-        return copyByStaging(source, target, Times::New);
+        return copyByStaging(source, target, Kind::Copy);
     if (fs::is_directory(status))
         return remakeLink(source, target);
     const Path file = fs::canonical(source, error);
-    return error ? error : copyByStaging(file, target, Times::New);
+    return error ? error : copyByStaging(file, target, Kind::Copy);
 }
 
 std::error_code move(const Path &source, const Path &target)
@@ -284,14 +396,18 @@ std::error_code move(const Path &source, const Path &target)
 
 void removeTree(const Path &path)
 {
-    std::error_code error;
-    if (fs::is_directory(fs::symlink_status(path, error))) {
-        ::chmod(path.c_str(), 0700);
-        for (fs::directory_iterator it(path, error); !error && it != fs::directory_iterator();
-             it.increment(error))
-            removeTree(it->path());
+    removeAt(AT_FDCWD, path.string());
+}
+
+void removeLeftovers(const Path &directory)
+{
+    const Stream folder(::opendir(directory.c_str()), ::closedir);
+    if (!folder)
+        return;
+    for (const std::string &name : namesIn(folder.get())) {
+        if (isLeftover(::dirfd(folder.get()), name))
+            removeAt(::dirfd(folder.get()), name);
     }
-    ::remove(path.c_str());
 }
 
 } // namespace TreeCopy

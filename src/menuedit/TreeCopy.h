@@ -16,13 +16,19 @@ namespace TreeCopy {
 
 using Path = std::filesystem::path;
 
-/// Copies \a source to \a target, which appears when the copy is complete.
+/// Copies \a source to \a target, which appears when the copy is complete. A copy is a new file of
+/// the user's: it has the permissions of the source as far as the umask lets it, never set-id bits.
 std::error_code copy(const Path &source, const Path &target);
 
-/// Moves \a source to \a target, by copying where they lie on different file systems.
+/// Moves \a source to \a target, by copying where they lie on different file systems. The permissions
+/// stay, set-id bits only together with owner and group.
 std::error_code move(const Path &source, const Path &target);
 
 /// Removes \a path, folders that may not be written included.
 void removeTree(const Path &path);
+
+/// Removes from \a directory what copies left there when they were killed: folders of this user's
+/// that nobody uses and nobody has touched for an hour.
+void removeLeftovers(const Path &directory);
 
 } // namespace TreeCopy

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "OrdinaryUser.h"
+#include "OtherFileSystem.h"
 #include "TestCase.h"
 
 #include <menuedit/FileTransfer.h>
@@ -82,17 +83,6 @@ private:
     QString m_path;
     bool m_isMounted;
 };
-
-// A folder on another file system than the temporary one, or an empty text.
-QString otherFileSystem(const QString &folder)
-{
-    struct stat ours = {};
-    struct stat other = {};
-    if (stat(QFile::encodeName(folder).constData(), &ours) != 0 || stat("/dev/shm", &other) != 0
-        || ours.st_dev == other.st_dev || access("/dev/shm", W_OK) != 0)
-        return QString();
-    return QStringLiteral("/dev/shm");
-}
 
 bool makePipe(const QString &path)
 {
