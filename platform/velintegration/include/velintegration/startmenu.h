@@ -13,12 +13,15 @@
  * entries that are not displayable are left out. They are grouped by the first of their main
  * categories into folders named after the category; what has none goes into "Other", the last
  * one. Every folder has a ".directory" file with its name in several languages, an icon and
- * the order of its children. The entries are copies that no longer depend on the originals.
+ * the order of its children. The entries are copies that no longer depend on the originals; they
+ * have their permissions as far as the umask lets them, never set-id bits.
  *
  * The new menu is built beside the old one and takes its place in the end: when anything
- * fails, the old one is left as it was.
+ * fails, the old one is left as it was. What a killed program left beside it an hour ago is
+ * removed.
  *
- * @param menuDir the folder of the menu. Missing parents are made, a link is followed
+ * @param menuDir the folder of the menu. Missing parents are made, a link is followed, unless
+ *        another user may have planted it (see Vel::leadsThroughPlantedLink)
  * @param templateDir a folder that is copied instead of all that; may be null or empty
  * @return whether the new menu stands
  */

@@ -113,9 +113,12 @@ public:
     /**
      * Writes the changes to the file, or nothing at all when there are none.
      *
-     * The new contents replace the old in one step. Permissions stay, symbolic links are
-     * followed, missing folders are not made. If the file has changed since it was read, the
-     * changes are applied to it as it now stands; if it is gone it is written whole.
+     * The new contents replace the old in one step. Permissions, access list and user attributes
+     * stay, and where they cannot, nobody gets more rights than before. Symbolic links are
+     * followed, but none that another user may have planted; missing folders are not made. If the
+     * file has changed since it was read, the changes are applied to it as it now stands; if it is
+     * gone it is written whole. Programs that save to one file at a time do not undo each other's
+     * changes; one of them may wait for the others, a second at most.
      *
      * @return false if that failed; the file is as it was then
      */
