@@ -34,6 +34,27 @@ void tst_ExecLine::findsTheProgram_data()
     QTest::newRow("an open escape") << QStringLiteral("vi\\") << none;
     QTest::newRow("a field code") << QStringLiteral("%f") << none;
     QTest::newRow("an unknown code") << QStringLiteral("vi %y") << none;
+    for (const char mark : {'#', ';', '|', '&', '<', '>'}) {
+        const QString with = QString::fromLatin1("vi a") + QLatin1Char(mark);
+        const auto row = [mark](const char *where) { return QByteArray(1, mark) + ' ' + where; };
+        QTest::newRow(row("before a code")) << with + QStringLiteral(" b %f") << none;
+        QTest::newRow(row("beside a code")) << with + QStringLiteral("%u") << none;
+        QTest::newRow(row("before a code in quotes")) << with + QStringLiteral(" \"%f\"") << none;
+        QTest::newRow(row("before a second code"))
+            << QStringLiteral("vi %f ") + QLatin1Char(mark) + QStringLiteral(" %c") << none;
+        QTest::newRow(row("in the program"))
+            << QStringLiteral("v") + QLatin1Char(mark) + QStringLiteral("i %f") << none;
+        QTest::newRow(row("behind a code"))
+            << QStringLiteral("vi %f ") + QLatin1Char(mark) + QStringLiteral(" x") << QStringLiteral("vi");
+        QTest::newRow(row("before a percent sign")) << with + QStringLiteral(" 5%%") << QStringLiteral("vi");
+        QTest::newRow(row("without a code")) << with << QStringLiteral("vi");
+        QTest::newRow(row("in double quotes"))
+            << QStringLiteral("vi \"a") + QLatin1Char(mark) + QStringLiteral("\" %f") << QStringLiteral("vi");
+        QTest::newRow(row("in single quotes"))
+            << QStringLiteral("vi 'a") + QLatin1Char(mark) + QStringLiteral("' %f") << QStringLiteral("vi");
+        QTest::newRow(row("behind a backslash"))
+            << QStringLiteral("vi a\\") + QLatin1Char(mark) + QStringLiteral(" %f") << QStringLiteral("vi");
+    }
 }
 
 void tst_ExecLine::findsTheProgram()

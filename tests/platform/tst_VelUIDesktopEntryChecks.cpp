@@ -74,6 +74,11 @@ void tst_VelUIDesktopEntryChecks::tellsWhyAnEntryCannotBeUsed_data()
     row("field code cut off", Application + "Exec=good %\n", -1);
     row("backslash at the end", Application + "Exec=good \\\\\n", -1);
     row("field code for a program", Application + "Exec=%f\n", -1);
+    row("a comment before a field code", Application + "Exec=good # %f\n", -1);
+    row("a second command with a field code", Application + "Exec=good; good %u\n", -1);
+    row("into a file that is given", Application + "Exec=good >%f\n", -1);
+    row("a second command in single quotes", Application + "Exec=good -c 'a;b' %f\n", 0);
+    row("a second command without a field code", Application + "Exec=good %f; good\n", 0);
     row("does not parse, before the program is missed", Application + "Exec=nosuch %x\n", -1);
 
     row("no exec", Application, 1);

@@ -28,6 +28,14 @@ bool isCode(QChar code)
     return code == Percent || isArgumentCode(code) || isDeprecatedCode(code);
 }
 
+// What a shell would not take as part of a word. Behind it an argument that is filled in would be
+// lost in a comment, be a command of its own or name a file to write to.
+bool endsCommand(const Piece &piece, Quote quote)
+{
+    return quote == Quote::None && piece.kind == Kind::Character
+        && QLatin1String("#;|&<>").contains(piece.character());
+}
+
 QStringList fileOrNothing(const QString &argument)
 {
     return argument.isEmpty() ? QStringList() : QStringList(argument);
@@ -101,11 +109,13 @@ std::optional<QString> ExecLine::program(const QString &exec)
     QString program;
     bool begun = false;
     bool ended = false;
+    bool isAtRisk = false;
     ShellQuoting::Scanner scanner(exec);
     while (!scanner.atEnd()) {
         const Piece piece = scanner.next();
         if (piece.kind == Kind::OpenEscape)
             return std::nullopt;
+        isAtRisk = isAtRisk || endsCommand(piece, scanner.quote());
         if (piece.kind == Kind::Blank) {
             ended = begun;
             continue;
@@ -114,8 +124,11 @@ std::optional<QString> ExecLine::program(const QString &exec)
             const QChar code = scanner.take();
             if (!isCode(code) || (!ended && isArgumentCode(code)))
                 return std::nullopt;
-            if (code != Percent)
+            if (code != Percent) {
+                if (isAtRisk)
+                    return std::nullopt;
                 continue;
+            }
         }
         begun = true;
         if (!ended)

@@ -34,7 +34,8 @@ struct Arguments
 QString expand(const QString &exec, const Arguments &arguments);
 
 /// The program that \a exec starts, without quoting; none if \a exec is no command line
-/// (an open quote, an unknown field code, a program that is a field code).
+/// (an open quote, an unknown field code, a program that is a field code, or a "#", ";", "|", "&",
+/// "<" or ">" outside of quotes before a field code).
 std::optional<QString> program(const QString &exec);
 
 } // namespace ExecLine
