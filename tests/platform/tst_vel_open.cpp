@@ -44,7 +44,8 @@ private Q_SLOTS:
 
 void tst_vel_open::failsWithoutAPath()
 {
-    for (const char *arguments : {"", "--exec", "--exec|", "x|y", "--exec|a|b"}) {
+    for (const char *arguments : {"", "--exec", "--exec|", "x|y", "--exec|a|b", "--trust", "--trust|--exec",
+                                  "--trust|x", "--exec|a|--trust"}) {
         QProcess process;
         process.start(program(), QString::fromLatin1(arguments).split(QLatin1Char('|')));
         QVERIFY(process.waitForFinished());

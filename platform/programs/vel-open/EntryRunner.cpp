@@ -5,6 +5,7 @@
 
 #include "BusActivation.h"
 #include "CommandWords.h"
+#include "HeldFile.h"
 #include "ProgramStart.h"
 #include "Terminal.h"
 
@@ -86,9 +87,9 @@ QString runCommand(const VelUIDesktopEntry &entry, const QString &path)
     return startProgram(words, entry.getPath());
 }
 
-QString runApplication(const VelUIDesktopEntry &entry, const QString &path)
+QString runApplication(const VelUIDesktopEntry &entry, const HeldFile &file, const QString &path)
 {
-    if (isBusActivatable(path) && activateOnBus(path))
+    if (isBusActivatable(file.path()) && activateOnBus(path))
         return {};
     const QString exec = entry.getExec();
     if (exec.isEmpty())
@@ -96,27 +97,46 @@ QString runApplication(const VelUIDesktopEntry &entry, const QString &path)
     return isWindowManagerCommand(exec) ? sendToWindowManager(exec) : runCommand(entry, path);
 }
 
-} // namespace
-
-QString runEntry(const QString &path)
+QString openLink(const QString &url)
 {
-    const QFileInfo file(path);
-    if (!file.exists())
-        return QStringLiteral("no such file or folder");
-    const QString absolutePath = file.absoluteFilePath();
-    if (file.isDir() || !path.endsWith(QLatin1String(".desktop")))
-        return openWithDesktop(absolutePath);
+    if (url.isEmpty())
+        return QStringLiteral("there is no URL in it");
+    // The program that opens it would take it for an option.
+    if (url.startsWith(QLatin1Char('-')))
+        return QStringLiteral("its URL %1 begins with \"-\", as no URL does").arg(url);
+    return openWithDesktop(url);
+}
 
-    VelUIDesktopEntry entry(absolutePath);
+QString runEntryFile(const QString &path, Trust trust)
+{
+    const HeldFile file(path);
+    if (!file.isOpen())
+        return file.error();
+    const QString whyNot = trust == Trust::Given ? QString() : file.whyNotTrusted();
+    if (!whyNot.isEmpty())
+        return whyNot;
+    VelUIDesktopEntry entry(file.path());
     if (!entry.load())
         return QStringLiteral("is no desktop entry");
     const QString type = entry.getType();
     if (type == QLatin1String("Application"))
-        return runApplication(entry, absolutePath);
+        return runApplication(entry, file, path);
     if (type == QLatin1String("Link"))
-        return entry.getURL().isEmpty() ? QStringLiteral("there is no URL in it")
-                                        : openWithDesktop(entry.getURL());
+        return openLink(entry.getURL());
     if (type == QLatin1String("Directory"))
-        return openWithDesktop(file.absolutePath());
+        return openWithDesktop(QFileInfo(path).absolutePath());
     return QStringLiteral("is neither an application nor a link nor a folder");
+}
+
+} // namespace
+
+QString runEntry(const QString &path, Trust trust)
+{
+    const QFileInfo file(path);
+    if (!file.exists())
+        return QStringLiteral("no such file or folder");
+    // Absolute, it cannot be taken for an option either.
+    const QString absolutePath = file.absoluteFilePath();
+    const bool isEntry = !file.isDir() && path.endsWith(QLatin1String(".desktop"));
+    return isEntry ? runEntryFile(absolutePath, trust) : openWithDesktop(absolutePath);
 }

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-// vel-open --exec PATH: runs a desktop entry.
+// vel-open [--trust] --exec PATH: runs a desktop entry.
 //
 // A child in a session of its own does the work and tells the outcome through a pipe. The
 // parent waits for that, but for no longer than a caller may be kept waiting: what takes its
@@ -14,8 +14,11 @@
 
 #include <cerrno>
 #include <chrono>
+#include <clocale>
 #include <cstdio>
 #include <cstring>
+#include <cwchar>
+#include <cwctype>
 #include <optional>
 #include <string>
 
@@ -28,18 +31,57 @@
 namespace {
 
 constexpr char Usage[] = "usage: vel-open --exec PATH\n"
-                         "Runs a desktop entry, or opens a file or folder.\n";
+                         "       vel-open --trust --exec PATH\n"
+                         "Runs a desktop entry, or opens a file or folder.\n"
+                         "\n"
+                         "An entry that belongs to another user than you and root and is not executable\n"
+                         "is run with --trust only, unless it lies in $XDG_DATA_HOME or $XDG_DATA_DIRS.\n";
 constexpr std::chrono::milliseconds LongestWait(1600);
 constexpr char Success = '+';
 
+struct Options
+{
+    const char *path = nullptr; ///< null when the command line is wrong
+    Trust trust = Trust::NotGiven;
+};
+
+Options optionsOf(int argc, char **argv)
+{
+    Options options;
+    int next = 1;
+    if (next < argc && std::strcmp(argv[next], "--trust") == 0) {
+        options.trust = Trust::Given;
+        ++next;
+    }
+    if (argc == next + 2 && std::strcmp(argv[next], "--exec") == 0 && *argv[next + 1])
+        options.path = argv[next + 1];
+    return options;
+}
+
+// A terminal obeys control characters; what comes from an entry or a path may hold any. Which they
+// are depends on the locale, and so does what is a character at all.
+std::string printable(const std::string &text)
+{
+    std::string result;
+    std::mbstate_t state = {};
+    for (std::size_t i = 0; i < text.size();) {
+        wchar_t character = 0;
+        const std::size_t length = std::mbrtowc(&character, text.data() + i, text.size() - i, &state);
+        const bool isCharacter = length != 0 && length <= text.size() - i;
+        if (isCharacter && !std::iswcntrl(std::wint_t(character)))
+            result.append(text, i, length);
+        else
+            result += '?';
+        if (!isCharacter)
+            state = {};
+        i += isCharacter ? length : 1;
+    }
+    return result;
+}
+
 int fail(const std::string &path, const std::string &reason)
 {
-    std::string line = "vel-open: " + path + ": " + reason;
-    for (char &c : line) {
-        if (c == '\n' || c == '\r')
-            c = '?';
-    }
-    std::fprintf(stderr, "%s\n", line.c_str());
+    std::fprintf(stderr, "vel-open: %s\n", printable(path + ": " + reason).c_str());
     return 1;
 }
 
@@ -64,11 +106,11 @@ void leaveTheCaller()
 }
 
 // Does the work and writes the outcome; does not return. Programs that it runs live on.
-[[noreturn]] void work(int outcome, int argc, char **argv, const char *path)
+[[noreturn]] void work(int outcome, int argc, char **argv, const Options &options)
 {
     leaveTheCaller();
     const QCoreApplication application(argc, argv);
-    const QString reason = runEntry(QFile::decodeName(path));
+    const QString reason = runEntry(QFile::decodeName(options.path), options.trust);
     const std::string text = reason.isEmpty() ? std::string(1, Success) : reason.toLocal8Bit().toStdString();
     const ssize_t written = write(outcome, text.data(), text.size());
     _exit(written < 0 ? 1 : 0);
@@ -96,8 +138,9 @@ std::optional<std::string> waitForOutcome(int outcome)
     }
 }
 
-int run(int argc, char **argv, const char *path)
+int run(int argc, char **argv, const Options &options)
 {
+    const char *const path = options.path;
     closeFilesOnExec();
     int ends[2];
     if (pipe2(ends, O_CLOEXEC) != 0)
@@ -106,7 +149,7 @@ int run(int argc, char **argv, const char *path)
     if (child < 0)
         return fail(path, std::strerror(errno));
     if (child == 0)
-        work(ends[1], argc, argv, path);
+        work(ends[1], argc, argv, options);
     close(ends[1]);
     const std::optional<std::string> outcome = waitForOutcome(ends[0]);
     if (!outcome || *outcome == std::string(1, Success))
@@ -118,6 +161,7 @@ int run(int argc, char **argv, const char *path)
 
 int main(int argc, char **argv)
 {
+    std::setlocale(LC_CTYPE, "");
     if (argc == 2 && std::strcmp(argv[1], "--help") == 0) {
         std::fputs(Usage, stdout);
         return 0;
@@ -126,9 +170,10 @@ int main(int argc, char **argv)
         std::puts("vel-open " VEL_VERSION);
         return 0;
     }
-    if (argc != 3 || std::strcmp(argv[1], "--exec") != 0 || !*argv[2]) {
-        std::fputs("vel-open: no entry given; usage: vel-open --exec PATH\n", stderr);
+    const Options options = optionsOf(argc, argv);
+    if (!options.path) {
+        std::fputs("vel-open: no entry given; usage: vel-open [--trust] --exec PATH\n", stderr);
         return 2;
     }
-    return run(argc, argv, argv[2]);
+    return run(argc, argv, options);
 }
