@@ -3,6 +3,8 @@
 
 #include "IconLookup.h"
 
+#include "PictureFile.h"
+
 #include <QDateTime>
 #include <QDir>
 #include <QFileInfo>
@@ -22,7 +24,7 @@ QString withoutImageSuffix(const QString &name)
 QIcon iconOfFile(const QString &path)
 {
     // Opening a pipe would wait for whoever writes into it.
-    if (!QFileInfo(path).isFile())
+    if (!QFileInfo(path).isFile() || !PictureFile::isSafe(path))
         return QIcon();
     QIcon icon(path);
     // What only has the suffix of an image gives an icon that is not null; a drawing has no sizes
@@ -38,6 +40,9 @@ QIcon IconLookup::find(const QString &name)
 {
     if (QDir::isAbsolutePath(name))
         return iconOfFile(name);
+    // From the folders of a theme such a name would lead to any other.
+    if (name.contains(QLatin1Char('/')))
+        return QIcon();
     const QIcon icon = QIcon::fromTheme(withoutImageSuffix(name));
     return icon.isNull() || icon.availableSizes().isEmpty() ? QIcon() : icon;
 }

@@ -1,0 +1,85 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "PictureFile.h"
+
+#include "DrawingContents.h"
+#include "Gzip.h"
+#include "PictureContents.h"
+#include "PictureLimits.h"
+
+#include <QFile>
+#include <QFileInfo>
+#include <QGuiApplication>
+#include <QImageReader>
+
+#include <optional>
+
+namespace {
+
+std::optional<QByteArray> contents(const QString &path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly))
+        return QByteArray(); // whoever reads it next tells
+    const QByteArray bytes = file.read(PictureLimits::Bytes + 1);
+    if (bytes.size() > PictureLimits::Bytes)
+        return std::nullopt;
+    return Gzip::isCompressed(bytes) ? Gzip::decompressed(bytes, PictureLimits::Bytes) : bytes;
+}
+
+// By its name, by its contents, or, as far as the reader of pictures knows nothing, perhaps.
+bool isDrawing(const QString &path, const QByteArray &format)
+{
+    const QString suffix = QFileInfo(path).suffix().toLower();
+    return suffix == QLatin1String("svg") || suffix == QLatin1String("svgz") || suffix == QLatin1String("gz")
+        || format.startsWith("svg") || format.isEmpty();
+}
+
+// A drawing is read whole, with all pictures in it, before its size is known.
+bool isSafeDrawing(const QString &path, QImageReader *reader)
+{
+    const std::optional<QByteArray> bytes = contents(path);
+    return bytes && DrawingContents::isSafe(*bytes)
+        && (reader->format().isEmpty() || PictureLimits::fits(reader->size()));
+}
+
+bool isSafeFile(const QString &path)
+{
+    QImageReader reader(path);
+    const QByteArray format = reader.format();
+    if (isDrawing(path, format))
+        return isSafeDrawing(path, &reader);
+    PictureLimits::Sum sum;
+    if (!PictureContents::isAmbiguous(format))
+        return PictureContents::fits(&reader, &sum);
+    const std::optional<QByteArray> bytes = contents(path);
+    return bytes && PictureContents::fits(*bytes, format, &sum);
+}
+
+// As Qt names the variant of a file for \a ratio.
+QString variant(const QString &path, int ratio)
+{
+    int place = path.lastIndexOf(QLatin1Char('.'));
+    if (place < 0)
+        place = path.size();
+    else if (path.leftRef(place).endsWith(QLatin1String(".9")))
+        place -= 2;
+    return QString(path).insert(place, QStringLiteral("@%1x").arg(ratio));
+}
+
+} // namespace
+
+bool PictureFile::isSafe(const QString &path)
+{
+    if (!isSafeFile(path))
+        return false;
+    if (qGuiApp->devicePixelRatio() <= 1)
+        return true;
+    for (int ratio = 2; ratio <= 9; ++ratio) {
+        const QFileInfo file(variant(path, ratio));
+        if (file.exists() && (!file.isFile() || !isSafeFile(file.filePath())))
+            return false;
+    }
+    return true;
+}

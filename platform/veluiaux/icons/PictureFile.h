@@ -1,0 +1,19 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+/// Judges picture files without decoding them.
+namespace PictureFile {
+
+/**
+ * Whether an icon may be made of the file \a path and of its variants for other pixel ratios.
+ *
+ * No picture in it may be larger than PictureLimits says, and a drawing may read no other file. What
+ * is no picture at all is left to whoever reads it.
+ */
+bool isSafe(const QString &path);
+
+} // namespace PictureFile
