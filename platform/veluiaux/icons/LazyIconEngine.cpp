@@ -78,6 +78,8 @@ QPixmap LazyIconEngine::scaledPixmap(const QSize &pixels, qreal ratio, IconDrawi
     if (memory.findPixmap(key, &pixmap))
         return pixmap;
     pixmap = IconDrawing::pixmap(base(), pixels, fit, mode, state);
+    if (pixmap.isNull()) // a file of the theme may be damaged
+        pixmap = IconDrawing::pixmap(m_plain, pixels, fit, mode, state);
     if (pixmap.isNull())
         return pixmap;
     if (!m_emblems.isEmpty())
