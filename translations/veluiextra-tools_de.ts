@@ -685,6 +685,10 @@ und eine dritte
         <source>cannot read the directory %1</source>
         <translation>der Ordner %1 kann nicht gelesen werden</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>Das Menü hat mehr als %1 Einträge oder %2 Ebenen; der Rest wurde ausgelassen. Suchen Sie nach Verknüpfungen, die immer wieder in dieselben Ordner führen.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

@@ -685,6 +685,10 @@ y una tercera
         <source>cannot read the directory %1</source>
         <translation>no se puede leer la carpeta %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>El menú tiene más de %1 elementos o %2 niveles; se ha omitido el resto. Busque enlaces que lleven una y otra vez a las mismas carpetas.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

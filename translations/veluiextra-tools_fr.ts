@@ -685,6 +685,10 @@ et une troisième
         <source>cannot read the directory %1</source>
         <translation>impossible de lire le dossier %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>Le menu a plus de %1 éléments ou %2 niveaux ; le reste a été omis. Cherchez des liens qui mènent encore et encore aux mêmes dossiers.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

@@ -685,6 +685,10 @@ e una terza
         <source>cannot read the directory %1</source>
         <translation>impossibile leggere la cartella %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>Il menu ha più di %1 elementi o %2 livelli; il resto è stato omesso. Cercare collegamenti che portano più volte alle stesse cartelle.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

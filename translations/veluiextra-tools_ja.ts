@@ -685,6 +685,10 @@ and a third one
         <source>cannot read the directory %1</source>
         <translation>フォルダ %1 を読み取れません</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>メニューの項目が %1 個、または階層が %2 段を超えているため、残りは省略されました。同じフォルダに何度もつながるリンクがないか確認してください。</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

@@ -685,6 +685,10 @@ i jeszcze trzeci
         <source>cannot read the directory %1</source>
         <translation>nie można odczytać katalogu %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>Menu ma więcej niż %1 elementów lub %2 poziomów; reszta została pominięta. Poszukaj dowiązań, które wciąż prowadzą do tych samych katalogów.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

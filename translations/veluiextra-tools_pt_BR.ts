@@ -685,6 +685,10 @@ e uma terceira
         <source>cannot read the directory %1</source>
         <translation>não foi possível ler a pasta %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>O menu tem mais de %1 itens ou %2 níveis; o restante foi omitido. Procure links que levem repetidamente às mesmas pastas.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

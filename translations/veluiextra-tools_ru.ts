@@ -685,6 +685,10 @@ and a third one
         <source>cannot read the directory %1</source>
         <translation>не удалось прочитать папку %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>В меню больше %1 элементов или %2 уровней; остальное пропущено. Поищите ссылки, которые снова и снова ведут в одни и те же папки.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

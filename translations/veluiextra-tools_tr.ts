@@ -685,6 +685,10 @@ ve bir üçüncüsü
         <source>cannot read the directory %1</source>
         <translation>%1 klasörü okunamıyor</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>Menüde %1 ögeden veya %2 düzeyden fazlası var; geri kalanı atlandı. Aynı klasörlere tekrar tekrar götüren bağlantıları arayın.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

@@ -685,6 +685,10 @@ and a third one
         <source>cannot read the directory %1</source>
         <translation>не вдалося прочитати теку %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>У меню понад %1 елементів або %2 рівнів; решту пропущено. Пошукайте посилання, які знову і знову ведуть до тих самих тек.</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

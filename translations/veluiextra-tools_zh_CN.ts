@@ -685,6 +685,10 @@ and a third one
         <source>cannot read the directory %1</source>
         <translation>无法读取文件夹 %1</translation>
     </message>
+    <message>
+        <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
+        <translation>该菜单超过 %1 个项目或 %2 层，其余部分已省略。请检查是否有反复指向相同文件夹的链接。</translation>
+    </message>
 </context>
 <context>
     <name>vel-wmbridge</name>

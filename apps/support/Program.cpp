@@ -3,6 +3,8 @@
 
 #include "Program.h"
 
+#include "TerminalText.h"
+
 #include <QCommandLineParser>
 #include <QCoreApplication>
 #include <QLibraryInfo>
@@ -71,7 +73,7 @@ QString Program::parse(QCommandLineParser &parser)
 void Program::printError(const QString &text)
 {
     std::fprintf(stderr, "%s: %s\n", QCoreApplication::applicationName().toLocal8Bit().constData(),
-                 text.toLocal8Bit().constData());
+                 TerminalText::plain(text).toLocal8Bit().constData());
 }
 
 int Program::fail(const QString &text, int status)

@@ -43,7 +43,8 @@ bool mayWantNoWindow(int argc, char **argv);
  */
 QString parse(QCommandLineParser &parser);
 
-/// Prints \a text on standard error as one line, after the program's name.
+/// Prints \a text on standard error as one line, after the program's name; "?" stands for every
+/// control character in it.
 void printError(const QString &text);
 
 /// Prints \a text like printError() and returns the exit status \a status.

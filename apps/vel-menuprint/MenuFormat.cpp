@@ -5,6 +5,8 @@
 
 #include "MenuTree.h"
 
+#include <support/TerminalText.h>
+
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
@@ -34,6 +36,12 @@ QString writable(QString text)
 QString oneLine(QString name)
 {
     return name.replace(QLatin1Char('\n'), QLatin1Char(' ')).replace(QLatin1Char('\r'), QLatin1Char(' '));
+}
+
+// A terminal would obey control characters.
+QString plain(const QString &name)
+{
+    return TerminalText::plain(oneLine(name));
 }
 
 // In a label an underscore marks the letter to press; two of them are one to show.
@@ -92,7 +100,7 @@ QJsonObject object(const MenuItem &item)
 void writeText(QByteArray *out, const MenuItem &item, int depth)
 {
     out->append(QByteArray(depth * 4, ' '));
-    out->append(item.kind == MenuItem::Separator ? QByteArray("--") : oneLine(item.name).toUtf8());
+    out->append(item.kind == MenuItem::Separator ? QByteArray("--") : plain(item.name).toUtf8());
     out->append(item.kind == MenuItem::Folder ? "/\n" : "\n");
     for (const MenuItem &child : item.children)
         writeText(out, child, depth + 1);

@@ -16,7 +16,8 @@ QByteArray openbox(const MenuItem &menu);
 /// A JSON object for each item: kind, name, path, icon, exec, children.
 QByteArray json(const MenuItem &menu);
 
-/// A name on each line, a folder's children indented by four blanks below it.
+/// A name on each line, a folder's children indented by four blanks below it. In a name a blank
+/// stands for the end of a line and "?" for every other control character.
 QByteArray text(const MenuItem &menu);
 
 } // namespace MenuFormat

@@ -11,6 +11,7 @@
 
 #include <QDateTime>
 #include <QDir>
+#include <QDirIterator>
 #include <QFileInfo>
 #include <QSet>
 
@@ -68,15 +69,23 @@ MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
     return item;
 }
 
-MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above);
+/// The way to what is being read, and how much was.
+struct Walk
+{
+    QSet<QString> above; ///< the canonical paths of the folders on the way
+    int items = 0;
+    bool isWhole = true;
+};
+
+MenuItem readFolder(const QFileInfo &folder, Walk *walk);
 
 // Nothing for what the menu does not show, and for a folder that is being read already.
-std::optional<MenuItem> itemOf(const QFileInfo &info, QSet<QString> *above)
+std::optional<MenuItem> itemOf(const QFileInfo &info, Walk *walk)
 {
     if (info.isDir()) {
-        if (above->contains(info.canonicalFilePath()))
+        if (walk->above.contains(info.canonicalFilePath()))
             return {};
-        return readFolder(info, above);
+        return readFolder(info, walk);
     }
     if (!EntryPath::isEntry(info.fileName()))
         return plainFile(info);
@@ -86,18 +95,26 @@ std::optional<MenuItem> itemOf(const QFileInfo &info, QSet<QString> *above)
     return entry(info, record);
 }
 
-QVector<Child> childrenOf(const QString &path, const SortOrder::Index &order, QSet<QString> *above)
+QVector<Child> childrenOf(const QString &path, const SortOrder::Index &order, Walk *walk)
 {
     QVector<Child> children;
-    for (const QFileInfo &info : QDir(path).entryInfoList(QDir::AllEntries | QDir::NoDotAndDotDot)) {
-        const std::optional<MenuItem> item = itemOf(info, above);
+    QDirIterator files(path, QDir::AllEntries | QDir::NoDotAndDotDot);
+    while (files.hasNext()) {
+        files.next();
+        if (walk->items >= MenuTree::MostItems || walk->above.size() >= MenuTree::MostLevels) {
+            walk->isWhole = false;
+            break;
+        }
+        ++walk->items;
+        const QFileInfo info = files.fileInfo();
+        const std::optional<MenuItem> item = itemOf(info, walk);
         if (item)
             children.append({*item, info, order.mention(info.fileName())});
     }
     return children;
 }
 
-MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above)
+MenuItem readFolder(const QFileInfo &folder, Walk *walk)
 {
     MenuItem item;
     item.kind = MenuItem::Folder;
@@ -113,9 +130,9 @@ MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above)
     }
 
     const QString canonical = folder.canonicalFilePath();
-    above->insert(canonical);
-    QVector<Child> children = childrenOf(item.path, SortOrder::Index(sortOrder), above);
-    above->remove(canonical);
+    walk->above.insert(canonical);
+    QVector<Child> children = childrenOf(item.path, SortOrder::Index(sortOrder), walk);
+    walk->above.remove(canonical);
 
     ItemOrder::sort(ItemOrder::ruleOf(folder.fileName()), children);
     for (const Child &child : qAsConst(children))
@@ -125,8 +142,11 @@ MenuItem readFolder(const QFileInfo &folder, QSet<QString> *above)
 
 } // namespace
 
-MenuItem MenuTree::read(const QString &path)
+MenuItem MenuTree::read(const QString &path, bool *isWhole)
 {
-    QSet<QString> above;
-    return readFolder(QFileInfo(QDir::cleanPath(path)), &above);
+    Walk walk;
+    MenuItem menu = readFolder(QFileInfo(QDir::cleanPath(path)), &walk);
+    if (isWhole)
+        *isWhole = walk.isWhole;
+    return menu;
 }

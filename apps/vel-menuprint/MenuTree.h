@@ -27,12 +27,21 @@ struct MenuItem
 /// Reads a menu directory with everything below it, in the order in which the menu shows it.
 namespace MenuTree {
 
+/// As many levels of folders are read, the first one included. Links can make a menu of any size of
+/// a few folders.
+constexpr int MostLevels = 32;
+/// As many items are read.
+constexpr int MostItems = 10000;
+
 /**
  * Returns the folder \a path with its children.
  *
  * Dot files, entries that are not to be displayed, and links that lead back to a folder on the way
  * are left out. A folder that cannot be read has no children.
+ *
+ * @param isWhole is set to whether all of the menu was read, if not null; false when it has more
+ *        than MostLevels or MostItems, and the rest is missing
  */
-MenuItem read(const QString &path);
+MenuItem read(const QString &path, bool *isWhole = nullptr);
 
 } // namespace MenuTree

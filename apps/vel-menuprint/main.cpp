@@ -87,7 +87,15 @@ int run(const Options &options)
     const QString why = obstacle(directory);
     if (!why.isEmpty())
         return Program::fail(why, CannotStart);
-    const QByteArray out = printed(options.format, MenuTree::read(directory.absoluteFilePath()));
+    bool isWhole = true;
+    const QByteArray out = printed(options.format, MenuTree::read(directory.absoluteFilePath(), &isWhole));
+    if (!isWhole)
+        Program::printError(
+            QCoreApplication::translate("vel-menuprint",
+                                        "The menu has more than %1 items or %2 levels, and the rest of it is "
+                                        "left out. Look for links that lead into the same folders again.")
+                .arg(MenuTree::MostItems)
+                .arg(MenuTree::MostLevels));
     const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
         && std::fflush(stdout) == 0;
     return written ? Done : Program::fail(qt_error_string(errno), CannotWrite);

@@ -43,6 +43,14 @@ QStringList names(const QVector<MenuItem> &items)
     return result;
 }
 
+int itemCount(const MenuItem &item)
+{
+    int count = 1;
+    for (const MenuItem &child : item.children)
+        count += itemCount(child);
+    return count;
+}
+
 QByteArray entry(const QByteArray &name, const QByteArray &more = QByteArray())
 {
     return "[Desktop Entry]\nType=Application\nName=" + name + "\nExec=true\n" + more;
@@ -62,15 +70,33 @@ private Q_SLOTS:
     void putsTheNewestFirstInRecents();
     void leavesOutWhatIsNotShown();
     void doesNotFollowALinkIntoItself();
+    void endsWhereLinksMakeAMenuWithoutEnd();
+    void endsWhereFoldersLieTooDeep();
+    void tellsThatAMenuIsNotWhole();
     void namesFoldersAsTheirDirectoryFileSays();
     void printsTheStartMenuWithoutADirectory();
     void printsText();
+    void printsNoControlCharacterAsText();
+    void tellsNoControlCharacterOfAPath();
     void printsJson();
     void printsAnOpenboxPipeMenu();
     void printsNamesThatXmlCannotHold();
     void tellsThatItCannotWrite();
     void quotesPathsForTheShell_data();
     void quotesPathsForTheShell();
+
+private:
+    /// Makes folders "level1" and so on, each with two links to the next one.
+    void doubleLevels(int count)
+    {
+        for (int i = 1; i <= count; ++i) {
+            const QString level = path(QStringLiteral("level%1").arg(i));
+            QVERIFY(QDir().mkpath(level));
+            for (const QString &link : {QStringLiteral("/a"), QStringLiteral("/b")})
+                QVERIFY(QFile::link(path(QStringLiteral("level%1").arg(i + 1)), level + link));
+        }
+        QVERIFY(QDir().mkpath(path(QStringLiteral("level%1").arg(count + 1))));
+    }
 };
 
 void tst_vel_menuprint::refusesWhatItCannotPrint_data()
@@ -163,6 +189,45 @@ void tst_vel_menuprint::doesNotFollowALinkIntoItself()
     }
 }
 
+void tst_vel_menuprint::endsWhereLinksMakeAMenuWithoutEnd()
+{
+    doubleLevels(16);
+    bool isWhole = true;
+    const MenuItem menu = MenuTree::read(path(QStringLiteral("level1")), &isWhole);
+    QCOMPARE(isWhole, false);
+    QCOMPARE(itemCount(menu), MenuTree::MostItems + 1); // and the menu itself
+
+    QVERIFY(QDir().mkpath(path(QStringLiteral("whole/folder"))));
+    MenuTree::read(path(QStringLiteral("whole")), &isWhole);
+    QCOMPARE(isWhole, true);
+}
+
+void tst_vel_menuprint::endsWhereFoldersLieTooDeep()
+{
+    QVERIFY(QDir().mkpath(
+        path(QStringLiteral("menu") + QStringLiteral("/x").repeated(MenuTree::MostLevels - 1))));
+    bool isWhole = false;
+    MenuTree::read(path(QStringLiteral("menu")), &isWhole);
+    QCOMPARE(isWhole, true);
+
+    QVERIFY(QDir().mkpath(
+        path(QStringLiteral("menu") + QStringLiteral("/x").repeated(MenuTree::MostLevels + 8))));
+    const MenuItem menu = MenuTree::read(path(QStringLiteral("menu")), &isWhole);
+    QCOMPARE(isWhole, false);
+    QCOMPARE(itemCount(menu), MenuTree::MostLevels);
+}
+
+void tst_vel_menuprint::tellsThatAMenuIsNotWhole()
+{
+    doubleLevels(16);
+    const Result result = print({path(QStringLiteral("level1"))});
+    QCOMPARE(result.status, 0);
+    QCOMPARE(result.out.count('\n'), MenuTree::MostItems + 1);
+    QCOMPARE(result.err.count('\n'), 1);
+    QVERIFY2(result.err.startsWith("vel-menuprint: The menu has more than 10000 items or 32 levels"),
+             result.err.constData());
+}
+
 void tst_vel_menuprint::namesFoldersAsTheirDirectoryFileSays()
 {
     write(QStringLiteral("menu/office/.directory"),
@@ -198,6 +263,28 @@ void tst_vel_menuprint::printsText()
         print({QStringLiteral("--format"), QStringLiteral("text"), path(QStringLiteral("menu"))});
     QCOMPARE(result.status, 0);
     QCOMPARE(result.out, QByteArray("menu/\n    folder/\n        A\n    --\n"));
+}
+
+void tst_vel_menuprint::printsNoControlCharacterAsText()
+{
+    write(QStringLiteral("menu/plain \x1b[2Jtext"), "text");
+    write(QStringLiteral("menu/z.desktop"),
+          entry("a\x1b]0;b\x07"
+                "c\x7f"
+                "d\xC2\x9B"
+                "e\\tf\\rg\xC3\xB6"));
+
+    const Result result = print({path(QStringLiteral("menu"))});
+    QCOMPARE(result.status, 0);
+    QCOMPARE(result.out, QByteArray("menu/\n    a?]0;b?c?d?e?f g\xC3\xB6\n    plain ?[2Jtext\n"));
+    QCOMPARE(result.err, QByteArray());
+}
+
+void tst_vel_menuprint::tellsNoControlCharacterOfAPath()
+{
+    const Result result = print({QStringLiteral("/nowhere\x1b[2J\n")});
+    QCOMPARE(result.status, 2);
+    QCOMPARE(result.err, QByteArray("vel-menuprint: no such directory: /nowhere?[2J?\n"));
 }
 
 void tst_vel_menuprint::printsJson()
@@ -264,7 +351,7 @@ void tst_vel_menuprint::printsNamesThatXmlCannotHold()
     }
     QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
     QVERIFY(labels.contains(QString::fromUtf8("A\xEF\xBF\xBD B")));
-    QVERIFY(MenuFormat::text(menu).endsWith("        A\x01 B\n"));
+    QVERIFY(MenuFormat::text(menu).endsWith("        A? B\n"));
 }
 
 void tst_vel_menuprint::tellsThatItCannotWrite()
