@@ -3,6 +3,8 @@
 
 #include "FolderCopy.h"
 
+#include "FolderLimits.h"
+
 #include <algorithm>
 #include <array>
 #include <cerrno>
@@ -105,7 +107,8 @@ private:
         std::error_code error;
         fs::directory_iterator it(from, error);
         for (; !error && it != fs::directory_iterator(); it.increment(error)) {
-            if (!copyOne(it->path(), to / it->path().filename()))
+            const bool isTaken = m_limits.take(m_open.size() - 1, "template of the start menu");
+            if (!isTaken || !copyOne(it->path(), to / it->path().filename()))
                 return false;
         }
         return !error;
@@ -128,6 +131,7 @@ private:
         return std::find(m_open.begin(), m_open.end(), fs::canonical(folder, error)) != m_open.end();
     }
 
+    FolderLimits m_limits;
     std::vector<fs::path> m_open; // the target, and the folders that are being copied
 };
 

@@ -16,6 +16,7 @@ bool copyFile(const std::filesystem::path &from, const std::filesystem::path &to
  *
  * @param from the folder to copy
  * @param to an existing folder; is left out where it lies in \a from
- * @return false when something could not be read or written
+ * @return false when something could not be read or written, or when there is more of it than
+ *         FolderLimits lets pass
  */
 bool copyFolderContents(const std::filesystem::path &from, const std::filesystem::path &to);

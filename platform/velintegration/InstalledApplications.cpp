@@ -3,6 +3,8 @@
 
 #include "InstalledApplications.h"
 
+#include "FolderLimits.h"
+
 #include <algorithm>
 #include <cstdlib>
 #include <filesystem>
@@ -66,8 +68,10 @@ public:
         if (error || std::find(m_open.begin(), m_open.end(), real) != m_open.end())
             return;
         m_open.push_back(real);
-        for (const fs::path &path : sortedContents(folder))
-            visit(path, idPrefix + path.filename().string());
+        for (const fs::path &path : sortedContents(folder)) {
+            if (m_limits.take(m_open.size(), "folder of installed applications"))
+                visit(path, idPrefix + path.filename().string());
+        }
         m_open.pop_back();
     }
 
@@ -101,6 +105,7 @@ private:
     std::set<std::string> *m_seenIds;
     std::vector<InstalledApplication> *m_found;
     std::vector<fs::path> m_open;
+    FolderLimits m_limits;
 };
 
 } // namespace

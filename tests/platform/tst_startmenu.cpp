@@ -7,6 +7,7 @@
 #include <veluiaux/VelUIDesktopEntry.h>
 
 #include <QDir>
+#include <QElapsedTimer>
 
 #include <unistd.h>
 
@@ -35,6 +36,7 @@ private Q_SLOTS:
     void hidesAnIdBehindWhatIsNoApplication();
     void findsApplicationsInSubfolders();
     void survivesLinksInACircle();
+    void survivesLinksThatMakeFoldersWithoutEnd();
     void usesTheDefaultDirectories_data();
     void usesTheDefaultDirectories();
     void namesThatClashGetTheirIds();
@@ -315,6 +317,25 @@ void tst_startmenu::survivesLinksInACircle()
     QVERIFY(create());
     QCOMPARE(names(inMenu(QStringLiteral("Game"))),
              QStringList({QStringLiteral(".directory"), QStringLiteral("app.desktop")}));
+}
+
+void tst_startmenu::survivesLinksThatMakeFoldersWithoutEnd()
+{
+    install(QStringLiteral("0.desktop"), "Utility;");
+    for (int i = 1; i <= 20; ++i) {
+        for (const QString &link : {QStringLiteral("/1a"), QStringLiteral("/1b")}) {
+            const QString level =
+                path(i == 1 ? QStringLiteral("home/applications") : QStringLiteral("level%1").arg(i));
+            QVERIFY(QDir().mkpath(level));
+            QVERIFY(QFile::link(path(QStringLiteral("level%1").arg(i + 1)), level + link));
+        }
+    }
+    write(QStringLiteral("level21/x.desktop"), "[Desktop Entry]\nType=Application\nName=x\nExec=true\n");
+    QElapsedTimer timer;
+    timer.start();
+    QVERIFY(create());
+    QVERIFY2(timer.elapsed() < 20000, qPrintable(QString::number(timer.elapsed())));
+    QVERIFY(QFileInfo::exists(inMenu(QStringLiteral("Utility/0.desktop"))));
 }
 
 void tst_startmenu::usesTheDefaultDirectories_data()

@@ -47,6 +47,7 @@ private Q_SLOTS:
     void aTemplateIsCopiedInstead();
     void aTemplateIsCopiedWithoutLinks();
     void aTemplateMayHoldTheMenu();
+    void aTemplateWithoutEndLeavesTheOldMenuWhole();
     void aMissingTemplateLeavesTheOldMenuWhole();
     void theSampleMenuShowsAllItsEntries();
 };
@@ -272,6 +273,22 @@ void tst_startmenu_folder::aTemplateIsCopiedWithoutLinks()
                                                 {QStringLiteral("folder/x.desktop"), "x"},
                                                 {QStringLiteral("sub"), "folder"}};
     QCOMPARE(tree(menu()), expected);
+}
+
+void tst_startmenu_folder::aTemplateWithoutEndLeavesTheOldMenuWhole()
+{
+    write(QStringLiteral("config/vel/startmenu/a.desktop"), "old");
+    const auto before = tree(path(QStringLiteral("config")));
+    for (int i = 1; i <= 16; ++i) {
+        const QString level = path(QStringLiteral("level%1").arg(i));
+        QVERIFY(QDir().mkpath(level));
+        for (const QString &link : {QStringLiteral("/a"), QStringLiteral("/b")})
+            QVERIFY(QFile::link(path(QStringLiteral("level%1").arg(i + 1)), level + link));
+    }
+    write(QStringLiteral("level17/x.desktop"), "x");
+    const QByteArray from = QFile::encodeName(path(QStringLiteral("level1")));
+    QVERIFY(!CreateStartMenu(QFile::encodeName(menu()).constData(), from.constData()));
+    QCOMPARE(tree(path(QStringLiteral("config"))), before);
 }
 
 void tst_startmenu_folder::aTemplateMayHoldTheMenu()
