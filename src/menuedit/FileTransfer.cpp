@@ -5,6 +5,7 @@
 
 #include "OnDisk.h"
 #include "TreeCopy.h"
+#include "TreeLimits.h"
 
 #include <QDir>
 #include <QFile>
@@ -51,7 +52,10 @@ std::error_code transferOne(const Pair &pair, Action action)
 {
     const TreeCopy::Path source = native(pair.source);
     const TreeCopy::Path target = native(pair.target);
-    return action == Action::Copy ? TreeCopy::copy(source, target) : TreeCopy::move(source, target);
+    if (action == Action::Move)
+        return TreeCopy::move(source, target);
+    const std::error_code error = TreeLimits::check(source);
+    return error ? error : TreeCopy::copy(source, target);
 }
 
 // Takes back what was done, the last first. What cannot be moved back stays whole where it is.

@@ -3,6 +3,8 @@
 
 #include "TreeCopy.h"
 
+#include "TreeLimits.h"
+
 #include <algorithm>
 #include <array>
 #include <cerrno>
@@ -316,10 +318,13 @@ std::error_code canBeRemoved(const Path &source)
     fs::recursive_directory_iterator it(source, fs::directory_options::none, error);
     if (!error && !isWritableFolder(source))
         return lastError();
+    int items = 0;
     while (!error && it != fs::recursive_directory_iterator()) {
         const bool isFolder = fs::is_directory(it->symlink_status(error));
         if (!error && isFolder && !isWritableFolder(it->path()))
             return lastError();
+        if (!error && TreeLimits::areMet(it.depth() + 1, ++items))
+            return std::make_error_code(std::errc::file_too_large);
         if (!error)
             it.increment(error);
     }

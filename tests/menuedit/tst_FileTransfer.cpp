@@ -6,6 +6,7 @@
 #include "TestCase.h"
 
 #include <menuedit/FileTransfer.h>
+#include <menuedit/TreeLimits.h>
 
 #include <QDateTime>
 #include <QDir>
@@ -52,6 +53,7 @@ private Q_SLOTS:
     void takesBackAFolderThatCannotBeCopiedWhole_data();
     void takesBackAFolderThatCannotBeCopiedWhole();
     void leavesTheSourceWhenTheDiskIsFull();
+    void copiesNoFolderThatIsTooDeep();
 
 private:
     QByteArray tree(const QString &folder) const;
@@ -460,6 +462,21 @@ void tst_FileTransfer::leavesTheSourceWhenTheDiskIsFull()
         QCOMPARE(tree(path(QStringLiteral("from"))), before);
         QCOMPARE(tree(path(QStringLiteral("small"))).count('\n'), 1);
     }
+}
+
+void tst_FileTransfer::copiesNoFolderThatIsTooDeep()
+{
+    QVERIFY(
+        QDir().mkpath(path(QStringLiteral("deep") + QStringLiteral("/x").repeated(TreeLimits::MostLevels))));
+    QVERIFY(QDir().mkpath(
+        path(QStringLiteral("flat") + QStringLiteral("/x").repeated(TreeLimits::MostLevels - 1))));
+    QVERIFY(QDir().mkpath(path(QStringLiteral("target"))));
+    const QString target = path(QStringLiteral("target"));
+    QCOMPARE(transfer({path(QStringLiteral("deep"))}, target, Action::Copy).failure, Failure::Failed);
+    QVERIFY(QDir(target).isEmpty());
+    QVERIFY(transfer({path(QStringLiteral("flat"))}, target, Action::Copy).succeeded());
+    // What only gets another name is not walked over.
+    QVERIFY(transfer({path(QStringLiteral("deep"))}, target, Action::Move).succeeded());
 }
 
 VEL_TEST_GUILESS_MAIN(tst_FileTransfer)
