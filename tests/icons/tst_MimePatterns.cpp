@@ -6,6 +6,7 @@
 #include <icons/MimeCacheReader.h>
 #include <icons/MimePatterns.h>
 
+#include <QElapsedTimer>
 #include <QSet>
 #include <QtEndian>
 
@@ -100,6 +101,8 @@ private Q_SLOTS:
     void findsTheEndThatDecides_data();
     void findsTheEndThatDecides();
     void takesTheLongestEnd();
+    void answersSoonForADearPattern_data();
+    void answersSoonForADearPattern();
     void joinsSeveralCaches();
 };
 
@@ -230,6 +233,32 @@ void tst_MimePatterns::takesTheLongestEnd()
     QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.tar.gz")), 7);
     QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.ar.gz")), 3);
     QCOMPARE(patterns.decidingSuffix(QStringLiteral("a.tar.GZ")), 7);
+}
+
+void tst_MimePatterns::answersSoonForADearPattern_data()
+{
+    QTest::addColumn<QByteArray>("pattern");
+    QTest::newRow("stars") << QByteArray("*a").repeated(60) + "*b";
+    QTest::newRow("stars and question marks") << QByteArray("*?").repeated(60) + "*b";
+    QTest::newRow("stars and sets") << QByteArray("*[a-z]").repeated(60) + "*b";
+    QTest::newRow("a regular expression") << QByteArray("(a*)*").repeated(20) + "$";
+}
+
+void tst_MimePatterns::answersSoonForADearPattern()
+{
+    QFETCH(QByteArray, pattern);
+    CacheWriter writer;
+    writer.setLists({}, {pattern});
+    writer.setEnd("potksed.");
+    MimePatterns patterns;
+    QVERIFY(patterns.addCache(writer.bytes()));
+    patterns.finish();
+    const QString name = QStringLiteral("a").repeated(240) + QStringLiteral("c.desktop");
+    QElapsedTimer timer;
+    timer.start();
+    for (int i = 0; i < 100; ++i)
+        QVERIFY(patterns.decidingSuffix(name) >= 0);
+    QVERIFY2(timer.elapsed() < 5000, qPrintable(QString::number(timer.elapsed())));
 }
 
 void tst_MimePatterns::joinsSeveralCaches()

@@ -6,6 +6,7 @@
 
 #include <menuedit/SortOrder.h>
 
+#include <QElapsedTimer>
 #include <QRandomGenerator>
 
 using SortOrder::AtEnd;
@@ -22,6 +23,8 @@ private Q_SLOTS:
     void tellsListsThatNeverContradictThemselves();
     void ordersAnyThreeNamesByAPlainList();
     void answersForALongListOfPatterns();
+    void answersSoonForADearPattern_data();
+    void answersSoonForADearPattern();
     void rewritesTheList_data();
     void rewritesTheList();
 };
@@ -162,6 +165,31 @@ void tst_SortOrder::answersForALongListOfPatterns()
 
     QCOMPARE(places.left, AtEnd);
     QCOMPARE(places.right, 7);
+}
+
+void tst_SortOrder::answersSoonForADearPattern_data()
+{
+    QTest::addColumn<QString>("pattern");
+    const QString many = QStringLiteral("*a").repeated(120);
+    QTest::newRow("stars") << many + QStringLiteral("*b");
+    QTest::newRow("stars in a row") << QStringLiteral("*").repeated(20000) + QLatin1Char('b');
+    QTest::newRow("stars and question marks") << QStringLiteral("*?").repeated(100) + QStringLiteral("*b");
+    QTest::newRow("stars and sets") << QStringLiteral("*[a-z]").repeated(100) + QStringLiteral("*b");
+    QTest::newRow("an open set") << many + QStringLiteral("*[a");
+    QTest::newRow("a name as a pattern") << QStringLiteral("(a*)*").repeated(40) + QLatin1Char('$');
+}
+
+// What backs up to every star would take longer than anybody lives.
+void tst_SortOrder::answersSoonForADearPattern()
+{
+    QFETCH(QString, pattern);
+    const SortOrder::Index index({pattern});
+    const QString name = QStringLiteral("a").repeated(250);
+    QElapsedTimer timer;
+    timer.start();
+    for (int i = 0; i < 100; ++i)
+        QCOMPARE(index.mention(name).pattern, AtEnd);
+    QVERIFY2(timer.elapsed() < 5000, qPrintable(QString::number(timer.elapsed())));
 }
 
 void tst_SortOrder::rewritesTheList_data()

@@ -6,6 +6,7 @@
 #include "VelMenuView.h"
 #include <menuedit/TreeLoader.h>
 
+#include <QElapsedTimer>
 #include <QFileSystemModel>
 #include <QInputDialog>
 #include <QLineEdit>
@@ -21,6 +22,7 @@ private Q_SLOTS:
     void offersTheLastTextAgain();
     void findsAnywhereInShownNamesWithoutRegardToCase_data();
     void findsAnywhereInShownNamesWithoutRegardToCase();
+    void findsSoonWhateverTheTextMeans();
     void findsInFoldersThatWereNeverOpened();
     void findsBeforeTheFirstFolderWasRead();
     void findsInTheOrderShown();
@@ -115,6 +117,28 @@ void tst_VelMenuViewFind::findsAnywhereInShownNamesWithoutRegardToCase()
     view.slotFind();
     QVERIFY(modal.finished());
     QCOMPARE(QFileInfo(view.selectedPath()).fileName(), file);
+}
+
+// A text is no pattern, and no name is dear to search through.
+void tst_VelMenuViewFind::findsSoonWhateverTheTextMeans()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("a").repeated(100000));
+    VelMenuView view(menu(), -1, true);
+    for (const QString &text : {QStringLiteral("(a*)*b"), QStringLiteral("*a").repeated(100),
+                                QStringLiteral("a").repeated(5000) + QLatin1Char('b')}) {
+        ModalDriver modal;
+        modal.handle([&text](QWidget *window) {
+            window->findChild<QLineEdit *>()->setText(text);
+            qobject_cast<QDialog *>(window)->accept();
+        });
+        modal.handle([](QWidget *window) { window->close(); });
+        QElapsedTimer timer;
+        timer.start();
+        view.slotFind();
+        QVERIFY(modal.finished());
+        QVERIFY2(timer.elapsed() < 10000, qPrintable(QString::number(timer.elapsed())));
+        QVERIFY(view.selectedPath().isEmpty());
+    }
 }
 
 void tst_VelMenuViewFind::findsInFoldersThatWereNeverOpened()
