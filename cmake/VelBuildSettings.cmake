@@ -5,6 +5,7 @@
 
 option(VEL_BUILD_TESTS "Build the tests" ON)
 option(VEL_BUILD_BENCHMARKS "Build the benchmarks" OFF)
+option(VEL_BUILD_FUZZERS "Build the fuzz targets, with clang; the preset \"fuzz\" has the settings for that" OFF)
 option(VEL_WARNINGS_AS_ERRORS "Stop at a compiler warning" OFF)
 set(VEL_PLATFORM "bundled" CACHE STRING
     "Which platform libraries to use: \"bundled\" builds those under platform/, \"system\" takes installed ones")
@@ -20,6 +21,10 @@ endif()
 find_program(VEL_CCACHE ccache)
 if(VEL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
     set(CMAKE_CXX_COMPILER_LAUNCHER "${VEL_CCACHE}")
+endif()
+
+if(VEL_BUILD_FUZZERS AND NOT (CMAKE_CXX_COMPILER_ID STREQUAL "Clang" AND VEL_PLATFORM STREQUAL "bundled"))
+    message(FATAL_ERROR "VEL_BUILD_FUZZERS needs clang and the bundled platform")
 endif()
 
 set(CMAKE_CXX_STANDARD 17)
