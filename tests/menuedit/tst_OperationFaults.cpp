@@ -150,6 +150,7 @@ void tst_OperationFaults::losesNothingWhenItIsKilled()
             QProcess::execute(QStringLiteral(VEL_FAULT_CHILD), {name, here, other, QStringLiteral("next")}),
             0);
         QCOMPARE(scene->fault(), QString());
+        QCOMPARE(scene->strays(), QStringList());
     }
     qInfo("seed %u: %d kills after %d operations, %d left something beside, nothing lost", seed, kills, done,
           cut);
