@@ -18,6 +18,7 @@ constexpr int LongestSuffix = 256;
 MimeCacheReader::MimeCacheReader(const QByteArray &cache)
     : m_cache(cache)
     , m_nodesLeft(cache.size() / int(EntrySize))
+    , m_textLeft(cache.size())
 {
 }
 
@@ -47,7 +48,9 @@ quint32 MimeCacheReader::number(quint32 offset)
 QString MimeCacheReader::text(quint32 offset)
 {
     const int end = offset < quint32(m_cache.size()) ? m_cache.indexOf('\0', int(offset)) : -1;
-    if (end < 0) {
+    if (end >= 0)
+        m_textLeft -= end - int(offset);
+    if (end < 0 || m_textLeft < 0) {
         m_valid = false;
         return QString();
     }

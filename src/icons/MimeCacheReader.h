@@ -30,5 +30,6 @@ private:
 
     const QByteArray m_cache;
     int m_nodesLeft; // no sane file has more; ends a tree that bites its own tail
+    int m_textLeft; // the same for entries that all name one long text
     bool m_valid = true;
 };

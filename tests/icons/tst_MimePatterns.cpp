@@ -10,6 +10,8 @@
 #include <QSet>
 #include <QtEndian>
 
+#include <algorithm>
+
 namespace {
 
 /// Writes a cache as update-mime-database does, but only its patterns.
@@ -97,6 +99,7 @@ private Q_SLOTS:
     void survivesACacheThatIsCutOff();
     void survivesBrokenNumbers();
     void survivesATreeThatBitesItsTail();
+    void survivesEntriesThatNameOneLongText();
     void readsTheSamePatternsAsTheTextFile();
     void findsTheEndThatDecides_data();
     void findsTheEndThatDecides();
@@ -163,6 +166,27 @@ void tst_MimePatterns::survivesATreeThatBitesItsTail()
     const int node = bytes.size() - 24;
     qToBigEndian(quint32(node), bytes.data() + node + 8);
     QVERIFY(!MimePatterns().addCache(bytes));
+}
+
+// A megabyte would become many gigabytes.
+void tst_MimePatterns::survivesEntriesThatNameOneLongText()
+{
+    constexpr quint32 count = 40000;
+    CacheWriter writer;
+    writer.setEnd("x");
+    writer.setLists({}, {});
+    const quint32 list = writer.append(4 + 12 * int(count));
+    const quint32 text = writer.append(500000);
+    writer.put(12, list);
+    writer.put(list, count);
+    for (quint32 i = 0; i < count; ++i)
+        writer.put(list + 4 + 12 * i, text);
+    QByteArray bytes = writer.bytes();
+    std::fill(bytes.begin() + int(text), bytes.end() - 1, 'a');
+
+    int visited = 0;
+    QVERIFY(!MimeCacheReader(bytes).visitPatterns([&visited](const QString &) { ++visited; }));
+    QVERIFY2(visited < 5, qPrintable(QString::number(visited)));
 }
 
 void tst_MimePatterns::readsTheSamePatternsAsTheTextFile()
