@@ -159,6 +159,36 @@
     </message>
 </context>
 <context>
+    <name>ShortcutScheme</name>
+    <message>
+        <source>The shortcuts could not be saved to %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>Die Kurzbefehle konnten nicht in %1 gespeichert werden: %2</translation>
+    </message>
+    <message>
+        <source>The shortcuts could not be read from %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>Die Kurzbefehle konnten nicht aus %1 gelesen werden: %2</translation>
+    </message>
+    <message>
+        <source>%1 is not a regular file.</source>
+        <translation>%1 ist keine normale Datei.</translation>
+    </message>
+    <message>
+        <source>%1 is too large for a file of shortcuts.</source>
+        <translation>%1 ist zu groß für eine Datei mit Kurzbefehlen.</translation>
+    </message>
+    <message>
+        <source>%1 holds no shortcuts.</source>
+        <translation>%1 enthält keine Kurzbefehle.</translation>
+    </message>
+    <message>
+        <source>Unreadable shortcuts in %1 were skipped: %2</source>
+        <comment>%2: their number</comment>
+        <translation>Unlesbare Kurzbefehle in %1 wurden übersprungen: %2</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutsModel</name>
     <message>
         <source>Action</source>

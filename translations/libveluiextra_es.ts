@@ -159,6 +159,36 @@
     </message>
 </context>
 <context>
+    <name>ShortcutScheme</name>
+    <message>
+        <source>The shortcuts could not be saved to %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>No se pudieron guardar los accesos rápidos en %1: %2</translation>
+    </message>
+    <message>
+        <source>The shortcuts could not be read from %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>No se pudieron leer los accesos rápidos de %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is not a regular file.</source>
+        <translation>%1 no es un archivo normal.</translation>
+    </message>
+    <message>
+        <source>%1 is too large for a file of shortcuts.</source>
+        <translation>%1 es demasiado grande para ser un archivo de accesos rápidos.</translation>
+    </message>
+    <message>
+        <source>%1 holds no shortcuts.</source>
+        <translation>%1 no contiene accesos rápidos.</translation>
+    </message>
+    <message>
+        <source>Unreadable shortcuts in %1 were skipped: %2</source>
+        <comment>%2: their number</comment>
+        <translation>Se omitieron accesos rápidos ilegibles de %1: %2</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutsModel</name>
     <message>
         <source>Action</source>

@@ -159,6 +159,36 @@
     </message>
 </context>
 <context>
+    <name>ShortcutScheme</name>
+    <message>
+        <source>The shortcuts could not be saved to %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>Impossible d&apos;enregistrer les raccourcis dans %1 : %2</translation>
+    </message>
+    <message>
+        <source>The shortcuts could not be read from %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>Impossible de lire les raccourcis dans %1 : %2</translation>
+    </message>
+    <message>
+        <source>%1 is not a regular file.</source>
+        <translation>%1 n&apos;est pas un fichier ordinaire.</translation>
+    </message>
+    <message>
+        <source>%1 is too large for a file of shortcuts.</source>
+        <translation>%1 est trop volumineux pour un fichier de raccourcis.</translation>
+    </message>
+    <message>
+        <source>%1 holds no shortcuts.</source>
+        <translation>%1 ne contient aucun raccourci.</translation>
+    </message>
+    <message>
+        <source>Unreadable shortcuts in %1 were skipped: %2</source>
+        <comment>%2: their number</comment>
+        <translation>Des raccourcis illisibles dans %1 ont été ignorés : %2</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutsModel</name>
     <message>
         <source>Action</source>

@@ -159,6 +159,36 @@
     </message>
 </context>
 <context>
+    <name>ShortcutScheme</name>
+    <message>
+        <source>The shortcuts could not be saved to %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>Impossibile salvare le scorciatoie in %1: %2</translation>
+    </message>
+    <message>
+        <source>The shortcuts could not be read from %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>Impossibile leggere le scorciatoie da %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is not a regular file.</source>
+        <translation>%1 non è un file normale.</translation>
+    </message>
+    <message>
+        <source>%1 is too large for a file of shortcuts.</source>
+        <translation>%1 è troppo grande per un file di scorciatoie.</translation>
+    </message>
+    <message>
+        <source>%1 holds no shortcuts.</source>
+        <translation>%1 non contiene scorciatoie.</translation>
+    </message>
+    <message>
+        <source>Unreadable shortcuts in %1 were skipped: %2</source>
+        <comment>%2: their number</comment>
+        <translation>Le scorciatoie illeggibili in %1 sono state saltate: %2</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutsModel</name>
     <message>
         <source>Action</source>

@@ -159,6 +159,36 @@
     </message>
 </context>
 <context>
+    <name>ShortcutScheme</name>
+    <message>
+        <source>The shortcuts could not be saved to %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>ショートカットを %1 に保存できませんでした: %2</translation>
+    </message>
+    <message>
+        <source>The shortcuts could not be read from %1: %2</source>
+        <comment>%2: what the system says</comment>
+        <translation>ショートカットを %1 から読み込めませんでした: %2</translation>
+    </message>
+    <message>
+        <source>%1 is not a regular file.</source>
+        <translation>%1 は通常のファイルではありません。</translation>
+    </message>
+    <message>
+        <source>%1 is too large for a file of shortcuts.</source>
+        <translation>%1 はショートカットのファイルとしては大きすぎます。</translation>
+    </message>
+    <message>
+        <source>%1 holds no shortcuts.</source>
+        <translation>%1 にはショートカットがありません。</translation>
+    </message>
+    <message>
+        <source>Unreadable shortcuts in %1 were skipped: %2</source>
+        <comment>%2: their number</comment>
+        <translation>%1 の読み取れないショートカットを飛ばしました: %2</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutsModel</name>
     <message>
         <source>Action</source>

@@ -66,7 +66,7 @@ void tst_ExportedSymbols::areThoseOfTheList()
 void tst_ExportedSymbols::belongToDocumentedClassesOnly()
 {
     static const QRegularExpression owner(
-        QStringLiteral("(?:^|\\s)(VelSettings|VelKeyServer|IShortcutObject|ShortcutsModel|"
+        QStringLiteral("(?:^|\\s)(VelSettings|VelKeyServer|IShortcutObject|ShortcutsModel|ShortcutScheme|"
                        "EditShortcutsDialog|VelMenuView|VelMenuDialog"
                        "|VelMimeTypeIconProvider|VelDesktopEntryPropsWidget|VelDesktopEntryEditDialog|"
                        "VelRadioGroupBox)(?:::|$)"));
