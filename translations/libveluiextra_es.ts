@@ -189,6 +189,14 @@
     </message>
 </context>
 <context>
+    <name>ShortcutSheet</name>
+    <message>
+        <source>Keyboard shortcuts</source>
+        <comment>title of a printed sheet</comment>
+        <translation>Accesos rápidos de teclado</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutsModel</name>
     <message>
         <source>Action</source>
