@@ -159,6 +159,45 @@
     </message>
 </context>
 <context>
+    <name>ShortcutClash</name>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;.</source>
+        <translation>Der Kurzbefehl „%1“ wird bereits für die Aktion „%2“ verwendet.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; of action &apos;%3&apos; begins with &apos;%1&apos;.</source>
+        <translation>Der Kurzbefehl „%2“ der Aktion „%3“ beginnt mit „%1“.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; begins with &apos;%1&apos;, the shortcut of action &apos;%3&apos;.</source>
+        <translation>Der Kurzbefehl „%2“ beginnt mit „%1“, dem Kurzbefehl der Aktion „%3“.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; opens the menu &apos;%2&apos;.</source>
+        <translation>Der Kurzbefehl „%1“ öffnet das Menü „%2“.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; leads to &apos;%2&apos; in the window.</source>
+        <translation>Der Kurzbefehl „%1“ führt im Fenster zu „%2“.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is the standard shortcut for &apos;%2&apos;.</source>
+        <translation>Der Kurzbefehl „%1“ ist der Standardkurzbefehl für „%2“.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
+        <translation>Der Kurzbefehl „%1“ wird bereits für die globale Aktion „%2“ verwendet.</translation>
+    </message>
+    <message>
+        <source>With &apos;%1&apos; as a shortcut this key cannot be typed into texts.</source>
+        <translation>Mit „%1“ als Kurzbefehl lässt sich diese Taste nicht mehr in Texte eingeben.</translation>
+    </message>
+    <message>
+        <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
+        <translation>Die aktuelle Tastaturbelegung kann „%1“ nicht erzeugen.</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutScheme</name>
     <message>
         <source>The shortcuts could not be saved to %1: %2</source>
@@ -205,6 +244,161 @@
     <message>
         <source>Shortcut</source>
         <translation>Kurzbefehl</translation>
+    </message>
+</context>
+<context>
+    <name>StandardKeyNames</name>
+    <message>
+        <source>Help</source>
+        <translation>Hilfe</translation>
+    </message>
+    <message>
+        <source>What&apos;s this?</source>
+        <translation>Was ist das?</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Öffnen</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>Speichern unter</translation>
+    </message>
+    <message>
+        <source>New</source>
+        <translation>Neu</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Löschen</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>Ausschneiden</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Kopieren</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Einfügen</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Rückgängig</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Wiederherstellen</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Zurück</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Vorwärts</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>Aktualisieren</translation>
+    </message>
+    <message>
+        <source>Zoom in</source>
+        <translation>Vergrößern</translation>
+    </message>
+    <message>
+        <source>Zoom out</source>
+        <translation>Verkleinern</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Drucken</translation>
+    </message>
+    <message>
+        <source>New tab</source>
+        <translation>Neues Unterfenster</translation>
+    </message>
+    <message>
+        <source>Next tab</source>
+        <translation>Nächstes Unterfenster</translation>
+    </message>
+    <message>
+        <source>Previous tab</source>
+        <translation>Vorheriges Unterfenster</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>Suchen</translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation>Weitersuchen</translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation>Rückwärts weitersuchen</translation>
+    </message>
+    <message>
+        <source>Replace</source>
+        <translation>Ersetzen</translation>
+    </message>
+    <message>
+        <source>Select all</source>
+        <translation>Alles auswählen</translation>
+    </message>
+    <message>
+        <source>Deselect</source>
+        <translation>Auswahl aufheben</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Vollbild</translation>
+    </message>
+    <message>
+        <source>Preferences</source>
+        <translation>Einstellungen</translation>
+    </message>
+    <message>
+        <source>Quit</source>
+        <translation>Beenden</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>Bold</source>
+        <translation>Fett</translation>
+    </message>
+    <message>
+        <source>Italic</source>
+        <translation>Kursiv</translation>
+    </message>
+    <message>
+        <source>Underline</source>
+        <translation>Unterstrichen</translation>
+    </message>
+    <message>
+        <source>Move the cursor</source>
+        <translation>Textmarke bewegen</translation>
+    </message>
+    <message>
+        <source>Select text</source>
+        <translation>Text auswählen</translation>
+    </message>
+    <message>
+        <source>Edit text</source>
+        <translation>Text bearbeiten</translation>
     </message>
 </context>
 <context>

@@ -159,6 +159,45 @@
     </message>
 </context>
 <context>
+    <name>ShortcutClash</name>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;.</source>
+        <translation>El acceso rápido «%1» ya se usa para la acción «%2».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; of action &apos;%3&apos; begins with &apos;%1&apos;.</source>
+        <translation>El acceso rápido «%2» de la acción «%3» empieza por «%1».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; begins with &apos;%1&apos;, the shortcut of action &apos;%3&apos;.</source>
+        <translation>El acceso rápido «%2» empieza por «%1», el acceso rápido de la acción «%3».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; opens the menu &apos;%2&apos;.</source>
+        <translation>El acceso rápido «%1» abre el menú «%2».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; leads to &apos;%2&apos; in the window.</source>
+        <translation>El acceso rápido «%1» lleva a «%2» en la ventana.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is the standard shortcut for &apos;%2&apos;.</source>
+        <translation>El acceso rápido «%1» es el acceso rápido estándar de «%2».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
+        <translation>El acceso rápido «%1» ya se usa para la acción global «%2».</translation>
+    </message>
+    <message>
+        <source>With &apos;%1&apos; as a shortcut this key cannot be typed into texts.</source>
+        <translation>Con «%1» como acceso rápido, esta tecla no se puede escribir en los textos.</translation>
+    </message>
+    <message>
+        <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
+        <translation>La distribución de teclado actual no puede producir «%1».</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutScheme</name>
     <message>
         <source>The shortcuts could not be saved to %1: %2</source>
@@ -205,6 +244,161 @@
     <message>
         <source>Shortcut</source>
         <translation>Acceso rápido</translation>
+    </message>
+</context>
+<context>
+    <name>StandardKeyNames</name>
+    <message>
+        <source>Help</source>
+        <translation>Ayuda</translation>
+    </message>
+    <message>
+        <source>What&apos;s this?</source>
+        <translation>¿Qué es esto?</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Abrir</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Cerrar</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Guardar</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>Guardar como</translation>
+    </message>
+    <message>
+        <source>New</source>
+        <translation>Nuevo</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Eliminar</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>Cortar</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copiar</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Pegar</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Deshacer</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Rehacer</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Atrás</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Adelante</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>Actualizar</translation>
+    </message>
+    <message>
+        <source>Zoom in</source>
+        <translation>Ampliar</translation>
+    </message>
+    <message>
+        <source>Zoom out</source>
+        <translation>Reducir</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Imprimir</translation>
+    </message>
+    <message>
+        <source>New tab</source>
+        <translation>Nueva pestaña</translation>
+    </message>
+    <message>
+        <source>Next tab</source>
+        <translation>Pestaña siguiente</translation>
+    </message>
+    <message>
+        <source>Previous tab</source>
+        <translation>Pestaña anterior</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>Buscar</translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation>Buscar siguiente</translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation>Buscar anterior</translation>
+    </message>
+    <message>
+        <source>Replace</source>
+        <translation>Sustituir</translation>
+    </message>
+    <message>
+        <source>Select all</source>
+        <translation>Seleccionar todo</translation>
+    </message>
+    <message>
+        <source>Deselect</source>
+        <translation>Deseleccionar</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Pantalla completa</translation>
+    </message>
+    <message>
+        <source>Preferences</source>
+        <translation>Preferencias</translation>
+    </message>
+    <message>
+        <source>Quit</source>
+        <translation>Salir</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancelar</translation>
+    </message>
+    <message>
+        <source>Bold</source>
+        <translation>Negrita</translation>
+    </message>
+    <message>
+        <source>Italic</source>
+        <translation>Cursiva</translation>
+    </message>
+    <message>
+        <source>Underline</source>
+        <translation>Subrayado</translation>
+    </message>
+    <message>
+        <source>Move the cursor</source>
+        <translation>Mover el cursor</translation>
+    </message>
+    <message>
+        <source>Select text</source>
+        <translation>Seleccionar texto</translation>
+    </message>
+    <message>
+        <source>Edit text</source>
+        <translation>Editar texto</translation>
     </message>
 </context>
 <context>

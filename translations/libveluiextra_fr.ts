@@ -159,6 +159,45 @@
     </message>
 </context>
 <context>
+    <name>ShortcutClash</name>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;.</source>
+        <translation>Le raccourci « %1 » est déjà utilisé pour l&apos;action « %2 ».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; of action &apos;%3&apos; begins with &apos;%1&apos;.</source>
+        <translation>Le raccourci « %2 » de l&apos;action « %3 » commence par « %1 ».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; begins with &apos;%1&apos;, the shortcut of action &apos;%3&apos;.</source>
+        <translation>Le raccourci « %2 » commence par « %1 », le raccourci de l&apos;action « %3 ».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; opens the menu &apos;%2&apos;.</source>
+        <translation>Le raccourci « %1 » ouvre le menu « %2 ».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; leads to &apos;%2&apos; in the window.</source>
+        <translation>Le raccourci « %1 » mène à « %2 » dans la fenêtre.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is the standard shortcut for &apos;%2&apos;.</source>
+        <translation>Le raccourci « %1 » est le raccourci standard pour « %2 ».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
+        <translation>Le raccourci « %1 » est déjà utilisé pour l&apos;action globale « %2 ».</translation>
+    </message>
+    <message>
+        <source>With &apos;%1&apos; as a shortcut this key cannot be typed into texts.</source>
+        <translation>Avec « %1 » comme raccourci, cette touche ne peut plus être saisie dans les textes.</translation>
+    </message>
+    <message>
+        <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
+        <translation>La disposition de clavier actuelle ne permet pas de produire « %1 ».</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutScheme</name>
     <message>
         <source>The shortcuts could not be saved to %1: %2</source>
@@ -205,6 +244,161 @@
     <message>
         <source>Shortcut</source>
         <translation>Raccourci</translation>
+    </message>
+</context>
+<context>
+    <name>StandardKeyNames</name>
+    <message>
+        <source>Help</source>
+        <translation>Aide</translation>
+    </message>
+    <message>
+        <source>What&apos;s this?</source>
+        <translation>Qu&apos;est-ce que c&apos;est ?</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Ouvrir</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Fermer</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>Enregistrer sous</translation>
+    </message>
+    <message>
+        <source>New</source>
+        <translation>Nouveau</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>Couper</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copier</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Coller</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Rétablir</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Précédent</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Suivant</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>Actualiser</translation>
+    </message>
+    <message>
+        <source>Zoom in</source>
+        <translation>Zoom avant</translation>
+    </message>
+    <message>
+        <source>Zoom out</source>
+        <translation>Zoom arrière</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Imprimer</translation>
+    </message>
+    <message>
+        <source>New tab</source>
+        <translation>Nouvel onglet</translation>
+    </message>
+    <message>
+        <source>Next tab</source>
+        <translation>Onglet suivant</translation>
+    </message>
+    <message>
+        <source>Previous tab</source>
+        <translation>Onglet précédent</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>Rechercher</translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation>Rechercher le suivant</translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation>Rechercher le précédent</translation>
+    </message>
+    <message>
+        <source>Replace</source>
+        <translation>Remplacer</translation>
+    </message>
+    <message>
+        <source>Select all</source>
+        <translation>Tout sélectionner</translation>
+    </message>
+    <message>
+        <source>Deselect</source>
+        <translation>Désélectionner</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Plein écran</translation>
+    </message>
+    <message>
+        <source>Preferences</source>
+        <translation>Préférences</translation>
+    </message>
+    <message>
+        <source>Quit</source>
+        <translation>Quitter</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Bold</source>
+        <translation>Gras</translation>
+    </message>
+    <message>
+        <source>Italic</source>
+        <translation>Italique</translation>
+    </message>
+    <message>
+        <source>Underline</source>
+        <translation>Souligné</translation>
+    </message>
+    <message>
+        <source>Move the cursor</source>
+        <translation>Déplacer le curseur</translation>
+    </message>
+    <message>
+        <source>Select text</source>
+        <translation>Sélectionner du texte</translation>
+    </message>
+    <message>
+        <source>Edit text</source>
+        <translation>Modifier le texte</translation>
     </message>
 </context>
 <context>

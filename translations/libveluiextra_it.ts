@@ -159,6 +159,45 @@
     </message>
 </context>
 <context>
+    <name>ShortcutClash</name>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;.</source>
+        <translation>La scorciatoia «%1» è già usata per l&apos;azione «%2».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; of action &apos;%3&apos; begins with &apos;%1&apos;.</source>
+        <translation>La scorciatoia «%2» dell&apos;azione «%3» inizia con «%1».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; begins with &apos;%1&apos;, the shortcut of action &apos;%3&apos;.</source>
+        <translation>La scorciatoia «%2» inizia con «%1», la scorciatoia dell&apos;azione «%3».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; opens the menu &apos;%2&apos;.</source>
+        <translation>La scorciatoia «%1» apre il menu «%2».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; leads to &apos;%2&apos; in the window.</source>
+        <translation>La scorciatoia «%1» porta a «%2» nella finestra.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is the standard shortcut for &apos;%2&apos;.</source>
+        <translation>La scorciatoia «%1» è la scorciatoia standard per «%2».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
+        <translation>La scorciatoia «%1» è già usata per l&apos;azione globale «%2».</translation>
+    </message>
+    <message>
+        <source>With &apos;%1&apos; as a shortcut this key cannot be typed into texts.</source>
+        <translation>Con «%1» come scorciatoia, questo tasto non può essere digitato nei testi.</translation>
+    </message>
+    <message>
+        <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
+        <translation>La disposizione di tastiera attuale non può produrre «%1».</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutScheme</name>
     <message>
         <source>The shortcuts could not be saved to %1: %2</source>
@@ -205,6 +244,161 @@
     <message>
         <source>Shortcut</source>
         <translation>Scorciatoia</translation>
+    </message>
+</context>
+<context>
+    <name>StandardKeyNames</name>
+    <message>
+        <source>Help</source>
+        <translation>Aiuto</translation>
+    </message>
+    <message>
+        <source>What&apos;s this?</source>
+        <translation>Che cos&apos;è?</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Apri</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Chiudi</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Salva</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>Salva come</translation>
+    </message>
+    <message>
+        <source>New</source>
+        <translation>Nuovo</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Elimina</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>Taglia</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copia</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>Incolla</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Annulla</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Rifai</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Indietro</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Avanti</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>Aggiorna</translation>
+    </message>
+    <message>
+        <source>Zoom in</source>
+        <translation>Ingrandisci</translation>
+    </message>
+    <message>
+        <source>Zoom out</source>
+        <translation>Rimpicciolisci</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Stampa</translation>
+    </message>
+    <message>
+        <source>New tab</source>
+        <translation>Nuova scheda</translation>
+    </message>
+    <message>
+        <source>Next tab</source>
+        <translation>Scheda successiva</translation>
+    </message>
+    <message>
+        <source>Previous tab</source>
+        <translation>Scheda precedente</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>Trova</translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation>Trova successivo</translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation>Trova precedente</translation>
+    </message>
+    <message>
+        <source>Replace</source>
+        <translation>Sostituisci</translation>
+    </message>
+    <message>
+        <source>Select all</source>
+        <translation>Seleziona tutto</translation>
+    </message>
+    <message>
+        <source>Deselect</source>
+        <translation>Deseleziona</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Schermo intero</translation>
+    </message>
+    <message>
+        <source>Preferences</source>
+        <translation>Preferenze</translation>
+    </message>
+    <message>
+        <source>Quit</source>
+        <translation>Esci</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annulla</translation>
+    </message>
+    <message>
+        <source>Bold</source>
+        <translation>Grassetto</translation>
+    </message>
+    <message>
+        <source>Italic</source>
+        <translation>Corsivo</translation>
+    </message>
+    <message>
+        <source>Underline</source>
+        <translation>Sottolineato</translation>
+    </message>
+    <message>
+        <source>Move the cursor</source>
+        <translation>Sposta il cursore</translation>
+    </message>
+    <message>
+        <source>Select text</source>
+        <translation>Seleziona il testo</translation>
+    </message>
+    <message>
+        <source>Edit text</source>
+        <translation>Modifica il testo</translation>
     </message>
 </context>
 <context>

@@ -159,6 +159,45 @@
     </message>
 </context>
 <context>
+    <name>ShortcutClash</name>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;.</source>
+        <translation>ショートカット「%1」は既にアクション「%2」に使用されています。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; of action &apos;%3&apos; begins with &apos;%1&apos;.</source>
+        <translation>アクション「%3」のショートカット「%2」は「%1」で始まります。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%2&apos; begins with &apos;%1&apos;, the shortcut of action &apos;%3&apos;.</source>
+        <translation>ショートカット「%2」は、アクション「%3」のショートカット「%1」で始まります。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; opens the menu &apos;%2&apos;.</source>
+        <translation>ショートカット「%1」はメニュー「%2」を開きます。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; leads to &apos;%2&apos; in the window.</source>
+        <translation>ショートカット「%1」はウィンドウの「%2」に移動します。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is the standard shortcut for &apos;%2&apos;.</source>
+        <translation>ショートカット「%1」は「%2」の標準ショートカットです。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
+        <translation>ショートカット「%1」は既にグローバルアクション「%2」に使用されています。</translation>
+    </message>
+    <message>
+        <source>With &apos;%1&apos; as a shortcut this key cannot be typed into texts.</source>
+        <translation>「%1」をショートカットにすると、このキーを文章に入力できなくなります。</translation>
+    </message>
+    <message>
+        <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
+        <translation>現在のキーボード配列では「%1」を入力できません。</translation>
+    </message>
+</context>
+<context>
     <name>ShortcutScheme</name>
     <message>
         <source>The shortcuts could not be saved to %1: %2</source>
@@ -205,6 +244,161 @@
     <message>
         <source>Shortcut</source>
         <translation>ショートカット</translation>
+    </message>
+</context>
+<context>
+    <name>StandardKeyNames</name>
+    <message>
+        <source>Help</source>
+        <translation>ヘルプ</translation>
+    </message>
+    <message>
+        <source>What&apos;s this?</source>
+        <translation>これは何?</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>開く</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>閉じる</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>保存</translation>
+    </message>
+    <message>
+        <source>Save as</source>
+        <translation>名前を付けて保存</translation>
+    </message>
+    <message>
+        <source>New</source>
+        <translation>新規</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>削除</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <translation>切り取り</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>コピー</translation>
+    </message>
+    <message>
+        <source>Paste</source>
+        <translation>貼り付け</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>やり直し</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>戻る</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>進む</translation>
+    </message>
+    <message>
+        <source>Refresh</source>
+        <translation>再読み込み</translation>
+    </message>
+    <message>
+        <source>Zoom in</source>
+        <translation>拡大</translation>
+    </message>
+    <message>
+        <source>Zoom out</source>
+        <translation>縮小</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>印刷</translation>
+    </message>
+    <message>
+        <source>New tab</source>
+        <translation>新しいタブ</translation>
+    </message>
+    <message>
+        <source>Next tab</source>
+        <translation>次のタブ</translation>
+    </message>
+    <message>
+        <source>Previous tab</source>
+        <translation>前のタブ</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>検索</translation>
+    </message>
+    <message>
+        <source>Find next</source>
+        <translation>次を検索</translation>
+    </message>
+    <message>
+        <source>Find previous</source>
+        <translation>前を検索</translation>
+    </message>
+    <message>
+        <source>Replace</source>
+        <translation>置換</translation>
+    </message>
+    <message>
+        <source>Select all</source>
+        <translation>すべて選択</translation>
+    </message>
+    <message>
+        <source>Deselect</source>
+        <translation>選択を解除</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>全画面表示</translation>
+    </message>
+    <message>
+        <source>Preferences</source>
+        <translation>設定</translation>
+    </message>
+    <message>
+        <source>Quit</source>
+        <translation>終了</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>キャンセル</translation>
+    </message>
+    <message>
+        <source>Bold</source>
+        <translation>太字</translation>
+    </message>
+    <message>
+        <source>Italic</source>
+        <translation>斜体</translation>
+    </message>
+    <message>
+        <source>Underline</source>
+        <translation>下線</translation>
+    </message>
+    <message>
+        <source>Move the cursor</source>
+        <translation>カーソルを移動</translation>
+    </message>
+    <message>
+        <source>Select text</source>
+        <translation>文字列を選択</translation>
+    </message>
+    <message>
+        <source>Edit text</source>
+        <translation>文字列を編集</translation>
     </message>
 </context>
 <context>
