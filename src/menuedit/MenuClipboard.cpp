@@ -34,7 +34,13 @@ QString cleaned(const QString &path)
     int slashes = 0;
     while (slashes < path.size() && path.at(slashes) == QLatin1Char('/'))
         ++slashes;
-    return slashes == 0 ? QString() : QDir::cleanPath(path.mid(slashes - 1));
+    if (slashes == 0)
+        return QString();
+    QString clean = QDir::cleanPath(path.mid(slashes - 1));
+    // The root is its own parent, which Qt leaves as it is written.
+    while (clean.startsWith(QLatin1String("/../")))
+        clean.remove(0, 3);
+    return clean == QLatin1String("/..") ? QStringLiteral("/") : clean;
 }
 
 // The path in a line of ours: whatever follows the prefix, read as it stands or, if there is

@@ -239,6 +239,9 @@ void tst_MenuClipboard::foldsSlashesAndDots()
                   QUrl(QStringLiteral("file://") + folder() + QStringLiteral("/x/../"))});
 
     QCOMPARE(localPaths(&data), QStringList({folder(), folder(), folder()}));
+
+    data.setUrls({QUrl(QStringLiteral("file:///..")), QUrl(QStringLiteral("file:///../..") + folder())});
+    QCOMPARE(localPaths(&data), QStringList({QStringLiteral("/"), folder()}));
 }
 
 void tst_MenuClipboard::splitsUrls_data()
