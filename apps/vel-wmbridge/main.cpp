@@ -60,22 +60,12 @@ Options parse()
             error};
 }
 
-// A line may hold anything; on a terminal it must not act.
-QString printable(QString line)
-{
-    for (QChar &character : line) {
-        if (character.category() == QChar::Other_Control)
-            character = QLatin1Char('?');
-    }
-    return line;
-}
-
 // Tells of what goes wrong while the bridge runs.
 void report(const Bridge *bridge)
 {
     QObject::connect(bridge, &Bridge::failed, qApp, [](const QString &line) {
-        Program::printError(QCoreApplication::translate("vel-wmbridge", "cannot run the command for %1")
-                                .arg(printable(line)));
+        Program::printError(
+            QCoreApplication::translate("vel-wmbridge", "cannot run the command for %1").arg(line));
     });
     QObject::connect(bridge, &Bridge::lost, qApp, [] {
         Program::printError(
