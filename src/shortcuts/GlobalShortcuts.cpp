@@ -3,8 +3,8 @@
 
 #include "GlobalShortcuts.h"
 
-#include "FileText.h"
 #include "KeyMatcher.h"
+#include "QuotedText.h"
 
 #include <velcore/dirs.h>
 #include <velcore/session.h>
@@ -73,7 +73,7 @@ QString GlobalShortcuts::find(const QString &path, const QKeySequence &sequence)
     const KeyMatcher matcher(sequence);
     for (const auto &binding : *bindings) {
         if (matcher.matches(binding.first.pItem))
-            return FileText::withoutQuotes(QString::fromUtf8(binding.second));
+            return QuotedText::withoutQuotes(QString::fromUtf8(binding.second));
     }
     return {};
 }

@@ -3,8 +3,8 @@
 
 #include "KeyMatcher.h"
 
-#include "FileText.h"
 #include "KeySequences.h"
+#include "QuotedText.h"
 
 #include <cstring>
 
@@ -110,7 +110,7 @@ std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
 
 bool KeyMatcher::matchesText(const char *fileKey) const
 {
-    QString key = FileText::withoutQuotes(QString::fromUtf8(fileKey));
+    QString key = QuotedText::withoutQuotes(QString::fromUtf8(fileKey));
     key.replace(QLatin1Char('|'), QLatin1Char('+'));
     key.remove(QLatin1String("None+"));
     const QString converted = KeyNames::fromKeyString(key);

@@ -5,7 +5,7 @@
 
 #include <QString>
 
-namespace FileText {
+namespace QuotedText {
 
 /// A key or value of the shortcut file without the quotes that it may be enclosed in.
 inline QString withoutQuotes(QString text)
@@ -17,4 +17,4 @@ inline QString withoutQuotes(QString text)
     return text;
 }
 
-} // namespace FileText
+} // namespace QuotedText
