@@ -38,6 +38,8 @@ class ShortcutsModel;
 class VELUIEXTRA_EXPORT EditShortcutsDialog : public QDialog
 {
     Q_OBJECT
+    /// Whether the dialog helps beyond its plain form, see setAssistance().
+    Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:
     /**
@@ -56,6 +58,15 @@ public:
      * @param changed whether the buttons Ok and Reset are enabled
      */
     void setChanged(bool changed);
+
+    /// Tells whether the dialog helps beyond its plain form; not at first.
+    bool assistance() const;
+    /**
+     * Switches on or off what the dialog has beyond its plain form, at any time.
+     *
+     * @param assistance false leaves exactly the plain form; edits stay pending
+     */
+    void setAssistance(bool assistance);
 
     /// Hides the dialog with the result Rejected; throws away what is changed.
     void reject() override;

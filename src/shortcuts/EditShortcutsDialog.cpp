@@ -26,6 +26,17 @@ EditShortcutsDialog::EditShortcutsDialog(ShortcutsModel *model, QWidget *parent)
 
 EditShortcutsDialog::~EditShortcutsDialog() = default;
 
+bool EditShortcutsDialog::assistance() const
+{
+    return d->assistance != nullptr;
+}
+
+void EditShortcutsDialog::setAssistance(bool assistance)
+{
+    if (assistance != this->assistance())
+        d->setAssistance(assistance);
+}
+
 void EditShortcutsDialog::setChanged(bool changed)
 {
     d->setChanged(changed);

@@ -43,6 +43,14 @@ EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(QDialog *dialog, Shortcut
     QObject::connect(&m_messageTimer, &QTimer::timeout, &m_context, [this] { showMessage(); });
 }
 
+void EditShortcutsDialogPrivate::setAssistance(bool isOn)
+{
+    assistance = isOn ? std::make_unique<EditShortcutsAssistance>(form, m_model) : nullptr;
+    if (isOn)
+        QObject::connect(assistance.get(), &EditShortcutsAssistance::keysChanged, &m_context,
+                         [this] { setChanged(true); });
+}
+
 void EditShortcutsDialogPrivate::fillTree()
 {
     form.treeView->setModel(m_model);

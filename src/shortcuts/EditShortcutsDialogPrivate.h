@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "EditShortcutsAssistance.h"
 #include "EditShortcutsForm.h"
 #include "KeyRecording.h"
 #include "ShortcutsModel.h"
@@ -11,6 +12,8 @@
 #include <QKeySequence>
 #include <QPointer>
 #include <QTimer>
+
+#include <memory>
 
 class QAbstractButton;
 class QDialog;
@@ -38,6 +41,9 @@ public:
     /// Enables or disables the buttons Ok and Reset.
     void setChanged(bool changed);
 
+    /// Completes the form, or makes it the plain one again.
+    void setAssistance(bool isOn);
+
     /// Shows the keys of the shortcut that is current.
     void showShortcut(const QKeySequence &defaultKey, const QKeySequence &pendingKey);
     /// No shortcut is current.
@@ -64,6 +70,8 @@ public:
     void discard();
 
     const EditShortcutsForm form;
+    /// What the form has beyond the plain one; null for nothing.
+    std::unique_ptr<EditShortcutsAssistance> assistance;
 
 private:
     void fillTree();
