@@ -21,13 +21,14 @@ class ShortcutsModel;
  *     list->addItem(clash.text);
  * \endcode
  *
- * EditShortcutsDialog refuses what is a SameKey or a GlobalKey; all else is advice.
+ * EditShortcutsDialog refuses a pending key of another shortcut and a GlobalKey; all else is
+ * advice.
  */
 struct VELUIEXTRA_EXPORT ShortcutClash
 {
     /// What a key clashes with.
     enum Kind {
-        SameKey, ///< another shortcut of the model has it
+        SameKey, ///< another shortcut of the model has it, as its pending key or as a further one
         Prefix, ///< it begins the longer key of another shortcut of the model, or the other way round
         Mnemonic, ///< its first chord opens a menu, or leads to a widget, of the window
         StandardKey, ///< its first chord is a standard key of the platform
@@ -43,8 +44,9 @@ struct VELUIEXTRA_EXPORT ShortcutClash
     /**
      * Finds everything that speaks against a key.
      *
-     * The pending keys of a model are looked at, and the names of its shortcuts, so that a key may
-     * be looked up before it is set. Shortcuts with the same name, in whatever group, are one.
+     * The pending keys of a model are looked at, the further keys of its actions, and the names of
+     * its shortcuts, so that a key may be looked up before it is set. Shortcuts with the same name, in
+     * whatever group, are one.
      *
      * The file of global shortcuts and the keyboard layout are read anew at every call. A window
      * manager's icon actions keep no key from others. Whether a key is on the layout is known under

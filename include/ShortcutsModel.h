@@ -74,7 +74,8 @@ public:
     /**
      * Registers an action and puts the key saved for it into force.
      *
-     * Its text (without mnemonic marks) and its icon are those of the action.
+     * Its text (without mnemonic marks) and its icon are those of the action. The key is the first
+     * of the action's; the further ones stay, see furtherKeySequences().
      *
      * @param name the name under which its key is saved, see IShortcutObject
      * @param action the action; not owned; its present key becomes the default key
@@ -107,6 +108,16 @@ public:
     bool isShortcutItem(const QModelIndex &index) const;
     /// Returns the pending key of the row of an index; empty for a group.
     QKeySequence keySequence(const QModelIndex &index) const;
+    /**
+     * Returns the keys that the row of an index has beside the pending one.
+     *
+     * Only an action has such keys, those of QAction::shortcuts() after the first. They take part
+     * in no edit and are not saved; they stay on the action when the pending key is put into force.
+     *
+     * @param index any column of the row
+     * @return empty for a group
+     */
+    QList<QKeySequence> furtherKeySequences(const QModelIndex &index) const;
     /// Returns the default key of the row of an index; empty for a group.
     QKeySequence defaultKeySequence(const QModelIndex &index) const;
     /**

@@ -18,8 +18,36 @@ QKeySequence ActionObject::objectKeySequence() const
 
 void ActionObject::setObjectKeySequence(const QKeySequence &key)
 {
-    if (m_wrapped)
-        m_wrapped->setShortcut(key);
+    if (!m_wrapped)
+        return;
+    QList<QKeySequence> keys = keysAfterTheFirst();
+    m_placeOfDoubled = int(keys.indexOf(key));
+    m_doubled = m_placeOfDoubled < 0 ? QKeySequence() : key;
+    // By a key that an action has twice nothing is triggered.
+    keys.removeAll(key);
+    if (!key.isEmpty() || !keys.isEmpty())
+        keys.prepend(key);
+    m_wrapped->setShortcuts(keys);
+}
+
+QList<QKeySequence> ActionObject::furtherKeys() const
+{
+    QList<QKeySequence> keys = m_wrapped ? keysAfterTheFirst() : QList<QKeySequence>();
+    keys.removeAll(keySequence());
+    return keys;
+}
+
+// With the one in its place that became the first, unless the application chose another first one.
+QList<QKeySequence> ActionObject::keysAfterTheFirst() const
+{
+    const QKeySequence first = m_wrapped->shortcut();
+    QList<QKeySequence> keys = m_wrapped->shortcuts();
+    if (!keys.isEmpty() && keys.constFirst() == first)
+        keys.removeFirst();
+    keys.removeAll(QKeySequence());
+    if (!m_doubled.isEmpty() && first == m_doubled && !keys.contains(m_doubled))
+        keys.insert(qMin(m_placeOfDoubled, int(keys.size())), m_doubled);
+    return keys;
 }
 
 QString ActionObject::text() const

@@ -6,9 +6,12 @@
 #include "WrappedObject.h"
 
 #include <QAction>
+#include <QList>
 
 /**
  * A QAction of the application; text and icon are the action's own.
+ *
+ * The user chooses the first of its keys; the further ones stay.
  */
 class ActionObject : public WrappedObject<QAction>
 {
@@ -29,4 +32,13 @@ public:
     void setObjectKeySequence(const QKeySequence &key) override;
     QString text() const override;
     QIcon icon() const override;
+
+    /// The keys that the action has, or will have, beside the pending one.
+    QList<QKeySequence> furtherKeys() const;
+
+private:
+    QList<QKeySequence> keysAfterTheFirst() const;
+
+    QKeySequence m_doubled; // a further key for as long as it is the first one, too
+    int m_placeOfDoubled = 0;
 };

@@ -3,6 +3,7 @@
 
 #include "ShortcutClash.h"
 
+#include "FurtherKeys.h"
 #include "IShortcutObject.h"
 #include "KeySequences.h"
 #include "KeyboardLayout.h"
@@ -15,6 +16,8 @@
 
 #include <QCoreApplication>
 
+#include <algorithm>
+
 namespace {
 
 using Clashes = QVector<ShortcutClash>;
@@ -26,43 +29,60 @@ QString shown(const QKeySequence &key)
 
 ShortcutClash sameKey(const QKeySequence &key, const IShortcutObject &other)
 {
-    return {ShortcutClash::SameKey,
-            QCoreApplication::translate("ShortcutClash", "Shortcut '%1' is already used for action '%2'.")
-                .arg(shown(key), other.text()),
+    const QString text = other.keySequence() == key
+        ? QCoreApplication::translate("ShortcutClash", "Shortcut '%1' is already used for action '%2'.")
+        : QCoreApplication::translate("ShortcutClash", "Shortcut '%1' is a further shortcut of action '%2'.");
+    return {ShortcutClash::SameKey, text.arg(shown(key), other.text()), other.name()};
+}
+
+ShortcutClash longerKey(const QKeySequence &key, const QKeySequence &longer, const IShortcutObject &other)
+{
+    return {ShortcutClash::Prefix,
+            QCoreApplication::translate("ShortcutClash", "Shortcut '%2' of action '%3' begins with '%1'.")
+                .arg(shown(key), shown(longer), other.text()),
             other.name()};
 }
 
-ShortcutClash prefix(const QKeySequence &shorter, const QKeySequence &longer, const IShortcutObject &other)
+ShortcutClash shorterKey(const QKeySequence &key, const QKeySequence &shorter, const IShortcutObject &other)
 {
-    const bool otherIsLonger = other.keySequence() == longer;
-    const QString text = otherIsLonger
-        ? QCoreApplication::translate("ShortcutClash", "Shortcut '%2' of action '%3' begins with '%1'.")
-        : QCoreApplication::translate("ShortcutClash",
-                                      "Shortcut '%2' begins with '%1', the shortcut of action '%3'.");
-    return {ShortcutClash::Prefix, text.arg(shown(shorter), shown(longer), other.text()), other.name()};
+    return {ShortcutClash::Prefix,
+            QCoreApplication::translate("ShortcutClash",
+                                        "Shortcut '%2' begins with '%1', the shortcut of action '%3'.")
+                .arg(shown(shorter), shown(key), other.text()),
+            other.name()};
+}
+
+Clashes withShortcut(const IShortcutObject &other, const QKeySequence &key)
+{
+    Clashes clashes;
+    const QList<QKeySequence> keys = QList<QKeySequence>{other.keySequence()} + FurtherKeys::of(other);
+    for (const QKeySequence &otherKey : keys) {
+        if (otherKey.isEmpty()) // would begin every key
+            continue;
+        if (otherKey == key)
+            clashes.append(sameKey(key, other));
+        else if (key.matches(otherKey) == QKeySequence::PartialMatch)
+            clashes.append(longerKey(key, otherKey, other));
+        else if (otherKey.matches(key) == QKeySequence::PartialMatch)
+            clashes.append(shorterKey(key, otherKey, other));
+    }
+    return clashes;
 }
 
 Clashes withModel(const ShortcutsModel &model, const QString &name, const QKeySequence &key)
 {
-    Clashes same;
-    Clashes prefixes;
+    Clashes clashes;
     for (int group = 0; group < model.rowCount(); ++group) {
         const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
         for (const IShortcutObject *other : objects) {
-            if (!other || other->name() == name)
-                continue;
-            const QKeySequence otherKey = other->keySequence();
-            if (otherKey.isEmpty()) // would begin every key
-                continue;
-            if (otherKey == key)
-                same.append(sameKey(key, *other));
-            else if (key.matches(otherKey) == QKeySequence::PartialMatch)
-                prefixes.append(prefix(key, otherKey, *other));
-            else if (otherKey.matches(key) == QKeySequence::PartialMatch)
-                prefixes.append(prefix(otherKey, key, *other));
+            if (other && other->name() != name)
+                clashes += withShortcut(*other, key);
         }
     }
-    return same + prefixes;
+    std::stable_sort(
+        clashes.begin(), clashes.end(),
+        [](const ShortcutClash &left, const ShortcutClash &right) { return left.kind < right.kind; });
+    return clashes;
 }
 
 Clashes withMnemonics(const QWidget &window, const QKeySequence &chord)

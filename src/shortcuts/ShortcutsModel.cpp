@@ -4,6 +4,7 @@
 #include "ShortcutsModel.h"
 
 #include "ActionObject.h"
+#include "FurtherKeys.h"
 #include "RowsChangedEvent.h"
 #include "ShortcutObject.h"
 
@@ -138,6 +139,12 @@ bool ShortcutsModel::isShortcutItem(const QModelIndex &index) const
 QKeySequence ShortcutsModel::keySequence(const QModelIndex &index) const
 {
     return this->index(index.row(), 1, index.parent()).data(Qt::EditRole).value<QKeySequence>();
+}
+
+QList<QKeySequence> ShortcutsModel::furtherKeySequences(const QModelIndex &index) const
+{
+    const IShortcutObject *object = isShortcutItem(index) ? firstObject(index) : nullptr;
+    return object ? FurtherKeys::of(*object) : QList<QKeySequence>();
 }
 
 QKeySequence ShortcutsModel::defaultKeySequence(const QModelIndex &index) const

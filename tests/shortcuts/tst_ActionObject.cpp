@@ -22,6 +22,10 @@ private Q_SLOTS:
     void leavesTheMnemonicMarksOut_data();
     void leavesTheMnemonicMarksOut();
     void showsTheActionAsItIsNow();
+    void keepsFurtherKeys_data();
+    void keepsFurtherKeys();
+    void firesByAFurtherKeyThatBecameTheFirst();
+    void takesWhatTheApplicationSetsMeanwhile();
     void asksForItsRemovalWhenTheActionGoes();
     void survivesTheDeletionOfTheActionWhileItIsApplied();
     void declaresNothingOfItsOwn();
@@ -116,6 +120,84 @@ void tst_ActionObject::showsTheActionAsItIsNow()
     action.setIcon(QIcon(pixmap));
     QCOMPARE(object.text(), QStringLiteral("Pause"));
     QCOMPARE(object.icon().cacheKey(), action.icon().cacheKey());
+}
+
+void tst_ActionObject::keepsFurtherKeys_data()
+{
+    QTest::addColumn<QStringList>("keys"); // put on the action one after the other
+    QTest::addColumn<QString>("all"); // that it has in the end
+    QTest::newRow("another") << QStringList{QStringLiteral("F6")} << QStringLiteral("F6 F8 F9");
+    QTest::newRow("none") << QStringList{QString()} << QStringLiteral("F8 F9");
+    QTest::newRow("none, then another")
+        << QStringList{QString(), QStringLiteral("F6")} << QStringLiteral("F6 F8 F9");
+    QTest::newRow("a further one") << QStringList{QStringLiteral("F8")} << QStringLiteral("F8 F9");
+    QTest::newRow("a further one, then another")
+        << QStringList{QStringLiteral("F8"), QStringLiteral("F6")} << QStringLiteral("F6 F8 F9");
+    QTest::newRow("one further one after the other")
+        << QStringList{QStringLiteral("F9"), QStringLiteral("F8"), QStringLiteral("F5")}
+        << QStringLiteral("F5 F8 F9");
+    QTest::newRow("a further one twice, then none")
+        << QStringList{QStringLiteral("F8"), QStringLiteral("F8"), QString()} << QStringLiteral("F8 F9");
+}
+
+void tst_ActionObject::keepsFurtherKeys()
+{
+    QFETCH(QStringList, keys);
+    QAction action(nullptr);
+    action.setShortcuts(
+        {QKeySequence(Qt::Key_F5), QKeySequence(Qt::Key_F8), QKeySequence(), QKeySequence(Qt::Key_F9)});
+    ActionObject object(QStringLiteral("n"), &action, QStringLiteral("g"));
+    object.reset();
+    QCOMPARE(object.furtherKeys(), (QList<QKeySequence>{QKeySequence(Qt::Key_F8), QKeySequence(Qt::Key_F9)}));
+    for (const QString &key : qAsConst(keys)) {
+        object.setKeySequence(QKeySequence(key));
+        object.apply();
+        QCOMPARE(object.objectKeySequence(), QKeySequence(key));
+    }
+    QStringList all;
+    for (const QKeySequence &key : action.shortcuts()) {
+        if (!key.isEmpty())
+            all.append(key.toString());
+    }
+    QTEST(all.join(QLatin1Char(' ')), "all");
+    // Those that are shown beside the pending key, which is the first.
+    all.removeOne(keys.constLast());
+    QStringList further;
+    for (const QKeySequence &key : object.furtherKeys())
+        further.append(key.toString());
+    QCOMPARE(further, all);
+}
+
+// Qt fires nothing by a key that an action has twice.
+void tst_ActionObject::firesByAFurtherKeyThatBecameTheFirst()
+{
+    QWidget window;
+    auto *action = new QAction(&window);
+    window.addAction(action);
+    action->setShortcuts({QKeySequence(Qt::Key_F5), QKeySequence(Qt::Key_F8)});
+    ActionObject object(QStringLiteral("n"), action, QStringLiteral("g"));
+    object.setKeySequence(QKeySequence(Qt::Key_F8));
+    QVERIFY(object.furtherKeys().isEmpty());
+    object.apply();
+    window.show();
+    window.activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(&window));
+    const QSignalSpy spy(action, &QAction::triggered);
+    QTest::keyClick(&window, Qt::Key_F8);
+    QCOMPARE(spy.count(), 1);
+    QTest::keyClick(&window, Qt::Key_F5);
+    QCOMPARE(spy.count(), 1);
+}
+
+void tst_ActionObject::takesWhatTheApplicationSetsMeanwhile()
+{
+    QAction action(nullptr);
+    action.setShortcuts({QKeySequence(Qt::Key_F5), QKeySequence(Qt::Key_F8)});
+    ActionObject object(QStringLiteral("n"), &action, QStringLiteral("g"));
+    object.setObjectKeySequence(QKeySequence(Qt::Key_F8));
+    action.setShortcuts({QKeySequence(Qt::Key_F3), QKeySequence(Qt::Key_F4)});
+    object.setObjectKeySequence(QKeySequence(Qt::Key_F6));
+    QCOMPARE(action.shortcuts(), (QList<QKeySequence>{QKeySequence(Qt::Key_F6), QKeySequence(Qt::Key_F4)}));
 }
 
 void tst_ActionObject::asksForItsRemovalWhenTheActionGoes()

@@ -36,6 +36,7 @@ private Q_SLOTS:
     void looksAtPendingKeys();
     void findsPrefixesBothWays();
 
+    void tellsOfFurtherKeys();
     void findsTheMnemonicOfAMenu();
     void findsTheMnemonicOfAWidget_data();
     void findsTheMnemonicOfAWidget();
@@ -176,6 +177,33 @@ void tst_ShortcutClash::findsPrefixesBothWays()
     QCOMPARE(clashes.at(0).text,
              str("Shortcut 'Ctrl+L, Ctrl+D' begins with 'Ctrl+L', the shortcut of action 'Text of short'."));
     QVERIFY(find("Ctrl+J, Ctrl+L").isEmpty());
+}
+
+void tst_ShortcutClash::tellsOfFurtherKeys()
+{
+    const QKeySequence ctrlJ(Qt::CTRL | Qt::Key_J);
+    QAction *action = addAction("many", "g", QKeySequence(Qt::CTRL | Qt::Key_L));
+    action->setShortcuts({action->shortcut(), ctrlJ, QKeySequence(Qt::CTRL | Qt::Key_M, Qt::Key_F9)});
+    Clashes clashes = find("Ctrl+J");
+    QCOMPARE(clashes.size(), 1);
+    QCOMPARE(clashes.at(0).kind, ShortcutClash::SameKey);
+    QCOMPARE(clashes.at(0).otherName, str("many"));
+    QCOMPARE(clashes.at(0).text, str("Shortcut 'Ctrl+J' is a further shortcut of action 'Text of many'."));
+    clashes = find("Ctrl+M");
+    QCOMPARE(clashes.size(), 1);
+    QCOMPARE(clashes.at(0).kind, ShortcutClash::Prefix);
+    QCOMPARE(clashes.at(0).otherName, str("many"));
+    QCOMPARE(clashes.at(0).text, str("Shortcut 'Ctrl+M, F9' of action 'Text of many' begins with 'Ctrl+M'."));
+    clashes = find("Ctrl+J, F9");
+    QCOMPARE(clashes.size(), 1);
+    QCOMPARE(clashes.at(0).text,
+             str("Shortcut 'Ctrl+J, F9' begins with 'Ctrl+J', the shortcut of action 'Text of many'."));
+    // As the first key it is told once, as that.
+    m_model->setKeySequence(row(0, 0), ctrlJ);
+    clashes = find("Ctrl+J");
+    QCOMPARE(clashes.size(), 1);
+    QCOMPARE(clashes.at(0).text, str("Shortcut 'Ctrl+J' is already used for action 'Text of many'."));
+    QVERIFY(ShortcutClash::find(*m_model, str("many"), ctrlJ).isEmpty());
 }
 
 void tst_ShortcutClash::findsTheMnemonicOfAMenu()

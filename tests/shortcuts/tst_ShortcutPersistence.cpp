@@ -53,6 +53,7 @@ private Q_SLOTS:
     void cleanup();
 
     void putsSavedKeysOnWhatIsRegistered();
+    void savesOneKeyOfSeveral();
     void readsSavedTexts_data();
     void readsSavedTexts();
     void readsSavedTextsInTheLanguageOfTheDesktop_data();
@@ -129,6 +130,30 @@ void tst_ShortcutPersistence::putsSavedKeysOnWhatIsRegistered()
     QCOMPARE(model.defaultKeySequence(model.index(0, 0, group)), f1);
     QCOMPARE(model.keySequence(model.index(1, 0, group)), chords);
     QCOMPARE(model.defaultKeySequence(model.index(1, 0, group)), f1);
+}
+
+void tst_ShortcutPersistence::savesOneKeyOfSeveral()
+{
+    QSettings settings(path(str("settings.ini")), QSettings::IniFormat);
+    const auto start = [&settings](QAction *action) {
+        action->setShortcuts({f1, f2, f3});
+        auto model = std::make_unique<ShortcutsModel>(&settings, QString());
+        model->registerAction(str("a"), action, str("File"));
+        return model;
+    };
+    QAction first(nullptr);
+    auto model = start(&first);
+    model->setKeySequence(model->index(0, 0, model->index(0, 0)), f3);
+    model->commitChanges();
+    model->saveKeys(&settings, QString());
+    QCOMPARE(settings.value(str("a")), QVariant(str("F3")));
+
+    QAction second(nullptr);
+    model = start(&second);
+    QCOMPARE(second.shortcuts(), (QList<QKeySequence>{f3, f2}));
+    model->restoreDefaults();
+    model->commitChanges();
+    QCOMPARE(second.shortcuts(), (QList<QKeySequence>{f1, f2, f3}));
 }
 
 void tst_ShortcutPersistence::readsSavedTexts_data()

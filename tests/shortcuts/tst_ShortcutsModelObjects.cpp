@@ -25,6 +25,8 @@ private Q_SLOTS:
     void survivesRemovalsInBulkOperations_data();
     void survivesRemovalsInBulkOperations();
     void survivesRegistrationInABulkOperation();
+    void tellsFurtherKeysOfActions();
+    void keepsFurtherKeysThroughEdits();
     void deletesItsObjectsButNotWhatTheyWrap();
 };
 
@@ -189,6 +191,44 @@ void tst_ShortcutsModelObjects::survivesRegistrationInABulkOperation()
     };
     m_model->commitChanges();
     QCOMPARE(m_model->rowCount(), 8);
+}
+
+void tst_ShortcutsModelObjects::tellsFurtherKeysOfActions()
+{
+    QAction *action = addAction("a", "File", f1);
+    m_model->registerShortcutObject(new KeyTestObject(str("b"), str("File"), f2));
+    QVERIFY(m_model->furtherKeySequences(row(0, 0)).isEmpty());
+    action->setShortcuts({f1, f2, f3});
+    for (const int column : {0, 1})
+        QCOMPARE(m_model->furtherKeySequences(row(0, 0, column)), (QList<QKeySequence>{f2, f3}));
+    m_model->setKeySequence(row(0, 0), f3);
+    QCOMPARE(m_model->furtherKeySequences(row(0, 0)), QList<QKeySequence>{f2});
+    QVERIFY(m_model->furtherKeySequences(row(0, 1)).isEmpty());
+    QVERIFY(m_model->furtherKeySequences(m_model->index(0, 0)).isEmpty());
+    QVERIFY(m_model->furtherKeySequences(QModelIndex()).isEmpty());
+    const QModelIndex index = row(0, 0);
+    delete action;
+    QVERIFY(m_model->furtherKeySequences(index).isEmpty());
+}
+
+void tst_ShortcutsModelObjects::keepsFurtherKeysThroughEdits()
+{
+    QAction *action = addAction("a", "File", f1);
+    action->setShortcuts({f1, f2});
+    m_model->setKeySequence(row(0, 0), f2);
+    m_model->commitChanges();
+    QCOMPARE(action->shortcuts(), QList<QKeySequence>{f2});
+    m_model->restoreDefaults();
+    m_model->commitChanges();
+    QCOMPARE(action->shortcuts(), (QList<QKeySequence>{f1, f2}));
+    m_model->setKeySequence(row(0, 0), QKeySequence());
+    m_model->commitChanges();
+    QCOMPARE(action->shortcut(), QKeySequence());
+    QCOMPARE(m_model->furtherKeySequences(row(0, 0)), QList<QKeySequence>{f2});
+    m_model->resetShortcuts();
+    m_model->restoreDefaults();
+    m_model->commitChanges();
+    QCOMPARE(action->shortcuts(), (QList<QKeySequence>{f1, f2}));
 }
 
 void tst_ShortcutsModelObjects::deletesItsObjectsButNotWhatTheyWrap()
