@@ -236,6 +236,18 @@ Q_SIGNALS:
     void selectionChanged(const QString &path);
 #pragma GCC diagnostic pop
 
+    /**
+     * The user should hear of something.
+     *
+     * While nothing is connected here, the view shows warnings and failures itself, as a tool tip
+     * at the item that they are about. A host that is connected shows them in its own way.
+     *
+     * @param text one or more sentences in plain text, translated
+     * @param kind 0 for a note, something that was done; 1 for a warning; 2 for a failure,
+     *        something that was not done
+     */
+    void told(const QString &text, int kind);
+
 private:
     friend class VelMenuViewPrivate;
     std::unique_ptr<VelMenuViewPrivate> d;

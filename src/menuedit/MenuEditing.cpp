@@ -37,11 +37,13 @@ void takeBack(const QString &path, FreeName::Kind kind)
 
 } // namespace
 
-MenuEditing::MenuEditing(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find)
+MenuEditing::MenuEditing(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
+                         MenuVoice &voice)
     : m_view(view)
     , m_menu(menu)
     , m_selection(selection)
     , m_find(find)
+    , m_voice(voice)
 {
 }
 

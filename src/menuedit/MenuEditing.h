@@ -10,6 +10,7 @@
 
 class MenuFind;
 class MenuSelection;
+class MenuVoice;
 class QTreeView;
 class ShownMenu;
 
@@ -23,7 +24,8 @@ class MenuEditing : public QObject
     Q_OBJECT
 
 public:
-    MenuEditing(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find);
+    MenuEditing(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
+                MenuVoice &voice);
     ~MenuEditing() override;
 
     /// Creates a folder or an entry where the selection says and opens the editor on it; whether
@@ -47,4 +49,5 @@ private:
     const ShownMenu &m_menu;
     MenuSelection &m_selection;
     MenuFind &m_find;
+    MenuVoice &m_voice;
 };

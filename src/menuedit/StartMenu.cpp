@@ -3,6 +3,7 @@
 
 #include "StartMenu.h"
 
+#include "MenuVoice.h"
 #include "WaitCursor.h"
 
 #include <frame/MessageBox.h>
@@ -18,7 +19,7 @@ QString StartMenu::directory()
     return QString::fromStdString(GetVelDir(VelDir::StartMenu));
 }
 
-bool StartMenu::recreate(QWidget *asker)
+bool StartMenu::recreate(QWidget *asker, MenuVoice &voice)
 {
     const QPointer<QWidget> self(asker);
     const auto answer = MessageBox::show(
@@ -27,8 +28,19 @@ bool StartMenu::recreate(QWidget *asker)
         QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok);
     if (!self || answer == QMessageBox::Cancel)
         return false;
-    const WaitCursor waiting;
-    if (!CreateStartMenu(QFile::encodeName(directory()).constData(), nullptr))
-        qWarning("VelMenuView: can't create the start menu");
+    bool isBuilt = false;
+    {
+        const WaitCursor waiting;
+        isBuilt = CreateStartMenu(QFile::encodeName(directory()).constData(), nullptr);
+    }
+    if (isBuilt)
+        return true;
+    qWarning("VelMenuView: can't create the start menu");
+    if (self)
+        voice.tell(QCoreApplication::translate("VelMenuView",
+                                               "The default menu could not be built in %1. The menu was left "
+                                               "as it is.")
+                       .arg(directory()),
+                   MenuVoice::Failure);
     return true;
 }

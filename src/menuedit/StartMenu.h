@@ -5,6 +5,7 @@
 
 #include <QString>
 
+class MenuVoice;
 class QWidget;
 
 /**
@@ -17,10 +18,11 @@ QString directory();
 
 /**
  * Builds the default menu anew after asking over \a asker, which may go away meanwhile. When the
- * menu cannot be built, the old one stays and a warning is logged.
+ * menu cannot be built, the old one stays, a warning is logged, and the user is told.
  *
+ * @param voice goes with \a asker
  * @return whether the user wanted it
  */
-bool recreate(QWidget *asker);
+bool recreate(QWidget *asker, MenuVoice &voice);
 
 } // namespace StartMenu

@@ -223,7 +223,7 @@ void VelMenuView::slotExe()
 void VelMenuView::slotRecreate()
 {
     const QPointer<VelMenuView> self(this);
-    if (!StartMenu::recreate(this) || !self)
+    if (!StartMenu::recreate(this, d->voice) || !self)
         return;
     d->showAnew();
     Q_EMIT changed();

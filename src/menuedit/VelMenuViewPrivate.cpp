@@ -14,13 +14,15 @@
 #include <QGuiApplication>
 #include <QItemSelectionModel>
 #include <QMenu>
+#include <QMetaMethod>
 
 VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directory, bool isEditable)
     : q(view)
+    , voice(view, [view] { return view->isSignalConnected(QMetaMethod::fromSignal(&VelMenuView::told)); })
     , menu(directory.isEmpty() ? StartMenu::directory() : directory, isEditable, view, view)
     , selection(view, menu)
     , find(view, menu, selection)
-    , editing(view, menu, selection, find)
+    , editing(view, menu, selection, find, voice)
 {
 }
 
@@ -29,6 +31,11 @@ VelMenuViewPrivate::~VelMenuViewPrivate()
     QObject::disconnect(q, &QAbstractItemView::doubleClicked, q, &VelMenuView::slotEdit);
     const std::unique_ptr<QItemSelectionModel> former(q->selectionModel());
     q->setModel(nullptr);
+}
+
+MenuVoice &VelMenuViewPrivate::voiceOf(const VelMenuView &view)
+{
+    return view.d->voice;
 }
 
 void VelMenuViewPrivate::show()
@@ -46,6 +53,7 @@ void VelMenuViewPrivate::show()
     if (menu.isEditable())
         makeEditable();
     QObject::connect(&editing, &MenuEditing::changed, q, &VelMenuView::changed);
+    QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
                      &VelMenuView::setActionsEnabled);
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,

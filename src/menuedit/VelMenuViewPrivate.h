@@ -7,6 +7,7 @@
 #include "MenuEditing.h"
 #include "MenuFind.h"
 #include "MenuSelection.h"
+#include "MenuVoice.h"
 #include "ShownMenu.h"
 
 #include <memory>
@@ -27,7 +28,11 @@ public:
     VelMenuViewPrivate(const VelMenuViewPrivate &) = delete;
     VelMenuViewPrivate &operator=(const VelMenuViewPrivate &) = delete;
 
+    /// How the parts of \a view tell the user.
+    static MenuVoice &voiceOf(const VelMenuView &view);
+
     VelMenuView *const q;
+    MenuVoice voice;
     ShownMenu menu;
     MenuSelection selection;
     MenuFind find;

@@ -4,6 +4,7 @@
 #include "MenuDropHost.h"
 #include "ShownOrder.h"
 #include "VelMenuView.h"
+#include "VelMenuViewPrivate.h"
 
 #include <frame/GuardedDialog.h>
 
@@ -11,7 +12,6 @@
 #include <QFileSystemModel>
 #include <QMessageBox>
 #include <QSortFilterProxyModel>
-#include <QToolTip>
 
 namespace {
 
@@ -49,17 +49,21 @@ public:
     {
         if (!m_view)
             return;
+        if (result.isDone)
+            show(result);
         if (!result.complaint.isEmpty())
             tellAt(result.targets.constFirst(), result.complaint);
-        if (!result.isDone)
-            return;
+    }
+
+private:
+    void show(const DropResult &result) const
+    {
         if (result.sortAnew)
             m_view->invalidateSortOrder(result.folder);
         m_view->showAndSelect(result.targets.constFirst());
         m_view->setActionsEnabled();
     }
 
-private:
     const QSortFilterProxyModel *proxy() const
     {
         return qobject_cast<const QSortFilterProxyModel *>(m_view->model());
@@ -73,9 +77,7 @@ private:
             proxy() ? qobject_cast<const QFileSystemModel *>(proxy()->sourceModel()) : nullptr;
         if (files && QFileInfo::exists(path))
             shown = proxy()->mapFromSource(files->index(path));
-        const QRect area = shown.isValid() ? m_view->visualRect(shown) : QRect();
-        const QPoint place = area.isValid() ? area.bottomLeft() : m_view->viewport()->rect().center();
-        QToolTip::showText(m_view->viewport()->mapToGlobal(place), text, m_view->viewport());
+        VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown);
     }
 
     VelMenuView *const m_view;
