@@ -34,6 +34,7 @@ class VelMenuDialogPrivate;
 class VELUIEXTRA_EXPORT VelMenuDialog : public QDialog
 {
     Q_OBJECT
+    Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:
     /**
@@ -62,6 +63,17 @@ public:
 
     /// The menu directory shown.
     QString menuDir() const;
+
+    /// Whether the dialog helps its users beyond the plain one; see setAssistance().
+    bool assistance() const;
+
+    /**
+     * Switches on what helps users beyond the plain dialog, in its view too
+     * (VelMenuView::setAssistance()). Off, as it is at first, the dialog has nothing of that.
+     *
+     * @param assistance whether the dialog is to help
+     */
+    void setAssistance(bool assistance);
 
     /// The path of the first selected item; empty when nothing is selected.
     QString selectedItemPath() const;

@@ -38,6 +38,7 @@ class VelMenuViewPrivate;
 class VELUIEXTRA_EXPORT VelMenuView : public QTreeView
 {
     Q_OBJECT
+    Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:
     /**
@@ -72,6 +73,17 @@ public:
      * @param parent the widget that the view belongs to; null leaves it where it is
      */
     void init(const QString &menuDir, int iconSize, bool editable, QWidget *parent);
+
+    /// Whether the view helps its users beyond the plain tree; see setAssistance().
+    bool assistance() const;
+
+    /**
+     * Switches on what helps users beyond the plain tree. Off, as it is at first, the view has
+     * nothing of that. A further init() keeps it as it is.
+     *
+     * @param assistance whether the view is to help
+     */
+    void setAssistance(bool assistance);
 
     /// The menu directory that the view was built on, as it was given.
     QString menuDir() const;

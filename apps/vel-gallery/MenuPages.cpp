@@ -9,6 +9,7 @@
 #include <VelMenuView.h>
 
 #include <QAction>
+#include <QCheckBox>
 #include <QCoreApplication>
 #include <QLabel>
 #include <QPushButton>
@@ -46,10 +47,13 @@ public:
         }
         auto *path = plainLabel(this);
         connect(m_view, &VelMenuView::selectionChanged, path, &QLabel::setText);
+        auto *assistance = new QCheckBox(PageTexts::tr("&Assistance"), this);
+        connect(assistance, &QCheckBox::toggled, m_view, &VelMenuView::setAssistance);
 
         auto *layout = new QVBoxLayout(this);
         layout->addWidget(toolBar);
         layout->addWidget(m_view, 1);
+        layout->addWidget(assistance);
         layout->addWidget(path);
     }
 
@@ -71,6 +75,7 @@ class MenuDialogsPage : public QWidget
 public:
     explicit MenuDialogsPage(QWidget *parent)
         : QWidget(parent)
+        , m_assistance(new QCheckBox(PageTexts::tr("&Assistance"), this))
         , m_result(plainLabel(this))
     {
         auto *layout = new QVBoxLayout(this);
@@ -82,6 +87,7 @@ public:
         addButton(PageTexts::tr("&Pick an entry..."), &MenuDialogsPage::pickEntry);
         addButton(PageTexts::tr("Edit the &menu..."), &MenuDialogsPage::editMenu);
         addButton(PageTexts::tr("Edit an e&ntry..."), &MenuDialogsPage::editEntry);
+        layout->addWidget(m_assistance);
         layout->addWidget(m_result);
         layout->addStretch(1);
     }
@@ -90,6 +96,7 @@ private:
     void pickEntry()
     {
         VelMenuDialog dialog(m_menu.path(), -1, false, false, this);
+        dialog.setAssistance(m_assistance->isChecked());
         if (dialog.exec() == QDialog::Accepted)
             m_result->setText(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr));
     }
@@ -97,6 +104,7 @@ private:
     void editMenu()
     {
         VelMenuDialog dialog(m_menu.path(), -1, true, true, this);
+        dialog.setAssistance(m_assistance->isChecked());
         dialog.exec();
     }
 
@@ -108,6 +116,7 @@ private:
     }
 
     const SampleFolder m_menu{QStringLiteral("menu")};
+    QCheckBox *const m_assistance;
     QLabel *const m_result;
 };
 
@@ -122,6 +131,7 @@ GalleryPage menuViewPage()
     page.snippet = QStringLiteral(R"(auto *view = new VelMenuView(directory, -1, true, page);
 connect(view, &VelMenuView::selectionChanged,
         label, &QLabel::setText);
+view->setAssistance(true); // more help for its user
 
 for (QAction *action : view->actions())
     toolBar->addAction(action);)");
@@ -143,6 +153,7 @@ if (picker.exec() == QDialog::Accepted)
 
 // Edit the menu; one Close button.
 VelMenuDialog editor(directory, -1, true, true, this);
+editor.setAssistance(true); // more help for its user
 editor.exec();
 
 // Edit one entry, or create it.

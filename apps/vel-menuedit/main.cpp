@@ -58,6 +58,7 @@ void print(const QString &line)
 int showDialog(const Options &options)
 {
     VelMenuDialog dialog(options.dir, options.iconSize, options.editable, !options.pick, nullptr, Qt::Window);
+    dialog.setAssistance(true);
     QObject::connect(new QShortcut(QKeySequence(Qt::Key_F1), &dialog), &QShortcut::activated, &dialog,
                      &VelMenuDialog::helpSlot);
     const bool accepted = dialog.exec() == QDialog::Accepted;

@@ -163,6 +163,16 @@ VelMenuDialog::~VelMenuDialog()
     updateWM();
 }
 
+bool VelMenuDialog::assistance() const
+{
+    return d->view->assistance();
+}
+
+void VelMenuDialog::setAssistance(bool assistance)
+{
+    d->view->setAssistance(assistance);
+}
+
 QString VelMenuDialog::menuDir() const
 {
     return d->view->menuDir();

@@ -38,7 +38,9 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
 {
     if (parent && parent != parentWidget())
         setParent(parent);
+    const bool isAssisted = d && d->isAssisted;
     d.reset(new VelMenuViewPrivate(this, menuDir, editable));
+    d->isAssisted = isAssisted;
 
     setDefaultDropAction(Qt::MoveAction);
     setHeaderHidden(true);
@@ -47,6 +49,16 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
         setIconSize(QSize(iconSize, iconSize));
     setDragDropMode(editable ? QAbstractItemView::DragDrop : QAbstractItemView::NoDragDrop);
     d->show();
+}
+
+bool VelMenuView::assistance() const
+{
+    return d->isAssisted;
+}
+
+void VelMenuView::setAssistance(bool assistance)
+{
+    d->isAssisted = assistance;
 }
 
 QString VelMenuView::menuDir() const

@@ -32,6 +32,8 @@ public:
     static MenuVoice &voiceOf(const VelMenuView &view);
 
     VelMenuView *const q;
+    /// See VelMenuView::setAssistance().
+    bool isAssisted = false;
     MenuVoice voice;
     ShownMenu menu;
     MenuSelection selection;

@@ -35,6 +35,7 @@ private Q_SLOTS:
     void remembersItsSize();
     void opensTheHelp();
     void hasPublicSlotsInOrder();
+    void passesAssistanceOn();
 };
 
 void tst_VelMenuDialog::picksFromTheStartMenuByDefault()
@@ -258,6 +259,17 @@ void tst_VelMenuDialog::hasPublicSlotsInOrder()
                            "setActionsEnabled()", "slotDirNew()", "slotFileNew()", "slotEdit()", "slotDel()",
                            "slotExe()", "slotCut()", "slotCopy()", "slotPaste()", "slotUp()", "slotDown()",
                            "slotRecreate()", "slotFind()", "slotFindNext()", "selectionChangedSlot()"}));
+}
+
+void tst_VelMenuDialog::passesAssistanceOn()
+{
+    VelMenuDialog dialog(menu(), -1, true, true);
+    const auto *view = dialog.findChild<VelMenuView *>();
+    QCOMPARE(dialog.property("assistance"), QVariant(false));
+    QVERIFY(!view->assistance());
+    QVERIFY(dialog.setProperty("assistance", true));
+    QVERIFY(dialog.assistance());
+    QVERIFY(view->assistance());
 }
 
 VEL_TEST_MAIN(tst_VelMenuDialog)

@@ -41,6 +41,7 @@ private Q_SLOTS:
     void passesOnThatFilesWereDropped();
     void startsAfreshOnAnotherDirectory();
     void goesAwayWhileItLoads();
+    void assistsWhenTold();
 };
 
 void tst_VelMenuView::showsNothingAndMakesNothingWhereThereIsNoDirectory()
@@ -330,6 +331,18 @@ void tst_VelMenuView::goesAwayWhileItLoads()
         QVERIFY(!rows && !entries);
     }
     QCoreApplication::processEvents();
+}
+
+void tst_VelMenuView::assistsWhenTold()
+{
+    VelMenuView view(menu(), -1, true);
+    QCOMPARE(view.property("assistance"), QVariant(false));
+    QVERIFY(view.setProperty("assistance", true));
+    QVERIFY(view.assistance());
+    view.init(menu(), -1, true, nullptr);
+    QVERIFY(view.assistance());
+    view.setAssistance(false);
+    QCOMPARE(view.property("assistance"), QVariant(false));
 }
 
 VEL_TEST_MAIN(tst_VelMenuView)
