@@ -4,8 +4,10 @@
 #include "FileTransfer.h"
 
 #include "OnDisk.h"
+#include "StagingFolder.h"
 #include "TreeCopy.h"
 #include "TreeLimits.h"
+#include "TreeRemoval.h"
 
 #include <QDir>
 #include <QFile>
@@ -63,7 +65,7 @@ void takeBack(const QVector<Pair> &done, Action action)
 {
     for (auto it = done.crbegin(); it != done.crend(); ++it) {
         if (action == Action::Copy)
-            TreeCopy::removeTree(native(it->target));
+            TreeRemoval::remove(native(it->target));
         else
             TreeCopy::move(native(it->target), native(it->source));
     }
@@ -116,7 +118,7 @@ Result transfer(const QStringList &sources, const QString &targetDirectory, Acti
     Result possible = check(sources, targetDirectory);
     if (!possible.succeeded())
         return possible;
-    TreeCopy::removeLeftovers(native(targetDirectory));
+    StagingFolder::removeLeftovers(native(targetDirectory));
     QVector<Pair> done;
     for (const QString &source : sources) {
         if (liesIn(source, targetDirectory))

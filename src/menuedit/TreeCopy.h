@@ -7,7 +7,7 @@
 #include <system_error>
 
 /**
- * Copying, moving and removing of one file or folder with everything in it, on the bytes that
+ * Copying and moving of one file or folder with everything in it, on the bytes that
  * the file system knows: names that are no valid text are carried along like any other.
  *
  * No operation overwrites anything; a target that exists is errc::file_exists.
@@ -23,12 +23,5 @@ std::error_code copy(const Path &source, const Path &target);
 /// Moves \a source to \a target, by copying where they lie on different file systems. The permissions
 /// stay, set-id bits only together with owner and group.
 std::error_code move(const Path &source, const Path &target);
-
-/// Removes \a path, folders that may not be written included.
-void removeTree(const Path &path);
-
-/// Removes from \a directory what copies left there when they were killed: folders of this user's
-/// that nobody uses and nobody has touched for an hour.
-void removeLeftovers(const Path &directory);
 
 } // namespace TreeCopy

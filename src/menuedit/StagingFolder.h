@@ -1,0 +1,36 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <filesystem>
+#include <system_error>
+
+/**
+ * A hidden folder of ours in the target directory, in which a copy is made ready. The lock on it
+ * tells that it is in use, however long the copying takes.
+ */
+class StagingFolder
+{
+public:
+    /// Makes one in \a directory.
+    explicit StagingFolder(const std::filesystem::path &directory);
+    /// Removes it with what is in it.
+    ~StagingFolder();
+    StagingFolder(const StagingFolder &) = delete;
+    StagingFolder &operator=(const StagingFolder &) = delete;
+
+    /// Why there is none.
+    std::error_code error() const { return m_error; }
+    /// The one path in it that is used.
+    std::filesystem::path item() const { return m_path / "item"; }
+
+    /// Removes from \a directory what copies left there when they were killed: folders of this
+    /// user's that nobody uses and nobody has touched for an hour.
+    static void removeLeftovers(const std::filesystem::path &directory);
+
+private:
+    std::filesystem::path m_path;
+    int m_folder = -1;
+    std::error_code m_error;
+};
