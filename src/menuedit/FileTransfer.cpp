@@ -65,7 +65,7 @@ void takeBack(const QVector<Pair> &done, Action action)
 {
     for (auto it = done.crbegin(); it != done.crend(); ++it) {
         if (action == Action::Copy)
-            TreeRemoval::remove(native(it->target));
+            TreeRemoval::removeOwn(native(it->target));
         else
             TreeCopy::move(native(it->target), native(it->source));
     }

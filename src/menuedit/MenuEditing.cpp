@@ -7,6 +7,7 @@
 #include "MenuFind.h"
 #include "MenuSelection.h"
 #include "ShownMenu.h"
+#include "TreeRemoval.h"
 #include "VelDesktopEntryEditDialog.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
@@ -154,7 +155,7 @@ void MenuEditing::remove(const QString &path)
     const QFileInfo info(path);
     // A link to a folder is removed as a file is: what it leads to is not ours to delete.
     if (info.isDir() && !info.isSymLink())
-        QDir(path).removeRecursively();
+        TreeRemoval::remove(QFile::encodeName(path).toStdString());
     else
         m_menu.files().remove(m_menu.files().index(path));
     m_menu.files().forgetItemInfo(path);

@@ -65,7 +65,7 @@ StagingFolder::StagingFolder(const std::filesystem::path &directory)
 StagingFolder::~StagingFolder()
 {
     if (!m_path.empty())
-        TreeRemoval::remove(m_path);
+        TreeRemoval::removeOwn(m_path);
     if (m_folder >= 0)
         ::close(m_folder);
 }
@@ -77,6 +77,6 @@ void StagingFolder::removeLeftovers(const std::filesystem::path &directory)
         return;
     for (const std::string &name : OpenFolder::namesIn(folder.get())) {
         if (isLeftover(::dirfd(folder.get()), name))
-            TreeRemoval::removeAt(::dirfd(folder.get()), name);
+            TreeRemoval::removeOwnAt(::dirfd(folder.get()), name);
     }
 }

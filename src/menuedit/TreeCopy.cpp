@@ -130,7 +130,7 @@ std::error_code moveByCopying(const Path &source, const Path &target)
     if ((error = copyByStaging(source, target, Kind::Move)))
         return error;
     if ((error = renameToNew(source, leaving.item())))
-        TreeRemoval::remove(target);
+        TreeRemoval::removeOwn(target);
     return error;
 }
 

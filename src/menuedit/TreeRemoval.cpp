@@ -3,6 +3,7 @@
 
 #include "TreeRemoval.h"
 
+#include "FileDescriptor.h"
 #include "OpenFolder.h"
 
 #include <cerrno>
@@ -13,22 +14,72 @@
 
 namespace TreeRemoval {
 
-void remove(const std::filesystem::path &path)
-{
-    removeAt(AT_FDCWD, path.string());
-}
+namespace {
 
 // By open folders, not by paths: another user may put a link in the place of what was looked at.
-void removeAt(int parent, const std::string &name)
+class Removal
 {
-    if (::unlinkat(parent, name.c_str(), 0) == 0 || errno != EISDIR)
-        return;
-    ::fchmodat(parent, name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
-    if (const OpenFolder::Stream folder = OpenFolder::open(parent, name.c_str())) {
-        for (const std::string &child : OpenFolder::namesIn(folder.get()))
-            removeAt(::dirfd(folder.get()), child);
+public:
+    enum class Rights { AsTheyAre, Taken };
+
+    explicit Removal(Rights rights)
+        : m_takesRights(rights == Rights::Taken)
+    {
     }
-    ::unlinkat(parent, name.c_str(), AT_REMOVEDIR);
+
+    void removeAt(int parent, const std::string &name, const Path &path);
+
+    const Result &result() const { return m_result; }
+
+private:
+    void note(const std::error_code &error, const Path &path);
+
+    const bool m_takesRights;
+    Result m_result;
+};
+
+void Removal::removeAt(int parent, const std::string &name, const Path &path)
+{
+    if (::unlinkat(parent, name.c_str(), 0) == 0)
+        return;
+    if (errno != EISDIR)
+        return note(lastError(), path);
+    if (m_takesRights)
+        ::fchmodat(parent, name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
+    const OpenFolder::Stream folder = OpenFolder::open(parent, name.c_str());
+    const std::error_code closed = folder ? std::error_code() : lastError();
+    if (folder) {
+        for (const std::string &child : OpenFolder::namesIn(folder.get()))
+            removeAt(::dirfd(folder.get()), child, path / child);
+    }
+    if (::unlinkat(parent, name.c_str(), AT_REMOVEDIR) != 0)
+        note(closed ? closed : lastError(), path);
+}
+
+// What lies in a folder comes before the folder, which then only tells that it is not empty.
+void Removal::note(const std::error_code &error, const Path &path)
+{
+    if (error != std::errc::no_such_file_or_directory && m_result.succeeded())
+        m_result = {error, path};
+}
+
+} // namespace
+
+Result remove(const Path &path)
+{
+    Removal removal(Removal::Rights::AsTheyAre);
+    removal.removeAt(AT_FDCWD, path.string(), path);
+    return removal.result();
+}
+
+void removeOwn(const Path &path)
+{
+    removeOwnAt(AT_FDCWD, path.string());
+}
+
+void removeOwnAt(int parent, const std::string &name)
+{
+    Removal(Removal::Rights::Taken).removeAt(parent, name, name);
 }
 
 } // namespace TreeRemoval

@@ -5,17 +5,34 @@
 
 #include <filesystem>
 #include <string>
+#include <system_error>
 
 /**
- * Removing of one file or folder with everything in it, on the bytes that the file system knows.
- * Links are removed, not followed.
+ * Removing of one file or folder with everything in it, on the bytes that the file system knows:
+ * names that are no valid text go like any other. Links are removed, not followed.
  */
 namespace TreeRemoval {
 
-/// Removes \a path, folders that may not be written included.
-void remove(const std::filesystem::path &path);
+using Path = std::filesystem::path;
+
+/// What came of a removal.
+struct Result
+{
+    /// Why something is still there; no error when nothing is.
+    std::error_code error;
+    /// The first path that could not be removed.
+    Path path;
+
+    bool succeeded() const { return !error; }
+};
+
+/// Removes \a path as far as the user may; goes on after what cannot be removed.
+Result remove(const Path &path);
+
+/// Removes what is ours, folders that may not be written included.
+void removeOwn(const Path &path);
 
 /// The same for \a name in the open folder \a parent.
-void removeAt(int parent, const std::string &name);
+void removeOwnAt(int parent, const std::string &name);
 
 } // namespace TreeRemoval

@@ -10,6 +10,9 @@
 #include <QMessageBox>
 #include <QSignalSpy>
 
+#include <sys/stat.h>
+#include <unistd.h>
+
 /// Deleting.
 class tst_VelMenuViewDelete : public EditTestCase
 {
@@ -28,6 +31,7 @@ private Q_SLOTS:
     void selectsNothingWhenTheDeletedRowGoes();
     void leavesTheKeyboardAtTheFolderOfAnOnlyChild_data();
     void leavesTheKeyboardAtTheFolderOfAnOnlyChild();
+    void deletesNamesThatAreNoText();
     void goesAwayWhileItAsksToDelete();
 };
 
@@ -220,6 +224,23 @@ void tst_VelMenuViewDelete::leavesTheKeyboardAtTheFolderOfAnOnlyChild()
     QVERIFY(!view.selectedItem().isValid());
     QCOMPARE(view.currentIndex(), keyboardAt.isEmpty() ? QModelIndex() : shown(view, menu() + keyboardAt));
     QVERIFY(view.currentIndex() != view.rootIndex());
+}
+
+void tst_VelMenuViewDelete::deletesNamesThatAreNoText()
+{
+    writeLetters("b", QStringLiteral("sub/"));
+    const QByteArray sub = QFile::encodeName(menu() + QLatin1String("/sub"));
+    QCOMPARE(mkdir((sub + "/bad\xff").constData(), 0777), 0);
+    QCOMPARE(mknod((sub + "/bad\xff/no\xfe.desktop").constData(), S_IFREG | 0600, 0), 0);
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    select(view, menu() + QLatin1String("/sub"));
+    ModalDriver modal;
+    announceDeleteQuestion(modal, QMessageBox::Yes);
+    view.slotDel();
+    QVERIFY(modal.finished());
+    QVERIFY(access(sub.constData(), F_OK) != 0);
+    QTRY_COMPARE(names(view, menu()), QStringList());
 }
 
 void tst_VelMenuViewDelete::goesAwayWhileItAsksToDelete()
