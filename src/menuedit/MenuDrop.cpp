@@ -14,6 +14,8 @@
 #include <QPointer>
 #include <QUrl>
 
+#include <algorithm>
+
 namespace {
 
 QString failureText(const FileTransfer::Result &result, Qt::DropAction action)
@@ -57,16 +59,23 @@ MenuDrop::MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &ho
 
 DropResult MenuDrop::carryOut()
 {
-    if (FileTransfer::liesIn(m_request.sources.constFirst(), m_folder))
+    const QStringList &sources = m_request.sources;
+    if (std::all_of(sources.begin(), sources.end(), [this](const QString &source) { return isHere(source); }))
         return reorder();
     if (m_model.isReadOnly())
         return {};
-    if (QFileInfo::exists(m_targets.constFirst()) && !confirm())
+    if (!isHere(sources.constFirst()) && QFileInfo::exists(m_targets.constFirst()) && !confirm())
         return {};
     return bringIn();
 }
 
-// What lies in the folder already only takes another place in its order.
+bool MenuDrop::isHere(const QString &source) const
+{
+    return !source.isEmpty() && FileTransfer::liesIn(source, m_folder);
+}
+
+// What lies in the folder already only takes another place in its order. Where there is more that
+// does not, the first does so along with it.
 DropResult MenuDrop::reorder()
 {
     // What is gone must not be listed.
@@ -83,7 +92,8 @@ DropResult MenuDrop::bringIn()
     const FileTransfer::Result possible = FileTransfer::check(m_request.sources, m_folder);
     if (!possible.succeeded())
         return refused(possible);
-    const bool isListed = m_request.row != -1;
+    const bool isListed =
+        isHere(m_request.sources.constFirst()) ? m_request.action == Qt::MoveAction : m_request.row != -1;
     std::optional<QStringList> order;
     if (isListed)
         order =
@@ -130,8 +140,10 @@ FileTransfer::Result MenuDrop::transfer()
 bool MenuDrop::link()
 {
     QList<QUrl> urls;
-    for (const QString &source : m_request.sources)
-        urls.append(QUrl::fromLocalFile(source));
+    for (const QString &source : qAsConst(m_request.sources)) {
+        if (!isHere(source))
+            urls.append(QUrl::fromLocalFile(source));
+    }
     QMimeData data;
     data.setUrls(urls);
     return m_model.QFileSystemModel::dropMimeData(&data, m_request.action, m_request.row, 0,

@@ -36,6 +36,7 @@ public:
     DropResult carryOut();
 
 private:
+    bool isHere(const QString &source) const;
     DropResult reorder();
     DropResult bringIn();
     bool confirm();

@@ -57,6 +57,9 @@ private Q_SLOTS:
     void writesTheOrderOnlyWhenTheFilesAreThere();
     void onlyReordersInTheOwnFolder();
     void leavesTheOrderOfACopyInTheOwnFolder();
+    void bringsInWhatLiesElsewhereBesideTheFirst_data();
+    void bringsInWhatLiesElsewhereBesideTheFirst();
+    void refusesAllWhereOneOfTheOthersExists();
     void doesNothingInAReadOnlyModel();
     void asksOnlyAboutTheFirstTarget();
     void doesNothingWithoutAYes();
@@ -182,6 +185,51 @@ void tst_MenuDrop::leavesTheOrderOfACopyInTheOwnFolder()
 
     QVERIFY(result.isDone);
     QVERIFY(m_host.places.isEmpty());
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::bringsInWhatLiesElsewhereBesideTheFirst_data()
+{
+    QTest::addColumn<Qt::DropAction>("action");
+    QTest::addColumn<int>("row");
+    QTest::addColumn<bool>("isListed");
+    QTest::newRow("move between rows") << Qt::MoveAction << 0 << true;
+    QTest::newRow("move onto the folder") << Qt::MoveAction << -1 << true;
+    QTest::newRow("copy between rows") << Qt::CopyAction << 0 << false;
+    QTest::newRow("copy onto the folder") << Qt::CopyAction << -1 << false;
+    QTest::newRow("link") << Qt::LinkAction << -1 << false;
+}
+
+// The first takes its place as it does alone.
+void tst_MenuDrop::bringsInWhatLiesElsewhereBesideTheFirst()
+{
+    QFETCH(Qt::DropAction, action);
+    QFETCH(int, row);
+    QFETCH(bool, isListed);
+    const DropResult result =
+        drop({QStringLiteral("to/a"), QStringLiteral("from/x"), QStringLiteral("from/y")}, action, row);
+    QVERIFY(result.isDone);
+    QCOMPARE(result.complaint, QString());
+    QCOMPARE(m_host.questions, QStringList());
+    for (const char *name : {"x", "y"}) {
+        QCOMPARE(read(path(QStringLiteral("to/") + QLatin1String(name))), QByteArray("from/") + name);
+        QCOMPARE(QFile::exists(path(QStringLiteral("from/") + QLatin1String(name))),
+                 action != Qt::MoveAction);
+    }
+    QCOMPARE(read(path(QStringLiteral("to/a"))), QByteArray("to/a"));
+    QCOMPARE(record() == Record + "SortOrder=*;a;\n", isListed);
+    QCOMPARE(record() == Record, !isListed);
+}
+
+void tst_MenuDrop::refusesAllWhereOneOfTheOthersExists()
+{
+    write(QStringLiteral("to/y"), "mine");
+    const DropResult result =
+        drop({QStringLiteral("to/a"), QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::MoveAction, 0);
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint,
+             path(QStringLiteral("to/y")) + QStringLiteral(" exists and was left as it is."));
+    QVERIFY(QFile::exists(path(QStringLiteral("from/x"))) && !QFile::exists(path(QStringLiteral("to/x"))));
     QCOMPARE(record(), Record);
 }
 

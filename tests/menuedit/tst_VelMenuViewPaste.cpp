@@ -27,13 +27,29 @@ private Q_SLOTS:
     void movesEveryNameThatAFileMayHave_data();
     void movesEveryNameThatAFileMayHave();
     void pastesWhatOtherProgramsCopied();
+    void movesAllThatWereCutBesideOneOfThem();
+    void keepsACutOfWhichOneIsRefused();
     void pastesNothing_data();
     void pastesNothing();
     void keepsEverythingWhenAPasteIsRefused_data();
     void keepsEverythingWhenAPasteIsRefused();
     void goesAwayWhileItAsksToOverwrite();
     void keepsPlaceInALargeFolder();
+
+private:
+    static void cut(const QStringList &paths);
 };
+
+void tst_VelMenuViewPaste::cut(const QStringList &paths)
+{
+    QList<QUrl> urls;
+    for (const QString &path : paths)
+        urls.append(QUrl::fromLocalFile(path));
+    auto *data = new QMimeData;
+    data->setUrls(urls);
+    data->setData(QStringLiteral("text/uri-move-list"), data->data(QStringLiteral("text/uri-list")));
+    QGuiApplication::clipboard()->setMimeData(data);
+}
 
 void tst_VelMenuViewPaste::movesACutItemBesideTheSelectedFile()
 {
@@ -164,6 +180,35 @@ void tst_VelMenuViewPaste::pastesWhatOtherProgramsCopied()
     view.slotPaste();
     QVERIFY(QFile::exists(foreign));
     QVERIFY(QFile::exists(m_sub + QLatin1String("/f 1%.desktop")));
+}
+
+void tst_VelMenuViewPaste::movesAllThatWereCutBesideOneOfThem()
+{
+    const QString other = write(QStringLiteral("outside/o.desktop"), entryText(QStringLiteral("O")));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 2));
+    cut({m_sub + QLatin1String("/y.desktop"), m_a, other});
+    select(view, m_sub);
+    view.slotPaste();
+    QVERIFY(!QFile::exists(m_a) && !QFile::exists(other));
+    QVERIFY(QFile::exists(m_sub + QLatin1String("/a.desktop")));
+    QVERIFY(QFile::exists(m_sub + QLatin1String("/o.desktop")));
+    QCOMPARE(view.dndFormat(QGuiApplication::clipboard()->mimeData()), QString());
+}
+
+void tst_VelMenuViewPaste::keepsACutOfWhichOneIsRefused()
+{
+    const QString other = write(QStringLiteral("outside/x.desktop"), entryText(QStringLiteral("O")));
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 2));
+    cut({m_sub + QLatin1String("/y.desktop"), m_a, other});
+    select(view, m_sub);
+    QSignalSpy changes(&view, &VelMenuView::changed);
+    view.slotPaste();
+    QVERIFY(QFile::exists(m_a) && QFile::exists(other));
+    QVERIFY(!QFile::exists(m_sub + QLatin1String("/a.desktop")));
+    QCOMPARE(changes.count(), 0);
+    QCOMPARE(view.dndFormat(QGuiApplication::clipboard()->mimeData()), QStringLiteral("text/uri-move-list"));
 }
 
 void tst_VelMenuViewPaste::pastesNothing_data()
