@@ -190,6 +190,13 @@ public:
     /// Shows the edit menu where the view is editable.
     void contextMenuEvent(QContextMenuEvent *event) override;
 
+    /**
+     * Return and Enter open or close a folder and, where the view is editable, edit an entry; F2
+     * edits both. Where the view is not editable, an entry leaves the keys to the window, whose
+     * default button may pick it.
+     */
+    void keyPressEvent(QKeyEvent *event) override;
+
     /// Asks what is to be done with the dropped files and does it.
     void dropEvent(QDropEvent *event) override;
 

@@ -18,6 +18,7 @@
 #include <QAction>
 #include <QDialogButtonBox>
 #include <QFile>
+#include <QFileInfo>
 #include <QFileSystemModel>
 #include <QIcon>
 #include <QPushButton>
@@ -54,6 +55,7 @@ public:
     void buildToolBar();
     void addAction(const char *name);
     void connectButtons();
+    void pick(const QModelIndex &shown) const;
     QString title(const QString &dir) const;
     QPushButton *button(QDialogButtonBox::StandardButton which) const { return buttonBox->button(which); }
     QString pathOf(const QModelIndex &shown) const;
@@ -107,6 +109,14 @@ void VelMenuDialogPrivate::connectButtons()
     }
 }
 
+// A folder is opened by a double click, whatever it is called.
+void VelMenuDialogPrivate::pick(const QModelIndex &shown) const
+{
+    QPushButton *ok = button(QDialogButtonBox::Ok);
+    if (ok && ok->isEnabled() && !QFileInfo(pathOf(shown)).isDir())
+        ok->click();
+}
+
 QString VelMenuDialogPrivate::title(const QString &dir) const
 {
     QString text;
@@ -146,6 +156,9 @@ VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bo
     layout->addWidget(d->buttonBox);
     connect(d->view->selectionModel(), &QItemSelectionModel::selectionChanged, this,
             &VelMenuDialog::selChanged);
+    if (!editable)
+        connect(d->view, &QAbstractItemView::doubleClicked, this,
+                [this](const QModelIndex &shown) { d->pick(shown); });
     d->connectButtons();
     setWindowTitle(d->title(shownDir));
     setWindowIcon(QIcon::fromTheme(QStringLiteral("velmenuedit")));

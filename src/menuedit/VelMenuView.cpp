@@ -14,6 +14,7 @@
 
 #include <QContextMenuEvent>
 #include <QDropEvent>
+#include <QKeyEvent>
 #include <QMenu>
 #include <QPointer>
 
@@ -206,6 +207,15 @@ QString VelMenuView::dndFormat(const QMimeData *mimeData) const
 QList<QUrl> VelMenuView::dndUrls(const QMimeData *mimeData, const QString &format) const
 {
     return MenuClipboard::urls(mimeData, format);
+}
+
+void VelMenuView::keyPressEvent(QKeyEvent *event)
+{
+    const QPointer<VelMenuView> self(this);
+    QTreeView::keyPressEvent(event);
+    // What the base ignores would go on to the default button of a dialog.
+    if (!event->isAccepted() && self && d->takeKey(*event))
+        event->accept();
 }
 
 void VelMenuView::dropEvent(QDropEvent *event)

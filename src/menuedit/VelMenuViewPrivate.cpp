@@ -3,6 +3,7 @@
 
 #include "VelMenuViewPrivate.h"
 
+#include "ItemKey.h"
 #include "MenuReordering.h"
 #include "StartMenu.h"
 #include "VelMenuModel.h"
@@ -11,8 +12,11 @@
 
 #include <QAction>
 #include <QClipboard>
+#include <QCoreApplication>
+#include <QFileInfo>
 #include <QGuiApplication>
 #include <QItemSelectionModel>
+#include <QKeyEvent>
 #include <QMenu>
 #include <QMetaMethod>
 
@@ -79,6 +83,38 @@ void VelMenuViewPrivate::moveSelected(bool up)
     find.clear();
     q->setActionsEnabled();
     Q_EMIT q->changed();
+}
+
+bool VelMenuViewPrivate::takeKey(const QKeyEvent &event)
+{
+    const QModelIndex current = q->currentIndex();
+    if (!current.isValid())
+        return false;
+    const bool isFolder = menu.files().isDir(menu.proxy().mapToSource(current));
+    const ItemKey::Use use = ItemKey::of(event.key(), event.modifiers(), menu.isEditable(), isFolder);
+    // A key that is held does it once.
+    if (use == ItemKey::Use::None || event.isAutoRepeat())
+        return use != ItemKey::Use::None;
+    if (use == ItemKey::Use::Toggle)
+        q->setExpanded(current, !q->isExpanded(current));
+    else
+        editCurrent();
+    return true;
+}
+
+void VelMenuViewPrivate::editCurrent()
+{
+    if (!q->selectionModel()->isSelected(q->currentIndex()))
+        selection.select(q->currentIndex());
+    if (actions->action(MenuActions::Edit)->isEnabled()) {
+        q->slotEdit();
+        return;
+    }
+    const QFileInfo info(selection.path());
+    voice.tell(QCoreApplication::translate("VelMenuView",
+                                           "%1 cannot be edited, because the folder %2 may not be written.")
+                   .arg(info.filePath(), info.isDir() ? info.filePath() : info.path()),
+               MenuVoice::Failure, q->currentIndex());
 }
 
 void VelMenuViewPrivate::makeEditable()

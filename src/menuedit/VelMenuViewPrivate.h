@@ -12,6 +12,7 @@
 
 #include <memory>
 
+class QKeyEvent;
 class VelMenuView;
 
 /**
@@ -47,8 +48,11 @@ public:
     /// Shows the menu directory after it was replaced.
     void showAnew();
     void moveSelected(bool up);
+    /// Does what a key does to the item that the keyboard is on; whether it does anything.
+    bool takeKey(const QKeyEvent &event);
 
 private:
+    void editCurrent();
     void makeEditable();
     void connectActions();
     void connectFiles();
