@@ -24,7 +24,8 @@ class VelMenuDialogPrivate;
  * Return, Enter and a double click on an entry pick it, or edit it in an editor, which they never
  * close; Return and Enter on a folder open or close it.
  *
- * The dialog remembers its size in the application's default QSettings. When it is destroyed
+ * The dialog remembers its size in the application's default QSettings, and is cut to the screen
+ * when it is shown. When it is destroyed
  * it tells the window manager to read the menu again, if its directory is the start menu, the
  * desktop folder or the tool bar; a message box appears when nobody takes the command.
  *

@@ -8,10 +8,12 @@
 #include <QLabel>
 #include <QListWidget>
 #include <QPlainTextEdit>
+#include <QScreen>
 #include <QScrollArea>
 #include <QScrollBar>
 #include <QSplitter>
 #include <QStackedWidget>
+#include <QStyle>
 #include <QVBoxLayout>
 
 namespace {
@@ -91,6 +93,12 @@ bool GalleryWindow::showPage(const QString &name)
         }
     }
     return false;
+}
+
+void GalleryWindow::fitToScreen()
+{
+    const QSize frame(0, style()->pixelMetric(QStyle::PM_TitleBarHeight, nullptr, this));
+    resize(size().boundedTo(screen()->availableSize() - frame));
 }
 
 QWidget *GalleryWindow::currentPage() const

@@ -25,6 +25,8 @@ public:
 
     /// Shows the page \a name, making it first if need be; false when there is none.
     bool showPage(const QString &name);
+    /// Cuts the window to its screen; pictures are taken of the whole one.
+    void fitToScreen();
     /// The widget of the page that is shown.
     QWidget *currentPage() const;
 

@@ -89,6 +89,7 @@ int run(const Options &options, const QStringList &arguments)
     GalleryWindow window(pages, options.context);
     if (!options.page.isEmpty())
         window.showPage(options.page);
+    window.fitToScreen();
     window.show();
     return QApplication::exec();
 }

@@ -11,7 +11,12 @@ class QWidget;
 /// The size that a dialog remembers in the application's default QSettings, as "Width" and "Height".
 namespace DialogSize {
 
-/// Gives \a dialog the size kept under \a group, or \a fallback where none is; no number counts as 0.
+/**
+ * Gives \a dialog the size kept under \a group, or \a fallback where none is; no number counts as 0.
+ *
+ * What is larger than the screen is cut to it when the dialog is first shown: the size may have been
+ * kept on another screen.
+ */
 void restore(QWidget &dialog, const QString &group, QSize fallback);
 
 /**

@@ -4,6 +4,7 @@
 #include "GalleryPages.h"
 #include "GalleryWindow.h"
 #include "TestCase.h"
+#include "XDoTool.h"
 
 #include <ShortcutsModel.h>
 #include <VelRadioGroupBox.h>
@@ -19,6 +20,8 @@
 #include <QProcess>
 #include <QProcessEnvironment>
 #include <QPushButton>
+#include <QRegularExpression>
+#include <QScreen>
 #include <QSet>
 #include <QSettings>
 #include <QSpinBox>
@@ -76,6 +79,7 @@ private Q_SLOTS:
     void saysThatTheSettingsFileCannotBeOpened();
     void givesAKeyThatIsNoActionsToTheUser();
     void writesPicturesInEveryCombination();
+    void fitsOnASmallScreen();
     void showsItsHelpWithoutADisplay();
     void refusesAnUnknownOption_data();
     void refusesAnUnknownOption();
@@ -269,6 +273,29 @@ void tst_vel_gallery::writesPicturesInEveryCombination()
     QVERIFY(dark.pixelColor(2, 2).lightness() < 100);
     QVERIFY(mirrored != light);
     QCOMPARE(large.size(), 2 * light.size());
+}
+
+void tst_vel_gallery::fitsOnASmallScreen()
+{
+    QProcess gallery;
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    // The window would be 1375 pixels wide.
+    environment.insert(s("QT_SCALE_FACTOR"), s("1.25"));
+    gallery.setProcessEnvironment(environment);
+    gallery.start(s(VEL_GALLERY), {s("--page"), s("radio-group-box")});
+    QVERIFY(gallery.waitForStarted());
+    const QByteArray window =
+        XDoTool::ask(s("search --sync --onlyvisible --pid %1").arg(gallery.processId()));
+    const QByteArray geometry =
+        XDoTool::ask(s("getwindowgeometry ") + QString::fromLatin1(window.split('\n').constLast()));
+    gallery.terminate();
+    QVERIFY(gallery.waitForFinished());
+    const QRegularExpressionMatch size =
+        QRegularExpression(s("Geometry: (\\d+)x(\\d+)")).match(QString::fromLatin1(geometry));
+    QVERIFY2(size.hasMatch(), geometry.constData());
+    const QSize screen = QGuiApplication::primaryScreen()->size();
+    QVERIFY2(size.captured(1).toInt() <= screen.width(), geometry.constData());
+    QVERIFY2(size.captured(2).toInt() <= screen.height(), geometry.constData());
 }
 
 QProcessEnvironment tst_vel_gallery::withoutADisplay()

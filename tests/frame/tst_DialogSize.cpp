@@ -9,6 +9,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QLockFile>
+#include <QScreen>
 #include <QSettings>
 
 /// Sizes that dialogs take from the settings and leave there.
@@ -19,6 +20,8 @@ class tst_DialogSize : public TestCase
 private Q_SLOTS:
     void restores_data();
     void restores();
+    void cutsToTheScreenWhenShown_data();
+    void cutsToTheScreenWhenShown();
     void remembers();
     void writesNothingWhenTheSizeStandsThere();
     void waitsForNobodyWhenTheSizeStandsThere();
@@ -51,6 +54,51 @@ void tst_DialogSize::restores()
     QDialog dialog;
     DialogSize::restore(dialog, QStringLiteral("Some"), QSize(300, 200));
     QTEST(dialog.size(), "size");
+}
+
+void tst_DialogSize::cutsToTheScreenWhenShown_data()
+{
+    QTest::addColumn<QSize>("kept");
+    QTest::addColumn<QSize>("least");
+    QTest::newRow("both") << QSize(9000, 8000) << QSize();
+    QTest::newRow("the width") << QSize(9000, 300) << QSize();
+    QTest::newRow("the height") << QSize(300, 8000) << QSize();
+    QTest::newRow("neither") << QSize(300, 200) << QSize();
+    QTest::newRow("no more than its contents allow") << QSize(9000, 300) << QSize(3000, 10);
+}
+
+void tst_DialogSize::cutsToTheScreenWhenShown()
+{
+    QFETCH(QSize, kept);
+    QFETCH(QSize, least);
+    QSettings settings;
+    settings.setValue(QStringLiteral("Some/Width"), kept.width());
+    settings.setValue(QStringLiteral("Some/Height"), kept.height());
+    QDialog dialog;
+    if (least.isValid())
+        dialog.setMinimumSize(least);
+    DialogSize::restore(dialog, QStringLiteral("Some"), QSize(300, 200));
+    QCOMPARE(dialog.size(), kept);
+
+    dialog.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&dialog));
+
+    const QSize screen = dialog.screen()->availableSize();
+    const QSize shown = dialog.size();
+    QVERIFY(shown.width() <= qMax(screen.width(), least.width()));
+    QVERIFY(shown.height() <= screen.height());
+    // What fits stays, and nothing is cut by more than a frame takes.
+    QCOMPARE(shown.width(), qMax(qMin(kept.width(), screen.width()), least.width()));
+    if (kept.height() < screen.height())
+        QCOMPARE(shown.height(), kept.height());
+    QVERIFY(shown.height() >= qMin(kept.height(), screen.height() - 60));
+    QVERIFY(dialog.frameGeometry().height() <= screen.height());
+
+    // From then on the size is the user's.
+    dialog.resize(kept.expandedTo(least));
+    dialog.hide();
+    dialog.show();
+    QCOMPARE(dialog.size(), kept.expandedTo(least));
 }
 
 void tst_DialogSize::remembers()
