@@ -7,7 +7,10 @@
 #include <sys/syscall.h>
 #include <unistd.h>
 
+#include <algorithm>
+#include <array>
 #include <cerrno>
+#include <climits>
 #include <cstdarg>
 
 namespace {
@@ -36,6 +39,17 @@ bool fails(const char *call, const QByteArray &entry)
         return false;
     errno = state().error;
     return true;
+}
+
+// The path of a name in an open folder.
+QByteArray whole(int folder, const char *name)
+{
+    if (folder == AT_FDCWD || *name == '/')
+        return name;
+    std::array<char, PATH_MAX> path;
+    const QByteArray link = "/proc/self/fd/" + QByteArray::number(folder);
+    const ssize_t length = ::readlink(link.constData(), path.data(), path.size());
+    return QByteArray(path.data(), int(std::max(length, ssize_t(0)))) + '/' + name;
 }
 
 } // namespace
@@ -70,15 +84,33 @@ QByteArrayList FaultySystem::log()
 #pragma GCC visibility push(default)
 extern "C" {
 
+int openat(int folder, const char *path, int flags, ...)
+{
+    va_list arguments;
+    va_start(arguments, flags);
+    const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(arguments, mode_t) : 0;
+    va_end(arguments);
+    if ((flags & O_CREAT) != 0 && fails("open", "open " + whole(folder, path)))
+        return -1;
+    return int(::syscall(SYS_openat, folder, path, flags, mode));
+}
+
+int openat64(int folder, const char *path, int flags, ...)
+{
+    va_list arguments;
+    va_start(arguments, flags);
+    const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(arguments, mode_t) : 0;
+    va_end(arguments);
+    return openat(folder, path, flags, mode);
+}
+
 int open(const char *path, int flags, ...)
 {
     va_list arguments;
     va_start(arguments, flags);
     const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(arguments, mode_t) : 0;
     va_end(arguments);
-    if ((flags & O_CREAT) != 0 && fails("open", QByteArray("open ") + path))
-        return -1;
-    return int(::syscall(SYS_openat, AT_FDCWD, path, flags, mode));
+    return openat(AT_FDCWD, path, flags, mode);
 }
 
 int open64(const char *path, int flags, ...)
@@ -121,10 +153,16 @@ int fsetxattr(int file, const char *name, const void *value, size_t size, int fl
                                            : int(::syscall(SYS_fsetxattr, file, name, value, size, flags));
 }
 
+int renameat(int fromFolder, const char *from, int toFolder, const char *to) noexcept
+{
+    return fails("rename", "rename " + whole(fromFolder, from) + " " + whole(toFolder, to))
+        ? -1
+        : int(::syscall(SYS_renameat, fromFolder, from, toFolder, to));
+}
+
 int rename(const char *from, const char *to) noexcept
 {
-    return fails("rename", QByteArray("rename ") + from + " " + to) ? -1
-                                                                    : int(::syscall(SYS_rename, from, to));
+    return renameat(AT_FDCWD, from, AT_FDCWD, to);
 }
 }
 #pragma GCC visibility pop

@@ -9,8 +9,8 @@
 /**
  * System calls that fail when a test asks for it.
  *
- * The program's own open, write, fsync, rename, fchmod and fsetxattr stand in front of those of the
- * C library, for every library that the program loads.
+ * The program's own open, openat, write, fsync, rename, renameat, fchmod and fsetxattr stand in front
+ * of those of the C library, for every library that the program loads.
  */
 namespace FaultySystem {
 
@@ -21,8 +21,8 @@ void writeInPieces();
 /// Everything works again, and the log is empty.
 void reset();
 
-/// What was called since the last reset: "open NAME", "write", "fsync", "fchmod",
-/// "fsetxattr", "rename".
+/// What was called since the last reset: "open PATH", "write", "fsync", "fchmod",
+/// "fsetxattr", "rename PATH PATH".
 QByteArrayList log();
 
 } // namespace FaultySystem

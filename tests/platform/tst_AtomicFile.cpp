@@ -35,6 +35,8 @@ private Q_SLOTS:
     void replacesNoFolder();
     void leavesNothingBesideWhenItFails();
     void tellsWhetherTheTargetIsUnchanged();
+    void keepsToItsFolderWhateverThatIsCalledMeanwhile();
+    void writesInAFolderThatMayNotBeRead();
 
     void keepsAnAccessList();
     void keepsUserAttributesAndNoOthers();
@@ -212,6 +214,39 @@ void tst_AtomicFile::tellsWhetherTheTargetIsUnchanged()
     QVERIFY(!AtomicFile::isUnchanged(*there));
     QVERIFY(QFile::remove(path(QStringLiteral("x"))));
     QVERIFY(!AtomicFile::isUnchanged(*there));
+}
+
+void tst_AtomicFile::keepsToItsFolderWhateverThatIsCalledMeanwhile()
+{
+    write(QStringLiteral("sub/x"), "abc");
+    write(QStringLiteral("sub/y"), "abc");
+    const auto x = AtomicFile::find(encoded(QStringLiteral("sub/x")));
+    const auto y = AtomicFile::find(encoded(QStringLiteral("sub/y")));
+    {
+        AtomicFile::Replacement replacement(*x, "def");
+        const AtomicFile::Replacement dropped(*y, "def");
+        QVERIFY(replacement.isReady() && dropped.isReady());
+        QVERIFY(QDir().rename(path(QStringLiteral("sub")), path(QStringLiteral("other"))));
+        write(QStringLiteral("sub/x"), "ghi");
+        QVERIFY(AtomicFile::isUnchanged(*x));
+        QVERIFY(replacement.commit());
+    }
+    QCOMPARE(read(path(QStringLiteral("sub/x"))), QByteArray("ghi"));
+    QCOMPARE(read(path(QStringLiteral("other/x"))), QByteArray("def"));
+    QCOMPARE(QDir(path(QStringLiteral("other"))).entryList(QDir::Files | QDir::Hidden),
+             QStringList({QStringLiteral("x"), QStringLiteral("y")}));
+}
+
+void tst_AtomicFile::writesInAFolderThatMayNotBeRead()
+{
+    const OrdinaryUser user(folder());
+    const QString file = write(QStringLiteral("sub/x"), "abc");
+    const QByteArray sub = encoded(QStringLiteral("sub"));
+    QCOMPARE(::chmod(sub.constData(), 0300), 0);
+    const bool replaced = replace(*AtomicFile::find(QFile::encodeName(file)), "def");
+    QCOMPARE(::chmod(sub.constData(), 0700), 0);
+    QVERIFY(replaced);
+    QCOMPARE(read(file), QByteArray("def"));
 }
 
 void tst_AtomicFile::keepsAnAccessList()

@@ -3,16 +3,21 @@
 
 #pragma once
 
+#include "FileDescriptor.h"
+
 #include <QByteArray>
 
 #include <sys/stat.h>
 
+#include <memory>
 #include <optional>
+#include <string>
 #include <string_view>
 
 /**
  * Replaces files whole: the new contents stand beside the old file, are on disk, and then
  * take its name. When anything fails the old file is untouched and nothing is left beside it.
+ * All of it happens in the folder that was opened first, whatever that is called meanwhile.
  */
 namespace AtomicFile {
 
@@ -22,9 +27,12 @@ struct Target
     QByteArray path;
     bool exists = false;
     struct stat status = {}; ///< of what exists
+    std::shared_ptr<const FileDescriptor> folder; ///< open; null if there is no such folder
 
-    /// The folder of the path; empty for the current one.
-    QByteArray folder() const { return path.left(path.lastIndexOf('/') + 1); }
+    /// The last part of the path.
+    const char *name() const { return path.constData() + path.lastIndexOf('/') + 1; }
+    /// The path of the folder; empty for the current one.
+    std::string_view folderPath() const { return {path.constData(), std::size_t(path.lastIndexOf('/') + 1)}; }
 };
 
 /// The file that \a path leads to through any symbolic links, which need not exist; none if
@@ -46,6 +54,7 @@ bool isUnchanged(const Target &target);
 class Replacement
 {
 public:
+    /// \a target has to live for as long as this object.
     Replacement(const Target &target, std::string_view bytes);
     ~Replacement();
     Replacement(const Replacement &) = delete;
@@ -57,10 +66,10 @@ public:
     bool commit();
 
 private:
-    int create(const QByteArray &folder, mode_t mode);
+    int create(mode_t mode);
 
-    const QByteArray m_target;
-    QByteArray m_name; ///< empty when there is no such file
+    const Target &m_target;
+    std::string m_name; ///< empty when there is no such file
     bool m_isReady = false;
 };
 

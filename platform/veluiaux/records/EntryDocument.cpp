@@ -10,6 +10,7 @@
 #include "SharedTexts.h"
 
 #include <DesktopEntryValue.h>
+#include <velcore/folderlock.h>
 #include <velcore/language.h>
 
 #include <fcntl.h>
@@ -251,17 +252,17 @@ bool EntryDocument::save()
     const std::lock_guard<std::mutex> lock(savingMutex());
     // Taken only when the new file is on disk: nobody else waits for that. When another program was
     // faster, all is done once more, now with the lock.
-    std::optional<Vel::FolderLock> folderLock;
+    LockedFolder locked;
     auto outcome = Outcome::Overtaken;
     for (int attempt = 1; outcome == Outcome::Overtaken; ++attempt) {
         const auto target = AtomicFile::find(m_path);
-        outcome = target ? replace(*target, &folderLock, attempt == MostAttempts) : Outcome::Failed;
+        outcome = target ? replace(*target, &locked, attempt == MostAttempts) : Outcome::Failed;
     }
     return outcome == Outcome::Saved;
 }
 
-EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target,
-                                              std::optional<Vel::FolderLock> *folderLock, bool isLast)
+EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target, LockedFolder *locked,
+                                              bool isLast)
 {
     // A file that is gone is written whole, and so is one that this text did not come from.
     const bool isWhole = !target.exists || (m_read && !isFromPath());
@@ -276,13 +277,13 @@ EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target,
         return Outcome::Failed;
     if (!(now->stamp == FileStamp(target.status)) && !isLast)
         return Outcome::Overtaken;
-    const bool isSame = now->text->bytes() == m_text->bytes(); // then ours has its index already
-    return replace(target, DesktopEntryWriter::apply(isSame ? *m_text : *now->text, m_changes), folderLock,
+    const bool isSame = isKnown || now->text->bytes() == m_text->bytes(); // then ours has its index already
+    return replace(target, DesktopEntryWriter::apply(isSame ? *m_text : *now->text, m_changes), locked,
                    isLast);
 }
 
 EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target, const QByteArray &bytes,
-                                              std::optional<Vel::FolderLock> *folderLock, bool isLast)
+                                              LockedFolder *locked, bool isLast)
 {
     // A larger one could not be read again.
     if (bytes.size() > EntryFile::LargestSize)
@@ -290,8 +291,10 @@ EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target, 
     AtomicFile::Replacement replacement(target, {bytes.constData(), std::size_t(bytes.size())});
     if (!replacement.isReady())
         return Outcome::Failed;
-    if (!*folderLock)
-        folderLock->emplace(target.folder().toStdString());
+    if (!*locked) {
+        Vel::lockFolder(target.folder->get());
+        *locked = target.folder;
+    }
     if (!isLast && !AtomicFile::isUnchanged(target))
         return Outcome::Overtaken;
     if (!replacement.commit())

@@ -8,14 +8,11 @@
 #include "FileStamp.h"
 #include "GroupValues.h"
 
-#include <velcore/folderlock.h>
-
 #include <QByteArray>
 #include <QString>
 #include <QStringList>
 
 #include <memory>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -84,10 +81,11 @@ private:
     bool isFromPath() const { return m_read && m_textPath == m_path; }
 
     enum class Outcome { Saved, Failed, Overtaken };
-    Outcome replace(const AtomicFile::Target &target, std::optional<Vel::FolderLock> *folderLock,
+    /// A folder that keeps its lock for as long as it is open.
+    using LockedFolder = std::shared_ptr<const FileDescriptor>;
+    Outcome replace(const AtomicFile::Target &target, LockedFolder *locked, bool isLast);
+    Outcome replace(const AtomicFile::Target &target, const QByteArray &bytes, LockedFolder *locked,
                     bool isLast);
-    Outcome replace(const AtomicFile::Target &target, const QByteArray &bytes,
-                    std::optional<Vel::FolderLock> *folderLock, bool isLast);
 
     QByteArray m_path;
     std::shared_ptr<const DesktopEntryText> m_text; ///< never null

@@ -76,7 +76,8 @@ void FileRights::look()
     std::array<char, 1024> names;
     const ssize_t size = ::llistxattr(m_path.constData(), names.data(), names.size());
     if (size < 0) {
-        m_hasAccessList = m_hasAttributes = errno == ERANGE;
+        // Too many to tell, or the folder has been renamed: then it is not known that there is no list.
+        m_hasAccessList = m_hasAttributes = errno == ERANGE || errno == ENOENT || errno == ENOTDIR;
         return;
     }
     for (const char *name = names.data(); name < names.data() + size; name += std::strlen(name) + 1) {

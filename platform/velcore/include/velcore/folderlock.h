@@ -32,7 +32,14 @@ public:
 
 private:
     int m_folder;
-    bool m_isHeld = false;
+    bool m_isHeld;
 };
+
+/**
+ * Takes that lock on a folder that is open for reading already, for as long as it stays open.
+ *
+ * @return what FolderLock::isHeld() tells
+ */
+VELCORE_EXPORT bool lockFolder(int folder);
 
 } // namespace Vel
