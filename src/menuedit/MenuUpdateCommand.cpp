@@ -41,5 +41,7 @@ QByteArray MenuUpdateCommand::forKind(int kind)
 
 bool MenuUpdateCommand::send(const QByteArray &command)
 {
-    return SendCommandToWM(QX11Info::display(), command.constData());
+    // Other platforms have a display, too: that of Wayland is no connection of Xlib's.
+    Display *const display = QX11Info::isPlatformX11() ? QX11Info::display() : nullptr;
+    return SendCommandToWM(display, command.constData());
 }

@@ -20,7 +20,8 @@ int kindOf(const QString &dir);
 /// The command line for a directory of \a kind, line feed included; empty for any other kind.
 QByteArray forKind(int kind);
 
-/// Sends a command over the application's display; whether the window manager has got it.
+/// Sends a command over the application's display; whether the window manager has got it, which it
+/// never has off X11.
 bool send(const QByteArray &command);
 
 } // namespace MenuUpdateCommand
