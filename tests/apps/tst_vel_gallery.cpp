@@ -3,8 +3,10 @@
 
 #include "GalleryPages.h"
 #include "GalleryWindow.h"
+#include "ModalDriver.h"
 #include "TestCase.h"
 #include "XDoTool.h"
+#include "editor/FileCommands.h"
 
 #include <ShortcutsModel.h>
 #include <VelRadioGroupBox.h>
@@ -12,6 +14,7 @@
 #include <QCheckBox>
 #include <QDialogButtonBox>
 #include <QDir>
+#include <QFileDialog>
 #include <QImage>
 #include <QLabel>
 #include <QLineEdit>
@@ -26,6 +29,10 @@
 #include <QSettings>
 #include <QSpinBox>
 
+#include <sys/resource.h>
+
+#include <algorithm>
+#include <csignal>
 #include <memory>
 
 namespace {
@@ -85,6 +92,7 @@ private Q_SLOTS:
     void refusesAnUnknownOption();
     void failsForAPageThatDoesNotExist();
     void failsWhenPicturesCannotBeWritten();
+    void savesNoHalfOfATextToAFullDisk();
 
 private:
     static QProcessEnvironment withoutADisplay();
@@ -356,6 +364,37 @@ void tst_vel_gallery::failsWhenPicturesCannotBeWritten()
     QCOMPARE(gallery.exitCode(), 1);
     QVERIFY(gallery.readAllStandardError().startsWith("vel-gallery: cannot make the folder "));
     QCOMPARE(read(file), QByteArray());
+}
+
+void tst_vel_gallery::savesNoHalfOfATextToAFullDisk()
+{
+    const QString file = path(s("text"));
+    QPlainTextEdit editor(s("More than the disk takes."));
+    const auto commands = fileCommands();
+    const auto save = std::find_if(commands.begin(), commands.end(), [](const EditorCommand &command) {
+        return command.name == s("file-save");
+    });
+    QVERIFY(save != commands.end());
+    ModalDriver modal;
+    modal.handle([&](QWidget *window) {
+        auto *const dialog = qobject_cast<QFileDialog *>(window);
+        QVERIFY(dialog);
+        dialog->findChild<QLineEdit *>()->setText(file);
+        static_cast<QDialog *>(dialog)->accept();
+    });
+    modal.answer({QMessageBox::Warning, s("Save"), s("Cannot write %1.").arg(file), QMessageBox::Ok},
+                 QMessageBox::Ok);
+    // As on a full disk, no file can grow beyond some bytes.
+    rlimit before = {};
+    getrlimit(RLIMIT_FSIZE, &before);
+    const rlimit small = {4, before.rlim_max};
+    const auto handler = std::signal(SIGXFSZ, SIG_IGN);
+    setrlimit(RLIMIT_FSIZE, &small);
+    save->run(&editor);
+    setrlimit(RLIMIT_FSIZE, &before);
+    std::signal(SIGXFSZ, handler);
+    QVERIFY(modal.finished());
+    QVERIFY(!QFile::exists(file));
 }
 
 VEL_TEST_MAIN(tst_vel_gallery)

@@ -38,7 +38,9 @@ void saveFile(QPlainTextEdit *editor)
         return;
     QSaveFile file(path);
     const QByteArray bytes = editor->toPlainText().toUtf8();
-    if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size() || !file.commit())
+    // What commit() itself still has to write it may fail to write, and say nothing.
+    if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size() || !file.flush()
+        || !file.commit())
         warn(editor, EditorTexts::tr("Save"), EditorTexts::tr("Cannot write %1.").arg(path));
 }
 
