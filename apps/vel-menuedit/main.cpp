@@ -8,6 +8,7 @@
 
 #include <velintegration/startmenu.h>
 
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QGuiApplication>
@@ -23,8 +24,10 @@ enum ExitStatus { Done = 0, NothingPicked = 1, CannotStart = 2 };
 // Whether the directory can be shown; the reason if not.
 QString obstacle(const Options &options)
 {
+    // Where no application is installed, the menu begins empty.
     if (options.isStartMenu && !QFileInfo::exists(options.dir)
-        && !CreateStartMenu(QFile::encodeName(options.dir).constData(), nullptr))
+        && !CreateStartMenu(QFile::encodeName(options.dir).constData(), nullptr)
+        && !QDir().mkpath(options.dir))
         return QCoreApplication::translate("vel-menuedit", "cannot create the start menu %1")
             .arg(options.dir);
     const QFileInfo info(options.dir);

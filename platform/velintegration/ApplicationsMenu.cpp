@@ -108,6 +108,8 @@ bool writeCategory(const fs::path &folder, const MenuCategory &category, const M
 bool buildApplicationsMenu(const fs::path &folder)
 {
     std::map<int, MenuItems> itemsOfCategories = collectItems();
+    if (itemsOfCategories.empty())
+        return false;
     QStringList sortOrder;
     for (auto &[place, items] : itemsOfCategories) {
         const MenuCategory &category = menuCategories().at(place);

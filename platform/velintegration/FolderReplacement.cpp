@@ -3,6 +3,8 @@
 
 #include "FolderReplacement.h"
 
+#include "FolderRemoval.h"
+
 #include <velcore/files.h>
 
 #include <algorithm>
@@ -46,28 +48,6 @@ fs::path resolved(const fs::path &path)
         result = next.is_absolute() ? next : result.parent_path() / next;
     }
     return {};
-}
-
-bool pathExists(const fs::path &path)
-{
-    std::error_code error;
-    return fs::exists(fs::symlink_status(path, error));
-}
-
-// Removes a folder even where a folder in it is read-only; links are removed, not followed.
-void removeAll(const fs::path &folder)
-{
-    std::error_code error;
-    const auto makeWritable = [](const fs::path &path) {
-        std::error_code ignored;
-        fs::permissions(path, fs::perms::owner_all, fs::perm_options::add, ignored);
-    };
-    makeWritable(folder);
-    for (fs::recursive_directory_iterator it(folder, error), end; !error && it != end; it.increment(error)) {
-        if (fs::is_directory(it->symlink_status(error)))
-            makeWritable(it->path());
-    }
-    fs::remove_all(folder, error);
 }
 
 // Whether \a text is made of two numbers with a "-" between them.
@@ -120,8 +100,10 @@ FolderReplacement::FolderReplacement(const fs::path &target, Exchange exchange)
     std::error_code error;
     const bool isReplaceable = m_target.has_filename()
         && (!pathExists(m_target) || fs::is_directory(fs::symlink_status(m_target, error)));
-    if (isReplaceable)
+    if (isReplaceable) {
+        PreviousFolder(m_target, m_exchange).recover();
         removeLeftovers();
+    }
     if (!isReplaceable || !makeParents() || !makeFolder())
         m_folder.clear();
 }
@@ -205,25 +187,6 @@ bool FolderReplacement::commit()
 
 bool FolderReplacement::replaceOld()
 {
-    if (!takePermissions(m_folder, m_target))
-        return false;
-    if (m_exchange(m_folder.c_str(), m_target.c_str()) != 0) {
-        const bool isUnknown = errno == EINVAL || errno == ENOSYS || errno == EOPNOTSUPP;
-        return isUnknown && replaceInTwoSteps();
-    }
-    removeAll(m_folder); // the old one lies there now
-    return true;
-}
-
-bool FolderReplacement::replaceInTwoSteps()
-{
-    const fs::path old = freeName("old");
-    if (rename(m_target.c_str(), old.c_str()) != 0)
-        return false;
-    if (rename(m_folder.c_str(), m_target.c_str()) != 0) {
-        rename(old.c_str(), m_target.c_str());
-        return false;
-    }
-    removeAll(old);
-    return true;
+    return takePermissions(m_folder, m_target)
+        && PreviousFolder(m_target, m_exchange).replaceTarget(m_folder);
 }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "PreviousFolder.h"
+
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -18,8 +20,7 @@
 class FolderReplacement
 {
 public:
-    /// Exchanges two paths in one step; 0, or -1 and errno.
-    using Exchange = int (*)(const char *first, const char *second);
+    using Exchange = PreviousFolder::Exchange;
 
     explicit FolderReplacement(const std::filesystem::path &target, Exchange exchange = exchangePaths);
     ~FolderReplacement();
@@ -32,7 +33,8 @@ public:
     /// The new folder, empty at first; its name begins with a dot.
     const std::filesystem::path &folder() const { return m_folder; }
 
-    /// Puts the new folder in the target's place and removes the old one.
+    /// Puts the new folder in the target's place. The old one stays as PreviousFolder, of which
+    /// there is one: the one before it goes.
     bool commit();
 
     /// The exchange of the file system; not every one knows it.
@@ -42,7 +44,6 @@ private:
     bool makeParents();
     bool makeFolder();
     bool replaceOld();
-    bool replaceInTwoSteps();
     void removeLeftovers() const;
     std::string nameFor(const char *purpose) const;
     std::filesystem::path freeName(const char *purpose) const;

@@ -25,6 +25,7 @@ private Q_SLOTS:
     void refusesDirectoriesThatItCannotShow_data();
     void refusesDirectoriesThatItCannotShow();
     void createsTheStartMenuOnFirstUse();
+    void beginsWithAnEmptyStartMenuWithoutApplications();
     void failsWhenTheStartMenuCannotBeCreated();
     void leavesAStartMenuThatIsThere();
     void tellsTheWindowManagerWhenItCloses_data();
@@ -218,6 +219,19 @@ void tst_vel_menuedit::createsTheStartMenuOnFirstUse()
     QVERIFY(finish(program));
     QCOMPARE(program.exitCode(), 0);
     QCOMPARE(program.readAllStandardError(), QByteArray());
+}
+
+void tst_vel_menuedit::beginsWithAnEmptyStartMenuWithoutApplications()
+{
+    m_environment.insert(QStringLiteral("XDG_DATA_DIRS"), path(QStringLiteral("none")));
+    CommandChannel channel;
+    QProcess program;
+    start(program, {});
+    press(windowNamed(standardDir("startmenu")), QStringLiteral("Escape"));
+    QVERIFY(finish(program));
+    QCOMPARE(program.exitCode(), 0);
+    QCOMPARE(QDir(standardDir("startmenu")).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
+             QStringList());
 }
 
 void tst_vel_menuedit::failsWhenTheStartMenuCannotBeCreated()

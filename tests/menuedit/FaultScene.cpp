@@ -207,6 +207,7 @@ private:
     Tree m_whole;
 };
 
+// Three menus in turn, so that each is told from the one before and the one after it.
 class MenuScene : public FaultScene
 {
 public:
@@ -220,10 +221,18 @@ public:
 
     QString fault() const override
     {
-        const Tree menu = treeOf(path(QStringLiteral("m/menu")));
-        return menu == treeOf(templateOf(0)) || menu == treeOf(templateOf(1))
-            ? QString()
-            : QStringLiteral("the menu is not whole");
+        const int menu = numberOf(QStringLiteral("menu"));
+        const int previous = numberOf(QStringLiteral("menu.previous"));
+        if (menu < 0)
+            return QStringLiteral("the menu is not whole");
+        if (previous < 0)
+            return QStringLiteral("the previous menu is not whole");
+        const QStringList kept = QDir(path(QStringLiteral("m")))
+                                     .entryList({QStringLiteral(".menu.kept*")}, QDir::Dirs | QDir::Hidden);
+        // The new one may stand in the place of the previous one while that lies aside.
+        if (kept.isEmpty() || menu == (previous + 1) % Menus)
+            return {};
+        return numberOf(kept.constFirst()) >= 0 ? QString() : QStringLiteral("the previous menu is lost");
     }
 
 protected:
@@ -231,20 +240,32 @@ protected:
     {
         for (int i = 0; i < 60; ++i) {
             const QString name = QStringLiteral("/folder%1/%2.desktop").arg(i % 4).arg(i);
-            const QByteArray entry = "[Desktop Entry]\nType=Application\nExec=true\nName=";
-            write(templateOf(0) + name, entry + "A\n");
-            if (i % 3 == 0)
-                write(templateOf(1) + name, entry + "B\n");
+            for (int menu = 0; menu < Menus; ++menu) {
+                if (i % (menu + 1) == 0)
+                    write(templateOf(menu) + name,
+                          "[Desktop Entry]\nType=Application\nExec=true\nName=" + QByteArray::number(menu)
+                              + '\n');
+            }
         }
         step(1);
+        step(2);
     }
     void nextOperation() override { step(0); }
     QStringList places() const override { return {path(QStringLiteral("m"))}; }
 
 private:
-    QString templateOf(int number) const
+    static constexpr int Menus = 3;
+
+    QString templateOf(int number) const { return path(QString::number(number % Menus)); }
+    // Which of the menus that folder holds; -1 for none of them.
+    int numberOf(const QString &folder) const
     {
-        return path(number % 2 ? QStringLiteral("b") : QStringLiteral("a"));
+        const Tree found = treeOf(path(QStringLiteral("m/") + folder));
+        for (int menu = 0; menu < Menus; ++menu) {
+            if (found == treeOf(templateOf(menu)))
+                return menu;
+        }
+        return -1;
     }
 };
 

@@ -38,11 +38,15 @@ private:
         errno = EINVAL;
         return -1;
     }
-    static int failingExchange(const char *, const char *)
+    static int exchangeSoOften(const char *first, const char *second)
     {
+        // What is taken back later is no longer in the way of anything.
+        if (s_exchanges-- != 0)
+            return FolderReplacement::exchangePaths(first, second);
         errno = EIO;
         return -1;
     }
+    static inline int s_exchanges = 0;
     // The exchange is unknown and the folder that was to take the place is gone.
     static int exchangeThatLosesTheNew(const char *first, const char *)
     {
@@ -62,29 +66,113 @@ private Q_SLOTS:
             QVERIFY(replacement.commit());
         }
         QCOMPARE(names(path(QStringLiteral("menu"))), QStringList(QStringLiteral("new")));
-        QCOMPARE(names(folder()), QStringList(QStringLiteral("menu")));
+        QCOMPARE(names(path(QStringLiteral("menu.previous"))), QStringList(QStringLiteral("old")));
+        QCOMPARE(names(folder()), QStringList({QStringLiteral("menu"), QStringLiteral("menu.previous")}));
+    }
+
+    void keepsOneCopyWhereNothingCanBeExchanged()
+    {
+        write(QStringLiteral("menu/old"), "x");
+        write(QStringLiteral("menu.previous/older"), "x");
+        {
+            FolderReplacement replacement(target(), unknownExchange);
+            fill(replacement);
+            QVERIFY(replacement.commit());
+        }
+        QCOMPARE(names(path(QStringLiteral("menu.previous"))), QStringList(QStringLiteral("old")));
+        QCOMPARE(names(folder()), QStringList({QStringLiteral("menu"), QStringLiteral("menu.previous")}));
+    }
+
+    void leavesTheOldWhenTheExchangeFails_data()
+    {
+        QTest::addColumn<bool>("hasCopy");
+        QTest::addColumn<int>("exchanges");
+        QTest::newRow("first time") << false << 0;
+        QTest::newRow("the copy's") << true << 0;
+        QTest::newRow("the target's") << true << 1;
     }
 
     void leavesTheOldWhenTheExchangeFails()
     {
+        QFETCH(bool, hasCopy);
+        QFETCH(int, exchanges);
         write(QStringLiteral("menu/old"), "x");
+        if (hasCopy)
+            write(QStringLiteral("menu.previous/older"), "x");
+        const QStringList before = names(folder());
         {
-            FolderReplacement replacement(target(), failingExchange);
+            s_exchanges = exchanges;
+            FolderReplacement replacement(target(), exchangeSoOften);
             fill(replacement);
             QVERIFY(!replacement.commit());
         }
         QCOMPARE(names(path(QStringLiteral("menu"))), QStringList(QStringLiteral("old")));
-        QCOMPARE(names(folder()), QStringList(QStringLiteral("menu")));
+        QCOMPARE(names(path(QStringLiteral("menu.previous"))),
+                 hasCopy ? QStringList(QStringLiteral("older")) : QStringList());
+        QCOMPARE(names(folder()), before);
+    }
+
+    void putsTheOldBackWhenTheSecondStepFails_data()
+    {
+        QTest::addColumn<bool>("hasCopy");
+        QTest::newRow("first time") << false;
+        QTest::newRow("with a copy") << true;
     }
 
     void putsTheOldBackWhenTheSecondStepFails()
     {
+        QFETCH(bool, hasCopy);
         write(QStringLiteral("menu/old"), "x");
+        if (hasCopy)
+            write(QStringLiteral("menu.previous/older"), "x");
         {
             FolderReplacement replacement(target(), exchangeThatLosesTheNew);
             QVERIFY(!replacement.commit());
         }
         QCOMPARE(names(path(QStringLiteral("menu"))), QStringList(QStringLiteral("old")));
+        QCOMPARE(names(path(QStringLiteral("menu.previous"))),
+                 hasCopy ? QStringList(QStringLiteral("older")) : QStringList());
+    }
+
+    void bringsTheCopyBackThatAKilledReplacementPutAway_data()
+    {
+        QTest::addColumn<QString>("place");
+        QTest::addColumn<bool>("hasCopy");
+        QTest::addColumn<QString>("copy");
+        // Where the new menu was when the program was killed; what is the copy afterwards.
+        QTest::newRow("before the copy was touched") << ".menu.kept%1" << true << "older";
+        QTest::newRow("in the place of the copy") << "menu.previous" << true << "older";
+        QTest::newRow("in the place of the menu") << "menu" << true << "old";
+        QTest::newRow("before the steps") << ".menu.new1-1" << false << "older";
+    }
+
+    void bringsTheCopyBackThatAKilledReplacementPutAway()
+    {
+        QFETCH(QString, place);
+        QFETCH(bool, hasCopy);
+        QFETCH(QString, copy);
+        write(QStringLiteral("new/new"), "x");
+        struct stat status = {};
+        QCOMPARE(stat(qPrintable(path(QStringLiteral("new"))), &status), 0);
+        const QString kept = QStringLiteral(".menu.kept%1").arg(status.st_ino);
+        const bool isNewKept = place.contains(QLatin1String("kept"));
+        place.replace(QLatin1String("%1"), QString::number(status.st_ino));
+        QVERIFY(QDir(folder()).rename(QStringLiteral("new"), place));
+        if (place != QLatin1String("menu"))
+            write(QStringLiteral("menu/old"), "x");
+        else
+            write(QStringLiteral("menu.previous/old"), "x");
+        if (!isNewKept)
+            write(kept + QStringLiteral("/older"), "x");
+        else if (hasCopy)
+            write(QStringLiteral("menu.previous/older"), "x");
+        {
+            const FolderReplacement replacement(target());
+        }
+        QCOMPARE(names(path(QStringLiteral("menu.previous"))), QStringList(copy));
+        QVERIFY(!QFile::exists(path(kept)));
+        QCOMPARE(names(path(QStringLiteral("menu"))),
+                 QStringList(place == QLatin1String("menu") ? QStringLiteral("new") : QStringLiteral("old")));
     }
 
     void leavesNothingWithoutACommit()

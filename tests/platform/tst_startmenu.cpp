@@ -18,7 +18,8 @@ class tst_startmenu : public StartMenuTestCase
 
 private Q_SLOTS:
     void refusesAnEmptyDirectory();
-    void isTheBareRootWithoutApplications();
+    void refusesAMenuWithoutApplications_data();
+    void refusesAMenuWithoutApplications();
     void groupsByTheFirstMainCategory_data();
     void groupsByTheFirstMainCategory();
     void ordersTheFoldersAsTheStandardDoes();
@@ -50,14 +51,28 @@ void tst_startmenu::refusesAnEmptyDirectory()
     QVERIFY(!CreateStartMenu("/", nullptr));
 }
 
-void tst_startmenu::isTheBareRootWithoutApplications()
+void tst_startmenu::refusesAMenuWithoutApplications_data()
 {
-    QVERIFY(create());
-    QCOMPARE(names(menu()), QStringList(QStringLiteral(".directory")));
-    const VelUIDesktopEntry root(inMenu(QStringLiteral(".directory")));
-    QCOMPARE(root.getType(), QStringLiteral("Directory"));
-    QCOMPARE(root.getName(), QStringLiteral("Start Menu"));
-    QCOMPARE(root.getSortOrder(), QStringList());
+    QTest::addColumn<bool>("hasOld");
+    QTest::addColumn<bool>("hasHidden");
+    QTest::newRow("no menu") << false << false;
+    QTest::newRow("a menu") << true << false;
+    QTest::newRow("only what is not shown") << true << true;
+}
+
+void tst_startmenu::refusesAMenuWithoutApplications()
+{
+    QFETCH(bool, hasOld);
+    QFETCH(bool, hasHidden);
+    if (hasHidden)
+        install(QStringLiteral("a.desktop"), "Game;", "NoDisplay=true\n");
+    if (hasOld) {
+        write(QStringLiteral("config/vel/startmenu/mine.desktop"), "mine");
+        write(QStringLiteral("config/vel/startmenu.previous/older.desktop"), "older");
+    }
+    const QMap<QString, QByteArray> before = tree(folder());
+    QVERIFY(!create());
+    QCOMPARE(tree(folder()), before);
 }
 
 void tst_startmenu::groupsByTheFirstMainCategory_data()
@@ -286,6 +301,7 @@ void tst_startmenu::hidesAnIdBehindWhatIsNoApplication()
     QFETCH(QString, kind);
     const QByteArray entry = "[Desktop Entry]\nType=Application\nExec=true\nCategories=Game;\nName=x\n";
     write(QStringLiteral("system/applications/a.desktop"), entry);
+    write(QStringLiteral("system/applications/other.desktop"), entry);
     QDir().mkpath(path(QStringLiteral("home/applications")));
     const QString hiding = path(QStringLiteral("home/applications/a.desktop"));
     if (kind == QLatin1String("hidden entry"))
@@ -295,7 +311,8 @@ void tst_startmenu::hidesAnIdBehindWhatIsNoApplication()
     else
         QVERIFY(QFile::link(kind.mid(8), hiding));
     QVERIFY(create());
-    QCOMPARE(names(menu()), QStringList(QStringLiteral(".directory")));
+    QCOMPARE(names(inMenu(QStringLiteral("Game"))),
+             QStringList({QStringLiteral(".directory"), QStringLiteral("other.desktop")}));
 }
 
 void tst_startmenu::findsApplicationsInSubfolders()

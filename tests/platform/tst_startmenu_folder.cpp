@@ -34,6 +34,10 @@ private Q_SLOTS:
     void copiesOfATemplateFollowTheUmask();
     void theSameInputGivesTheSameTree();
     void replacesTheOldMenu();
+    void keepsTheMenuThatWasReplacedLast();
+    void keepsThePreviousMenuWhereThereIsNoOldOne();
+    void replacesWhateverStandsInThePlaceOfThePreviousMenu_data();
+    void replacesWhateverStandsInThePlaceOfThePreviousMenu();
     void missingParentsAreMade();
     void aLinkIsFollowed();
     void aDanglingLinkIsFollowed();
@@ -132,11 +136,67 @@ void tst_startmenu_folder::replacesTheOldMenu()
     QCOMPARE(tree(menu()).keys(),
              QStringList({QStringLiteral(".directory"), QStringLiteral("Game"),
                           QStringLiteral("Game/.directory"), QStringLiteral("Game/a.desktop")}));
-    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
+    QCOMPARE(names(path(QStringLiteral("config/vel"))),
+             QStringList({QStringLiteral("startmenu"), QStringLiteral("startmenu.previous")}));
+}
+
+void tst_startmenu_folder::keepsTheMenuThatWasReplacedLast()
+{
+    install(QStringLiteral("a.desktop"), "Game;");
+    const QString previous = menu() + QStringLiteral(".previous");
+    for (const char *name : {"first", "second", "third"}) {
+        write(QStringLiteral("config/vel/startmenu/sub/%1.desktop").arg(QLatin1String(name)), name);
+        QCOMPARE(chmod(qPrintable(inMenu(QStringLiteral("sub"))), 0711), 0);
+        const QMap<QString, QByteArray> old = tree(menu());
+        QVERIFY(create());
+        QCOMPARE(tree(previous), old);
+        QCOMPARE(modeOf(previous + QStringLiteral("/sub")), 0711U);
+        QVERIFY(!QFile::exists(inMenu(QStringLiteral("sub"))));
+        QCOMPARE(names(path(QStringLiteral("config/vel"))),
+                 QStringList({QStringLiteral("startmenu"), QStringLiteral("startmenu.previous")}));
+    }
+}
+
+void tst_startmenu_folder::keepsThePreviousMenuWhereThereIsNoOldOne()
+{
+    install(QStringLiteral("a.desktop"), "Game;");
+    const QString kept = write(QStringLiteral("config/vel/startmenu.previous/mine.desktop"), "mine");
+    QVERIFY(create());
+    QCOMPARE(read(kept), QByteArray("mine"));
+}
+
+void tst_startmenu_folder::replacesWhateverStandsInThePlaceOfThePreviousMenu_data()
+{
+    QTest::addColumn<QString>("kind");
+    for (const char *kind : {"file", "link", "dangling link"})
+        QTest::newRow(kind) << QString::fromLatin1(kind);
+}
+
+void tst_startmenu_folder::replacesWhateverStandsInThePlaceOfThePreviousMenu()
+{
+    QFETCH(QString, kind);
+    install(QStringLiteral("a.desktop"), "Game;");
+    write(QStringLiteral("config/vel/startmenu/mine.desktop"), "mine");
+    const QString precious = write(QStringLiteral("precious/file"), "x");
+    const QString previous = menu() + QStringLiteral(".previous");
+    if (kind == QLatin1String("file"))
+        write(QStringLiteral("config/vel/startmenu.previous"), "a file");
+    else
+        QVERIFY(QFile::link(
+            path(kind == QLatin1String("link") ? QStringLiteral("precious") : QStringLiteral("none")),
+            previous));
+    QVERIFY(create());
+    QVERIFY(!QFileInfo(previous).isSymLink());
+    QCOMPARE(names(previous), QStringList(QStringLiteral("mine.desktop")));
+    QCOMPARE(read(precious), QByteArray("x"));
+    QVERIFY(!QFile::exists(path(QStringLiteral("none"))));
+    QCOMPARE(names(path(QStringLiteral("config/vel"))),
+             QStringList({QStringLiteral("startmenu"), QStringLiteral("startmenu.previous")}));
 }
 
 void tst_startmenu_folder::missingParentsAreMade()
 {
+    install(QStringLiteral("a.desktop"), "Game;");
     const QString deep = path(QStringLiteral("one/two/three/menu/"));
     QVERIFY(CreateStartMenu(QFile::encodeName(deep).constData(), nullptr));
     QVERIFY(QFile::exists(path(QStringLiteral("one/two/three/menu/.directory"))));
@@ -153,16 +213,21 @@ void tst_startmenu_folder::aLinkIsFollowed()
     QVERIFY(QFileInfo(menu()).isSymLink());
     QCOMPARE(names(path(QStringLiteral("real/menu"))),
              QStringList({QStringLiteral(".directory"), QStringLiteral("Game")}));
-    QCOMPARE(names(path(QStringLiteral("real"))), QStringList(QStringLiteral("menu")));
+    QCOMPARE(names(path(QStringLiteral("real"))),
+             QStringList({QStringLiteral("menu"), QStringLiteral("menu.previous")}));
+    QCOMPARE(names(path(QStringLiteral("real/menu.previous"))), QStringList(QStringLiteral("old.desktop")));
+    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
 }
 
 void tst_startmenu_folder::aDanglingLinkIsFollowed()
 {
+    install(QStringLiteral("a.desktop"), "Game;");
     QDir().mkpath(path(QStringLiteral("config/vel")));
     QVERIFY(QFile::link(QStringLiteral("../../real/menu"), menu()));
     QVERIFY(create());
     QVERIFY(QFileInfo(menu()).isSymLink());
-    QCOMPARE(names(path(QStringLiteral("real/menu"))), QStringList(QStringLiteral(".directory")));
+    QCOMPARE(names(path(QStringLiteral("real/menu"))),
+             QStringList({QStringLiteral(".directory"), QStringLiteral("Game")}));
 }
 
 void tst_startmenu_folder::aCircleOfLinksIsRefused()
@@ -176,17 +241,22 @@ void tst_startmenu_folder::aCircleOfLinksIsRefused()
 
 void tst_startmenu_folder::linksInTheOldMenuAreNotFollowed()
 {
+    install(QStringLiteral("a.desktop"), "Game;");
     const QString precious = write(QStringLiteral("precious/file"), "x");
     QDir().mkpath(menu());
     QVERIFY(QFile::link(path(QStringLiteral("precious")), inMenu(QStringLiteral("link"))));
+    // The first time it is kept, the second time it goes.
+    QVERIFY(create());
+    QCOMPARE(names(menu() + QStringLiteral(".previous")), QStringList(QStringLiteral("link")));
     QVERIFY(create());
     QCOMPARE(read(precious), QByteArray("x"));
-    QCOMPARE(names(menu()), QStringList(QStringLiteral(".directory")));
+    QCOMPARE(names(menu()), QStringList({QStringLiteral(".directory"), QStringLiteral("Game")}));
 }
 
 void tst_startmenu_folder::keepsThePermissionsOfTheOldMenu()
 {
     const auto permissions = QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner;
+    install(QStringLiteral("a.desktop"), "Game;");
     QDir().mkpath(menu());
     QVERIFY(QFile::setPermissions(menu(), permissions));
     QVERIFY(create());
@@ -195,12 +265,16 @@ void tst_startmenu_folder::keepsThePermissionsOfTheOldMenu()
 
 void tst_startmenu_folder::removesReadOnlyFoldersOfTheOldMenu()
 {
+    install(QStringLiteral("a.desktop"), "Game;");
     write(QStringLiteral("config/vel/startmenu/a/b/c.desktop"), "[Desktop Entry]\n");
     for (const char *name : {"a/b", "a"})
         QVERIFY(QFile::setPermissions(inMenu(QString::fromLatin1(name)), QFile::ReadOwner | QFile::ExeOwner));
     const OrdinaryUser user(folder());
     QVERIFY(create());
-    QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
+    QVERIFY(create());
+    QVERIFY(!QFile::exists(menu() + QStringLiteral(".previous/a")));
+    QCOMPARE(names(path(QStringLiteral("config/vel"))),
+             QStringList({QStringLiteral("startmenu"), QStringLiteral("startmenu.previous")}));
 }
 
 void tst_startmenu_folder::aFullDiskLeavesTheOldMenuWhole()

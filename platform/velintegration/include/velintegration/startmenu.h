@@ -6,7 +6,9 @@
 #include <velintegration/velintegration_export.h>
 
 /**
- * Builds a start menu anew. What was in it before is lost.
+ * Builds a start menu anew. The menu that was there before stays beside it, as the folder of the
+ * same name with ".previous" behind it; the one that was kept there goes. What \a menuDir leads to
+ * counts where it is a link.
  *
  * The menu holds the applications that are installed: the entries in "applications" of
  * XDG_DATA_HOME and XDG_DATA_DIRS, where an id in an earlier directory hides later ones;
@@ -17,8 +19,8 @@
  * have their permissions as far as the umask lets them, never set-id bits.
  *
  * The new menu is built beside the old one and takes its place in the end: when anything
- * fails, the old one is left as it was. What a killed program left beside it an hour ago is
- * removed.
+ * fails, or no application at all is installed and there is no template, the old one is left as it
+ * was, and so is the previous one. What a killed program left beside it an hour ago is removed.
  *
  * @param menuDir the folder of the menu. Missing parents are made, a link is followed, unless
  *        another user may have planted it (see Vel::leadsThroughPlantedLink)
