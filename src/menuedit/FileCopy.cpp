@@ -4,6 +4,7 @@
 #include "FileCopy.h"
 
 #include "FileDescriptor.h"
+#include "FileProgress.h"
 
 #include <array>
 #include <cerrno>
@@ -34,10 +35,12 @@ bool writeAll(int fd, const char *bytes, size_t size)
     return true;
 }
 
-std::error_code copyContents(int from, int to)
+std::error_code copyContents(int from, int to, FileProgress &progress)
 {
     std::array<char, 1 << 16> buffer;
     for (;;) {
+        if (!progress.goOn())
+            return std::make_error_code(std::errc::operation_canceled);
         const ssize_t count = ::read(from, buffer.data(), buffer.size());
         if (count < 0 && errno == EINTR)
             continue;
@@ -65,7 +68,7 @@ bool keepRights(int fd, const struct stat &old)
 
 } // namespace
 
-std::error_code copy(const Path &source, const Path &target, Kind kind)
+std::error_code copy(const Path &source, const Path &target, Kind kind, FileProgress &progress)
 {
     // Not blocking: something else may have taken the file's place since it was looked at.
     const FileDescriptor from(::open(source.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOFOLLOW));
@@ -79,7 +82,7 @@ std::error_code copy(const Path &source, const Path &target, Kind kind)
     FileDescriptor to(::open(target.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
     if (!to.isOpen())
         return lastError();
-    if (const std::error_code error = copyContents(from.fd(), to.fd()))
+    if (const std::error_code error = copyContents(from.fd(), to.fd(), progress))
         return error;
     if ((kind == Kind::Move && !keepRights(to.fd(), status)) || ::fsync(to.fd()) != 0 || !to.close())
         return lastError();

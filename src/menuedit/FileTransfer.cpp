@@ -3,6 +3,7 @@
 
 #include "FileTransfer.h"
 
+#include "FileProgress.h"
 #include "OnDisk.h"
 #include "StagingFolder.h"
 #include "TreeCopy.h"
@@ -50,32 +51,44 @@ bool wouldContainItself(const QFileInfo &source, const QString &canonicalDirecto
     return source.isDir() && !source.isSymLink() && isBelow(canonicalDirectory, source.canonicalFilePath());
 }
 
-std::error_code transferOne(const Pair &pair, Action action)
+std::error_code transferOne(const Pair &pair, Action action, FileProgress &progress)
 {
+    if (!progress.goOn())
+        return std::make_error_code(std::errc::operation_canceled);
     const TreeCopy::Path source = native(pair.source);
     const TreeCopy::Path target = native(pair.target);
-    if (action == Action::Move)
-        return TreeCopy::move(source, target);
-    const std::error_code error = TreeLimits::check(source);
-    return error ? error : TreeCopy::copy(source, target);
+    return action == Action::Move ? TreeCopy::move(source, target, progress)
+                                  : TreeCopy::copy(source, target, progress);
+}
+
+// Counts what is to be done; why it is too much, if it is.
+std::error_code count(const QString &source, Action action, FileProgress &progress)
+{
+    if (action == Action::Copy)
+        return TreeLimits::check(native(source), progress);
+    progress.expect(1);
+    return {};
 }
 
 // Takes back what was done, the last first. What cannot be moved back stays whole where it is.
-void takeBack(const QVector<Pair> &done, Action action)
+void takeBack(const QVector<Pair> &done, Action action, FileProgress &progress)
 {
+    UnstoppableProgress toTheEnd(progress);
     for (auto it = done.crbegin(); it != done.crend(); ++it) {
         if (action == Action::Copy)
-            TreeRemoval::removeOwn(native(it->target));
+            TreeRemoval::removeOwn(native(it->target), toTheEnd);
         else
-            TreeCopy::move(native(it->target), native(it->source));
+            TreeCopy::move(native(it->target), native(it->source), toTheEnd);
     }
 }
 
-Failure failureOf(const std::error_code &error)
+Result failed(const Pair &pair, const std::error_code &error)
 {
     if (error == std::errc::file_exists)
-        return Failure::TargetExists;
-    return Failure::Failed;
+        return {Failure::TargetExists, pair.target, QString()};
+    if (error == std::errc::operation_canceled)
+        return {Failure::Canceled, pair.source, QString()};
+    return {Failure::Failed, pair.source, QString::fromLocal8Bit(error.message().c_str())};
 }
 
 } // namespace
@@ -113,27 +126,35 @@ Result check(const QStringList &sources, const QString &targetDirectory)
     return {};
 }
 
-Result transfer(const QStringList &sources, const QString &targetDirectory, Action action)
+Result transfer(const QStringList &sources, const QString &targetDirectory, Action action,
+                FileProgress &progress)
 {
     Result possible = check(sources, targetDirectory);
     if (!possible.succeeded())
         return possible;
-    StagingFolder::removeLeftovers(native(targetDirectory));
-    QVector<Pair> done;
+    QVector<Pair> pairs;
     for (const QString &source : sources) {
-        if (liesIn(source, targetDirectory))
-            continue;
-        const Pair pair{source, targetOf(source, targetDirectory)};
-        const std::error_code error = transferOne(pair, action);
-        if (error) {
-            takeBack(done, action);
-            const Failure failure = failureOf(error);
-            return {failure, failure == Failure::TargetExists ? pair.target : source,
-                    QString::fromLocal8Bit(error.message().c_str())};
+        if (!liesIn(source, targetDirectory))
+            pairs.append({source, targetOf(source, targetDirectory)});
+    }
+    for (const Pair &pair : qAsConst(pairs)) {
+        if (const std::error_code error = count(pair.source, action, progress))
+            return failed(pair, error);
+    }
+    StagingFolder::removeLeftovers(native(targetDirectory));
+    for (auto pair = pairs.cbegin(); pair != pairs.cend(); ++pair) {
+        if (const std::error_code error = transferOne(*pair, action, progress)) {
+            takeBack(pairs.mid(0, int(pair - pairs.cbegin())), action, progress);
+            return failed(*pair, error);
         }
-        done.append(pair);
     }
     return {};
+}
+
+Result transfer(const QStringList &sources, const QString &targetDirectory, Action action)
+{
+    FileProgress nobody;
+    return transfer(sources, targetDirectory, action, nobody);
 }
 
 } // namespace FileTransfer

@@ -6,6 +6,8 @@
 #include <QString>
 #include <QStringList>
 
+class FileProgress;
+
 /**
  * Copying and moving of files and folders into a directory. All or nothing: when one item
  * fails, those already done are taken back. Nothing is ever overwritten, and an item appears
@@ -21,6 +23,7 @@ enum class Failure {
     TargetExists, ///< The directory has something of that name; or two items have the same.
     IntoItself, ///< A folder was to be put into itself or below itself.
     NotWritable, ///< The directory does not exist or may not be written.
+    Canceled, ///< Whoever followed did not want to go on.
     Failed ///< Anything else; see Result::reason.
 };
 
@@ -48,6 +51,9 @@ Result check(const QStringList &sources, const QString &targetDirectory);
  * Links are remade, not followed, in a folder that is copied. A link given itself is moved so
  * that it still points to the same thing; a copy of a link to a file is a copy of that file.
  */
+Result transfer(const QStringList &sources, const QString &targetDirectory, Action action,
+                FileProgress &progress);
+/// The same with nobody following.
 Result transfer(const QStringList &sources, const QString &targetDirectory, Action action);
 
 } // namespace FileTransfer

@@ -3,6 +3,7 @@
 
 #include "MenuDrop.h"
 
+#include "FileProgress.h"
 #include "FolderOrder.h"
 #include "FolderWatch.h"
 #include "OnDisk.h"
@@ -22,6 +23,7 @@ QString failureText(const FileTransfer::Result &result, Qt::DropAction action)
 {
     switch (result.failure) {
     case FileTransfer::Failure::None:
+    case FileTransfer::Failure::Canceled: // which the user knows
         break;
     case FileTransfer::Failure::SourceGone:
         return QFileSystemModel::tr("%1 does not exist.").arg(result.path);
@@ -102,7 +104,10 @@ DropResult MenuDrop::bringIn()
         if (!link())
             return {};
     } else {
+        const QPointer<QFileSystemModel> model(&m_model);
         const FileTransfer::Result result = transfer();
+        if (!model)
+            return {};
         if (!result.succeeded())
             return refused(result);
     }
@@ -130,10 +135,13 @@ FileTransfer::Result MenuDrop::transfer()
 {
     const QStringList released =
         m_request.action == Qt::MoveAction ? m_watch.release(m_request.sources) : QStringList();
+    const QPointer<FolderWatch> watch(&m_watch);
+    const std::unique_ptr<FileProgress> progress = m_host.follow(m_request.action);
     const FileTransfer::Result result =
-        FileTransfer::transfer(m_request.sources, m_folder, transferAction(m_request.action));
+        FileTransfer::transfer(m_request.sources, m_folder, transferAction(m_request.action), *progress);
     // What could not be moved is still there.
-    m_watch.watchAgain(released);
+    if (watch)
+        watch->watchAgain(released);
     return result;
 }
 

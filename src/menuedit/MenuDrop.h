@@ -31,8 +31,8 @@ public:
 
     MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &host, const Request &request);
 
-    /// Does it. Runs an event loop where the user is asked; when the model goes away meanwhile,
-    /// nothing is done.
+    /// Does it. Event loops run where the user is asked and while files are transferred; when the
+    /// model goes away meanwhile, nothing is done, or what was done is taken back.
     DropResult carryOut();
 
 private:

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "FileProgress.h"
+
 #include <QPersistentModelIndex>
 #include <QString>
 #include <QStringList>
@@ -54,6 +56,16 @@ public:
     /// The list for \a folder of the file model as it is shown, with \a name before the child at
     /// the source row \a row; nothing where nobody shows an order.
     virtual std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) = 0;
+
+    /**
+     * Returns what follows the copying or moving of files. An event loop may run whenever it is
+     * asked whether to go on, in which the model and this object may be deleted; it says no then.
+     */
+    virtual std::unique_ptr<FileProgress> follow(Qt::DropAction action)
+    {
+        Q_UNUSED(action)
+        return std::make_unique<FileProgress>();
+    }
 
     /// Shows what came of the drop.
     virtual void finished(const DropResult &result) = 0;

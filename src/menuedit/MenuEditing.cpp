@@ -4,6 +4,7 @@
 #include "MenuEditing.h"
 
 #include "EntryDisplay.h"
+#include "FileProgress.h"
 #include "MenuFind.h"
 #include "MenuSelection.h"
 #include "ShownMenu.h"
@@ -154,8 +155,9 @@ void MenuEditing::remove(const QString &path)
         return;
     const QFileInfo info(path);
     // A link to a folder is removed as a file is: what it leads to is not ours to delete.
+    FileProgress nobody;
     if (info.isDir() && !info.isSymLink())
-        TreeRemoval::remove(QFile::encodeName(path).toStdString());
+        TreeRemoval::remove(QFile::encodeName(path).toStdString(), nobody);
     else
         m_menu.files().remove(m_menu.files().index(path));
     m_menu.files().forgetItemInfo(path);

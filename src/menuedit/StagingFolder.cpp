@@ -48,7 +48,8 @@ bool isLeftover(int parent, const std::string &name)
 
 } // namespace
 
-StagingFolder::StagingFolder(const std::filesystem::path &directory)
+StagingFolder::StagingFolder(const std::filesystem::path &directory, FileProgress &progress)
+    : m_progress(progress)
 {
     const std::string letters(StagingLetters, 'X');
     std::string name = (directory / StagingName).string() + letters;
@@ -65,7 +66,7 @@ StagingFolder::StagingFolder(const std::filesystem::path &directory)
 StagingFolder::~StagingFolder()
 {
     if (!m_path.empty())
-        TreeRemoval::removeOwn(m_path);
+        TreeRemoval::removeOwn(m_path, m_progress);
     if (m_folder >= 0)
         ::close(m_folder);
 }

@@ -6,6 +6,8 @@
 #include <filesystem>
 #include <system_error>
 
+class FileProgress;
+
 /**
  * A hidden folder of ours in the target directory, in which a copy is made ready. The lock on it
  * tells that it is in use, however long the copying takes.
@@ -13,8 +15,8 @@
 class StagingFolder
 {
 public:
-    /// Makes one in \a directory.
-    explicit StagingFolder(const std::filesystem::path &directory);
+    /// Makes one in \a directory; \a progress follows its removal.
+    StagingFolder(const std::filesystem::path &directory, FileProgress &progress);
     /// Removes it with what is in it.
     ~StagingFolder();
     StagingFolder(const StagingFolder &) = delete;
@@ -30,6 +32,7 @@ public:
     static void removeLeftovers(const std::filesystem::path &directory);
 
 private:
+    FileProgress &m_progress;
     std::filesystem::path m_path;
     int m_folder = -1;
     std::error_code m_error;

@@ -5,6 +5,7 @@
 
 #include "FileCopy.h"
 #include "FileDescriptor.h"
+#include "FileProgress.h"
 #include "StagingFolder.h"
 #include "TreeLimits.h"
 #include "TreeRemoval.h"
@@ -24,16 +25,18 @@ namespace {
 namespace fs = std::filesystem;
 using FileCopy::Kind;
 
-std::error_code copyTree(const Path &source, const Path &target, Kind kind);
+std::error_code copyTree(const Path &source, const Path &target, Kind kind, FileProgress &progress);
 
-std::error_code copyFolder(const Path &source, const Path &target, const struct stat &status, Kind kind)
+std::error_code copyFolder(const Path &source, const Path &target, const struct stat &status, Kind kind,
+                           FileProgress &progress)
 {
     if (!FileCopy::makeFolder(target, status, kind))
         return lastError();
     std::error_code error;
     fs::directory_iterator it(source, error);
     while (!error && it != fs::directory_iterator()) {
-        if (const std::error_code failed = copyTree(it->path(), target / it->path().filename(), kind))
+        if (const std::error_code failed =
+                copyTree(it->path(), target / it->path().filename(), kind, progress))
             return failed;
         it.increment(error);
     }
@@ -42,8 +45,10 @@ std::error_code copyFolder(const Path &source, const Path &target, const struct 
     return error;
 }
 
-std::error_code copyTree(const Path &source, const Path &target, Kind kind)
+std::error_code copyTree(const Path &source, const Path &target, Kind kind, FileProgress &progress)
 {
+    if (!progress.goOn())
+        return std::make_error_code(std::errc::operation_canceled);
     struct stat status = {};
     if (::lstat(source.c_str(), &status) != 0)
         return lastError();
@@ -51,15 +56,16 @@ std::error_code copyTree(const Path &source, const Path &target, Kind kind)
     if (S_ISLNK(status.st_mode))
         fs::copy_symlink(source, target, error);
     else if (S_ISREG(status.st_mode))
-        error = FileCopy::copy(source, target, kind);
+        error = FileCopy::copy(source, target, kind, progress);
     else if (S_ISDIR(status.st_mode))
-        error = copyFolder(source, target, status, kind);
+        error = copyFolder(source, target, status, kind, progress);
     else
         error = std::make_error_code(std::errc::not_supported);
     if (!error && kind == Kind::Move) {
         const std::array<timespec, 2> stamps{status.st_atim, status.st_mtim};
         ::utimensat(AT_FDCWD, target.c_str(), stamps.data(), AT_SYMLINK_NOFOLLOW);
     }
+    progress.advance();
     return error;
 }
 
@@ -79,12 +85,12 @@ std::error_code renameToNew(const Path &source, const Path &target)
     return {};
 }
 
-std::error_code copyByStaging(const Path &source, const Path &target, Kind kind)
+std::error_code copyByStaging(const Path &source, const Path &target, Kind kind, FileProgress &progress)
 {
-    const StagingFolder staging(target.parent_path());
+    const StagingFolder staging(target.parent_path(), progress);
     if (staging.error())
         return staging.error();
-    if (const std::error_code error = copyTree(source, staging.item(), kind))
+    if (const std::error_code error = copyTree(source, staging.item(), kind, progress))
         return error;
     return renameToNew(staging.item(), target);
 }
@@ -95,7 +101,7 @@ bool isWritableFolder(const Path &path)
 }
 
 // Whether everything below the folder \a source may be removed.
-std::error_code canBeRemoved(const Path &source)
+std::error_code canBeRemoved(const Path &source, FileProgress &progress)
 {
     std::error_code error;
     fs::recursive_directory_iterator it(source, fs::directory_options::none, error);
@@ -108,6 +114,9 @@ std::error_code canBeRemoved(const Path &source)
             return lastError();
         if (!error && TreeLimits::areMet(it.depth() + 1, ++items))
             return std::make_error_code(std::errc::file_too_large);
+        if (!error && !progress.goOn())
+            return std::make_error_code(std::errc::operation_canceled);
+        progress.expect(1);
         if (!error)
             it.increment(error);
     }
@@ -116,21 +125,21 @@ std::error_code canBeRemoved(const Path &source)
 
 // The source goes only when the copy is complete, and leaves its place in one step: either
 // both are there afterwards or only the copy.
-std::error_code moveByCopying(const Path &source, const Path &target)
+std::error_code moveByCopying(const Path &source, const Path &target, FileProgress &progress)
 {
     std::error_code error;
     if (fs::is_directory(fs::symlink_status(source, error)))
-        error = canBeRemoved(source);
+        error = canBeRemoved(source, progress);
     if (error)
         return error;
     StagingFolder::removeLeftovers(source.parent_path());
-    const StagingFolder leaving(source.parent_path());
+    const StagingFolder leaving(source.parent_path(), progress);
     if (leaving.error())
         return leaving.error();
-    if ((error = copyByStaging(source, target, Kind::Move)))
+    if ((error = copyByStaging(source, target, Kind::Move, progress)))
         return error;
     if ((error = renameToNew(source, leaving.item())))
-        TreeRemoval::removeOwn(target);
+        TreeRemoval::removeOwn(target, progress);
     return error;
 }
 
@@ -151,35 +160,48 @@ std::error_code remakeLink(const Path &source, const Path &target)
     return error;
 }
 
+std::error_code moveLink(const Path &source, const Path &target)
+{
+    if (const std::error_code error = remakeLink(source, target))
+        return error;
+    if (::unlink(source.c_str()) == 0)
+        return {};
+    const std::error_code error = lastError();
+    ::unlink(target.c_str());
+    return error;
+}
+
+// What was one step is done unless it failed.
+std::error_code advanced(const std::error_code &error, FileProgress &progress)
+{
+    if (!error)
+        progress.advance();
+    return error;
+}
+
 } // namespace
 
-std::error_code copy(const Path &source, const Path &target)
+std::error_code copy(const Path &source, const Path &target, FileProgress &progress)
 {
     std::error_code error;
     const fs::file_status status = fs::status(source, error);
     if (error)
         return error;
     if (!fs::is_symlink(fs::symlink_status(source, error)))
-        return copyByStaging(source, target, Kind::Copy);
+        return copyByStaging(source, target, Kind::Copy, progress);
     if (fs::is_directory(status))
-        return remakeLink(source, target);
+        return advanced(remakeLink(source, target), progress);
     const Path file = fs::canonical(source, error);
-    return error ? error : copyByStaging(file, target, Kind::Copy);
+    return error ? error : copyByStaging(file, target, Kind::Copy, progress);
 }
 
-std::error_code move(const Path &source, const Path &target)
+std::error_code move(const Path &source, const Path &target, FileProgress &progress)
 {
-    if (isRelativeLink(source)) {
-        if (const std::error_code error = remakeLink(source, target))
-            return error;
-        if (::unlink(source.c_str()) == 0)
-            return {};
-        const std::error_code error = lastError();
-        ::unlink(target.c_str());
-        return error;
-    }
+    if (isRelativeLink(source))
+        return advanced(moveLink(source, target), progress);
     const std::error_code error = renameToNew(source, target);
-    return error == std::errc::cross_device_link ? moveByCopying(source, target) : error;
+    return error == std::errc::cross_device_link ? moveByCopying(source, target, progress)
+                                                 : advanced(error, progress);
 }
 
 } // namespace TreeCopy

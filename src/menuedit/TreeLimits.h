@@ -6,6 +6,8 @@
 #include <filesystem>
 #include <system_error>
 
+class FileProgress;
+
 /**
  * How much a menu's folder may hold that is copied in one go. A folder of the disk that was dropped by
  * mistake would keep the user waiting for hours.
@@ -22,7 +24,7 @@ constexpr bool areMet(int levels, int items)
 }
 
 /// Why \a path, with everything below it and links not followed, is too much to copy; no error when
-/// it is not.
-std::error_code check(const std::filesystem::path &path);
+/// it is not. Has \a progress expect it.
+std::error_code check(const std::filesystem::path &path, FileProgress &progress);
 
 } // namespace TreeLimits

@@ -4,6 +4,7 @@
 #include "TreeRemoval.h"
 
 #include "FileDescriptor.h"
+#include "FileProgress.h"
 #include "OpenFolder.h"
 
 #include <cerrno>
@@ -22,8 +23,9 @@ class Removal
 public:
     enum class Rights { AsTheyAre, Taken };
 
-    explicit Removal(Rights rights)
+    Removal(Rights rights, FileProgress &progress)
         : m_takesRights(rights == Rights::Taken)
+        , m_progress(progress)
     {
     }
 
@@ -35,13 +37,18 @@ private:
     void note(const std::error_code &error, const Path &path);
 
     const bool m_takesRights;
+    FileProgress &m_progress;
+    bool m_isCanceled = false;
     Result m_result;
 };
 
 void Removal::removeAt(int parent, const std::string &name, const Path &path)
 {
+    m_isCanceled = m_isCanceled || !m_progress.goOn();
+    if (m_isCanceled)
+        return note(std::make_error_code(std::errc::operation_canceled), path);
     if (::unlinkat(parent, name.c_str(), 0) == 0)
-        return;
+        return m_progress.advance();
     if (errno != EISDIR)
         return note(lastError(), path);
     if (m_takesRights)
@@ -53,7 +60,8 @@ void Removal::removeAt(int parent, const std::string &name, const Path &path)
             removeAt(::dirfd(folder.get()), child, path / child);
     }
     if (::unlinkat(parent, name.c_str(), AT_REMOVEDIR) != 0)
-        note(closed ? closed : lastError(), path);
+        return note(closed ? closed : lastError(), path);
+    m_progress.advance();
 }
 
 // What lies in a folder comes before the folder, which then only tells that it is not empty.
@@ -65,21 +73,23 @@ void Removal::note(const std::error_code &error, const Path &path)
 
 } // namespace
 
-Result remove(const Path &path)
+Result remove(const Path &path, FileProgress &progress)
 {
-    Removal removal(Removal::Rights::AsTheyAre);
+    Removal removal(Removal::Rights::AsTheyAre, progress);
     removal.removeAt(AT_FDCWD, path.string(), path);
     return removal.result();
 }
 
-void removeOwn(const Path &path)
+void removeOwn(const Path &path, FileProgress &progress)
 {
-    removeOwnAt(AT_FDCWD, path.string());
+    UnstoppableProgress toTheEnd(progress);
+    Removal(Removal::Rights::Taken, toTheEnd).removeAt(AT_FDCWD, path.string(), path);
 }
 
 void removeOwnAt(int parent, const std::string &name)
 {
-    Removal(Removal::Rights::Taken).removeAt(parent, name, name);
+    FileProgress nobody;
+    Removal(Removal::Rights::Taken, nobody).removeAt(parent, name, name);
 }
 
 } // namespace TreeRemoval

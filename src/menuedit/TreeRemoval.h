@@ -7,6 +7,8 @@
 #include <string>
 #include <system_error>
 
+class FileProgress;
+
 /**
  * Removing of one file or folder with everything in it, on the bytes that the file system knows:
  * names that are no valid text go like any other. Links are removed, not followed.
@@ -26,13 +28,14 @@ struct Result
     bool succeeded() const { return !error; }
 };
 
-/// Removes \a path as far as the user may; goes on after what cannot be removed.
-Result remove(const Path &path);
+/// Removes \a path as far as the user may; goes on after what cannot be removed. When \a progress
+/// says no, it is errc::operation_canceled, and what is not yet removed stays.
+Result remove(const Path &path, FileProgress &progress);
 
-/// Removes what is ours, folders that may not be written included.
-void removeOwn(const Path &path);
+/// Removes what is ours, folders that may not be written included, whatever \a progress says.
+void removeOwn(const Path &path, FileProgress &progress);
 
-/// The same for \a name in the open folder \a parent.
+/// The same for \a name in the open folder \a parent, which nobody follows.
 void removeOwnAt(int parent, const std::string &name);
 
 } // namespace TreeRemoval

@@ -33,9 +33,25 @@ public:
         return QStringList{QStringLiteral("*"), name};
     }
 
+    std::unique_ptr<FileProgress> follow(Qt::DropAction) override { return std::make_unique<Follower>(this); }
+
     void finished(const DropResult &) override { QFAIL("is told by the model"); }
 
+    class Follower : public FileProgress
+    {
+    public:
+        explicit Follower(Host *host)
+            : m_host(host)
+        {
+        }
+        bool goOn() override { return !m_host->goOn || m_host->goOn(); }
+
+    private:
+        Host *m_host;
+    };
+
     std::function<bool()> answer;
+    std::function<bool()> goOn;
     bool hasOrder = true;
     QStringList questions;
     QStringList places;
@@ -66,6 +82,9 @@ private Q_SLOTS:
     void refusesATargetThatIsStillThereAfterAYes();
     void goesOnWhenTheTargetIsGoneAfterAYes();
     void doesNothingWhenTheModelGoesWhileItAsks();
+    void doesNothingWhenTheUserCancels();
+    void takesBackWhenTheModelGoesWhileItCopies_data();
+    void takesBackWhenTheModelGoesWhileItCopies();
     void tellsWhatFailed();
 
 private:
@@ -303,6 +322,40 @@ void tst_MenuDrop::doesNothingWhenTheModelGoesWhileItAsks()
     QVERIFY(!drop({QStringLiteral("from/x")}, Qt::MoveAction, 0).isDone);
 
     QVERIFY(!QFile::exists(target));
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::doesNothingWhenTheUserCancels()
+{
+    m_host.goOn = [] { return false; };
+    const DropResult result = drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::CopyAction, 0);
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint, QString());
+    QVERIFY(!QFile::exists(path(QStringLiteral("to/x"))));
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::takesBackWhenTheModelGoesWhileItCopies_data()
+{
+    QTest::addColumn<Qt::DropAction>("action");
+    QTest::newRow("copy") << Qt::CopyAction;
+    QTest::newRow("move") << Qt::MoveAction;
+}
+
+void tst_MenuDrop::takesBackWhenTheModelGoesWhileItCopies()
+{
+    QFETCH(Qt::DropAction, action);
+    m_host.goOn = [this] {
+        if (QFile::exists(path(QStringLiteral("to/x"))))
+            m_model.reset();
+        return m_model != nullptr;
+    };
+    const DropResult result = drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, action, 0);
+    QVERIFY(!m_model);
+    QVERIFY(!result.isDone);
+    QCOMPARE(QDir(path(QStringLiteral("to"))).entryList(QDir::Files), QStringList(QStringLiteral("a")));
+    QCOMPARE(QDir(path(QStringLiteral("from"))).entryList(QDir::Files),
+             QStringList({QStringLiteral("x"), QStringLiteral("y")}));
     QCOMPARE(record(), Record);
 }
 

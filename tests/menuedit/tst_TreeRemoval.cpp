@@ -4,6 +4,7 @@
 #include "OrdinaryUser.h"
 #include "TestCase.h"
 
+#include <menuedit/FileProgress.h>
 #include <menuedit/TreeRemoval.h>
 
 #include <QDir>
@@ -31,12 +32,17 @@ private Q_SLOTS:
     void removesTheFolderThatCannotBeListedIfItIsEmpty();
 
 private:
+    TreeRemoval::Result remove(const char *name) const
+    {
+        FileProgress nobody;
+        return TreeRemoval::remove(native(name), nobody);
+    }
     fs::path native(const char *name) const { return fs::path(path(QLatin1String(name)).toStdString()); }
 };
 
 void tst_TreeRemoval::removesWhatIsNotThere()
 {
-    QVERIFY(TreeRemoval::remove(native("none")).succeeded());
+    QVERIFY(remove("none").succeeded());
 }
 
 void tst_TreeRemoval::removesNamesThatAreNoText()
@@ -44,7 +50,7 @@ void tst_TreeRemoval::removesNamesThatAreNoText()
     write(QStringLiteral("d/plain"), "x");
     fs::create_directories(native("d") / "bad\xff\xfe");
     std::ofstream(native("d") / "bad\xff\xfe" / "also\xc3") << "x";
-    QVERIFY(TreeRemoval::remove(native("d")).succeeded());
+    QVERIFY(remove("d").succeeded());
     QVERIFY(!fs::exists(native("d")));
 }
 
@@ -53,9 +59,9 @@ void tst_TreeRemoval::removesLinksAndNotWhatTheyLeadTo()
     write(QStringLiteral("elsewhere/kept"), "x");
     write(QStringLiteral("d/plain"), "x");
     QVERIFY(QFile::link(path(QStringLiteral("elsewhere")), path(QStringLiteral("d/link"))));
-    QVERIFY(TreeRemoval::remove(native("d")).succeeded());
+    QVERIFY(remove("d").succeeded());
     QVERIFY(QFile::link(path(QStringLiteral("elsewhere")), path(QStringLiteral("link"))));
-    QVERIFY(TreeRemoval::remove(native("link")).succeeded());
+    QVERIFY(remove("link").succeeded());
     QVERIFY(!fs::exists(fs::symlink_status(native("link"))));
     QVERIFY(QFile::exists(path(QStringLiteral("elsewhere/kept"))));
 }
@@ -67,7 +73,7 @@ void tst_TreeRemoval::tellsWhatStaysAndWhy()
     write(QStringLiteral("d/e"), "x");
     const OrdinaryUser user(folder());
     QCOMPARE(chmod(native("d/closed").c_str(), 0500), 0);
-    const TreeRemoval::Result result = TreeRemoval::remove(native("d"));
+    const TreeRemoval::Result result = remove("d");
     QVERIFY(!result.succeeded());
     QVERIFY(result.error == std::errc::permission_denied);
     QCOMPARE(result.path.string(), native("d/closed/b").string());
@@ -81,7 +87,8 @@ void tst_TreeRemoval::removesItsOwnWhateverTheRights()
     write(QStringLiteral("d/closed/b"), "x");
     const OrdinaryUser user(folder());
     QCOMPARE(chmod(native("d/closed").c_str(), 0), 0);
-    TreeRemoval::removeOwn(native("d"));
+    FileProgress nobody;
+    TreeRemoval::removeOwn(native("d"), nobody);
     QVERIFY(!fs::exists(native("d")));
 }
 
@@ -91,9 +98,9 @@ void tst_TreeRemoval::removesTheFolderThatCannotBeListedIfItIsEmpty()
     write(QStringLiteral("full/closed/a"), "x");
     const OrdinaryUser user(folder());
     QCOMPARE(chmod(native("d/closed").c_str(), 0), 0);
-    QVERIFY(TreeRemoval::remove(native("d")).succeeded());
+    QVERIFY(remove("d").succeeded());
     QCOMPARE(chmod(native("full/closed").c_str(), 0), 0);
-    const TreeRemoval::Result result = TreeRemoval::remove(native("full"));
+    const TreeRemoval::Result result = remove("full");
     QVERIFY(result.error == std::errc::permission_denied);
     QCOMPARE(result.path.string(), native("full/closed").string());
     QCOMPARE(chmod(native("full/closed").c_str(), 0700), 0);
