@@ -115,10 +115,12 @@ public:
     void clearFindResults();
 
     /**
-     * Searches the names of the whole tree for the text asked for last and selects a match.
+     * Searches the names of the whole menu for the text asked for last and selects a match.
      *
-     * Folders that were never opened are read first, for a bounded time. Nothing happens when
-     * no text was given yet; when nothing matches, a message box says so.
+     * Folders that were never opened are searched too, but not what a link leads to outside the
+     * menu. A search that takes more than half a second shows a small window; its button and
+     * Escape end it. It ends by itself after 20,000 folders or ten seconds. Nothing happens
+     * when no text was given yet; when nothing matches, a message box says so.
      *
      * @param next whether to go on to the next match of the last search instead
      * @return whether a match was selected

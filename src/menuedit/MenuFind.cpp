@@ -3,18 +3,29 @@
 
 #include "MenuFind.h"
 
+#include "FoundOrder.h"
+#include "LongWork.h"
 #include "MenuSelection.h"
+#include "OnDisk.h"
+#include "OpenedFolders.h"
+#include "RowCache.h"
 #include "ShownMenu.h"
-#include "TreeLoader.h"
-#include "VelMenuProxyModel.h"
-#include "WaitCursor.h"
+#include "VelMenuModel.h"
 
 #include <frame/MessageBox.h>
 
 #include <QCoreApplication>
+#include <QDir>
+#include <QElapsedTimer>
 #include <QInputDialog>
 #include <QPointer>
 #include <QTreeView>
+
+namespace {
+
+constexpr int MostMilliseconds = 10000;
+
+} // namespace
 
 MenuFind::MenuFind(QTreeView *view, const ShownMenu &menu, MenuSelection &selection)
     : m_view(view)
@@ -45,65 +56,101 @@ void MenuFind::ask()
 
 bool MenuFind::find(bool next)
 {
-    if (m_text.isEmpty())
+    if (m_text.isEmpty() || m_isSearching)
         return false;
     if (next && showNext())
         return true;
 
     clear();
     const QString text = m_text;
+    QVector<MenuWalk::Item> matches;
     const QPointer<MenuFind> self(this);
-    {
-        const WaitCursor waiting;
-        if (self)
-            m_menu.loader().load(m_menu.proxy().mapToSource(m_view->rootIndex()));
-        // The view may show another directory by now, and another text may have been asked for.
-        if (!self || m_text != text)
-            return false;
-        for (const QModelIndex &match : matches())
-            m_matches.append(match);
-    }
-    if (m_matches.isEmpty()) {
-        MessageBox::show(m_view, QMessageBox::Information, QCoreApplication::translate("VelMenuView", "Find"),
-                         QCoreApplication::translate("VelMenuView", "'%1' not found .").arg(text),
-                         QMessageBox::Close);
+    const End end = search(text, &matches);
+    // The view may show another directory by now, and another text may have been asked for.
+    if (!self || end == End::Canceled || m_text != text)
         return false;
-    }
-    m_shown = 0;
-    show();
-    return true;
+    m_matches = inOrder(matches);
+    if (showNext())
+        return true;
+    tellNothing(text);
+    return false;
 }
 
-// From the first child, as a search from the root itself would begin among its siblings.
-QModelIndexList MenuFind::matches() const
+MenuFind::End MenuFind::search(const QString &text, QVector<MenuWalk::Item> *matches)
 {
-    const QModelIndex root = m_view->rootIndex();
-    const QModelIndex first = root.isValid() ? m_menu.proxy().index(0, 0, root) : QModelIndex();
-    if (!first.isValid())
-        return {};
-    return m_menu.proxy().match(first, Qt::DisplayRole, m_text, -1,
-                                Qt::MatchContains | Qt::MatchWrap | Qt::MatchRecursive);
+    const QPointer<MenuFind> self(this);
+    m_isSearching = true;
+    LongWork work(m_view, QCoreApplication::translate("VelMenuView", "Find"),
+                  QCoreApplication::translate("VelMenuView", "Searching the menu for '%1'...").arg(text));
+    if (!self)
+        return End::Canceled;
+    const QSet<QString> opened = OpenedFolders::in(m_menu.files());
+    MenuWalk walk(m_menu.files().menuDirectory(), [&](const QString &path) { return opened.contains(path); });
+    QElapsedTimer timer;
+    timer.start();
+    bool isInTime = true;
+    while (const std::optional<MenuWalk::Item> item = isInTime ? walk.next() : std::nullopt) {
+        const RowCache::Display display = m_menu.files().displayOf(item->path, item->isFolder);
+        if (!display.isHidden && display.name.contains(text, Qt::CaseInsensitive))
+            matches->append(*item);
+        if (!work.goOn() || !self) {
+            if (self)
+                m_isSearching = false;
+            return End::Canceled;
+        }
+        isInTime = timer.elapsed() < MostMilliseconds;
+    }
+    m_isSearching = false;
+    return isInTime && walk.isWhole() ? End::Whole : End::Limit;
 }
 
+QStringList MenuFind::inOrder(const QVector<MenuWalk::Item> &matches) const
+{
+    return FoundOrder::sorted(QDir::cleanPath(m_menu.files().menuDirectory()), matches,
+                              [this](const MenuWalk::Item &item) {
+                                  return m_menu.files().displayOf(item.path, item.isFolder).name;
+                              });
+}
+
+void MenuFind::tellNothing(const QString &text)
+{
+    MessageBox::show(m_view, QMessageBox::Information, QCoreApplication::translate("VelMenuView", "Find"),
+                     QCoreApplication::translate("VelMenuView", "'%1' not found .").arg(text),
+                     QMessageBox::Close);
+}
+
+// Drops the matches that are gone.
 bool MenuFind::showNext()
 {
-    for (int i = m_matches.size() - 1; i >= 0; --i) {
-        if (m_matches.at(i).isValid())
-            continue;
-        m_matches.removeAt(i);
-        if (i <= m_shown)
+    while (!m_matches.isEmpty()) {
+        const int next = (m_shown + 1) % m_matches.size();
+        if (show(m_matches.at(next))) {
+            m_shown = next;
+            return true;
+        }
+        m_matches.removeAt(next);
+        if (next <= m_shown)
             --m_shown;
     }
-    if (m_matches.isEmpty())
+    return false;
+}
+
+bool MenuFind::show(const QString &path)
+{
+    const QModelIndex match = OnDisk::exists(path) ? m_selection.shown(path) : QModelIndex();
+    if (!match.isValid())
         return false;
-    m_shown = (m_shown + 1) % m_matches.size();
-    show();
+    connect(&m_menu.files(), &QFileSystemModel::directoryLoaded, this, &MenuFind::keepInSight,
+            Qt::UniqueConnection);
+    m_selection.select(match);
+    m_view->scrollTo(match);
     return true;
 }
 
-void MenuFind::show()
+// The folders on the way are read only now; their rows push the match out of sight.
+void MenuFind::keepInSight(const QString &loadedFolder)
 {
-    const QModelIndex match = m_matches.at(m_shown);
-    m_selection.select(match);
-    m_view->scrollTo(match);
+    const QString match = m_matches.value(m_shown);
+    if (match.startsWith(loadedFolder + QLatin1Char('/')) && m_selection.path() == match)
+        m_view->scrollTo(m_selection.shown(match));
 }

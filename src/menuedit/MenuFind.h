@@ -3,10 +3,12 @@
 
 #pragma once
 
-#include <QList>
+#include "MenuWalk.h"
+
 #include <QObject>
-#include <QPersistentModelIndex>
 #include <QString>
+#include <QStringList>
+#include <QVector>
 
 class MenuSelection;
 class QTreeView;
@@ -14,6 +16,9 @@ class ShownMenu;
 
 /**
  * Finding items by their names: the text asked for, the matches and the one that is shown.
+ *
+ * A search looks through the folders on disk. The model reads those on the way to a match that is
+ * shown, and no others.
  */
 class MenuFind : public QObject
 {
@@ -25,22 +30,28 @@ public:
 
     /// Asks for a text and selects the first match; the user may take this object away meanwhile.
     void ask();
-    /// Searches the whole tree and selects the first match, or goes on to the \a next one of the
-    /// last search; whether a match was selected.
+    /// Searches the whole menu and selects the first match, or goes on to the \a next one of the
+    /// last search; whether a match was selected. This object may go away meanwhile.
     bool find(bool next);
     /// Drops the matches, so that the next search begins anew.
     void clear();
 
 private:
+    /// How a search ended.
+    enum class End { Whole, Limit, Canceled };
+
     bool showNext();
-    void show();
-    QModelIndexList matches() const;
+    bool show(const QString &path);
+    void keepInSight(const QString &loadedFolder);
+    End search(const QString &text, QVector<MenuWalk::Item> *matches);
+    QStringList inOrder(const QVector<MenuWalk::Item> &matches) const;
+    void tellNothing(const QString &text);
 
     QTreeView *const m_view;
     const ShownMenu &m_menu;
     MenuSelection &m_selection;
     QString m_text;
-    // In the sorting model; persistent, as rows come and go between two searches.
-    QList<QPersistentModelIndex> m_matches;
+    QStringList m_matches;
     int m_shown = -1;
+    bool m_isSearching = false;
 };

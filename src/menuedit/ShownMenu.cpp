@@ -3,7 +3,6 @@
 
 #include "ShownMenu.h"
 
-#include "TreeLoader.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 
@@ -22,7 +21,6 @@ void ShownMenu::build()
 {
     const std::unique_ptr<VelMenuModel> former = std::move(m_files);
     m_files = std::make_unique<VelMenuModel>(m_directory, m_view, nullptr);
-    m_loader = std::make_unique<TreeLoader>(m_files.get());
     m_files->setReadOnly(!m_isEditable);
     m_proxy->setSourceModel(m_files.get());
 }

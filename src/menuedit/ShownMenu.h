@@ -8,14 +8,12 @@
 #include <memory>
 
 class QObject;
-class TreeLoader;
 class VelMenuModel;
 class VelMenuProxyModel;
 class VelMenuView;
 
 /**
- * One menu directory as a view shows it: the model of its files, the sorting model above that,
- * and the loader that reads folders which were never opened.
+ * One menu directory as a view shows it: the model of its files and the sorting model above that.
  */
 class ShownMenu
 {
@@ -32,7 +30,6 @@ public:
 
     VelMenuModel &files() const { return *m_files; }
     VelMenuProxyModel &proxy() const { return *m_proxy; }
-    TreeLoader &loader() const { return *m_loader; }
 
     /// Builds the model of the files under the sorting model. To be called again when the
     /// directory was replaced: what the model watched is gone then.
@@ -43,6 +40,5 @@ private:
     const bool m_isEditable;
     VelMenuView *const m_view;
     std::unique_ptr<VelMenuModel> m_files;
-    std::unique_ptr<TreeLoader> m_loader;
     std::unique_ptr<VelMenuProxyModel> m_proxy;
 };

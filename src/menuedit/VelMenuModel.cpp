@@ -8,7 +8,6 @@
 #include "MenuClipboard.h"
 #include "MenuDrop.h"
 #include "MenuIconProvider.h"
-#include "RowCache.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
@@ -26,6 +25,22 @@ const QDir::Filters DefaultFilter = QDir::AllEntries | QDir::NoDotAndDotDot | QD
 
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
+
+// The file that tells how \a path is shown; empty for a file that is no entry and for a folder
+// without a record file.
+QString describingFile(const QString &path, bool isFolder)
+{
+    const QString recordFile = EntryPath::recordFileOf(path);
+    if (isFolder && QFileInfo::exists(recordFile))
+        return recordFile;
+    return EntryPath::isEntry(path) || EntryPath::isRecordFile(path) ? path : QString();
+}
+
+RowCache::Display readDisplay(const QString &file)
+{
+    const VelUIDesktopEntry entry(file);
+    return {EntryDisplay::shownName(entry), EntryPath::isEntry(file) && EntryDisplay::isHidden(entry)};
+}
 
 } // namespace
 
@@ -171,25 +186,30 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 {
     if (isFolder && m_cache->isPlain(path))
         return false;
-    const QString recordFile = EntryPath::recordFileOf(path);
-    const QString file = isFolder && QFileInfo::exists(recordFile) ? recordFile : path;
-    const bool isEntry = EntryPath::isEntry(file);
-    if (!isEntry && !EntryPath::isRecordFile(file)) {
+    const QString file = describingFile(path, isFolder);
+    if (file.isEmpty()) {
         if (isFolder)
             m_cache->setPlain(path);
         return false;
     }
 
     std::optional<RowCache::Display> display = m_cache->takePrefetched(file);
-    if (!display) {
-        const VelUIDesktopEntry entry(file);
-        display = RowCache::Display{EntryDisplay::shownName(entry), isEntry && EntryDisplay::isHidden(entry)};
-    }
+    if (!display)
+        display = readDisplay(file);
     // The row of a file that is gone stands until the base class sees it. What is asked for then
     // must not be remembered of the next file that comes to this path.
     if (!display->name.isEmpty() || QFileInfo::exists(file))
         m_cache->setDisplay(path, *display);
     return true;
+}
+
+RowCache::Display VelMenuModel::displayOf(const QString &path, bool isFolder) const
+{
+    const std::optional<RowCache::Display> known = m_cache->display(path);
+    if (known && !known->name.isEmpty())
+        return *known;
+    const QString file = describingFile(path, isFolder);
+    return file.isEmpty() ? RowCache::Display{QFileInfo(path).fileName(), false} : readDisplay(file);
 }
 
 // The same as filePath(), which puts the path together anew from its elements. The node of

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "RowCache.h"
+
 #include <QFileSystemModel>
 #include <QPointer>
 #include <QString>
@@ -13,7 +15,6 @@
 class FolderWatch;
 class MenuDropHost;
 class MenuIconProvider;
-class RowCache;
 class VelMenuView;
 struct DropResult;
 
@@ -48,6 +49,10 @@ public:
     /// The menu directory, clean and absolute, with a "/" at the end if it was given with one;
     /// empty if none was given.
     QString menuDirectory() const;
+
+    /// How the row of \a path is shown, or would be; looks at the file if that was never asked for.
+    /// Makes no row, and remembers nothing.
+    RowCache::Display displayOf(const QString &path, bool isFolder) const;
 
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);

@@ -7,6 +7,7 @@
 #include "VelMenuView.h"
 
 #include <QDialog>
+#include <QDir>
 #include <QLineEdit>
 
 void FindTestCase::find(VelMenuView &view, const QString &text)
@@ -19,4 +20,17 @@ void FindTestCase::find(VelMenuView &view, const QString &text)
     view.slotFind();
     QVERIFY(modal.finished());
     QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void FindTestCase::writeMaze()
+{
+    for (int from = 0; from < 9; ++from) {
+        const QString folder = QStringLiteral("%1/m%2").arg(menu()).arg(from);
+        QVERIFY(QDir().mkpath(folder));
+        for (int to = 0; to < 9; ++to) {
+            if (to != from)
+                QVERIFY(QFile::link(QStringLiteral("../m%1").arg(to),
+                                    QStringLiteral("%1/l%2").arg(folder).arg(to)));
+        }
+    }
 }

@@ -18,4 +18,7 @@ public:
 protected:
     /// Searches for \a text, no window opens but the question for it.
     void find(VelMenuView &view, const QString &text);
+    /// Fills the menu with nine folders that hold nothing but links to each other: there are more
+    /// ways through them than a search can go, which takes it more than half a second.
+    void writeMaze();
 };

@@ -4,7 +4,6 @@
 #include "FindTestCase.h"
 #include "ModalDriver.h"
 #include "VelMenuView.h"
-#include <menuedit/TreeLoader.h>
 
 #include <QElapsedTimer>
 #include <QFileSystemModel>
@@ -33,7 +32,6 @@ private Q_SLOTS:
     void findsNeitherTheMenuNorItsNeighbors();
     void doesNotFollowLinksInCircles();
     void passesOverFoldersThatCannotBeRead();
-    void stopsAtItsLimits();
 };
 
 void tst_VelMenuViewFind::doesNothingWithoutAText()
@@ -296,31 +294,6 @@ void tst_VelMenuViewFind::passesOverFoldersThatCannotBeRead()
     find(view, QStringLiteral("needle"));
     QVERIFY(QFile::setPermissions(closed, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
     QCOMPARE(view.selectedPath(), isRoot ? closed + QLatin1String("/y.desktop") : needle);
-}
-
-void tst_VelMenuViewFind::stopsAtItsLimits()
-{
-    for (int i = 0; i < 20; ++i)
-        writeEntry(QStringLiteral("f%1/x.desktop").arg(i), QStringLiteral("X"));
-    QString chain = menu();
-    for (int i = 0; i < 200; ++i)
-        chain += QLatin1String("/d");
-    QVERIFY(QDir().mkpath(chain));
-    QFileSystemModel model;
-    TreeLoader loader(&model);
-    const QModelIndex root = model.setRootPath(menu());
-    loader.setLimits(5, 10000);
-    QVERIFY(!loader.load(root));
-    loader.setLimits(1000, 1);
-    QVERIFY(!loader.load(root));
-    loader.setLimits(1000, 10000);
-    QVERIFY(loader.load(root));
-    for (int i = 0; i < 20; ++i)
-        QCOMPARE(model.rowCount(model.index(QStringLiteral("%1/f%2").arg(menu()).arg(i))), 1);
-    // Nothing has to be read again.
-    loader.setLimits(1000, 1);
-    QVERIFY(loader.load(root));
-    QVERIFY(!loader.load(QModelIndex()));
 }
 
 VEL_TEST_MAIN(tst_VelMenuViewFind)
