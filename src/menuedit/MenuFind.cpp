@@ -4,10 +4,11 @@
 #include "MenuFind.h"
 
 #include "FoundOrder.h"
+#include "LoadedFolders.h"
 #include "LongWork.h"
 #include "MenuSelection.h"
+#include "MenuVoice.h"
 #include "OnDisk.h"
-#include "OpenedFolders.h"
 #include "RowCache.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
@@ -27,10 +28,11 @@ constexpr int MostMilliseconds = 10000;
 
 } // namespace
 
-MenuFind::MenuFind(QTreeView *view, const ShownMenu &menu, MenuSelection &selection)
+MenuFind::MenuFind(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuVoice &voice)
     : m_view(view)
     , m_menu(menu)
     , m_selection(selection)
+    , m_voice(voice)
 {
 }
 
@@ -70,10 +72,12 @@ bool MenuFind::find(bool next)
     if (!self || end == End::Canceled || m_text != text)
         return false;
     m_matches = inOrder(matches);
-    if (showNext())
-        return true;
-    tellNothing(text);
-    return false;
+    const bool isFound = showNext();
+    if (!isFound)
+        tellNothing(text);
+    if (self && end == End::Limit)
+        tellOfLimit();
+    return isFound;
 }
 
 MenuFind::End MenuFind::search(const QString &text, QVector<MenuWalk::Item> *matches)
@@ -84,7 +88,7 @@ MenuFind::End MenuFind::search(const QString &text, QVector<MenuWalk::Item> *mat
                   QCoreApplication::translate("VelMenuView", "Searching the menu for '%1'...").arg(text));
     if (!self)
         return End::Canceled;
-    const QSet<QString> opened = OpenedFolders::in(m_menu.files());
+    const QSet<QString> opened = LoadedFolders::in(m_menu.files());
     MenuWalk walk(m_menu.files().menuDirectory(), [&](const QString &path) { return opened.contains(path); });
     QElapsedTimer timer;
     timer.start();
@@ -117,6 +121,15 @@ void MenuFind::tellNothing(const QString &text)
     MessageBox::show(m_view, QMessageBox::Information, QCoreApplication::translate("VelMenuView", "Find"),
                      QCoreApplication::translate("VelMenuView", "'%1' not found .").arg(text),
                      QMessageBox::Close);
+}
+
+void MenuFind::tellOfLimit()
+{
+    m_voice.tell(
+        QCoreApplication::translate("VelMenuView",
+                                    "The menu is too large to be searched as a whole. Only a part of it "
+                                    "was searched."),
+        MenuVoice::Warning);
 }
 
 // Drops the matches that are gone.

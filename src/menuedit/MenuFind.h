@@ -11,6 +11,7 @@
 #include <QVector>
 
 class MenuSelection;
+class MenuVoice;
 class QTreeView;
 class ShownMenu;
 
@@ -25,7 +26,7 @@ class MenuFind : public QObject
     Q_OBJECT
 
 public:
-    MenuFind(QTreeView *view, const ShownMenu &menu, MenuSelection &selection);
+    MenuFind(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuVoice &voice);
     ~MenuFind() override;
 
     /// Asks for a text and selects the first match; the user may take this object away meanwhile.
@@ -46,10 +47,12 @@ private:
     End search(const QString &text, QVector<MenuWalk::Item> *matches);
     QStringList inOrder(const QVector<MenuWalk::Item> &matches) const;
     void tellNothing(const QString &text);
+    void tellOfLimit();
 
     QTreeView *const m_view;
     const ShownMenu &m_menu;
     MenuSelection &m_selection;
+    MenuVoice &m_voice;
     QString m_text;
     QStringList m_matches;
     int m_shown = -1;

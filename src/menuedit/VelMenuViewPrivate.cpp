@@ -25,7 +25,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , voice(view, [view] { return view->isSignalConnected(QMetaMethod::fromSignal(&VelMenuView::told)); })
     , menu(directory.isEmpty() ? StartMenu::directory() : directory, isEditable, view, view)
     , selection(view, menu)
-    , find(view, menu, selection)
+    , find(view, menu, selection, voice)
     , editing(view, menu, selection, find, voice)
 {
 }

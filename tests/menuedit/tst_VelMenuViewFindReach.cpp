@@ -9,6 +9,7 @@
 #include <QElapsedTimer>
 #include <QFileSystemModel>
 #include <QLineEdit>
+#include <QSignalSpy>
 #include <QTemporaryDir>
 #include <QTimer>
 
@@ -193,10 +194,15 @@ void tst_VelMenuViewFindReach::endsAtItsLimitOfFolders()
     writeMaze();
     VelMenuView view(menu(), -1, true);
     QVERIFY(open(view, menu(), 9));
+    const QSignalSpy told(&view, &VelMenuView::told);
     QElapsedTimer timer;
     timer.start();
     searchInVain(view, QStringLiteral("needle"));
     QVERIFY2(timer.elapsed() < 15000, qPrintable(QString::number(timer.elapsed())));
+    QCOMPARE(told.count(), 1);
+    QVERIFY(
+        told.constFirst().constFirst().toString().contains(QLatin1String("Only a part of it was searched.")));
+    QCOMPARE(told.constFirst().constLast().toInt(), 1);
 }
 
 VEL_TEST_MAIN(tst_VelMenuViewFindReach)

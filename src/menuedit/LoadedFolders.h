@@ -11,9 +11,9 @@ class VelMenuModel;
 /**
  * Which folders of a menu a model has read, as it does when the user opens one.
  */
-namespace OpenedFolders {
+namespace LoadedFolders {
 
 /// Their paths. Has no further folder read, and makes no row.
 QSet<QString> in(const VelMenuModel &model);
 
-} // namespace OpenedFolders
+} // namespace LoadedFolders

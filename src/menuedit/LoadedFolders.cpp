@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "OpenedFolders.h"
+#include "LoadedFolders.h"
 
 #include "VelMenuModel.h"
 
@@ -21,7 +21,7 @@ void collect(const VelMenuModel &model, const QModelIndex &folder, QSet<QString>
 
 } // namespace
 
-QSet<QString> OpenedFolders::in(const VelMenuModel &model)
+QSet<QString> LoadedFolders::in(const VelMenuModel &model)
 {
     QSet<QString> paths;
     const QModelIndex root = model.index(model.menuDirectory());
