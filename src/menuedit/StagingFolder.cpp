@@ -11,7 +11,6 @@
 #include <cstdlib>
 #include <ctime>
 #include <string>
-#include <string_view>
 
 #include <fcntl.h>
 #include <sys/file.h>
@@ -24,23 +23,13 @@ constexpr std::string_view StagingName = ".velcopy-";
 constexpr std::size_t StagingLetters = 6;
 constexpr time_t LeftoverAge = 60 * 60;
 
-bool isStagingName(std::string_view name)
-{
-    if (name.substr(0, StagingName.size()) != StagingName)
-        return false;
-    name.remove_prefix(StagingName.size());
-    return name.size() == StagingLetters && std::all_of(name.begin(), name.end(), [](char c) {
-               return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
-           });
-}
-
 // Whether a copy of this user was killed that made this folder.
 bool isLeftover(int parent, const std::string &name)
 {
     struct stat status = {};
-    if (!isStagingName(name) || ::fstatat(parent, name.c_str(), &status, AT_SYMLINK_NOFOLLOW) != 0
-        || !S_ISDIR(status.st_mode) || status.st_uid != ::geteuid()
-        || status.st_mtime >= ::time(nullptr) - LeftoverAge)
+    if (!StagingFolder::isNameOfOne(name)
+        || ::fstatat(parent, name.c_str(), &status, AT_SYMLINK_NOFOLLOW) != 0 || !S_ISDIR(status.st_mode)
+        || status.st_uid != ::geteuid() || status.st_mtime >= ::time(nullptr) - LeftoverAge)
         return false;
     const OpenFolder::Stream folder = OpenFolder::open(parent, name.c_str());
     return folder && ::flock(::dirfd(folder.get()), LOCK_EX | LOCK_NB) == 0;
@@ -69,6 +58,16 @@ StagingFolder::~StagingFolder()
         TreeRemoval::removeOwn(m_path, m_progress);
     if (m_folder >= 0)
         ::close(m_folder);
+}
+
+bool StagingFolder::isNameOfOne(std::string_view name)
+{
+    if (name.substr(0, StagingName.size()) != StagingName)
+        return false;
+    name.remove_prefix(StagingName.size());
+    return name.size() == StagingLetters && std::all_of(name.begin(), name.end(), [](char c) {
+               return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
+           });
 }
 
 void StagingFolder::removeLeftovers(const std::filesystem::path &directory)

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <filesystem>
+#include <string_view>
 #include <system_error>
 
 class FileProgress;
@@ -26,6 +27,9 @@ public:
     std::error_code error() const { return m_error; }
     /// The one path in it that is used.
     std::filesystem::path item() const { return m_path / "item"; }
+
+    /// Whether a file or folder called \a name may be one of ours.
+    static bool isNameOfOne(std::string_view name);
 
     /// Removes from \a directory what copies left there when they were killed: folders of this
     /// user's that nobody uses and nobody has touched for an hour.

@@ -1,0 +1,6 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FileChange.h"
+
+FileChange::~FileChange() = default;

@@ -1,0 +1,28 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "Refusal.h"
+
+/**
+ * One thing on disk that an operation of the user changed, and can be changed back.
+ *
+ * It begins as done. undo() and redo() take turns; each changes all or nothing and never
+ * overwrites what it does not know.
+ */
+class FileChange
+{
+public:
+    FileChange() = default;
+    virtual ~FileChange();
+    FileChange(const FileChange &) = delete;
+    FileChange &operator=(const FileChange &) = delete;
+
+    /// Looks how the disk stands after the operation, after undo() or after redo().
+    virtual void note() = 0;
+    /// Whether the disk still stands as it was noted; why not.
+    virtual Refusal check() const = 0;
+    virtual Refusal undo() = 0;
+    virtual Refusal redo() = 0;
+};

@@ -1,0 +1,55 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FileStep.h"
+
+FileStep::FileStep() = default;
+FileStep::~FileStep() = default;
+FileStep::FileStep(FileStep &&other) noexcept = default;
+FileStep &FileStep::operator=(FileStep &&other) noexcept = default;
+
+void FileStep::add(std::unique_ptr<FileChange> change)
+{
+    m_changes.push_back(std::move(change));
+}
+
+void FileStep::note()
+{
+    for (const auto &change : m_changes)
+        change->note();
+}
+
+Refusal FileStep::undo()
+{
+    Changes changes;
+    for (auto it = m_changes.rbegin(); it != m_changes.rend(); ++it)
+        changes.push_back(it->get());
+    return run(changes, &FileChange::undo, &FileChange::redo);
+}
+
+Refusal FileStep::redo()
+{
+    Changes changes;
+    for (const auto &change : m_changes)
+        changes.push_back(change.get());
+    return run(changes, &FileChange::redo, &FileChange::undo);
+}
+
+// What fails half way has all that was done before it taken back.
+Refusal FileStep::run(const Changes &changes, Refusal (FileChange::*there)(), Refusal (FileChange::*back)())
+{
+    for (const FileChange *change : changes) {
+        if (const Refusal refusal = change->check())
+            return refusal;
+    }
+    Refusal refusal;
+    std::size_t done = 0;
+    while (done < changes.size() && !(refusal = (changes[done]->*there)()))
+        ++done;
+    for (; refusal && done > 0; --done) {
+        if ((changes[done - 1]->*back)())
+            refusal.isForGood = true;
+    }
+    note();
+    return refusal;
+}
