@@ -7,8 +7,6 @@
 #include "ShortcutConflict.h"
 #include "ShortcutsTreeView.h"
 
-#include <frame/MessageBox.h>
-
 #include <QApplication>
 #include <QDialog>
 #include <QDialogButtonBox>
@@ -21,26 +19,16 @@
 #include <QRadioButton>
 #include <QSignalBlocker>
 
-#include <utility>
-
-namespace {
-
-// How often a message looks whether a button of the mouse is still held, in milliseconds.
-constexpr int MouseWait = 20;
-
-} // namespace
-
 EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts)
     : form(dialog)
     , m_dialog(dialog)
     , m_model(shortcuts)
+    , m_buttons(form.buttonBox)
+    , m_message(dialog)
 {
     fillTree();
     setChanged(false);
     connectKeys();
-    m_messageTimer.setSingleShot(true);
-    m_messageTimer.setInterval(MouseWait);
-    QObject::connect(&m_messageTimer, &QTimer::timeout, &m_context, [this] { showMessage(); });
 }
 
 void EditShortcutsDialogPrivate::setAssistance(bool isOn)
@@ -75,6 +63,8 @@ void EditShortcutsDialogPrivate::connectKeys()
     QObject::connect(form.keyWidget, &QKeySequenceEdit::keySequenceChanged, &m_context,
                      [this](const QKeySequence &key) { enterKey(QKeySequence(key)); });
     QObject::connect(form.keyWidget, &QKeySequenceEdit::editingFinished, &m_context, [this] { settle(); });
+    // Meanwhile the host may have given the shortcut another key, or none.
+    QObject::connect(&m_message, &ConflictMessage::closed, &m_context, [this] { dropKey(); });
     QObject::connect(form.defaultKeyRB, &QRadioButton::toggled, &m_context, [this] { enterDefaultKey(); });
     // Last: the dialog takes events as soon as it has this object.
     form.keyWidget->installEventFilter(m_dialog);
@@ -105,10 +95,9 @@ void EditShortcutsDialogPrivate::showNoShortcut()
 // Puts a key into the key editor without the editor announcing it; drops a recording.
 void EditShortcutsDialogPrivate::showKey(const QKeySequence &key)
 {
-    const bool hadChord = m_recording.hasChord();
+    if (m_recording.hasChord())
+        m_buttons.setRecording(false);
     m_recording.stop();
-    if (hadChord)
-        enableChangeButtons(m_wasChanged);
     const QSignalBlocker blocker(form.keyWidget);
     form.keyWidget->setKeySequence(key);
 }
@@ -122,15 +111,10 @@ bool EditShortcutsDialogPrivate::watchKeyEditor(const QEvent &event)
     return false;
 }
 
-// The first chord is a change: Ok can be pressed before the editor is done with the key.
 bool EditShortcutsDialogPrivate::record(const QKeyEvent &event)
 {
-    const bool hadChord = m_recording.hasChord();
     const bool isWithheld = m_recording.withholds(event);
-    if (m_recording.hasChord() && !hadChord) {
-        m_wasChanged = isChanged();
-        enableChangeButtons(true);
-    }
+    m_buttons.setRecording(m_recording.hasChord());
     return isWithheld;
 }
 
@@ -145,11 +129,10 @@ void EditShortcutsDialogPrivate::leaveKeyEditor(Qt::FocusReason reason)
         return;
     }
     endRecording();
-    // A message that opens while a button is pressed would keep the release from it.
     if (reason == Qt::MouseFocusReason)
-        m_messageTimer.start();
+        m_message.showLater();
     else
-        showMessage();
+        m_message.show();
 }
 
 // Takes the key recorded so far; when there is none, the editor shows the old one again.
@@ -169,25 +152,23 @@ void EditShortcutsDialogPrivate::enterKey(const QKeySequence &key)
     if (key.isEmpty() && m_recording.isActive())
         return;
     finish(key);
-    showMessage();
+    m_message.show();
 }
 
 // Nothing is enabled and disabled on the way: a button that has the focus would lose it.
 void EditShortcutsDialogPrivate::finish(const QKeySequence &key)
 {
-    const bool hadChord = m_recording.hasChord();
     m_recording.stop();
-    if (m_model && key != form.treeView->currentKeySequence() && takeKey(key))
-        return;
-    if (hadChord)
-        enableChangeButtons(m_wasChanged);
-    dropKey();
+    const bool isTaken = m_model && key != form.treeView->currentKeySequence() && takeKey(key);
+    m_buttons.setRecording(false);
+    if (!isTaken)
+        dropKey();
 }
 
 bool EditShortcutsDialogPrivate::settle()
 {
     endRecording();
-    return showMessage();
+    return m_message.show();
 }
 
 void EditShortcutsDialogPrivate::dropRecording()
@@ -217,29 +198,8 @@ bool EditShortcutsDialogPrivate::refuseTakenKey(const QKeySequence &key)
     const ShortcutConflict conflict = ShortcutConflict::find(*m_model, key);
     if (conflict.kind == ShortcutConflict::None)
         return false;
-    const QString text = conflict.kind == ShortcutConflict::Global
-        ? tr("Shortcut '%1' is already used for global action '%2'.")
-        : tr("Shortcut '%1' is already used for action '%2'. Please try another.");
-    m_message = text.arg(key.toString(QKeySequence::PortableText), conflict.holder);
+    m_message.refuse(key, conflict);
     return true;
-}
-
-// Returns whether there was nothing to tell; otherwise the dialog may have gone with the message.
-bool EditShortcutsDialogPrivate::showMessage()
-{
-    if (m_message.isEmpty())
-        return true;
-    if (QGuiApplication::mouseButtons() != Qt::NoButton) {
-        m_messageTimer.start();
-        return false;
-    }
-    const QString text = std::exchange(m_message, QString());
-    const QPointer<QDialog> self(m_dialog);
-    MessageBox::show(m_dialog, QMessageBox::Critical, tr("Shortcuts conflict"), text);
-    // Meanwhile the host may have given the shortcut another key, or none.
-    if (self)
-        dropKey();
-    return false;
 }
 
 void EditShortcutsDialogPrivate::enterDefaultKey()
@@ -268,19 +228,12 @@ void EditShortcutsDialogPrivate::setPendingKey(const QKeySequence &key)
 
 bool EditShortcutsDialogPrivate::isChanged() const
 {
-    return m_model && form.buttonBox->button(QDialogButtonBox::Ok)->isEnabled();
+    return m_model && m_buttons.isChanged();
 }
 
 void EditShortcutsDialogPrivate::setChanged(bool changed)
 {
-    m_wasChanged = changed;
-    enableChangeButtons(changed || m_recording.hasChord());
-}
-
-void EditShortcutsDialogPrivate::enableChangeButtons(bool changed)
-{
-    form.buttonBox->button(QDialogButtonBox::Ok)->setEnabled(changed);
-    form.buttonBox->button(QDialogButtonBox::Reset)->setEnabled(changed);
+    m_buttons.setChanged(changed);
 }
 
 void EditShortcutsDialogPrivate::press(QAbstractButton *button)

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "ChangeButtons.h"
+#include "ConflictMessage.h"
 #include "EditShortcutsAssistance.h"
 #include "EditShortcutsForm.h"
 #include "KeyRecording.h"
@@ -11,7 +13,6 @@
 #include <QCoreApplication>
 #include <QKeySequence>
 #include <QPointer>
-#include <QTimer>
 
 #include <memory>
 
@@ -35,8 +36,7 @@ public:
     /// Builds the form on \a dialog and shows \a shortcuts, which may be null, in it.
     EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts);
 
-    /// Whether there is something to apply, and a model that takes it: the Ok button is the one
-    /// record of that.
+    /// Whether there is something to apply, and a model that takes it.
     bool isChanged() const;
     /// Enables or disables the buttons Ok and Reset.
     void setChanged(bool changed);
@@ -84,17 +84,14 @@ private:
     void finish(const QKeySequence &key);
     bool takeKey(const QKeySequence &key);
     bool refuseTakenKey(const QKeySequence &key);
-    bool showMessage();
-    void enableChangeButtons(bool changed);
     void setPendingKey(const QKeySequence &key);
     QKeySequence shownDefaultKey() const;
 
     QDialog *const m_dialog;
     const QPointer<ShortcutsModel> m_model;
     KeyRecording m_recording;
-    bool m_wasChanged = false; // without the key that is being recorded
-    QString m_message; // about a refused key, until it is shown
-    QTimer m_messageTimer; // shows it when the mouse is up again
+    ChangeButtons m_buttons;
+    ConflictMessage m_message;
     /// Ends the connections: widgets and model may outlive this object.
     const QObject m_context;
 };
