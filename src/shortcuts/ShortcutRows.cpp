@@ -15,6 +15,11 @@ QVector<const IShortcutObject *> ShortcutRows::ofGroup(const ShortcutsModel &mod
     return rows;
 }
 
+const IShortcutObject *ShortcutRows::at(const ShortcutsModel &model, const QModelIndex &index)
+{
+    return model.isShortcutItem(index) ? model.firstObject(index) : nullptr;
+}
+
 QVector<QPair<int, int>> ShortcutRows::empty(const ShortcutsModel &model)
 {
     return model.emptyRows();

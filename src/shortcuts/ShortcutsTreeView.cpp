@@ -12,6 +12,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -41,12 +42,14 @@ void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
         model()->removeEventFilter(this);
         disconnect(model(), &QObject::destroyed, this, nullptr);
     }
-    m_hidden.clear();
+    m_hidden.forget();
+    m_index.clear();
+    m_closedGroups.clear();
     QTreeView::setModel(newModel);
     if (ShortcutsModel *shortcuts = shortcutsModel()) {
         shortcuts->installEventFilter(this);
         connect(shortcuts, &QObject::destroyed, this, [this] { setModel(nullptr); });
-        hideEmptyRows(*shortcuts);
+        hideRows(*shortcuts, {});
         m_groups = shortcuts->rowCount();
     }
 }
@@ -72,6 +75,8 @@ void ShortcutsTreeView::setKeySequence(QKeySequence key)
 void ShortcutsTreeView::currentChanged(const QModelIndex &current, const QModelIndex &previous)
 {
     QTreeView::currentChanged(current, previous);
+    if (current.isValid())
+        m_leftRow = QPersistentModelIndex();
     const ShortcutsModel *shortcuts = shortcutsModel();
     if (!shortcuts || current == previous)
         return;
@@ -86,6 +91,8 @@ void ShortcutsTreeView::dataChanged(const QModelIndex &topLeft, const QModelInde
                                     const QVector<int> &roles)
 {
     QTreeView::dataChanged(topLeft, bottomRight, roles);
+    if (m_filter.isActive())
+        refreshRowsLater();
     if (!isShortcutCurrent())
         return;
     // The key stands in column 1, whichever column is current.
@@ -150,8 +157,10 @@ int ShortcutsTreeView::indentationOf(const QModelIndex &index) const
 
 bool ShortcutsTreeView::eventFilter(QObject *watched, QEvent *event)
 {
-    if (watched == model() && event->type() == RowsChangedEvent::eventType())
+    if (watched == model() && event->type() == RowsChangedEvent::eventType()) {
+        m_index.clear();
         refreshRowsLater();
+    }
     return QTreeView::eventFilter(watched, event);
 }
 
@@ -175,37 +184,94 @@ void ShortcutsTreeView::refreshRows()
     const ShortcutsModel *shortcuts = shortcutsModel();
     if (!shortcuts)
         return;
-    const auto hidden = m_hidden;
-    m_hidden.clear();
-    for (const QPersistentModelIndex &index : hidden) {
-        if (index.isValid())
-            setRowHidden(index.row(), index.parent(), false);
-    }
-    hideEmptyRows(*shortcuts);
-    scheduleDelayedItemsLayout();
+    hideRows(*shortcuts, currentIndex());
     for (; m_groups < shortcuts->rowCount(); ++m_groups)
         expand(shortcuts->index(m_groups, 0));
-    if (currentIndex().isValid() && isRowHidden(currentIndex().row(), currentIndex().parent()))
+    leaveHiddenRow();
+}
+
+void ShortcutsTreeView::hideRows(const ShortcutsModel &shortcuts, const QModelIndex &keptRow)
+{
+    m_hidden.showAll();
+    if (!m_filter.isActive()) {
+        m_hidden.hideEmpty(shortcuts);
+    } else {
+        ShortcutIndex::Matches matches = m_index.matches(shortcuts, m_filter);
+        if (ShortcutRows::at(shortcuts, keptRow))
+            matches[keptRow.parent().row()][keptRow.row()] = true;
+        Q_EMIT filtered(m_hidden.hideOthers(shortcuts, matches));
+    }
+    scheduleDelayedItemsLayout();
+}
+
+// Keys must not go to a row that nobody sees.
+void ShortcutsTreeView::leaveHiddenRow()
+{
+    const QPersistentModelIndex current = currentIndex();
+    if (current.isValid() && isRowHidden(current.row(), current.parent())) {
         selectionModel()->clear();
-}
-
-void ShortcutsTreeView::hideEmptyRows(const ShortcutsModel &shortcuts)
-{
-    QVector<int> emptyRows(shortcuts.rowCount());
-    const auto rows = ShortcutRows::empty(shortcuts);
-    for (const auto &[group, row] : rows) {
-        hideRow(shortcuts.index(row, 0, shortcuts.index(group, 0)));
-        ++emptyRows[group];
-    }
-    for (int group = 0; group < emptyRows.size(); ++group) {
-        const QModelIndex header = shortcuts.index(group, 0);
-        if (emptyRows.at(group) == shortcuts.rowCount(header))
-            hideRow(header);
+        m_leftRow = current;
+    } else if (!current.isValid() && m_leftRow.isValid()
+               && !isRowHidden(m_leftRow.row(), m_leftRow.parent())) {
+        setCurrentIndex(m_leftRow);
     }
 }
 
-void ShortcutsTreeView::hideRow(const QModelIndex &index)
+void ShortcutsTreeView::setFilter(const ShortcutFilter &filter)
 {
-    setRowHidden(index.row(), index.parent(), true);
-    m_hidden.append(index);
+    const bool wasActive = m_filter.isActive();
+    m_filter = filter;
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    if (!shortcuts)
+        return;
+    hideRows(*shortcuts, {});
+    if (m_filter.isActive() && !wasActive)
+        openGroups(*shortcuts);
+    else if (!m_filter.isActive())
+        closeGroups();
+    leaveHiddenRow();
+    if (!m_filter.isActive())
+        scrollTo(currentIndex());
+}
+
+void ShortcutsTreeView::prepareFilter()
+{
+    if (const ShortcutsModel *shortcuts = shortcutsModel())
+        m_index.read(*shortcuts);
+}
+
+void ShortcutsTreeView::openGroups(const ShortcutsModel &shortcuts)
+{
+    for (int group = 0; group < shortcuts.rowCount(); ++group) {
+        const QModelIndex index = shortcuts.index(group, 0);
+        if (isExpanded(index))
+            continue;
+        m_closedGroups.append(index);
+        expand(index);
+    }
+}
+
+void ShortcutsTreeView::closeGroups()
+{
+    const auto groups = std::exchange(m_closedGroups, {});
+    for (const QPersistentModelIndex &group : groups) {
+        if (group != currentIndex().parent())
+            collapse(group);
+    }
+}
+
+void ShortcutsTreeView::selectFirstShortcut()
+{
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    if (!shortcuts || isShortcutCurrent())
+        return;
+    for (int group = 0; group < shortcuts->rowCount(); ++group) {
+        const QModelIndex header = shortcuts->index(group, 0);
+        for (int row = 0; row < shortcuts->rowCount(header); ++row) {
+            if (!isRowHidden(row, header)) {
+                setCurrentIndex(shortcuts->index(row, 0, header));
+                return;
+            }
+        }
+    }
 }

@@ -3,6 +3,10 @@
 
 #pragma once
 
+#include "HiddenRows.h"
+#include "ShortcutFilter.h"
+#include "ShortcutIndex.h"
+
 #include <QKeySequence>
 #include <QPersistentModelIndex>
 #include <QTreeView>
@@ -15,6 +19,9 @@ class ShortcutsModel;
  *
  * Rows whose shortcut is gone are hidden, and groups of such rows alone. A group that is registered
  * later comes open. With a model of another kind it is a plain tree.
+ *
+ * A filter hides further rows. When it hides the current one, nothing is current until that row is
+ * seen again. A row that no longer matches because its key changed stays while it is current.
  */
 class ShortcutsTreeView : public QTreeView
 {
@@ -32,6 +39,13 @@ public:
     /// The pending key of the current item; empty when that is no shortcut.
     QKeySequence currentKeySequence() const;
 
+    /// Shows those shortcuts alone that \a filter matches, in groups that are open.
+    void setFilter(const ShortcutFilter &filter);
+    /// Does what takes time when the first filter is set.
+    void prepareFilter();
+    /// Makes the first shortcut that is seen current, unless one is current.
+    void selectFirstShortcut();
+
 public Q_SLOTS:
     /// Sets the pending key of the current item.
     void setKeySequence(QKeySequence key);
@@ -41,6 +55,8 @@ Q_SIGNALS:
     void currentShortcutChanged(QKeySequence defaultKS, QKeySequence currentKS);
     /// A group, or nothing, became current.
     void currentItemIsNotShortcut();
+    /// A filter was set, or what it matches has changed: it lets \a count shortcuts be seen.
+    void filtered(int count);
 
 protected:
     void currentChanged(const QModelIndex &current, const QModelIndex &previous) override;
@@ -54,12 +70,18 @@ private:
     ShortcutsModel *shortcutsModel() const;
     void refreshRowsLater();
     void refreshRows();
-    void hideEmptyRows(const ShortcutsModel &shortcuts);
-    void hideRow(const QModelIndex &index);
+    void hideRows(const ShortcutsModel &shortcuts, const QModelIndex &keptRow);
+    void leaveHiddenRow();
+    void openGroups(const ShortcutsModel &shortcuts);
+    void closeGroups();
     QVector<QModelIndex> widestItems(const ShortcutsModel &shortcuts) const;
     int indentationOf(const QModelIndex &index) const;
 
-    QVector<QPersistentModelIndex> m_hidden;
+    HiddenRows m_hidden{this};
+    ShortcutFilter m_filter;
+    ShortcutIndex m_index;
+    QPersistentModelIndex m_leftRow; // was current until it was hidden
+    QVector<QPersistentModelIndex> m_closedGroups; // those that a filter opened
     int m_groups = 0; // those that were there at the last look; later ones come open
     bool m_isRefreshPending = false;
 };

@@ -56,7 +56,22 @@ private Q_SLOTS:
     void keepsItsModelWhenTheOneBeforeGoes();
     void outlivesItsModel();
 
+    void showsWhatAFilterMatchesInItsGroups();
+    void tellsHowManyShortcutsAFilterMatches();
+    void opensGroupsWhileTheyAreFiltered();
+    void leavesAFilteredRowUntilItIsSeenAgain();
+    void staysWhereTheUserWentMeanwhile();
+    void keepsTheCurrentRowWhileItsKeyChanges();
+    void filtersWhatIsRegisteredLater();
+    void selectsTheFirstShortcutThatIsSeen();
+
 private:
+    static ShortcutFilter filterFor(const char *text)
+    {
+        ShortcutFilter filter;
+        filter.setText(str(text));
+        return filter;
+    }
     QModelIndex row(int group, int row, int column = 0) const
     {
         return m_model->index(row, column, m_model->index(group, 0));
@@ -358,6 +373,103 @@ void tst_ShortcutsTreeView::outlivesItsModel()
     QCoreApplication::processEvents();
     m_view->setKeySequence(f1);
     QVERIFY(m_view->currentKeySequence().isEmpty());
+}
+
+void tst_ShortcutsTreeView::showsWhatAFilterMatchesInItsGroups()
+{
+    m_view->setFilter(filterFor("open"));
+    QCOMPARE(shownTexts(), (QStringList{str("File"), str("open")}));
+    m_view->setFilter(filterFor("edit"));
+    QVERIFY(m_view->isRowHidden(0, {}));
+    QVERIFY(!m_view->isRowHidden(0, m_model->index(1, 0)));
+    m_view->setFilter(ShortcutFilter());
+    QCOMPARE(shownTexts().size(), 5);
+}
+
+void tst_ShortcutsTreeView::tellsHowManyShortcutsAFilterMatches()
+{
+    QSignalSpy spy(m_view.get(), &ShortcutsTreeView::filtered);
+    m_view->setFilter(filterFor("file"));
+    QCOMPARE(spy.takeLast().at(0).toInt(), 2);
+    m_view->setFilter(filterFor("none of these"));
+    QCOMPARE(spy.takeLast().at(0).toInt(), 0);
+    QVERIFY(m_view->isRowHidden(0, {}));
+    QVERIFY(m_view->isRowHidden(1, {}));
+}
+
+void tst_ShortcutsTreeView::opensGroupsWhileTheyAreFiltered()
+{
+    m_view->collapse(m_model->index(0, 0));
+    m_view->setFilter(filterFor("open"));
+    QCOMPARE(shownTexts(), (QStringList{str("File"), str("open")}));
+    m_view->setFilter(filterFor("save"));
+    QVERIFY(m_view->isExpanded(m_model->index(0, 0)));
+    m_view->setFilter(ShortcutFilter());
+    QVERIFY(!m_view->isExpanded(m_model->index(0, 0)));
+    QVERIFY(m_view->isExpanded(m_model->index(1, 0)));
+}
+
+void tst_ShortcutsTreeView::leavesAFilteredRowUntilItIsSeenAgain()
+{
+    m_view->setCurrentIndex(row(0, 0));
+    QSignalSpy other(m_view.get(), &ShortcutsTreeView::currentItemIsNotShortcut);
+    m_view->setFilter(filterFor("save"));
+    QCOMPARE(other.count(), 1);
+    QVERIFY(!m_view->currentIndex().isValid());
+    m_view->setFilter(filterFor("s"));
+    QVERIFY(!m_view->isShortcutCurrent());
+    m_view->setFilter(ShortcutFilter());
+    QCOMPARE(m_view->currentIndex(), row(0, 0));
+    QVERIFY(m_view->selectionModel()->isSelected(row(0, 0)));
+}
+
+void tst_ShortcutsTreeView::staysWhereTheUserWentMeanwhile()
+{
+    m_view->setCurrentIndex(row(0, 0));
+    m_view->setFilter(filterFor("copy"));
+    m_view->setCurrentIndex(row(1, 0));
+    m_view->setFilter(ShortcutFilter());
+    QCOMPARE(m_view->currentIndex(), row(1, 0));
+}
+
+void tst_ShortcutsTreeView::keepsTheCurrentRowWhileItsKeyChanges()
+{
+    m_view->setFilter(filterFor("f1"));
+    QCOMPARE(shownTexts(), (QStringList{str("File"), str("open")}));
+    m_view->setCurrentIndex(row(0, 0));
+    QSignalSpy spy(m_view.get(), &ShortcutsTreeView::filtered);
+    m_model->setKeySequence(row(0, 0), QKeySequence(Qt::Key_F9));
+    m_model->setKeySequence(row(1, 0), f1);
+    QTRY_COMPARE(spy.count(), 1);
+    QCOMPARE(m_view->currentIndex(), row(0, 0));
+    QVERIFY(!m_view->isRowHidden(0, m_model->index(0, 0)));
+    QVERIFY(!m_view->isRowHidden(0, m_model->index(1, 0)));
+    m_view->setFilter(filterFor("f1 "));
+    QVERIFY(m_view->isRowHidden(0, {}));
+}
+
+void tst_ShortcutsTreeView::filtersWhatIsRegisteredLater()
+{
+    m_view->setFilter(filterFor("new"));
+    addAction("new one", "File", QKeySequence());
+    addAction("another one", "File", QKeySequence());
+    addAction("a new group's", "Help", QKeySequence());
+    QTRY_COMPARE(shownTexts().size(), 4);
+    QVERIFY(m_view->isRowHidden(0, m_model->index(0, 0)));
+}
+
+void tst_ShortcutsTreeView::selectsTheFirstShortcutThatIsSeen()
+{
+    m_view->setFilter(filterFor("none of these"));
+    m_view->selectFirstShortcut();
+    QVERIFY(!m_view->currentIndex().isValid());
+    m_view->setFilter(filterFor("copy"));
+    m_view->setCurrentIndex(m_model->index(1, 0));
+    m_view->selectFirstShortcut();
+    QCOMPARE(m_view->currentIndex(), row(1, 0));
+    m_view->setFilter(ShortcutFilter());
+    m_view->selectFirstShortcut();
+    QCOMPARE(m_view->currentIndex(), row(1, 0));
 }
 
 VEL_TEST_MAIN(tst_ShortcutsTreeView)

@@ -1,0 +1,85 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ShortcutIndex.h"
+
+#include "FurtherKeys.h"
+#include "IShortcutObject.h"
+#include "ShortcutChange.h"
+#include "ShortcutRows.h"
+#include "ShortcutsModel.h"
+
+namespace {
+
+// Between texts that no word may span.
+constexpr QChar Border = QLatin1Char('\n');
+
+} // namespace
+
+ShortcutIndex::Matches ShortcutIndex::matches(const ShortcutsModel &model, const ShortcutFilter &filter)
+{
+    read(model);
+    Matches matches(m_groups.size());
+    for (int group = 0; group < m_groups.size(); ++group) {
+        const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
+        matches[group].resize(objects.size());
+        for (int row = 0; row < objects.size(); ++row) {
+            const IShortcutObject *object = objects.at(row);
+            if (!object)
+                continue;
+            Entry &entry = m_groups[group][row];
+            if (entry.key != object->keySequence())
+                setKey(&entry, *object);
+            entry.row.isChanged = ShortcutChange::isChanged(*object);
+            matches[group][row] = filter.matches(entry.row);
+        }
+    }
+    return matches;
+}
+
+void ShortcutIndex::read(const ShortcutsModel &model)
+{
+    if (fits(model))
+        return;
+    m_groups = QVector<QVector<Entry>>(model.rowCount());
+    for (int group = 0; group < m_groups.size(); ++group) {
+        const QString name = ShortcutFilter::folded(model.index(group, 0).data().toString());
+        const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
+        m_groups[group].reserve(objects.size());
+        for (const IShortcutObject *object : objects)
+            m_groups[group].append(object ? entryOf(*object, name) : Entry());
+    }
+}
+
+bool ShortcutIndex::fits(const ShortcutsModel &model) const
+{
+    bool fits = m_groups.size() == model.rowCount();
+    for (int group = 0; fits && group < m_groups.size(); ++group)
+        fits = m_groups.at(group).size() == model.rowCount(model.index(group, 0));
+    return fits;
+}
+
+ShortcutIndex::Entry ShortcutIndex::entryOf(const IShortcutObject &object, const QString &group)
+{
+    Entry entry;
+    entry.names = ShortcutFilter::folded(object.text()) + Border + group + Border;
+    setKey(&entry, object);
+    return entry;
+}
+
+void ShortcutIndex::setKey(Entry *entry, const IShortcutObject &object)
+{
+    entry->key = object.keySequence();
+    entry->row.keys = {entry->key};
+    const QList<QKeySequence> furtherKeys = FurtherKeys::of(object);
+    for (const QKeySequence &key : furtherKeys)
+        entry->row.keys.append(key);
+    entry->row.text = entry->names;
+    for (const QKeySequence &key : qAsConst(entry->row.keys)) {
+        const QString portable = key.toString(QKeySequence::PortableText);
+        const QString native = key.toString(QKeySequence::NativeText);
+        entry->row.text += ShortcutFilter::folded(portable) + Border;
+        if (native != portable)
+            entry->row.text += ShortcutFilter::folded(native) + Border;
+    }
+}

@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "ShortcutFilter.h"
+
+#include <QVector>
+
+class IShortcutObject;
+class ShortcutsModel;
+
+/**
+ * Finds the rows of a ShortcutsModel that a ShortcutFilter matches.
+ *
+ * It folds the texts of a row once, and that of its key again when that is another one.
+ */
+class ShortcutIndex
+{
+public:
+    /// Whether a row is matched, by group and row; a row that shows nothing is not.
+    using Matches = QVector<QVector<bool>>;
+
+    /// The rows of \a model that \a filter matches.
+    Matches matches(const ShortcutsModel &model, const ShortcutFilter &filter);
+    /// Reads the texts of \a model if that was not done yet.
+    void read(const ShortcutsModel &model);
+    /// Forgets all texts: rows came or went.
+    void clear() { m_groups.clear(); }
+
+private:
+    struct Entry
+    {
+        QString names; // of the shortcut and its group
+        QKeySequence key; // the one that the row was made for
+        ShortcutFilter::Row row;
+    };
+
+    bool fits(const ShortcutsModel &model) const;
+    static Entry entryOf(const IShortcutObject &object, const QString &group);
+    static void setKey(Entry *entry, const IShortcutObject &object);
+
+    QVector<QVector<Entry>> m_groups;
+};
