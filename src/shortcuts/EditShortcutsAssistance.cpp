@@ -3,10 +3,90 @@
 
 #include "EditShortcutsAssistance.h"
 
+#include "NoMatchLabel.h"
+#include "ShortcutFilterBar.h"
+#include "ShortcutsTreeView.h"
+
+#include <QBoxLayout>
+#include <QLineEdit>
+
+namespace {
+
+// The widgets that the Tab key goes through, in its order.
+QVector<QWidget *> tabOrder(QWidget *window)
+{
+    QVector<QWidget *> widgets;
+    for (QWidget *widget = window->nextInFocusChain(); widget != window;
+         widget = widget->nextInFocusChain()) {
+        if (widget->focusPolicy() & Qt::TabFocus)
+            widgets.append(widget);
+    }
+    return widgets;
+}
+
+} // namespace
+
 EditShortcutsAssistance::EditShortcutsAssistance(const EditShortcutsForm &form, ShortcutsModel *shortcuts)
     : m_form(form)
     , m_model(shortcuts)
 {
+    addFilterBar();
 }
 
-EditShortcutsAssistance::~EditShortcutsAssistance() = default;
+EditShortcutsAssistance::~EditShortcutsAssistance()
+{
+    m_form.treeView->setFilter(ShortcutFilter());
+}
+
+// Above the tree, also on the way of the Tab key.
+void EditShortcutsAssistance::addFilterBar()
+{
+    QWidget *dialog = m_form.treeView->parentWidget();
+    const QVector<QWidget *> below = tabOrder(dialog);
+    m_filterBar = std::make_unique<ShortcutFilterBar>(dialog);
+    m_noMatchLabel = std::make_unique<NoMatchLabel>(m_form.treeView);
+    auto *layout = qobject_cast<QBoxLayout *>(dialog->layout());
+    layout->insertWidget(layout->indexOf(m_form.treeView), m_filterBar.get());
+    QWidget *last = tabOrder(dialog).constLast();
+    for (QWidget *widget : below) {
+        QWidget::setTabOrder(last, widget);
+        last = widget;
+    }
+
+    if (!dialog->isVisible())
+        m_filterBar->filterEdit()->setFocus();
+
+    connect(m_filterBar.get(), &ShortcutFilterBar::filterChanged, this,
+            &EditShortcutsAssistance::applyFilter);
+    connect(m_filterBar.get(), &ShortcutFilterBar::entered, m_form.treeView,
+            &ShortcutsTreeView::prepareFilter);
+    connect(m_filterBar.get(), &ShortcutFilterBar::left, m_form.treeView, [this] {
+        m_form.treeView->selectFirstShortcut();
+        m_form.treeView->setFocus();
+    });
+    connect(m_form.treeView, &ShortcutsTreeView::filtered, this, &EditShortcutsAssistance::showCount);
+}
+
+void EditShortcutsAssistance::applyFilter()
+{
+    const ShortcutFilter filter = m_filterBar->filter();
+    if (!filter.isActive())
+        m_noMatchLabel->say(QString());
+    m_form.treeView->setFilter(filter);
+}
+
+void EditShortcutsAssistance::showCount(int count)
+{
+    const QKeySequence key = m_filterBar->filter().key();
+    if (count > 0)
+        m_noMatchLabel->say(QString());
+    else if (key.isEmpty())
+        m_noMatchLabel->say(tr("No action matches the filter."));
+    else
+        m_noMatchLabel->say(tr("No action has the shortcut %1.").arg(key.toString(QKeySequence::NativeText)));
+}
+
+bool EditShortcutsAssistance::stepBackFromFilter()
+{
+    return m_filterBar->stepBack();
+}

@@ -9,6 +9,11 @@
 #include <QObject>
 #include <QPointer>
 
+#include <memory>
+
+class NoMatchLabel;
+class ShortcutFilterBar;
+
 /**
  * What the shortcuts dialog has beyond its plain form.
  *
@@ -24,11 +29,20 @@ public:
     EditShortcutsAssistance(const EditShortcutsForm &form, ShortcutsModel *shortcuts);
     ~EditShortcutsAssistance() override;
 
+    /// Goes one step back to the whole tree; false when there is no filter.
+    bool stepBackFromFilter();
+
 Q_SIGNALS:
     /// A part made other keys pending.
     void keysChanged();
 
 private:
+    void addFilterBar();
+    void applyFilter();
+    void showCount(int count);
+
     const EditShortcutsForm m_form;
     const QPointer<ShortcutsModel> m_model;
+    std::unique_ptr<ShortcutFilterBar> m_filterBar;
+    std::unique_ptr<NoMatchLabel> m_noMatchLabel;
 };

@@ -143,10 +143,10 @@ void EditShortcutsDialog::closeEvent(QCloseEvent *event)
 
 void EditShortcutsDialog::keyPressEvent(QKeyEvent *event)
 {
-    if (event->matches(QKeySequence::Cancel))
-        slotReject();
-    else
+    if (!event->matches(QKeySequence::Cancel))
         QDialog::keyPressEvent(event);
+    else if (!d->assistance || !d->assistance->stepBackFromFilter())
+        slotReject();
 }
 
 bool EditShortcutsDialog::eventFilter(QObject *watched, QEvent *event)
