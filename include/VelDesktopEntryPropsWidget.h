@@ -19,7 +19,7 @@ class VelUIDesktopEntry;
  *
  * It has a row for each key, with a second row for the user's own language where the key has
  * one; rows that do not belong to the type of the entry (Application, Link or Directory) are
- * hidden and emptied. Values go into the entry exactly as they were typed.
+ * hidden and emptied, and come back with their values when the user takes the type back. Values go into the entry exactly as they were typed.
  *
  * The form keeps no record: values come in with loadFrom() and go out with saveTo(), which
  * may be given another record. It neither checks the values nor touches a file;
@@ -58,8 +58,9 @@ public:
     /**
      * Writes the values of the form into an entry, which is not saved by that.
      *
-     * Of the two lists of desktop environments the chosen one is written; the other one is
-     * emptied when the choice was changed and is left alone when it was not.
+     * Of the two lists of desktop environments the chosen one is written, and the other one is left
+     * alone. The type is written unless the entry that was loaded has one that the form does not
+     * know and the user chose no other.
      *
      * @param entry the entry to write to; nothing happens when it is null
      */
@@ -87,7 +88,8 @@ public:
     void setShowURLInfoButton(bool show);
 
 Q_SIGNALS:
-    /// Emitted when the user changed a value; loading an entry may emit it as well.
+    /// Emitted when the user changed a value; loading an entry emits it once for each path or command
+    /// that it changes.
     void changed();
 
     /**
@@ -98,6 +100,7 @@ Q_SIGNALS:
     void requestedURLInfo(const QString &url);
 
 private:
+    friend class VelDesktopEntryPropsWidgetPrivate;
     Q_DISABLE_COPY(VelDesktopEntryPropsWidget)
     const std::unique_ptr<VelDesktopEntryPropsWidgetPrivate> d;
 };

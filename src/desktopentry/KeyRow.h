@@ -3,10 +3,9 @@
 
 #pragma once
 
+#include "KeptValue.h"
 #include "PropsRow.h"
 #include "fields/PlainFields.h"
-
-#include <utility>
 
 namespace VelUI {
 
@@ -25,12 +24,13 @@ public:
 
     void load(const VelUIDesktopEntry &entry) override { setFieldValue(m_field, (entry.*m_getter)()); }
     void save(VelUIDesktopEntry *entry) const override { (entry->*m_setter)(fieldValue(m_field)); }
-    void clear() override { setFieldValue(m_field, Value{}); }
+    void putAway() override { m_kept.putAway(m_field); }
+    void restore() override { m_kept.restore(m_field); }
+    void forget() override { m_kept.forget(); }
 
 private:
-    using Value = decltype(fieldValue(std::declval<const Field *>()));
-
     Field *const m_field;
+    KeptValue<Field> m_kept;
     const Getter m_getter;
     const Setter m_setter;
 };

@@ -26,7 +26,12 @@ public:
 
     virtual void load(const VelUIDesktopEntry &entry) = 0;
     virtual void save(VelUIDesktopEntry *entry) const = 0;
-    virtual void clear() = 0;
+    /// Empties the row; what it showed is kept until restore() or forget().
+    virtual void putAway() = 0;
+    /// Shows again what was put away.
+    virtual void restore() = 0;
+    /// Forgets what was put away.
+    virtual void forget() = 0;
 
 private:
     Q_DISABLE_COPY(PropsRow)

@@ -14,6 +14,7 @@
 #include "fields/PathEdit.h"
 #include "fields/ShowInChoice.h"
 #include "fields/StringListEdit.h"
+#include "fields/TiedLines.h"
 
 #include <QCheckBox>
 
@@ -35,11 +36,28 @@ public:
 
     void load(const VelUIDesktopEntry &entry) override { m_choice->load(entry); }
     void save(VelUIDesktopEntry *entry) const override { m_choice->save(entry); }
-    void clear() override { m_choice->load({}, {}); }
+    // Every type has them.
+    void putAway() override { }
+    void restore() override { }
+    void forget() override { }
+
+    ShowInChoice *choice() const { return m_choice; }
 
 private:
     ShowInChoice *const m_choice;
 };
+
+struct Lines
+{
+    QLineEdit *base;
+    QLineEdit *local;
+};
+
+// Takes the lines in braces: they are added in the order in which they stand there.
+void tie(const Lines &lines)
+{
+    new TiedLines(lines.base, lines.local);
+}
 
 int addField(FormLayout *layout, const QString &label, QWidget *field)
 {
@@ -68,8 +86,8 @@ void PropsTable::build()
     using E = VelUIDesktopEntry;
     constexpr ShownFor all = ShownFor::All, applications = ShownFor::Applications;
     // clang-format off
-    add<QLineEdit>(required(tr("Name")), all, "nameEdit", &E::getName, &E::setName);
-    add<QLineEdit>(localizedLabel(tr("Name")), all, "localNameEdit", &E::getLocalName, &E::setLocalName);
+    tie({m_nameLine = add<QLineEdit>(required(tr("Name")), all, "nameEdit", &E::getName, &E::setName),
+         add<QLineEdit>(localizedLabel(tr("Name")), all, "localNameEdit", &E::getLocalName, &E::setLocalName)});
     add<IconEdit>(tr("Icon"), all, "iconEdit", &E::getIcon, &E::setIcon);
     add<IconEdit>(localizedLabel(tr("Icon")), all, "localIconEdit", &E::getLocalIcon, &E::setLocalIcon);
     add<PathEdit>(required(tr("Exec")), applications, "execEdit", &E::getExec, &E::setExec);
@@ -77,10 +95,10 @@ void PropsTable::build()
     add<QLineEdit>(tr("Path"), applications, "pathEdit", &E::getPath, &E::setPath);
     add<PathEdit>(tr("Try exec"), applications, "tryExecEdit", &E::getTryExec, &E::setTryExec);
     addUrl();
-    add<QLineEdit>(tr("Generic name"), all, "genericNameEdit", &E::getGenericName, &E::setGenericName);
-    add<QLineEdit>(localizedLabel(tr("Generic name")), all, "localGenericNameEdit", &E::getLocalGenericName, &E::setLocalGenericName);
-    add<QLineEdit>(tr("Comment"), all, "commentEdit", &E::getComment, &E::setComment);
-    add<QLineEdit>(localizedLabel(tr("Comment")), all, "localCommentEdit", &E::getLocalComment, &E::setLocalComment);
+    tie({add<QLineEdit>(tr("Generic name"), all, "genericNameEdit", &E::getGenericName, &E::setGenericName),
+         add<QLineEdit>(localizedLabel(tr("Generic name")), all, "localGenericNameEdit", &E::getLocalGenericName, &E::setLocalGenericName)});
+    tie({add<QLineEdit>(tr("Comment"), all, "commentEdit", &E::getComment, &E::setComment),
+         add<QLineEdit>(localizedLabel(tr("Comment")), all, "localCommentEdit", &E::getLocalComment, &E::setLocalComment)});
     add<QCheckBox>(tr("No display"), all, "noDisplayCheckBox", &E::getNoDisplay, &E::setNoDisplay);
     add<QCheckBox>(tr("Hidden"), all, "hiddenCheckBox", &E::getHidden, &E::setHidden);
     addShowIn();
@@ -124,7 +142,9 @@ void PropsTable::addShowIn()
 {
     const ShowInChoice::Texts texts{tr("Only show in"), tr("Not show in"), tr("Add desktop environment:"),
                                     tr("Edit desktop environment:")};
-    m_rows.push_back(std::make_unique<ShowInRows>(m_layout, texts));
+    auto rows = std::make_unique<ShowInRows>(m_layout, texts);
+    m_showIn = rows->choice();
+    m_rows.push_back(std::move(rows));
 }
 
 void PropsTable::setMimeTypeTexts(StringListEdit *field)
@@ -147,20 +167,36 @@ void PropsTable::setKeywordTexts(StringListEdit *field)
 
 void PropsTable::showFor(const QString &type)
 {
+    forget();
+    changeTo(type);
+    forget();
+}
+
+void PropsTable::forget()
+{
+    for (const auto &row : m_rows)
+        row->forget();
+}
+
+void PropsTable::changeTo(const QString &type)
+{
     for (const ShownFor group : {ShownFor::Applications, ShownFor::Links}) {
         const bool isShown = EntryTypeRules::isShown(group, type);
         for (const auto &row : m_rows) {
             if (row->shownFor() != group)
                 continue;
             row->setVisible(isShown);
-            if (!isShown)
-                row->clear();
+            if (isShown)
+                row->restore();
+            else
+                row->putAway();
         }
     }
 }
 
 void PropsTable::load(const VelUIDesktopEntry &entry, const QString &type)
 {
+    forget();
     for (const auto &row : m_rows) {
         if (EntryTypeRules::isShown(row->shownFor(), type))
             row->load(entry);
@@ -178,6 +214,16 @@ void PropsTable::save(VelUIDesktopEntry *entry, const QString &type) const
 UrlRow *PropsTable::urlRow() const
 {
     return m_urlRow;
+}
+
+ShowInChoice *PropsTable::showIn() const
+{
+    return m_showIn;
+}
+
+QLineEdit *PropsTable::nameLine() const
+{
+    return m_nameLine;
 }
 
 } // namespace VelUI

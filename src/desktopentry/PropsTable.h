@@ -10,8 +10,11 @@
 #include <memory>
 #include <vector>
 
+class QLineEdit;
+
 namespace VelUI {
 
+class ShowInChoice;
 class StringListEdit;
 class UrlRow;
 
@@ -29,11 +32,17 @@ public:
 
     /// Shows the rows for an entry of \a type; hides and empties the others.
     void showFor(const QString &type);
+    /// The same when the user changes the type: the rows come back with what they showed when the
+    /// user left their type.
+    void changeTo(const QString &type);
     /// Fills the rows that are shown for the type of \a entry.
     void load(const VelUIDesktopEntry &entry, const QString &type);
     void save(VelUIDesktopEntry *entry, const QString &type) const;
 
     UrlRow *urlRow() const;
+    ShowInChoice *showIn() const;
+    /// The line of the name, with which editing begins.
+    QLineEdit *nameLine() const;
 
 private:
     Q_DISABLE_COPY(PropsTable)
@@ -56,6 +65,7 @@ private:
     static void setMimeTypeTexts(StringListEdit *field);
 
     void build();
+    void forget();
     void addUrl();
     void addShowIn();
     template <typename Field, typename Getter, typename Setter>
@@ -65,6 +75,8 @@ private:
     FormLayout *const m_layout;
     std::vector<std::unique_ptr<PropsRow>> m_rows;
     UrlRow *m_urlRow = nullptr;
+    ShowInChoice *m_showIn = nullptr;
+    QLineEdit *m_nameLine = nullptr;
 };
 
 } // namespace VelUI

@@ -47,6 +47,7 @@ TypeChooser::TypeChooser(FormLayout *layout, QWidget *form)
     m_box->setMinimumContentsLength(8);
     m_box->installEventFilter(this);
     connect(m_box, QOverload<int>::of(&QComboBox::currentIndexChanged), this, &TypeChooser::boxChanged);
+    connect(m_box, QOverload<int>::of(&QComboBox::activated), this, &TypeChooser::itemChosen);
 }
 
 TypeChooser::~TypeChooser()
@@ -67,6 +68,7 @@ bool TypeChooser::setType(const QString &type, const QStringList &allowed)
     const QStringList choices = EntryTypeRules::choices(allowed);
     if (type.isEmpty() || !choices.contains(type))
         return false;
+    m_isDecided = true;
     if (type == m_type && choices == m_allowedTypes)
         return false;
     if (choices != m_allowedTypes) {
@@ -81,6 +83,16 @@ bool TypeChooser::setType(const QString &type, const QStringList &allowed)
 QString TypeChooser::type() const
 {
     return m_type;
+}
+
+bool TypeChooser::isDecided() const
+{
+    return m_isDecided;
+}
+
+void TypeChooser::leaveOpen()
+{
+    m_isDecided = false;
 }
 
 QStringList TypeChooser::allowedTypes() const
@@ -137,10 +149,22 @@ void TypeChooser::boxChanged(int index)
     const bool isConfirmed = confirmChange();
     if (!self)
         return;
-    if (isConfirmed)
+    if (isConfirmed) {
         m_type = chosen;
+        m_isDecided = true;
+    }
     showType();
     if (isConfirmed && m_chosen)
+        m_chosen();
+}
+
+// Choosing the type that is shown changes nothing in the box.
+void TypeChooser::itemChosen(int index)
+{
+    if (m_isDecided || m_box->itemData(index, TypeRole).toString() != m_type)
+        return;
+    m_isDecided = true;
+    if (m_chosen)
         m_chosen();
 }
 

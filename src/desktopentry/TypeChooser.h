@@ -33,6 +33,11 @@ public:
     /// not allowed.
     bool setType(const QString &type, const QStringList &allowed);
     QString type() const;
+    /// Whether the type shown is that of the entry: it is not after leaveOpen(), until the user
+    /// chooses one, be it the one shown, or setType() sets one.
+    bool isDecided() const;
+    /// The entry has a type that the form does not know: the one shown is a proposal.
+    void leaveOpen();
     QStringList allowedTypes() const;
     void setReadOnly(bool readOnly);
 
@@ -44,6 +49,7 @@ private:
     void fillBox();
     void showType();
     void boxChanged(int index);
+    void itemChosen(int index);
     bool confirmChange();
 
     FormLayout *const m_layout;
@@ -54,6 +60,7 @@ private:
     QStringList m_allowedTypes;
     std::function<void()> m_chosen;
     bool m_isAsking = false;
+    bool m_isDecided = true;
 };
 
 } // namespace VelUI

@@ -80,9 +80,19 @@ void UrlRow::save(VelUIDesktopEntry *entry) const
     entry->setURL(url());
 }
 
-void UrlRow::clear()
+void UrlRow::putAway()
 {
-    setFieldValue(m_line, {});
+    m_kept.putAway(m_line);
+}
+
+void UrlRow::restore()
+{
+    m_kept.restore(m_line);
+}
+
+void UrlRow::forget()
+{
+    m_kept.forget();
 }
 
 } // namespace VelUI

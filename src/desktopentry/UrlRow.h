@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "KeptValue.h"
 #include "PropsRow.h"
 
 #include <QCoreApplication>
@@ -30,7 +31,9 @@ public:
     void setVisible(bool visible) override;
     void load(const VelUIDesktopEntry &entry) override;
     void save(VelUIDesktopEntry *entry) const override;
-    void clear() override;
+    void putAway() override;
+    void restore() override;
+    void forget() override;
 
 private:
     struct Field
@@ -47,6 +50,7 @@ private:
     QToolButton *const m_infoButton;
     bool m_isInfoButtonWanted = false;
     bool m_isVisible = true;
+    KeptValue<QLineEdit> m_kept;
 };
 
 } // namespace VelUI

@@ -4,11 +4,14 @@
 #include <VelDesktopEntryEditDialog.h>
 
 #include "EntryTypeRules.h"
+#include "VelDesktopEntryPropsWidgetPrivate.h"
+#include "fields/ShowInChoice.h"
 
 #include <VelDesktopEntryPropsWidget.h>
 #include <VelMenuDialog.h>
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
+#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
 #include <frame/Unsuitable.h>
@@ -56,6 +59,10 @@ public:
     bool checkSuitable(const VelUIDesktopEntry &entry);
     bool inheritFrom(const QString &pattern, VelUIDesktopEntry *entry);
     void savePosition();
+    void setNewType();
+    void copy(VelUIDesktopEntry entry);
+    void emptyListSwitchedFrom(VelUIDesktopEntry *entry) const;
+    VelDesktopEntryPropsWidgetPrivate &form() const { return VelDesktopEntryPropsWidgetPrivate::of(*props); }
 
     static QString unsuitableText(VelUIDesktopEntry::SuitableError error);
 
@@ -134,13 +141,50 @@ void VelDesktopEntryEditDialogPrivate::savePosition()
     SaveDesktopItemPosition(file.fileName().toLocal8Bit().constData(), position->x(), position->y());
 }
 
+// Where the path says nothing, the new entry gets the type that the form shows.
+void VelDesktopEntryEditDialogPrivate::setNewType()
+{
+    const EntryTypeRules::NewEntry types = EntryTypeRules::newEntryAt(path);
+    props->setType(types.type.isEmpty() ? form().typeChooser.type() : types.type, types.allowed);
+}
+
+// A folder stays one, whatever is copied to its record; a new entry, too, keeps its type where what
+// is copied has none of ours.
+void VelDesktopEntryEditDialogPrivate::copy(VelUIDesktopEntry entry)
+{
+    const VelUI::TypeChooser &chooser = form().typeChooser;
+    const QString type = chooser.type();
+    const bool wasDecided = chooser.isDecided();
+    if (EntryPath::isRecordFile(path))
+        entry.setType(wasDecided ? type : loaded.getType());
+    props->loadFrom(entry);
+    if (wasDecided && !chooser.isDecided())
+        props->setType(type, chooser.allowedTypes());
+}
+
+// An entry may hold both lists; whoever goes over to the other one means it to count.
+void VelDesktopEntryEditDialogPrivate::emptyListSwitchedFrom(VelUIDesktopEntry *entry) const
+{
+    const bool isOnlyChosen = form().rows.showIn()->isOnlyChosen();
+    if (isOnlyChosen == VelUI::ShowInChoice::choosesOnly(loaded))
+        return;
+    if (isOnlyChosen)
+        entry->setNotShowIn({});
+    else
+        entry->setOnlyShowIn({});
+}
+
 VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
     : QDialog(parent)
     , d(std::make_unique<VelDesktopEntryEditDialogPrivate>(this))
 {
     d->props = new VelDesktopEntryPropsWidget(this);
     d->props->setObjectName(QStringLiteral("props"));
+    // Whoever opens the dialog types the name first.
+    d->props->setFocus();
     connect(d->props, &VelDesktopEntryPropsWidget::changed, this, [this] { d->markModified(); });
+    connect(&d->form(), &VelDesktopEntryPropsWidgetPrivate::showInSwitched, this,
+            [this] { d->markModified(); });
 
     auto *buttonBox = new QDialogButtonBox(
         QDialogButtonBox::Ok | QDialogButtonBox::Cancel | QDialogButtonBox::Help, Qt::Horizontal, this);
@@ -180,13 +224,12 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     const VelUIDesktopEntry own = entry;
     if (!pattern.isEmpty() && !d->inheritFrom(pattern, &entry))
         return false;
+    d->form().allowAllTypes();
     d->props->loadFrom(entry);
     d->path = path;
     d->loaded = own;
-    if (!loaded) {
-        const EntryTypeRules::NewEntry types = EntryTypeRules::newEntryAt(path);
-        d->props->setType(types.type, types.allowed);
-    }
+    if (!loaded)
+        d->setNewType();
     setWindowTitle(tr("Desktop Entry Editor") + QStringLiteral(" - ") + path + QStringLiteral("[*]"));
     // Filling the form is not a change of the user's.
     setWindowModified(false);
@@ -209,6 +252,7 @@ void VelDesktopEntryEditDialog::accept()
     VelUIDesktopEntry entry = d->loaded;
     entry.setFilePath(d->path);
     d->props->saveTo(&entry);
+    d->emptyListSwitchedFrom(&entry);
     const QPointer<VelDesktopEntryEditDialog> self(this);
     if (!d->checkSuitable(entry))
         return;
@@ -241,7 +285,7 @@ void VelDesktopEntryEditDialog::copyFrom()
     VelUIDesktopEntry entry(source);
     if (!entry.load())
         return;
-    d->props->loadFrom(entry);
+    d->copy(entry);
     d->markModified();
 }
 

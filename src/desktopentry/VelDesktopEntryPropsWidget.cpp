@@ -14,6 +14,7 @@
 #include <QCheckBox>
 #include <QLineEdit>
 #include <QRadioButton>
+#include <QScopedValueRollback>
 #include <QScrollArea>
 
 using namespace VelUI;
@@ -60,16 +61,21 @@ void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList 
 
 void VelDesktopEntryPropsWidget::loadFrom(const VelUIDesktopEntry &entry)
 {
+    const QScopedValueRollback<bool> loading(d->isLoading, true);
     setType(entry.getType(), d->typeChooser.allowedTypes());
-    if (entry.isValid())
-        d->rows.load(entry, d->typeChooser.type());
+    if (!entry.isValid())
+        return;
+    if (!EntryTypeRules::choices({}).contains(entry.getType()))
+        d->typeChooser.leaveOpen();
+    d->rows.load(entry, d->typeChooser.type());
 }
 
 void VelDesktopEntryPropsWidget::saveTo(VelUIDesktopEntry *entry)
 {
     if (!entry)
         return;
-    entry->setType(d->typeChooser.type());
+    if (d->typeChooser.isDecided())
+        entry->setType(d->typeChooser.type());
     d->rows.save(entry, d->typeChooser.type());
 }
 

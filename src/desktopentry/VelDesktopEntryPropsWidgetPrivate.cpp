@@ -8,6 +8,7 @@
 #include "fields/FormLayout.h"
 #include "fields/IconEdit.h"
 #include "fields/PathEdit.h"
+#include "fields/ShowInChoice.h"
 #include "fields/StringListEdit.h"
 
 #include <VelDesktopEntryPropsWidget.h>
@@ -56,29 +57,48 @@ VelDesktopEntryPropsWidgetPrivate::VelDesktopEntryPropsWidgetPrivate(VelDesktopE
 {
     layout->setRowStretch(layout->rowCount(), 1);
     connectChanges();
+    form->setFocusProxy(rows.nameLine());
+}
+
+VelDesktopEntryPropsWidgetPrivate &VelDesktopEntryPropsWidgetPrivate::of(VelDesktopEntryPropsWidget &form)
+{
+    return *form.d;
+}
+
+void VelDesktopEntryPropsWidgetPrivate::allowAllTypes()
+{
+    q->setType(EntryTypeRules::Application, {});
+}
+
+// The fields tell of every change, also of those that filling them makes.
+void VelDesktopEntryPropsWidgetPrivate::tellChange()
+{
+    if (!isLoading)
+        Q_EMIT q->changed();
 }
 
 void VelDesktopEntryPropsWidgetPrivate::connectChanges()
 {
-    const auto changed = &VelDesktopEntryPropsWidget::changed;
+    const auto changed = &VelDesktopEntryPropsWidgetPrivate::tellChange;
     const QWidget *const content = scrollArea->widget();
     for (QLineEdit *line : content->findChildren<QLineEdit *>())
-        connect(line, &QLineEdit::textEdited, q, changed);
+        connect(line, &QLineEdit::textEdited, this, changed);
     for (IconEdit *edit : content->findChildren<IconEdit *>())
-        connect(edit, &IconEdit::iconChanged, q, changed);
+        connect(edit, &IconEdit::iconChanged, this, changed);
     for (QCheckBox *box : content->findChildren<QCheckBox *>())
-        connect(box, &QCheckBox::stateChanged, q, changed);
+        connect(box, &QCheckBox::stateChanged, this, changed);
     for (PathEdit *edit : content->findChildren<PathEdit *>())
-        connect(edit, &PathEdit::changed, q, changed);
+        connect(edit, &PathEdit::changed, q, &VelDesktopEntryPropsWidget::changed);
     for (StringListEdit *edit : content->findChildren<StringListEdit *>())
-        connect(edit, &StringListEdit::changed, q, changed);
+        connect(edit, &StringListEdit::changed, this, changed);
     for (ActionListEdit *edit : content->findChildren<ActionListEdit *>())
-        connect(edit, &ActionListEdit::changed, q, changed);
+        connect(edit, &ActionListEdit::changed, this, changed);
 
     typeChooser.onChosen([this] {
-        rows.showFor(typeChooser.type());
+        rows.changeTo(typeChooser.type());
         Q_EMIT q->changed();
     });
+    connect(rows.showIn(), &ShowInChoice::switched, this, &VelDesktopEntryPropsWidgetPrivate::showInSwitched);
     connect(rows.urlRow()->infoButton(), &QToolButton::clicked, this,
             [this] { Q_EMIT q->requestedURLInfo(rows.urlRow()->url()); });
     connect(qApp, &QApplication::focusChanged, this,

@@ -23,14 +23,26 @@ class VelDesktopEntryPropsWidgetPrivate : public QObject
 public:
     explicit VelDesktopEntryPropsWidgetPrivate(VelDesktopEntryPropsWidget *form);
 
+    /// The parts of \a form, for the dialog around it.
+    static VelDesktopEntryPropsWidgetPrivate &of(VelDesktopEntryPropsWidget &form);
+
+    /// Forgets which types another file had to choose from.
+    void allowAllTypes();
+
     VelDesktopEntryPropsWidget *const q;
     QScrollArea *const scrollArea;
     VelUI::FormLayout *const layout;
     VelUI::TypeChooser typeChooser;
     VelUI::PropsTable rows;
     bool readOnly = false;
+    bool isLoading = false;
+
+Q_SIGNALS:
+    /// The user chose the other list of desktop environments.
+    void showInSwitched();
 
 private:
+    void tellChange();
     void connectChanges();
     void keepInView(QWidget *focused);
 };

@@ -10,6 +10,7 @@
 #include <frame/DesktopEntryRecord.h>
 
 #include <QRadioButton>
+#include <QSignalSpy>
 
 using namespace FormDriving;
 using namespace VelUI;
@@ -56,8 +57,7 @@ private Q_SLOTS:
     void enablesTheListOfTheChosenButton();
     void choosesTheButtonByTheLists();
     void writesTheChosenListAlone();
-    void keepsBothListsOfARecordWithoutASwitch();
-    void forgetsASwitchWhenItIsFilledAnew();
+    void tellsOfASwitchOfTheUsers();
 };
 
 void tst_ShowInChoice::startsWithTheFirstButton()
@@ -108,35 +108,23 @@ void tst_ShowInChoice::writesTheChosenListAlone()
     form.choice.save(&fresh);
     QCOMPARE(fresh.getOnlyShowIn(), QStringList());
     QCOMPARE(fresh.getNotShowIn(), Others);
+    VelUIDesktopAction other = actionWith({}, {QStringLiteral("W")});
     form.button("onlyShowInButton")->click();
-    form.choice.save(&fresh);
-    QCOMPARE(fresh.getOnlyShowIn(), Desktops);
-    QCOMPARE(fresh.getNotShowIn(), QStringList());
+    form.choice.save(&other);
+    QCOMPARE(other.getOnlyShowIn(), Desktops);
+    QCOMPARE(other.getNotShowIn(), QStringList({QStringLiteral("W")}));
 }
 
-void tst_ShowInChoice::keepsBothListsOfARecordWithoutASwitch()
+void tst_ShowInChoice::tellsOfASwitchOfTheUsers()
 {
     Form form;
-    VelUIDesktopAction both = actionWith(Desktops, Others);
-    form.choice.load(both);
-    form.choice.save(&both);
-    QCOMPARE(both.getOnlyShowIn(), Desktops);
-    QCOMPARE(both.getNotShowIn(), Others);
+    const QSignalSpy switched(&form.choice, &ShowInChoice::switched);
+    form.choice.load(Desktops, Others);
+    QCOMPARE(switched.count(), 0);
+    QVERIFY(!form.choice.isOnlyChosen());
     form.button("onlyShowInButton")->click();
-    form.button("notShowInButton")->click();
-    form.choice.save(&both);
-    QCOMPARE(both.getOnlyShowIn(), QStringList());
-    QCOMPARE(both.getNotShowIn(), Others);
-}
-
-void tst_ShowInChoice::forgetsASwitchWhenItIsFilledAnew()
-{
-    Form form;
-    VelUIDesktopAction both = actionWith(Desktops, Others);
-    form.button("notShowInButton")->click();
-    form.choice.load(both);
-    form.choice.save(&both);
-    QCOMPARE(both.getOnlyShowIn(), Desktops);
+    QCOMPARE(switched.count(), 1);
+    QVERIFY(form.choice.isOnlyChosen());
 }
 
 VEL_TEST_MAIN(tst_ShowInChoice)

@@ -34,6 +34,7 @@ private Q_SLOTS:
     void takesOnlyWhatTheEntryLacksFromATemplate();
     void warnsOfATemplateThatCannotBeRead();
     void makesAnApplicationOfATemplateOfALink();
+    void opensWithTheNameSelected();
     void marksTheTitleAfterTheFirstChange();
     void marksAChangeWithoutAPlaceInTheTitle();
     void showsTheHelp();
@@ -199,6 +200,19 @@ void tst_VelDesktopEntryEditDialog::makesAnApplicationOfATemplateOfALink()
     QCOMPARE(type(&dialog), QStringLiteral("Application"));
     QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Page"));
     QCOMPARE(line(&dialog, "urlEdit")->text(), QString());
+}
+
+void tst_VelDesktopEntryEditDialog::opensWithTheNameSelected()
+{
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(write(QStringLiteral("a.desktop"), plainApplication)));
+    dialog.show();
+    QVERIFY(QTest::qWaitForWindowActive(&dialog));
+    QLineEdit *name = line(&dialog, "nameEdit");
+    QCOMPARE(QApplication::focusWidget(), name);
+    QCOMPARE(name->selectedText(), name->text());
+    QTest::keyClick(name, Qt::Key_Tab, Qt::ShiftModifier);
+    QCOMPARE(QApplication::focusWidget(), child<QComboBox>(&dialog, "typeComboBox"));
 }
 
 void tst_VelDesktopEntryEditDialog::marksTheTitleAfterTheFirstChange()

@@ -24,6 +24,7 @@ private Q_SLOTS:
     void copiesFromAnEntryOfTheMenu();
     void keepsTheTargetsOwnKeysWhenCopying();
     void switchesTheListsWhenCopying();
+    void keepsAFolderAFolderWhenCopying();
     void marksACopyAsAChange();
     void copiesNothingFromAFileThatDoesNotLoad();
     void copiesNothingWhenThePickerIsCanceled();
@@ -111,6 +112,21 @@ void tst_VelDesktopEntryEditDialogCopying::switchesTheListsWhenCopying()
     copyFrom(dialog, source);
     QCOMPARE(runAndPress(dialog, okButton), int(QDialog::Accepted));
     QCOMPARE(read(file), plainApplication + "NotShowIn=Elsewhere;\n");
+}
+
+void tst_VelDesktopEntryEditDialogCopying::keepsAFolderAFolderWhenCopying()
+{
+    const QString source = writeToMenu(QStringLiteral("full.desktop"), EntrySamples::fullApplication());
+    QVERIFY(QDir().mkpath(path(QStringLiteral("folder"))));
+    const QString file = write(QStringLiteral("folder/.directory"), EntrySamples::directory());
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    copyFrom(dialog, source);
+    QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Full"));
+    click(okButton(&dialog));
+    QCOMPARE(dialog.result(), int(QDialog::Accepted));
+    QVERIFY(read(file).contains("\nType=Directory\n"));
+    QVERIFY(!read(file).contains("\nExec="));
 }
 
 void tst_VelDesktopEntryEditDialogCopying::marksACopyAsAChange()

@@ -15,6 +15,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QPointer>
+#include <QRadioButton>
 
 using namespace FormDriving;
 
@@ -38,6 +39,10 @@ private Q_SLOTS:
     void savesAgainAfterAnAcceptedChange();
     void keepsPermissionsAndLinks();
     void dropsTheKeysOfTheOldType();
+    void emptiesTheListThatTheUserLeft_data();
+    void emptiesTheListThatTheUserLeft();
+    void refusesATypeThatItDoesNotKnow();
+    void savesNoTypeOfTheFileBefore();
     void savesThePositionOnTheDesktop_data();
     void savesThePositionOnTheDesktop();
     void warnsOfAPositionElsewhereAfterSaving_data();
@@ -273,6 +278,57 @@ void tst_VelDesktopEntryEditDialogSaving::dropsTheKeysOfTheOldType()
     for (const char *key : {"Exec", "Keywords", "Actions", "[Desktop Action", "StartupWMClass"})
         QVERIFY2(!bytes.contains(QByteArray("\n") + key), key);
     QVERIFY(bytes.contains("X-Vendor-Key=keep me\n"));
+}
+
+void tst_VelDesktopEntryEditDialogSaving::emptiesTheListThatTheUserLeft_data()
+{
+    QTest::addColumn<int>("switches");
+    QTest::addColumn<QByteArray>("lists");
+    QTest::newRow("no switch") << 0 << QByteArray("OnlyShowIn=X;\nNotShowIn=Y;\n");
+    QTest::newRow("a switch") << 1 << QByteArray("OnlyShowIn=X;\n");
+    QTest::newRow("there and back") << 2 << QByteArray("OnlyShowIn=X;\nNotShowIn=Y;\n");
+}
+
+void tst_VelDesktopEntryEditDialogSaving::emptiesTheListThatTheUserLeft()
+{
+    QFETCH(int, switches);
+    QFETCH(QByteArray, lists);
+    const QString file = write(QStringLiteral("a.desktop"), plainApplication + "OnlyShowIn=X;\nNotShowIn=Y;\n");
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    for (int i = 0; i < switches; ++i)
+        child<QRadioButton>(&dialog, i % 2 == 0 ? "onlyShowInButton" : "notShowInButton")->click();
+    QCOMPARE(dialog.isWindowModified(), switches > 0);
+    ModalDriver modal;
+    modal.answer(warning(QStringLiteral("You create hidden desktop entry")), QMessageBox::Ok);
+    click(okButton(&dialog));
+    QVERIFY(modal.finished());
+    QCOMPARE(read(file), plainApplication + lists);
+}
+
+void tst_VelDesktopEntryEditDialogSaving::refusesATypeThatItDoesNotKnow()
+{
+    const QByteArray bytes = "[Desktop Entry]\nType=FSDevice\nName=a\n";
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    QTest::keyClicks(line(&dialog, "commentEdit"), QStringLiteral("x"));
+    ModalDriver modal;
+    modal.answer(warning(QStringLiteral("wrong/incomplete desktop entry")), QMessageBox::Ok);
+    click(okButton(&dialog));
+    QVERIFY(modal.finished());
+    QCOMPARE(read(file), bytes);
+}
+
+void tst_VelDesktopEntryEditDialogSaving::savesNoTypeOfTheFileBefore()
+{
+    const QString file = write(QStringLiteral("a.desktop"), plainApplication);
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(path(QStringLiteral("folder/.directory")), true));
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    QCOMPARE(type(&dialog), QStringLiteral("Application"));
+    click(okButton(&dialog));
+    QCOMPARE(read(file), plainApplication);
 }
 
 void tst_VelDesktopEntryEditDialogSaving::savesThePositionOnTheDesktop_data()

@@ -95,7 +95,8 @@ void tst_VelDesktopEntryPropsWidgetChanges::reportsLoadingByThePathFieldsOnly()
 {
     VelDesktopEntryPropsWidget form;
     QSignalSpy changed(&form, &VelDesktopEntryPropsWidget::changed);
-    form.loadFrom(entry("[Desktop Entry]\nType=Application\nName=a\nComment=b\nIcon=c\nKeywords=d;\n"));
+    form.loadFrom(entry("[Desktop Entry]\nType=Application\nName=a\nComment=b\nIcon=c\nKeywords=d;\n"
+                        "Terminal=true\nHidden=true\n"));
     QCOMPARE(changed.count(), 0);
     form.loadFrom(entry("[Desktop Entry]\nType=Application\nName=a\nExec=true\n"));
     QVERIFY(changed.count() > 0);

@@ -12,6 +12,7 @@
 #include <desktopentry/StringListEdit.h>
 #include <frame/DesktopEntryRecord.h>
 
+#include <QAbstractItemView>
 #include <QCheckBox>
 #include <QComboBox>
 #include <QPointer>
@@ -59,6 +60,11 @@ private Q_SLOTS:
     void restoresTheTypeOnAnyOtherAnswer();
     void survivesItsDeletionBehindTheQuestion();
     void emptiesTheRowsOfTheOldType();
+    void bringsBackWhatTheUserEmptiedByTheType();
+    void bringsBackNothingOfAnotherEntry();
+    void keepsATypeThatItDoesNotKnow_data();
+    void keepsATypeThatItDoesNotKnow();
+    void takesTheTypeShownWhenTheUserChoosesIt();
     void keepsTheCommonRowsWhenTheTypeChanges();
     void savesNothingOfTheOldType();
     void ignoresTheWheelOverTheTypeWithoutFocus();
@@ -251,6 +257,75 @@ void tst_VelDesktopEntryPropsWidgetTypes::emptiesTheRowsOfTheOldType()
     form.setType(application, {});
     form.setType(link, {});
     QCOMPARE(child<QLineEdit>(&form, "urlEdit")->text(), QString());
+}
+
+void tst_VelDesktopEntryPropsWidgetTypes::bringsBackWhatTheUserEmptiedByTheType()
+{
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(entry(EntrySamples::fullApplication()));
+    ModalDriver modal;
+    for (const QString &type : {link, directory, application}) {
+        modal.answer(typeQuestion, QMessageBox::Yes);
+        chooseType(form, type);
+        QVERIFY(modal.finished());
+        QCOMPARE(child<PathEdit>(&form, "execEdit")->text().isEmpty(), type != application);
+    }
+    QCOMPARE(child<PathEdit>(&form, "execEdit")->text(), QStringLiteral("/bin/sh -c true %u"));
+    QVERIFY(child<QCheckBox>(&form, "terminalCheckBox")->isChecked());
+    QCOMPARE(child<StringListEdit>(&form, "categoriesEdit")->strings(),
+             QStringList({QStringLiteral("Utility"), QStringLiteral("Qt")}));
+    QCOMPARE(child<ActionListEdit>(&form, "actionsEdit")->actions().size(), 2);
+}
+
+void tst_VelDesktopEntryPropsWidgetTypes::bringsBackNothingOfAnotherEntry()
+{
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(entry(EntrySamples::fullApplication()));
+    ModalDriver modal;
+    modal.answer(typeQuestion, QMessageBox::Yes);
+    chooseType(form, directory);
+    form.loadFrom(entry(EntrySamples::link()));
+    modal.answer(typeQuestion, QMessageBox::Yes);
+    chooseType(form, application);
+    QVERIFY(modal.finished());
+    QCOMPARE(child<PathEdit>(&form, "execEdit")->text(), QString());
+}
+
+void tst_VelDesktopEntryPropsWidgetTypes::keepsATypeThatItDoesNotKnow_data()
+{
+    QTest::addColumn<QByteArray>("line");
+    QTest::newRow("another one") << QByteArray("Type=FSDevice\n");
+    QTest::newRow("in lower case") << QByteArray("Type=application\n");
+    QTest::newRow("none") << QByteArray();
+}
+
+void tst_VelDesktopEntryPropsWidgetTypes::keepsATypeThatItDoesNotKnow()
+{
+    QFETCH(QByteArray, line);
+    const QByteArray bytes = "[Desktop Entry]\n" + line + "Name=a\nExec=/bin/sh\n";
+    VelUIDesktopEntry record = entry(bytes);
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(record);
+    child<QLineEdit>(&form, "nameEdit")->setText(QStringLiteral("b"));
+    form.saveTo(&record);
+    QVERIFY(record.save());
+    QCOMPARE(read(path(QStringLiteral("entry.desktop"))), QByteArray(bytes).replace("Name=a", "Name=b"));
+}
+
+void tst_VelDesktopEntryPropsWidgetTypes::takesTheTypeShownWhenTheUserChoosesIt()
+{
+    VelUIDesktopEntry record = entry("[Desktop Entry]\nType=FSDevice\nName=a\nExec=/bin/sh\n");
+    VelDesktopEntryPropsWidget form;
+    form.loadFrom(record);
+    form.show();
+    QVERIFY(QTest::qWaitForWindowActive(&form));
+    const QSignalSpy changed(&form, &VelDesktopEntryPropsWidget::changed);
+    QComboBox *box = typeBox(form);
+    box->showPopup();
+    QTest::keyClick(box->view(), Qt::Key_Return);
+    QCOMPARE(changed.count(), 1);
+    form.saveTo(&record);
+    QCOMPARE(record.getType(), application);
 }
 
 void tst_VelDesktopEntryPropsWidgetTypes::keepsTheCommonRowsWhenTheTypeChanges()

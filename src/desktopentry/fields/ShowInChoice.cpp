@@ -63,15 +63,19 @@ ShowInChoice::ShowInChoice(const Texts &texts, FormLayout *layout)
     m_no->setEnabled(false);
     connect(m_onlyButton, &QRadioButton::toggled, m_only, &QWidget::setEnabled);
     connect(m_onlyButton, &QRadioButton::toggled, m_no, &QWidget::setDisabled);
-    connect(m_onlyButton, &QRadioButton::toggled, this, [this] { m_isSwitched = true; });
+    connect(m_onlyButton, &QRadioButton::toggled, this, [this] {
+        if (!m_isLoading)
+            Q_EMIT switched();
+    });
 }
 
 void ShowInChoice::load(const QStringList &only, const QStringList &no)
 {
+    m_isLoading = true;
     m_only->setStrings(only);
     m_no->setStrings(no);
     (no.isEmpty() ? m_onlyButton : m_noButton)->setChecked(true);
-    m_isSwitched = false;
+    m_isLoading = false;
 }
 
 bool ShowInChoice::isOnlyChosen() const
@@ -87,11 +91,6 @@ QStringList ShowInChoice::only() const
 QStringList ShowInChoice::no() const
 {
     return m_no->strings();
-}
-
-bool ShowInChoice::keepsBothOf(const QStringList &only, const QStringList &no) const
-{
-    return !m_isSwitched && !no.isEmpty() && m_only->strings() == only;
 }
 
 } // namespace VelUI

@@ -44,36 +44,39 @@ public:
     }
 
     /**
-     * Writes the chosen list to \a record and empties the other one.
-     *
-     * A record that holds both lists keeps them, unless something else was chosen: here, or in the
-     * other record that the choice was filled from.
+     * Writes the chosen list to \a record and leaves the other one alone.
      */
     template <typename Record>
     void save(Record *record) const
     {
-        if (isOnlyChosen()) {
+        if (isOnlyChosen())
             record->setOnlyShowIn(only());
-            record->setNotShowIn({});
-            return;
-        }
-        const bool keepsBoth = keepsBothOf(record->getOnlyShowIn(), record->getNotShowIn());
-        record->setNotShowIn(no());
-        if (!keepsBoth)
-            record->setOnlyShowIn({});
+        else
+            record->setNotShowIn(no());
     }
 
-private:
+    /// Whether load() chooses "Only show in" for \a record.
+    template <typename Record>
+    static bool choosesOnly(const Record &record)
+    {
+        return record.getNotShowIn().isEmpty();
+    }
+
     bool isOnlyChosen() const;
+
+Q_SIGNALS:
+    /// The user chose the other list.
+    void switched();
+
+private:
     QStringList only() const;
     QStringList no() const;
-    bool keepsBothOf(const QStringList &only, const QStringList &no) const;
 
     QRadioButton *m_onlyButton;
     StringListEdit *m_only;
     QRadioButton *m_noButton;
     StringListEdit *m_no;
-    bool m_isSwitched = false; // since the last loading
+    bool m_isLoading = false;
 };
 
 } // namespace VelUI
