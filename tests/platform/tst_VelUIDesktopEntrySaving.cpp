@@ -53,6 +53,7 @@ private Q_SLOTS:
     void mergesIntoAFileThatChangedMeanwhile();
     void mergesIntoAFileThatChangedWithoutANewSizeOrTime();
     void writesAFileThatIsGoneWhole();
+    void writesAFileThatWasEmptiedWhole();
     void createsAFileWhenThereIsNothingToWrite();
     void savesAgainAfterSaving();
     void savesThroughNoLinkThatAnotherUserPlanted();
@@ -377,7 +378,6 @@ void tst_VelUIDesktopEntrySaving::mergesIntoAFileThatChangedMeanwhile_data()
     row("they removed what we removed", Header + "Icon=i\n", noName, Header + "Icon=i\n");
     row("other language", Header + "Name=Theirs\nName[fr]=F\n", local,
         Header + "Name=Theirs\nName[fr]=F\nName[de]=L\n");
-    row("they emptied it", "", name, Header + "Name=B\n");
     row("their action stays",
         Header + "Actions=a;c;\n[Desktop Action a]\nName=A\n[Desktop Action c]\nName=C\n", action,
         Header
@@ -427,6 +427,18 @@ void tst_VelUIDesktopEntrySaving::writesAFileThatIsGoneWhole()
     QCOMPARE(read(m_file), bytes);
     record.setName(QStringLiteral("B"));
     QVERIFY(QFile::remove(m_file));
+    QVERIFY(record.save());
+    QCOMPARE(read(m_file), QByteArray(bytes).replace("=A", "=B"));
+}
+
+void tst_VelUIDesktopEntrySaving::writesAFileThatWasEmptiedWhole()
+{
+    const QByteArray bytes = "#c\n" + Header + "Name=A\nX=\xFF\n\n[O]\n";
+    write(QStringLiteral("x.desktop"), bytes);
+    VelUIDesktopEntry record(m_file);
+    QCOMPARE(record.getName(), QStringLiteral("A"));
+    write(QStringLiteral("x.desktop"), QByteArray());
+    record.setName(QStringLiteral("B"));
     QVERIFY(record.save());
     QCOMPARE(read(m_file), QByteArray(bytes).replace("=A", "=B"));
 }

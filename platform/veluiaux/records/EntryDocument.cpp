@@ -264,8 +264,10 @@ bool EntryDocument::save()
 EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target, LockedFolder *locked,
                                               bool isLast)
 {
-    // A file that is gone is written whole, and so is one that this text did not come from.
-    const bool isWhole = !target.exists || (m_read && !isFromPath());
+    // A file that is gone or was emptied is written whole, and so is one that this text did not come
+    // from.
+    const bool isEmptied = target.exists && target.status.st_size == 0 && !m_text->bytes().empty();
+    const bool isWhole = !target.exists || isEmptied || (m_read && !isFromPath());
     if (!isWhole && m_changes.isEmpty())
         return Outcome::Saved;
     const bool isKnown = isWhole || (isFromPath() && m_settled && FileStamp(target.status) == m_stamp);
