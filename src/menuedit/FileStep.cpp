@@ -35,21 +35,25 @@ Refusal FileStep::redo()
     return run(changes, &FileChange::redo, &FileChange::undo);
 }
 
-// What fails half way has all that was done before it taken back.
+// A change is looked at when its turn comes, as it may need what another one brought back, and noted
+// before the next: that is what it has to find when it goes the other way. What fails half way has all
+// that was done before it taken back.
 Refusal FileStep::run(const Changes &changes, Refusal (FileChange::*there)(), Refusal (FileChange::*back)())
 {
-    for (const FileChange *change : changes) {
-        if (const Refusal refusal = change->check())
-            return refusal;
-    }
     Refusal refusal;
     std::size_t done = 0;
-    while (done < changes.size() && !(refusal = (changes[done]->*there)()))
-        ++done;
+    for (; done < changes.size(); ++done) {
+        refusal = changes[done]->check();
+        if (!refusal)
+            refusal = (changes[done]->*there)();
+        if (refusal)
+            break;
+        changes[done]->note();
+    }
     for (; refusal && done > 0; --done) {
         if ((changes[done - 1]->*back)())
             refusal.isForGood = true;
+        changes[done - 1]->note();
     }
-    note();
     return refusal;
 }

@@ -5,37 +5,7 @@
 
 #include "ExactMove.h"
 #include "StagingFolder.h"
-
-#include <QDir>
-#include <QFile>
-#include <QFileInfo>
-#include <QStandardPaths>
-
-namespace {
-
-// The trash of the home folder, made where there is none; empty where none can be had.
-QString homeTrash()
-{
-    const QString data = QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation);
-    const QString trash = data + QStringLiteral("/Trash");
-    if (!QFileInfo(trash).isDir()) {
-        if (!QDir().mkpath(data) || !QDir().mkdir(trash))
-            return QString();
-        QFile::setPermissions(trash, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
-    }
-    const QFileInfo info(trash);
-    return info.isWritable() && info.isExecutable() ? trash : QString();
-}
-
-// The file in a trash that says where the one at \a place was.
-QString trashInfoOf(const QString &place)
-{
-    const QFileInfo info(place);
-    return QFileInfo(info.path()).path() + QStringLiteral("/info/") + info.fileName()
-        + QStringLiteral(".trashinfo");
-}
-
-} // namespace
+#include "Trash.h"
 
 KeptThing::KeptThing(const QString &path)
     : m_state(path)
@@ -47,13 +17,9 @@ KeptThing::~KeptThing() = default;
 std::unique_ptr<KeptThing> KeptThing::inTrash(const QString &path)
 {
     std::unique_ptr<KeptThing> kept(new KeptThing(path));
-    QString place;
-    // Without a trash in the home folder Qt takes the current folder for one.
-    if (!kept->m_state.exists() || homeTrash().isEmpty() || !QFile::moveToTrash(path, &place))
-        return nullptr;
-    kept->m_place = ExactMove::native(place);
-    kept->m_trashInfo = trashInfoOf(place);
-    return kept;
+    kept->m_inTrash = Trash::put(path);
+    kept->m_place = ExactMove::native(kept->m_inTrash);
+    return kept->m_inTrash.isEmpty() ? nullptr : std::move(kept);
 }
 
 std::unique_ptr<KeptThing> KeptThing::beside(const QString &path)
@@ -74,8 +40,8 @@ std::error_code KeptThing::bringBack(const QString &path)
 {
     if (const std::error_code error = ExactMove::move(m_place, ExactMove::native(path)))
         return error;
-    if (!m_trashInfo.isEmpty())
-        QFile::remove(m_trashInfo);
+    if (!m_inTrash.isEmpty())
+        Trash::forget(m_inTrash);
     m_folder.reset();
     return {};
 }

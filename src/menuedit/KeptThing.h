@@ -40,6 +40,6 @@ private:
 
     TreeState m_state;
     TreeCopy::Path m_place;
-    QString m_trashInfo; // the file that says where it was; empty where it is not in a trash
+    QString m_inTrash; // the same as text; empty where it is not in a trash
     std::unique_ptr<StagingFolder> m_folder;
 };

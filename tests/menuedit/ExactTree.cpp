@@ -104,6 +104,14 @@ QString ExactTree::difference(const ExactTree &found, const QSet<QByteArray> &re
     return lines.join(QLatin1Char('\n'));
 }
 
+QMap<QByteArray, ino_t> ExactTree::numbers() const
+{
+    QMap<QByteArray, ino_t> numbers;
+    for (auto it = m_items.begin(); it != m_items.end(); ++it)
+        numbers.insert(it.key(), it->number);
+    return numbers;
+}
+
 QSet<QByteArray> ExactTree::contents() const
 {
     QSet<QByteArray> contents;

@@ -28,6 +28,8 @@ public:
     /// for those only that are not among \a rewritten ("*" for all).
     QString difference(const ExactTree &found, const QSet<QByteArray> &rewritten = {}) const;
     int count() const { return m_items.size(); }
+    /// The numbers by which the file system knows what is there, by paths.
+    QMap<QByteArray, ino_t> numbers() const;
     /// The contents of all files.
     QSet<QByteArray> contents() const;
 
