@@ -3,6 +3,8 @@
 
 #include "FaultScene.h"
 
+#include "UndoScene.h"
+
 #include <menuedit/FileTransfer.h>
 
 #include <velintegration/startmenu.h>
@@ -289,6 +291,8 @@ std::unique_ptr<FaultScene> FaultScene::make(const QString &name, const QString 
         return std::make_unique<DropScene>(folder, otherFolder);
     if (name == QLatin1String("menu"))
         return std::make_unique<MenuScene>(folder, otherFolder);
+    if (name == QLatin1String("undo"))
+        return std::make_unique<UndoScene>(folder, otherFolder);
     return {};
 }
 

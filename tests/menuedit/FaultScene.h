@@ -24,7 +24,7 @@ public:
     /**
      * The scene of that name, with everything in \a folder: "save" (a record), "move" (a folder to
      * \a otherFolder on another file system and back), "drop" (several items and the order of
-     * their new folder) or "menu" (the default menu).
+     * their new folder), "menu" (the default menu) or "undo" (what is undone and done again).
      */
     static std::unique_ptr<FaultScene> make(const QString &name, const QString &folder,
                                             const QString &otherFolder);

@@ -103,7 +103,7 @@ private:
 void tst_OperationFaults::losesNothingWhenItIsKilled_data()
 {
     QTest::addColumn<QString>("name");
-    for (const char *name : {"save", "move", "drop", "menu"})
+    for (const char *name : {"save", "move", "drop", "menu", "undo"})
         QTest::newRow(name) << QString::fromLatin1(name);
 }
 
