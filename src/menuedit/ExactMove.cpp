@@ -4,6 +4,7 @@
 #include "ExactMove.h"
 
 #include "FileDescriptor.h"
+#include "FileProgress.h"
 
 #include <QFile>
 
@@ -34,8 +35,9 @@ std::error_code renameTo(const Path &from, const Path &to)
 std::error_code carryOver(const Path &from, const Path &to)
 {
     std::error_code error;
+    FileProgress nobody;
     if (!fs::is_symlink(fs::symlink_status(from, error)))
-        return TreeCopy::move(from, to);
+        return TreeCopy::move(from, to, nobody);
     const Path text = fs::read_symlink(from, error);
     return error ? error : ExactMove::moveLink(from, to, text);
 }

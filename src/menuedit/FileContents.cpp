@@ -5,6 +5,7 @@
 
 #include "ExactMove.h"
 #include "FileDescriptor.h"
+#include "FileProgress.h"
 #include "StagingFolder.h"
 
 #include <QList>
@@ -19,7 +20,7 @@
 
 namespace {
 
-constexpr off_t MostBytes = 1 << 20; // no record is larger
+constexpr off_t MostBytes = 16 << 20; // of a large menu what its entries were made from; a record has 1 MiB
 constexpr mode_t AllBits = 07777;
 constexpr mode_t PlainBits = 0777;
 
@@ -106,7 +107,8 @@ bool FileContents::operator==(const FileContents &other) const
 // so nobody can put another file there in between.
 std::error_code FileContents::replace(const TreeCopy::Path &path, const FileContents &expected) const
 {
-    const StagingFolder folder(path.parent_path());
+    FileProgress nobody;
+    const StagingFolder folder(path.parent_path(), nobody);
     if (folder.error())
         return folder.error();
     if (m_exists && !write(folder.item()))

@@ -22,7 +22,7 @@ class FileContents
 public:
     /// No file.
     FileContents() = default;
-    /// What is at \a path; nullopt for what is no regular file, for one too large for a record and for one
+    /// What is at \a path; nullopt for what is no regular file, for one of more than 16 MiB and for one
     /// that cannot be read.
     static std::optional<FileContents> of(const TreeCopy::Path &path);
 

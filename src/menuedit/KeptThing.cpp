@@ -26,7 +26,7 @@ std::unique_ptr<KeptThing> KeptThing::beside(const QString &path)
 {
     const TreeCopy::Path native = ExactMove::native(path);
     std::unique_ptr<KeptThing> kept(new KeptThing(path));
-    kept->m_folder = std::make_unique<StagingFolder>(native.parent_path());
+    kept->m_folder = std::make_unique<StagingFolder>(native.parent_path(), kept->m_nobody);
     kept->m_place = kept->m_folder->item();
     return kept->m_folder->error() || ExactMove::move(native, kept->m_place) ? nullptr : std::move(kept);
 }

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "FileProgress.h"
 #include "TreeCopy.h"
 #include "TreeState.h"
 
@@ -41,5 +42,6 @@ private:
     TreeState m_state;
     TreeCopy::Path m_place;
     QString m_inTrash; // the same as text; empty where it is not in a trash
+    FileProgress m_nobody; // follows what becomes of the folder
     std::unique_ptr<StagingFolder> m_folder;
 };

@@ -118,8 +118,12 @@ void UndoScene::fill()
 void UndoScene::nextOperation()
 {
     write(path(QStringLiteral("next")), "next");
-    for (const QString &place : places())
+    for (const QString &place : places()) {
         FileTransfer::transfer({path(QStringLiteral("next"))}, place, FileTransfer::Action::Copy);
+        VelUIDesktopEntry record(place + QStringLiteral("/.directory"));
+        record.setComment(QStringLiteral("next"));
+        record.save();
+    }
 }
 
 QStringList UndoScene::places() const

@@ -6,6 +6,7 @@
 #include "OtherFileSystem.h"
 #include "TestCase.h"
 
+#include <menuedit/FileProgress.h>
 #include <menuedit/FileTransfer.h>
 #include <menuedit/FolderOrder.h>
 #include <menuedit/KeptThing.h>
@@ -72,6 +73,12 @@ private:
     void operations();
     QStringList inTrash() const;
 
+    // Qt does not find names that are no text.
+    static void drop(const QString &path)
+    {
+        FileProgress nobody;
+        TreeRemoval::removeOwn(QFile::encodeName(path).toStdString(), nobody);
+    }
     static QString home() { return QFile::decodeName(qgetenv("XDG_DATA_HOME")); }
 
     QByteArray m_dataHome;
@@ -92,8 +99,7 @@ void tst_FileStep::init()
 void tst_FileStep::cleanup()
 {
     qputenv("XDG_DATA_HOME", m_dataHome);
-    // Qt does not find names that are no text.
-    TreeRemoval::removeOwn(QFile::encodeName(folder()).toStdString());
+    drop(folder());
     TestCase::cleanup();
 }
 
@@ -415,9 +421,7 @@ void tst_FileStep::refusesWhatIsNotAsItWasLeft_data()
     const auto rewrite = [this](const char *name) {
         return Meanwhile([=] { write(QLatin1String("menu/") + QLatin1String(name), "theirs"); });
     };
-    const auto drop = [this](const char *name) {
-        return Meanwhile([=] { TreeRemoval::removeOwn(QFile::encodeName(in(name)).toStdString()); });
-    };
+    const auto dropped = [this](const char *name) { return Meanwhile([=] { drop(in(name)); }); };
     const Operation makeFolder = [this](StepRecorder &recorder) {
         recorder.mayMake(in("new"));
         make("new/one");
@@ -433,14 +437,14 @@ void tst_FileStep::refusesWhatIsNotAsItWasLeft_data()
     const char taken[] = "There is another %1 by now.";
     row("a new folder got something", makeFolder, rewrite("new/two"), "new", changed);
     row("a file in a new folder changed", makeFolder, rewrite("new/one"), "new", changed);
-    row("a new folder is gone", makeFolder, drop("new"), "new", gone);
+    row("a new folder is gone", makeFolder, dropped("new"), "new", gone);
     row("an edited file was edited", editX, rewrite("games/x"), "games/x", changed);
-    row("an edited file is gone", editX, drop("games/x"), "games/x", gone);
+    row("an edited file is gone", editX, dropped("games/x"), "games/x", gone);
     row(
         "an edited file may be read by more", editX,
         [this] { chmod(QFile::encodeName(in("games/x")), 0604); }, "games/x", changed);
     row("the place of a deleted file is taken", removeX, rewrite("games/x"), "games/x", taken);
-    row("the folder of a deleted file is gone", removeX, drop("games"), "games", gone);
+    row("the folder of a deleted file is gone", removeX, dropped("games"), "games", gone);
     row(
         "the folder of a deleted file is a link", removeX,
         [this] {
@@ -448,7 +452,7 @@ void tst_FileStep::refusesWhatIsNotAsItWasLeft_data()
         },
         "games", changed);
     row("the place before a move is taken", moveX, rewrite("games/x"), "games/x", taken);
-    row("what was moved is gone", moveX, drop("office/x"), "office/x", gone);
+    row("what was moved is gone", moveX, dropped("office/x"), "office/x", gone);
     row(
         "what was moved is another file", moveX,
         [this] {
