@@ -11,7 +11,8 @@ ActionState ActionState::of(const Selection &selection)
     state.create = selection.writable;
     state.edit = selection.writable;
     state.paste = selection.writable && selection.filesOnClipboard;
-    state.up = selection.writable && selection.row != 0;
-    state.down = selection.writable && selection.row != selection.count - 1;
+    const bool isMovable = selection.writable && !selection.isByTime;
+    state.up = isMovable && selection.row != 0;
+    state.down = isMovable && selection.row != selection.count - 1;
     return state;
 }

@@ -16,6 +16,7 @@ struct ActionState
         bool filesOnClipboard = false; ///< whether the clipboard holds files
         int row = 0; ///< the place of the item among its siblings as shown
         int count = 0; ///< the number of siblings shown, the item included
+        bool isByTime = false; ///< whether the siblings are ordered by time, not by the user
     };
 
     bool create = true;

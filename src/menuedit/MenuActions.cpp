@@ -3,6 +3,7 @@
 
 #include "MenuActions.h"
 
+#include "ItemOrder.h"
 #include "MenuClipboard.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
@@ -80,6 +81,8 @@ ActionState stateOf(const ShownMenu &menu, const QModelIndex &item)
             !MenuClipboard::format(QGuiApplication::clipboard()->mimeData()).isEmpty();
         selection.row = shown.row();
         selection.count = menu.proxy().rowCount(shown.parent());
+        const QString folder = item.parent().data(QFileSystemModel::FileNameRole).toString();
+        selection.isByTime = ItemOrder::ruleOf(folder) == ItemOrder::Rule::ByTime;
     }
     return ActionState::of(selection);
 }

@@ -67,6 +67,11 @@ void MenuSelection::show(const QString &path)
     if (index.parent().isValid())
         m_view->expand(index.parent());
     select(index);
+    reveal(path);
+}
+
+void MenuSelection::reveal(const QString &path)
+{
     QTimer::singleShot(0, this, [this, path] {
         const QModelIndex again = shown(path);
         if (again.isValid())

@@ -38,6 +38,9 @@ public:
     /// Selects the item of \a path alone, opens its folder and scrolls to it, at the latest when
     /// the event loop runs.
     void show(const QString &path);
+    /// Scrolls to the item of \a path when the event loop runs: rows that come and go meanwhile do not
+    /// push it out of sight.
+    void reveal(const QString &path);
     /// Clears the selection, and puts the keyboard beside the item at \a path, which is about to go.
     void leave(const QString &path);
 

@@ -79,7 +79,9 @@ void VelMenuViewPrivate::moveSelected(bool up)
     const QModelIndex item = selection.item();
     if (!item.isValid())
         return;
+    const QString path = selection.path();
     MenuReordering::move(menu, item, up);
+    selection.reveal(path);
     find.clear();
     q->setActionsEnabled();
     Q_EMIT q->changed();
@@ -121,6 +123,7 @@ void VelMenuViewPrivate::makeEditable()
 {
     actions = std::make_unique<MenuActions>(q, menu.directory() == StartMenu::directory());
     connectActions();
+    connectRows();
     q->setActionsEnabled();
     QObject::connect(q, &QAbstractItemView::doubleClicked, q, &VelMenuView::slotEdit);
     QObject::connect(QGuiApplication::clipboard(), &QClipboard::dataChanged, actions->menu(),
@@ -147,6 +150,20 @@ void VelMenuViewPrivate::connectActions()
     connectTo(MenuActions::Recreate, &VelMenuView::slotRecreate);
     connectTo(MenuActions::Up, &VelMenuView::slotUp);
     connectTo(MenuActions::Down, &VelMenuView::slotDown);
+}
+
+// Where an item stands among the others decides whether it can go up or down.
+void VelMenuViewPrivate::connectRows()
+{
+    m_refresh.setSingleShot(true);
+    QObject::connect(&m_refresh, &QTimer::timeout, q, &VelMenuView::setActionsEnabled);
+    const auto refresh = [this] { m_refresh.start(0); };
+    const VelMenuProxyModel *rows = &menu.proxy();
+    QObject::connect(rows, &QAbstractItemModel::rowsInserted, &m_refresh, refresh);
+    QObject::connect(rows, &QAbstractItemModel::rowsRemoved, &m_refresh, refresh);
+    QObject::connect(rows, &QAbstractItemModel::rowsMoved, &m_refresh, refresh);
+    QObject::connect(rows, &QAbstractItemModel::layoutChanged, &m_refresh, refresh);
+    QObject::connect(rows, &QAbstractItemModel::modelReset, &m_refresh, refresh);
 }
 
 void VelMenuViewPrivate::connectFiles()

@@ -10,6 +10,8 @@
 #include "MenuVoice.h"
 #include "ShownMenu.h"
 
+#include <QTimer>
+
 #include <memory>
 
 class QKeyEvent;
@@ -55,7 +57,11 @@ private:
     void editCurrent();
     void makeEditable();
     void connectActions();
+    void connectRows();
     void connectFiles();
     void showRoot();
     void hideTopLevel();
+
+    // Rows come in many signals; the actions are looked at once afterwards.
+    QTimer m_refresh;
 };

@@ -148,6 +148,9 @@ void tst_VelMenuViewActions::enablesByRule_data()
     row("in the middle, files to paste", true, true, true, 1, 3, "create edit paste up down");
     row("first", true, true, false, 0, 3, "create edit down");
     row("last", true, true, false, 2, 3, "create edit up");
+    ActionState::Selection recent{true, true, false, 1, 3};
+    recent.isByTime = true;
+    QTest::newRow("in the middle, by time") << recent << QStringLiteral("create edit");
     row("alone", true, true, false, 0, 1, "create edit");
     row("may not be written", true, false, true, 1, 3, "");
 }
