@@ -227,6 +227,7 @@ public Q_SLOTS:
     /// Puts the selected item on the clipboard, to be copied where it is pasted.
     void slotCopy();
     /// Moves or copies what is on the clipboard into the selected folder or beside the selected item.
+    /// A program that holds the clipboard and does not answer is told of after two seconds at most.
     void slotPaste();
     /// Moves the selected item up by one place.
     void slotUp();

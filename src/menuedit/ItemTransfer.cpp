@@ -3,7 +3,9 @@
 
 #include "ItemTransfer.h"
 
+#include "ClipboardContents.h"
 #include "MenuClipboard.h"
+#include "MenuVoice.h"
 #include "VelMenuModel.h"
 
 #include <QClipboard>
@@ -11,6 +13,7 @@
 #include <QGuiApplication>
 #include <QIcon>
 #include <QMenu>
+#include <QPersistentModelIndex>
 #include <QPointer>
 
 void ItemTransfer::put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action)
@@ -21,12 +24,33 @@ void ItemTransfer::put(const VelMenuModel &files, const QModelIndex &item, Qt::D
         clipboard->setMimeData(new MenuClipboard::ItemData(files.filePath(item), action));
 }
 
-bool ItemTransfer::paste(VelMenuModel &files, const QModelIndex &item)
+namespace {
+
+// Whether what is on the clipboard can be had without a long wait; tells when it cannot.
+bool isToBeHad(ClipboardContents *contents, const QModelIndex &item, MenuVoice &voice)
 {
-    if (!item.isValid())
+    const QPersistentModelIndex place(item);
+    const QPointer<MenuVoice> guarded(&voice);
+    if (!contents || contents->isAnswered())
+        return place.isValid();
+    if (guarded)
+        voice.tell(QCoreApplication::translate("VelMenuView",
+                                               "The program that holds the clipboard does not answer. "
+                                               "Nothing was pasted."),
+                   MenuVoice::Failure);
+    return false;
+}
+
+} // namespace
+
+bool ItemTransfer::paste(VelMenuModel &files, const QModelIndex &selected, ClipboardContents *contents,
+                         MenuVoice &voice)
+{
+    const QPersistentModelIndex item(selected);
+    if (!item.isValid() || !isToBeHad(contents, item, voice))
         return false;
     const bool isFolder = files.isDir(item);
-    const QModelIndex target = isFolder ? item : item.parent();
+    const QModelIndex target = isFolder ? QModelIndex(item) : item.parent();
     const int row = isFolder ? -1 : item.row();
     const int column = isFolder ? -1 : item.column();
 

@@ -5,6 +5,8 @@
 
 #include <Qt>
 
+class ClipboardContents;
+class MenuVoice;
 class QModelIndex;
 class QPoint;
 class QWidget;
@@ -19,9 +21,15 @@ namespace ItemTransfer {
 /// first, and leaves it so for an invalid item.
 void put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action);
 
-/// Moves or copies what is on the clipboard into the folder \a item or to the place of the file
-/// \a item; whether something was moved, which it is only once. An event loop may run in it.
-bool paste(VelMenuModel &files, const QModelIndex &item);
+/**
+ * Moves or copies what is on the clipboard into the folder \a item or to the place of the file
+ * \a item. An event loop may run in it.
+ *
+ * @param contents who knows whether the owner of the clipboard answers; null when nobody does
+ * @param voice tells when it does not
+ * @return whether something was moved, which it is only once
+ */
+bool paste(VelMenuModel &files, const QModelIndex &item, ClipboardContents *contents, MenuVoice &voice);
 
 /// Asks in a menu at the global \a position what is to be done with dropped files;
 /// Qt::IgnoreAction for nothing. The \a view may go away meanwhile.

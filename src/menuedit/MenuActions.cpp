@@ -4,16 +4,13 @@
 #include "MenuActions.h"
 
 #include "ItemOrder.h"
-#include "MenuClipboard.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 
 #include <QAction>
-#include <QClipboard>
 #include <QCoreApplication>
 #include <QFileInfo>
-#include <QGuiApplication>
 #include <QIcon>
 #include <QMenu>
 
@@ -69,7 +66,7 @@ QKeySequence keyOf(MenuActions::Action action)
     }
 }
 
-ActionState stateOf(const ShownMenu &menu, const QModelIndex &item)
+ActionState stateOf(const ShownMenu &menu, const QModelIndex &item, const ClipboardContents &clipboard)
 {
     ActionState::Selection selection;
     selection.any = item.isValid();
@@ -77,8 +74,7 @@ ActionState stateOf(const ShownMenu &menu, const QModelIndex &item)
         const QFileInfo info(menu.files().filePath(item));
         const QModelIndex shown = menu.proxy().mapFromSource(item);
         selection.writable = QFileInfo(info.isDir() ? info.filePath() : info.absolutePath()).isWritable();
-        selection.filesOnClipboard =
-            !MenuClipboard::format(QGuiApplication::clipboard()->mimeData()).isEmpty();
+        selection.filesOnClipboard = clipboard.mayHoldFiles();
         selection.row = shown.row();
         selection.count = menu.proxy().rowCount(shown.parent());
         const QString folder = item.parent().data(QFileSystemModel::FileNameRole).toString();
@@ -132,7 +128,7 @@ void MenuActions::enable(Action which, bool isEnabled)
 
 void MenuActions::update(const ShownMenu &menu, const QModelIndex &item)
 {
-    const ActionState state = stateOf(menu, item);
+    const ActionState state = stateOf(menu, item, m_clipboard);
     enable(NewFolder, state.create);
     enable(NewEntry, state.create);
     for (const Action action : {Edit, Delete, Execute, Cut, Copy})

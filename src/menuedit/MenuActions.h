@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "ClipboardContents.h"
+
 #include "ActionState.h"
 
 #include <QVector>
@@ -49,6 +51,9 @@ public:
     /// Null for what is not offered.
     QAction *action(Action which) const { return m_actions.at(which); }
 
+    /// What of the clipboard Paste depends on.
+    ClipboardContents &clipboard() { return m_clipboard; }
+
     /// Enables what makes sense for \a item of the file model, or without one.
     void update(const ShownMenu &menu, const QModelIndex &item);
 
@@ -56,6 +61,7 @@ private:
     void add(QWidget *view, Action which);
     void enable(Action which, bool isEnabled);
 
+    ClipboardContents m_clipboard;
     std::unique_ptr<QMenu> m_menu;
     QVector<QAction *> m_actions;
 };

@@ -9,7 +9,9 @@
 
 #include <QDir>
 
+#include <algorithm>
 #include <cstdio>
+#include <iterator>
 
 namespace MenuClipboard {
 
@@ -163,6 +165,14 @@ QString format(const QMimeData *data)
             return ours;
     }
     return QString();
+}
+
+bool areFiles(const QByteArrayList &types)
+{
+    // The last one is what Qt makes a list of URLs of.
+    const QByteArray ours[] = {moveFormat().toLatin1(), copyFormat().toLatin1(), "text/x-moz-url"};
+    return std::any_of(std::begin(ours), std::end(ours),
+                       [&types](const QByteArray &type) { return types.contains(type); });
 }
 
 QList<QUrl> urls(const QMimeData *data, const QString &format)

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include <QByteArray>
+#include <QByteArrayList>
 #include <QList>
 #include <QMimeData>
 #include <QString>
@@ -56,6 +56,9 @@ private:
 
 /// The format of ours that \a data has, a cut before a copy; empty when there is none.
 QString format(const QMimeData *data);
+
+/// Whether a clipboard that offers the \a types, by their names on X11, has a format of ours.
+bool areFiles(const QByteArrayList &types);
 
 /// The URLs that \a data has in \a format. Text without a line separator is complained about
 /// on standard error and is one URL.

@@ -195,7 +195,8 @@ void VelMenuView::slotCopy()
 void VelMenuView::slotPaste()
 {
     const QPointer<VelMenuView> self(this);
-    if (ItemTransfer::paste(d->menu.files(), selectedItem()) && self)
+    ClipboardContents *const clipboard = d->actions ? &d->actions->clipboard() : nullptr;
+    if (ItemTransfer::paste(d->menu.files(), selectedItem(), clipboard, d->voice) && self)
         setActionsEnabled();
 }
 

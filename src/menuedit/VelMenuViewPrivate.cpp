@@ -11,10 +11,8 @@
 #include "VelMenuView.h"
 
 #include <QAction>
-#include <QClipboard>
 #include <QCoreApplication>
 #include <QFileInfo>
-#include <QGuiApplication>
 #include <QItemSelectionModel>
 #include <QKeyEvent>
 #include <QMenu>
@@ -126,8 +124,7 @@ void VelMenuViewPrivate::makeEditable()
     connectRows();
     q->setActionsEnabled();
     QObject::connect(q, &QAbstractItemView::doubleClicked, q, &VelMenuView::slotEdit);
-    QObject::connect(QGuiApplication::clipboard(), &QClipboard::dataChanged, actions->menu(),
-                     [view = q] { view->setActionsEnabled(); });
+    QObject::connect(&actions->clipboard(), &ClipboardContents::changed, q, &VelMenuView::setActionsEnabled);
     q->setDropIndicatorShown(true);
 }
 

@@ -1,0 +1,213 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "HandsOnTestCase.h"
+#include "VelMenuView.h"
+#include "XDoTool.h"
+
+#include <QAction>
+#include <QElapsedTimer>
+#include <QProcess>
+#include <QSignalSpy>
+#include <QTimer>
+
+#include <algorithm>
+
+namespace {
+
+/// How long the event loop did not run at a stretch, in milliseconds.
+class Freeze : public QObject
+{
+public:
+    Freeze()
+    {
+        m_since.start();
+        connect(&m_timer, &QTimer::timeout, this,
+                [this] { m_longest = std::max(m_longest, m_since.restart()); });
+        m_timer.start(5);
+    }
+
+    qint64 longest() const { return std::max(m_longest, m_since.elapsed()); }
+
+private:
+    QTimer m_timer;
+    QElapsedTimer m_since;
+    qint64 m_longest = 0;
+};
+
+const int Noticed = 400;
+const int Often = 1000;
+
+} // namespace
+
+/// Another program that owns the clipboard, and answers or does not.
+class tst_ClipboardOwner : public HandsOnTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init();
+    void cleanup();
+
+    void asksASilentOwnerOnceAndAtNoSelection();
+    void givesUpAPasteFromASilentOwner();
+    void givesUpAPasteFromAnOwnerThatFallsSilent();
+    void survivesItsViewWhileItWaits();
+    void pastesFromAnOwnerThatAnswers();
+    void looksAnewWhenAnotherTakesTheClipboard();
+    void asksNobodyForWhatItOwnsItself();
+
+private:
+    void startOwner(int types, int data, const QString &text = QString());
+    int questions();
+    bool canPaste() const { return action(view(), QStringLiteral("pasteAction"))->isEnabled(); }
+
+    std::unique_ptr<QProcess> m_owner;
+    QByteArray m_asked;
+    QString m_a;
+    QString m_sub;
+};
+
+void tst_ClipboardOwner::init()
+{
+    MenuTestCase::init();
+    m_asked.clear();
+    m_a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    m_sub = writeFolder(QStringLiteral("sub"), QStringLiteral("Sub"));
+}
+
+void tst_ClipboardOwner::cleanup()
+{
+    closeDialog();
+    if (m_owner) {
+        m_owner->kill();
+        m_owner->waitForFinished();
+    }
+    m_owner.reset();
+    HandsOnTestCase::cleanup();
+}
+
+void tst_ClipboardOwner::startOwner(int types, int data, const QString &text)
+{
+    m_owner = std::make_unique<QProcess>();
+    m_owner->start(QStringLiteral(VEL_CLIPBOARD_OWNER),
+                   {QString::number(types), QString::number(data), text});
+    QTRY_VERIFY(m_owner->canReadLine());
+    QCOMPARE(m_owner->readLine(), QByteArray("ready\n"));
+}
+
+// How often the owner was asked so far.
+int tst_ClipboardOwner::questions()
+{
+    m_asked += m_owner->readAllStandardOutput();
+    return m_asked.count("asked ");
+}
+
+void tst_ClipboardOwner::asksASilentOwnerOnceAndAtNoSelection()
+{
+    openDialog(menu(), 3);
+    const Freeze freeze;
+    startOwner(0, 0);
+    QTRY_COMPARE(questions(), 1);
+    for (const QString &file : {m_a, menu() + QLatin1String("/b.desktop"), m_sub, m_a})
+        clickItem(file);
+    XDoTool::press(QStringLiteral("Down"));
+    QTest::qWait(700);
+    QCOMPARE(questions(), 1);
+    QVERIFY2(freeze.longest() < Noticed, qPrintable(QString::number(freeze.longest())));
+}
+
+void tst_ClipboardOwner::givesUpAPasteFromASilentOwner()
+{
+    openDialog(menu(), 3);
+    startOwner(0, 0);
+    clickItem(m_sub);
+    QSignalSpy told(&view(), &VelMenuView::told);
+    const QStringList before = everythingIn(menu());
+    const Freeze freeze;
+    // That nothing can be known of the clipboard is told when it is asked for.
+    QTRY_VERIFY(canPaste());
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_COMPARE(told.count(), 1);
+    QCOMPARE(told.constFirst().at(0).toString(),
+             QStringLiteral("The program that holds the clipboard does not answer. Nothing was pasted."));
+    QCOMPARE(told.constFirst().at(1).toInt(), 2);
+    QCOMPARE(questions(), 1);
+    QCOMPARE(everythingIn(menu()), before);
+    QVERIFY2(freeze.longest() < Noticed, qPrintable(QString::number(freeze.longest())));
+}
+
+void tst_ClipboardOwner::givesUpAPasteFromAnOwnerThatFallsSilent()
+{
+    openDialog(menu(), 3);
+    startOwner(1, 0);
+    clickItem(m_sub);
+    QTRY_VERIFY(canPaste());
+    QSignalSpy told(&view(), &VelMenuView::told);
+    const Freeze freeze;
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_COMPARE(told.count(), 1);
+    QCOMPARE(told.constFirst().at(1).toInt(), 2);
+    // It is not waited for again.
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_COMPARE(told.count(), 2);
+    QCOMPARE(questions(), 2);
+    QVERIFY2(freeze.longest() < Noticed, qPrintable(QString::number(freeze.longest())));
+}
+
+void tst_ClipboardOwner::survivesItsViewWhileItWaits()
+{
+    startOwner(1, 0);
+    auto *view = new VelMenuView(menu(), -1, true);
+    QVERIFY(open(*view, menu(), 3));
+    select(*view, m_sub);
+    QTRY_VERIFY(action(*view, QStringLiteral("pasteAction"))->isEnabled());
+    QTimer::singleShot(200, view, [view] { delete view; });
+    view->slotPaste();
+    QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+void tst_ClipboardOwner::pastesFromAnOwnerThatAnswers()
+{
+    const QString other = write(QStringLiteral("outside/o.desktop"), entryText(QStringLiteral("O")));
+    openDialog(menu(), 3);
+    startOwner(Often, Often, QUrl::fromLocalFile(other).toString() + QStringLiteral("\r\n"));
+    clickItem(m_sub);
+    QTRY_VERIFY(canPaste());
+    QSignalSpy told(&view(), &VelMenuView::told);
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_VERIFY(QFile::exists(m_sub + QLatin1String("/o.desktop")));
+    QCOMPARE(told.count(), 0);
+}
+
+void tst_ClipboardOwner::looksAnewWhenAnotherTakesTheClipboard()
+{
+    openDialog(menu(), 3);
+    clickItem(m_sub);
+    startOwner(0, 0);
+    QTRY_VERIFY(canPaste());
+    // Another one takes the clipboard from the silent one.
+    const std::unique_ptr<QProcess> former = std::move(m_owner);
+    startOwner(Often, Often, QStringLiteral("file:///none\r\n"));
+    QTRY_COMPARE(questions(), 1);
+    QTRY_VERIFY(canPaste());
+    QTRY_COMPARE(former->state(), QProcess::NotRunning);
+    m_owner->kill();
+    QTRY_VERIFY(!canPaste());
+}
+
+void tst_ClipboardOwner::asksNobodyForWhatItOwnsItself()
+{
+    openDialog(menu(), 3);
+    startOwner(0, 0);
+    clickItem(m_a);
+    XDoTool::press(QStringLiteral("ctrl+c"));
+    clickItem(m_sub);
+    QVERIFY(canPaste());
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_VERIFY(QFile::exists(m_sub + QLatin1String("/a.desktop")));
+}
+
+VEL_TEST_MAIN(tst_ClipboardOwner)
+#include "tst_ClipboardOwner.moc"
