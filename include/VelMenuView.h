@@ -85,6 +85,22 @@ public:
      */
     void setAssistance(bool assistance);
 
+    /**
+     * Shows only those items that a text finds, and the folders that lead to them, opened.
+     *
+     * An item is found when every word of the text stands in its name, generic name, comment,
+     * command, keywords or file name, in any order, whatever the case and the accents. Of a
+     * folder that is found everything can be seen. Folders that were never opened are searched in
+     * the background, so that rows may come a moment later. While a filter is set, Find Next goes
+     * through what it found. Without assistance() nothing is filtered.
+     *
+     * What is edited, moved or made stays in sight until another text is given. No order of a
+     * folder loses what the filter leaves out.
+     *
+     * @param text the words, apart by blanks; empty to show everything again
+     */
+    void setFilter(const QString &text);
+
     /// The menu directory that the view was built on, as it was given.
     QString menuDir() const;
 
@@ -238,7 +254,8 @@ public Q_SLOTS:
     void slotRecreate();
     /// Asks for a text and selects the first item whose name contains it.
     void slotFind();
-    /// Selects the next item whose name contains the text asked for last.
+    /// Selects the next item whose name contains the text asked for last, or the next that the
+    /// filter found; see setFilter().
     void slotFindNext();
     /// Emits selectionChanged(const QString &) with the path selected now.
     void selectionChangedSlot();

@@ -4,7 +4,18 @@
 #include "EntryDisplay.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
 #include <frame/Undisplayable.h>
+
+#include <QFileInfo>
+
+QString EntryDisplay::describingFile(const QString &path, bool isFolder)
+{
+    const QString recordFile = EntryPath::recordFileOf(path);
+    if (isFolder && QFileInfo::exists(recordFile))
+        return recordFile;
+    return EntryPath::isEntry(path) || EntryPath::isRecordFile(path) ? path : QString();
+}
 
 QString EntryDisplay::shownName(const VelUIDesktopEntry &entry)
 {

@@ -12,6 +12,10 @@ class VelUIDesktopEntry;
  */
 namespace EntryDisplay {
 
+/// The file that tells how the item at \a path is shown; empty for a file that is no entry and for
+/// a folder without a record file.
+QString describingFile(const QString &path, bool isFolder);
+
 /**
  * The name under which the menu shows \a entry, which may be a folder's record as well: its name
  * in the user's language as it stands; without one, the untranslated name (empty or not) followed

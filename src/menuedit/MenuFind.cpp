@@ -12,6 +12,7 @@
 #include "RowCache.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
+#include "VelMenuProxyModel.h"
 
 #include <frame/MessageBox.h>
 
@@ -150,6 +151,7 @@ bool MenuFind::showNext()
 
 bool MenuFind::show(const QString &path)
 {
+    m_menu.proxy().letThrough(path);
     const QModelIndex match = OnDisk::exists(path) ? m_selection.shown(path) : QModelIndex();
     if (!match.isValid())
         return false;

@@ -61,6 +61,7 @@ void MenuSelection::select(const QModelIndex &index)
 void MenuSelection::show(const QString &path)
 {
     clear();
+    m_menu.proxy().letThrough(path);
     const QModelIndex index = shown(path);
     if (!index.isValid())
         return;

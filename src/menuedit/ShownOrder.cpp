@@ -5,9 +5,27 @@
 
 #include "OnDisk.h"
 #include "SortOrder.h"
+#include "VelMenuProxyModel.h"
 
 #include <QFileSystemModel>
 #include <QSortFilterProxyModel>
+
+namespace {
+
+// What a filter leaves out keeps its place.
+QVector<QModelIndex> childrenOf(const QSortFilterProxyModel &proxy, const QModelIndex &folder)
+{
+    const auto *menu = qobject_cast<const VelMenuProxyModel *>(&proxy);
+    if (menu && menu->isFiltered())
+        return menu->allInOrder(folder);
+    const QModelIndex shown = proxy.mapFromSource(folder);
+    QVector<QModelIndex> children;
+    for (int i = 0; i < proxy.rowCount(shown); ++i)
+        children.append(proxy.mapToSource(proxy.index(i, 0, shown)));
+    return children;
+}
+
+} // namespace
 
 QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QString &name, int row,
                              const QModelIndex &folder)
@@ -15,11 +33,9 @@ QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QString &
     // The row of a file that went stands for a moment longer.
     const std::optional<QSet<QString>> present =
         OnDisk::namesIn(folder.data(QFileSystemModel::FilePathRole).toString());
-    const QModelIndex shown = proxy.mapFromSource(folder);
     QStringList children;
     int place = -1;
-    for (int i = 0; i < proxy.rowCount(shown); ++i) {
-        const QModelIndex child = proxy.mapToSource(proxy.index(i, 0, shown));
+    for (const QModelIndex &child : childrenOf(proxy, folder)) {
         if (child.row() == row)
             place = children.size();
         const QString childName = child.data(QFileSystemModel::FileNameRole).toString();

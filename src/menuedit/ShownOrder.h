@@ -16,7 +16,8 @@ namespace ShownOrder {
 
 /**
  * The list that keeps the children of a folder in the order shown, with one of them, or a new
- * one, in a place of its own; see SortOrder::rewritten(). Children that are gone are left out.
+ * one, in a place of its own; see SortOrder::rewritten(). Children that are gone are left out;
+ * those that only a filter leaves out are not.
  *
  * @param proxy what is shown, above a QFileSystemModel
  * @param name the file name of the one

@@ -26,16 +26,6 @@ const QDir::Filters DefaultFilter = QDir::AllEntries | QDir::NoDotAndDotDot | QD
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
 
-// The file that tells how \a path is shown; empty for a file that is no entry and for a folder
-// without a record file.
-QString describingFile(const QString &path, bool isFolder)
-{
-    const QString recordFile = EntryPath::recordFileOf(path);
-    if (isFolder && QFileInfo::exists(recordFile))
-        return recordFile;
-    return EntryPath::isEntry(path) || EntryPath::isRecordFile(path) ? path : QString();
-}
-
 RowCache::Display readDisplay(const QString &file)
 {
     const VelUIDesktopEntry entry(file);
@@ -186,7 +176,7 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 {
     if (isFolder && m_cache->isPlain(path))
         return false;
-    const QString file = describingFile(path, isFolder);
+    const QString file = EntryDisplay::describingFile(path, isFolder);
     if (file.isEmpty()) {
         if (isFolder)
             m_cache->setPlain(path);
@@ -208,7 +198,7 @@ RowCache::Display VelMenuModel::displayOf(const QString &path, bool isFolder) co
     const std::optional<RowCache::Display> known = m_cache->display(path);
     if (known && !known->name.isEmpty())
         return *known;
-    const QString file = describingFile(path, isFolder);
+    const QString file = EntryDisplay::describingFile(path, isFolder);
     return file.isEmpty() ? RowCache::Display{QFileInfo(path).fileName(), false} : readDisplay(file);
 }
 

@@ -9,9 +9,10 @@
 #include <frame/EntryPath.h>
 
 #include <QDateTime>
+#include <QDir>
 #include <QFileInfo>
 
-#include <optional>
+#include <algorithm>
 
 namespace {
 
@@ -93,6 +94,7 @@ void VelMenuProxyModel::setSourceModel(QAbstractItemModel *model)
     m_needsFileOrder = false;
     m_files = qobject_cast<VelMenuModel *>(model);
     m_menuDirectory = m_files ? m_files->menuDirectory() : QString();
+    m_root = QDir::cleanPath(m_menuDirectory);
     // Before the base class connects: its slots sort.
     if (m_files)
         watch(model);
@@ -124,9 +126,53 @@ void VelMenuProxyModel::invalidateSortOrder(const QString &folderPath)
     invalidate();
 }
 
+void VelMenuProxyModel::setFilter(const std::optional<FilteredRows> &rows)
+{
+    if (m_filter == rows)
+        return;
+    m_filter = rows;
+    invalidate();
+}
+
+void VelMenuProxyModel::letThrough(const QString &path)
+{
+    if (!m_filter || !m_files || m_filter->contains(path))
+        return;
+    m_filter->add(m_root, path, QFileInfo(path).isDir());
+    invalidate();
+}
+
+// In the way in which the base class sorts.
+QVector<QModelIndex> VelMenuProxyModel::allInOrder(const QModelIndex &folder) const
+{
+    QVector<QModelIndex> children;
+    const int count = sourceModel()->rowCount(folder);
+    for (int row = 0; row < count; ++row) {
+        const QModelIndex child = sourceModel()->index(row, 0, folder);
+        if (!child.data(VelMenuModel::HiddenRole).toBool())
+            children.append(child);
+    }
+    std::stable_sort(
+        children.begin(), children.end(),
+        [this](const QModelIndex &left, const QModelIndex &right) { return lessThan(right, left); });
+    return children;
+}
+
+// The menu directory itself and what lies around it always are.
+bool VelMenuProxyModel::isLetThrough(const QModelIndex &index) const
+{
+    if (!m_filter || !m_files)
+        return true;
+    const QString path = m_files->filePath(index);
+    const bool isBelowRoot =
+        path.size() > m_root.size() && path.startsWith(m_root) && path.at(m_root.size()) == QLatin1Char('/');
+    return !isBelowRoot || m_filter->contains(path);
+}
+
 bool VelMenuProxyModel::filterAcceptsRow(int sourceRow, const QModelIndex &sourceParent) const
 {
-    if (sourceModel()->index(sourceRow, 0, sourceParent).data(VelMenuModel::HiddenRole).toBool())
+    const QModelIndex index = sourceModel()->index(sourceRow, 0, sourceParent);
+    if (index.data(VelMenuModel::HiddenRole).toBool() || !isLetThrough(index))
         return false;
     return QSortFilterProxyModel::filterAcceptsRow(sourceRow, sourceParent);
 }

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "FilteredRows.h"
 #include "ItemOrder.h"
 #include "SortOrder.h"
 
@@ -11,8 +12,10 @@
 #include <QSortFilterProxyModel>
 #include <QString>
 #include <QStringList>
+#include <QVector>
 
 #include <memory>
+#include <optional>
 #include <unordered_map>
 
 class VelMenuModel;
@@ -39,6 +42,17 @@ public:
     /// gives it, and filters and sorts anew.
     void invalidateSortOrder(const QString &folderPath);
 
+    /// Shows only what the \a rows let through; everything for none.
+    void setFilter(const std::optional<FilteredRows> &rows);
+    bool isFiltered() const { return m_filter.has_value(); }
+    /// What a filter lets through; to be asked while there is one.
+    const FilteredRows &filteredRows() const { return *m_filter; }
+    /// Shows the file at \a path, too, if a filter leaves it out.
+    void letThrough(const QString &path);
+    /// All children of a \a folder of the source model in the order of the menu, as they were shown
+    /// if there were no filter.
+    QVector<QModelIndex> allInOrder(const QModelIndex &folder) const;
+
     bool filterAcceptsRow(int sourceRow, const QModelIndex &sourceParent) const override;
     /// Whether \a left is shown below \a right.
     bool lessThan(const QModelIndex &left, const QModelIndex &right) const override;
@@ -48,6 +62,7 @@ private:
     struct Row;
     class Item;
 
+    bool isLetThrough(const QModelIndex &index) const;
     void watch(QAbstractItemModel *model);
     void dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight);
     void dropUnnamedRows();
@@ -71,6 +86,8 @@ private:
 
     VelMenuModel *m_files = nullptr;
     QString m_menuDirectory;
+    QString m_root; // the same, without a "/" at the end
+    std::optional<FilteredRows> m_filter;
     bool m_isTakingMany = false;
     mutable bool m_isOrdering = false;
     mutable bool m_needsFileOrder = false;

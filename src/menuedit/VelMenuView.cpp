@@ -60,6 +60,8 @@ bool VelMenuView::assistance() const
 void VelMenuView::setAssistance(bool assistance)
 {
     d->isAssisted = assistance;
+    if (!assistance)
+        d->filter.setText(QString());
 }
 
 QString VelMenuView::menuDir() const
@@ -120,7 +122,18 @@ void VelMenuView::slotFind()
 
 void VelMenuView::slotFindNext()
 {
-    findAndSelect(true);
+    if (d->filter.isOn())
+        d->filter.selectNext();
+    else
+        findAndSelect(true);
+}
+
+void VelMenuView::setFilter(const QString &text)
+{
+    if (!d->isAssisted)
+        return;
+    d->filter.setText(text);
+    setActionsEnabled();
 }
 
 bool VelMenuView::createNew(bool folder)

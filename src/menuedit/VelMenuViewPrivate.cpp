@@ -24,6 +24,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , menu(directory.isEmpty() ? StartMenu::directory() : directory, isEditable, view, view)
     , selection(view, menu)
     , find(view, menu, selection, voice)
+    , filter(view, menu, selection, voice)
     , editing(view, menu, selection, find, voice)
 {
 }

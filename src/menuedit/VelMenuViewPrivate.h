@@ -5,6 +5,7 @@
 
 #include "MenuActions.h"
 #include "MenuEditing.h"
+#include "MenuFilter.h"
 #include "MenuFind.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
@@ -41,6 +42,7 @@ public:
     ShownMenu menu;
     MenuSelection selection;
     MenuFind find;
+    MenuFilter filter;
     MenuEditing editing;
     /// Null where the view is only to be looked at.
     std::unique_ptr<MenuActions> actions;

@@ -1,0 +1,42 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "FileIdentity.h"
+
+#include <QCache>
+#include <QString>
+
+/**
+ * What the items of a menu can be found by: their names, generic names, comments, commands,
+ * keywords and file names.
+ *
+ * A file is read when it is asked for first, and again once it changed. What is kept is bounded; of
+ * what was dropped the file is read anew.
+ */
+class EntryFields
+{
+public:
+    struct Fields
+    {
+        QString text; ///< folded (see SearchText), the fields apart by line feeds
+        bool isHidden = false; ///< the menu leaves the item out
+    };
+
+    EntryFields();
+    EntryFields(const EntryFields &) = delete;
+    EntryFields &operator=(const EntryFields &) = delete;
+
+    /// The fields of the file or folder at \a path as it is now.
+    Fields of(const QString &path, bool isFolder);
+
+private:
+    struct Known
+    {
+        FileIdentity identity;
+        Fields fields;
+    };
+
+    QCache<QString, Known> m_known;
+};
