@@ -27,7 +27,12 @@ bool KeyRecording::withholds(const QKeyEvent &event)
     const bool isModifier = RecordedKey::isModifier(event.key());
     if (!isModifier && !RecordedKey::isChord(event.key(), event.modifiers()))
         return true;
+    // It may be for Shift+Tab, and the key that waits must not go with it.
+    if (isModifier && m_isHeld)
+        return true;
     if (event.type() == QEvent::KeyPress) {
+        if (m_isHeld)
+            stop();
         m_isActive = true;
         m_hasChord = m_hasChord || !isModifier;
     }
@@ -47,8 +52,16 @@ bool KeyRecording::isRepeated(const QKeyEvent &event)
     return false;
 }
 
+void KeyRecording::hold()
+{
+    m_isActive = true;
+    m_hasChord = true;
+    m_isHeld = true;
+}
+
 void KeyRecording::stop()
 {
     m_isActive = false;
     m_hasChord = false;
+    m_isHeld = false;
 }

@@ -9,7 +9,7 @@ class QKeyEvent;
  * How far the recording of a key has come, by the events on their way to the key editor.
  *
  * It begins with the press of a modifier or of a chord, and lasts until it is stopped. A key that
- * is held is pressed once.
+ * is held down is pressed once.
  */
 class KeyRecording
 {
@@ -23,6 +23,10 @@ public:
     /// Whether a chord was pressed.
     bool hasChord() const { return m_hasChord; }
 
+    /// It ended, but its key waits for a decision; the next press begins another recording.
+    void hold();
+    /// Whether a key waits for a decision.
+    bool isHeld() const { return m_isHeld; }
     /// It ended or was dropped.
     void stop();
 
@@ -31,6 +35,7 @@ private:
 
     bool m_isActive = false;
     bool m_hasChord = false;
+    bool m_isHeld = false;
     unsigned long m_releaseTime = 0; // in milliseconds, by the clock of the events
     int m_releasedKey = 0;
 };
