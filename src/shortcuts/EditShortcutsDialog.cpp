@@ -56,7 +56,7 @@ void EditShortcutsDialog::disableShortcutEdit()
 // NOLINTNEXTLINE(performance-unnecessary-value-param)
 void EditShortcutsDialog::checkEnteredKeySequence(QKeySequence key)
 {
-    d->enterKey(key);
+    d->entry().enter(key);
 }
 
 void EditShortcutsDialog::setDefaultShortcut()
@@ -71,7 +71,7 @@ void EditShortcutsDialog::processButtonBox(QAbstractButton *button)
 
 void EditShortcutsDialog::slotAccept()
 {
-    if (!d->settle())
+    if (!d->entry().settle())
         return;
     const QPointer<EditShortcutsDialog> self(this);
     d->commit();
@@ -99,7 +99,7 @@ void EditShortcutsDialog::reject()
 void EditShortcutsDialog::done(int result)
 {
     if (result == Accepted) {
-        if (!d->settle())
+        if (!d->entry().settle())
             return;
     } else if (result == Rejected && d->isChanged()) {
         d->discard();
@@ -111,13 +111,13 @@ void EditShortcutsDialog::setVisible(bool visible)
 {
     // Before the key editor loses the focus, which would take the key.
     if (!visible)
-        d->dropRecording();
+        d->entry().drop();
     QDialog::setVisible(visible);
 }
 
 void EditShortcutsDialog::closeEvent(QCloseEvent *event)
 {
-    if (!d->settle()) {
+    if (!d->entry().settle()) {
         event->ignore();
         return;
     }
@@ -151,7 +151,7 @@ void EditShortcutsDialog::keyPressEvent(QKeyEvent *event)
 
 bool EditShortcutsDialog::eventFilter(QObject *watched, QEvent *event)
 {
-    if (watched == d->form.keyWidget && d->watchKeyEditor(*event))
+    if (watched == d->form.keyWidget && d->entry().watch(*event))
         return true;
     return QDialog::eventFilter(watched, event);
 }

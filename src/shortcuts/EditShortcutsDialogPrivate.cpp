@@ -3,16 +3,13 @@
 
 #include "EditShortcutsDialogPrivate.h"
 
+#include "ClashingRows.h"
 #include "KeySequences.h"
-#include "ShortcutConflict.h"
 #include "ShortcutsTreeView.h"
 
-#include <QApplication>
 #include <QDialog>
 #include <QDialogButtonBox>
-#include <QFocusEvent>
 #include <QGroupBox>
-#include <QKeyEvent>
 #include <QKeySequenceEdit>
 #include <QLabel>
 #include <QPushButton>
@@ -23,20 +20,40 @@ EditShortcutsDialogPrivate::EditShortcutsDialogPrivate(QDialog *dialog, Shortcut
     : form(dialog)
     , m_dialog(dialog)
     , m_model(shortcuts)
-    , m_buttons(form.buttonBox)
-    , m_message(dialog)
+    , m_entry(dialog, form, shortcuts)
 {
     fillTree();
     setChanged(false);
     connectKeys();
 }
 
+EditShortcutsDialogPrivate::~EditShortcutsDialogPrivate()
+{
+    if (assistance)
+        setAssistance(false);
+}
+
 void EditShortcutsDialogPrivate::setAssistance(bool isOn)
 {
+    m_entry.drop();
+    m_entry.setAssistance(nullptr);
     assistance = isOn ? std::make_unique<EditShortcutsAssistance>(form, m_model) : nullptr;
+    m_keyAssistance = isOn ? std::make_unique<KeyAssistance>(form, m_model) : nullptr;
+    m_entry.setAssistance(m_keyAssistance.get());
     if (isOn)
-        QObject::connect(assistance.get(), &EditShortcutsAssistance::keysChanged, &m_context,
-                         [this] { setChanged(true); });
+        connectAssistance();
+}
+
+void EditShortcutsDialogPrivate::connectAssistance()
+{
+    QObject::connect(assistance.get(), &EditShortcutsAssistance::keysChanged, &m_context,
+                     [this] { setChanged(true); });
+    const KeyAssistance *keys = m_keyAssistance.get();
+    QObject::connect(keys, &KeyAssistance::noneChosen, &m_context, [this] { takeKeyAway(); });
+    QObject::connect(keys, &KeyAssistance::goToRequested, &m_context,
+                     [this](const QString &name) { goTo(name); });
+    QObject::connect(keys, &KeyAssistance::takeOverRequested, &m_context,
+                     [this](const QString &name) { takeOver(name); });
 }
 
 void EditShortcutsDialogPrivate::fillTree()
@@ -60,11 +77,8 @@ void EditShortcutsDialogPrivate::connectKeys()
             setChanged(false);
         });
 
-    QObject::connect(form.keyWidget, &QKeySequenceEdit::keySequenceChanged, &m_context,
-                     [this](const QKeySequence &key) { enterKey(QKeySequence(key)); });
-    QObject::connect(form.keyWidget, &QKeySequenceEdit::editingFinished, &m_context, [this] { settle(); });
-    // Meanwhile the host may have given the shortcut another key, or none.
-    QObject::connect(&m_message, &ConflictMessage::closed, &m_context, [this] { dropKey(); });
+    QObject::connect(&m_entry, &KeyEntry::entered, &m_context,
+                     [this](const QKeySequence &key) { setPendingKey(key); });
     QObject::connect(form.defaultKeyRB, &QRadioButton::toggled, &m_context, [this] { enterDefaultKey(); });
     // Last: the dialog takes events as soon as it has this object.
     form.keyWidget->installEventFilter(m_dialog);
@@ -76,11 +90,11 @@ void EditShortcutsDialogPrivate::showShortcut(const QKeySequence &defaultKey, co
     const QString defaultText = defaultKey.toString(QKeySequence::PortableText);
     form.defaultKeyLabel->setText(defaultText.isEmpty() ? tr("None") : defaultText);
     form.defaultKeyRB->setAccessibleDescription(form.defaultKeyLabel->text());
-    showKey(pendingKey);
+    m_entry.show(pendingKey);
     if (defaultKey == pendingKey) {
         const QSignalBlocker blocker(form.defaultKeyRB);
         form.defaultKeyRB->setChecked(true);
-        showKey(QKeySequence());
+        m_entry.show(QKeySequence());
     } else {
         form.customKeyRB->setChecked(true);
     }
@@ -88,126 +102,50 @@ void EditShortcutsDialogPrivate::showShortcut(const QKeySequence &defaultKey, co
 
 void EditShortcutsDialogPrivate::showNoShortcut()
 {
-    dropRecording();
+    m_entry.drop();
     form.groupBox->setEnabled(false);
-}
-
-// Puts a key into the key editor without the editor announcing it; drops a recording.
-void EditShortcutsDialogPrivate::showKey(const QKeySequence &key)
-{
-    if (m_recording.hasChord())
-        m_buttons.setRecording(false);
-    m_recording.stop();
-    const QSignalBlocker blocker(form.keyWidget);
-    form.keyWidget->setKeySequence(key);
-}
-
-bool EditShortcutsDialogPrivate::watchKeyEditor(const QEvent &event)
-{
-    if (event.type() == QEvent::KeyPress || event.type() == QEvent::KeyRelease)
-        return record(static_cast<const QKeyEvent &>(event));
-    if (event.type() == QEvent::FocusOut)
-        leaveKeyEditor(static_cast<const QFocusEvent &>(event).reason());
-    return false;
-}
-
-bool EditShortcutsDialogPrivate::record(const QKeyEvent &event)
-{
-    const bool isWithheld = m_recording.withholds(event);
-    m_buttons.setRecording(m_recording.hasChord());
-    return isWithheld;
-}
-
-// The editor itself would wait a second for one more chord, while the user goes on to another
-// row or to Ok.
-void EditShortcutsDialogPrivate::leaveKeyEditor(Qt::FocusReason reason)
-{
-    if (reason == Qt::PopupFocusReason)
-        return;
-    if (QApplication::focusWidget() == form.buttonBox->button(QDialogButtonBox::Cancel)) {
-        dropRecording();
-        return;
-    }
-    endRecording();
-    if (reason == Qt::MouseFocusReason)
-        m_message.showLater();
-    else
-        m_message.show();
-}
-
-// Takes the key recorded so far; when there is none, the editor shows the old one again.
-void EditShortcutsDialogPrivate::endRecording()
-{
-    if (!m_recording.isActive())
-        return;
-    if (m_recording.hasChord() && form.treeView->isShortcutCurrent())
-        finish(form.keyWidget->keySequence());
-    else
-        dropKey();
-}
-
-void EditShortcutsDialogPrivate::enterKey(const QKeySequence &key)
-{
-    // What the editor announces when a recording begins.
-    if (key.isEmpty() && m_recording.isActive())
-        return;
-    finish(key);
-    m_message.show();
-}
-
-// Nothing is enabled and disabled on the way: a button that has the focus would lose it.
-void EditShortcutsDialogPrivate::finish(const QKeySequence &key)
-{
-    m_recording.stop();
-    const bool isTaken = m_model && key != form.treeView->currentKeySequence() && takeKey(key);
-    m_buttons.setRecording(false);
-    if (!isTaken)
-        dropKey();
-}
-
-bool EditShortcutsDialogPrivate::settle()
-{
-    endRecording();
-    return m_message.show();
-}
-
-void EditShortcutsDialogPrivate::dropRecording()
-{
-    m_message.clear();
-    if (m_recording.isActive())
-        dropKey();
-}
-
-void EditShortcutsDialogPrivate::dropKey()
-{
-    showKey(form.treeView->currentKeySequence());
-}
-
-// Makes a key the pending one, unless a message or nothing at all has to say why not.
-bool EditShortcutsDialogPrivate::takeKey(const QKeySequence &key)
-{
-    // Not a key that Qt has no name for; and a recording may have outlived its row.
-    if (!KeySequences::survivesSaving(key) || refuseTakenKey(key) || !form.treeView->isShortcutCurrent())
-        return false;
-    setPendingKey(key);
-    return true;
-}
-
-bool EditShortcutsDialogPrivate::refuseTakenKey(const QKeySequence &key)
-{
-    const ShortcutConflict conflict = ShortcutConflict::find(*m_model, key);
-    if (conflict.kind == ShortcutConflict::None)
-        return false;
-    m_message.refuse(key, conflict);
-    return true;
 }
 
 void EditShortcutsDialogPrivate::enterDefaultKey()
 {
     if (!form.defaultKeyRB->isChecked())
         return;
-    showKey(QKeySequence());
+    m_entry.show(QKeySequence());
     setPendingKey(shownDefaultKey());
+}
+
+void EditShortcutsDialogPrivate::takeKeyAway()
+{
+    m_entry.drop();
+    if (!form.treeView->currentKeySequence().isEmpty())
+        setPendingKey(QKeySequence());
+}
+
+void EditShortcutsDialogPrivate::goTo(const QString &name)
+{
+    const QKeySequence key = m_keyAssistance->key();
+    m_entry.drop();
+    const QModelIndex row = m_model ? ClashingRows::first(*m_model, name, key) : QModelIndex();
+    if (!row.isValid())
+        return;
+    form.treeView->setCurrentIndex(row);
+    form.treeView->scrollTo(row);
+    form.treeView->setFocus();
+}
+
+void EditShortcutsDialogPrivate::takeOver(const QString &name)
+{
+    if (!m_model)
+        return;
+    const QKeySequence key = m_keyAssistance->key();
+    const auto rows = ClashingRows::of(*m_model, name, key);
+    // Who hears of that may do anything.
+    for (const QPersistentModelIndex &row : rows) {
+        if (m_model)
+            m_model->setKeySequence(row, QKeySequence());
+    }
+    noteChange();
+    m_entry.reconsider();
 }
 
 QKeySequence EditShortcutsDialogPrivate::shownDefaultKey() const
@@ -222,18 +160,23 @@ QKeySequence EditShortcutsDialogPrivate::shownDefaultKey() const
 void EditShortcutsDialogPrivate::setPendingKey(const QKeySequence &key)
 {
     form.treeView->setKeySequence(key);
+    noteChange();
+}
+
+void EditShortcutsDialogPrivate::noteChange()
+{
     setChanged(true);
     form.buttonBox->button(QDialogButtonBox::RestoreDefaults)->setEnabled(true);
 }
 
 bool EditShortcutsDialogPrivate::isChanged() const
 {
-    return m_model && m_buttons.isChanged();
+    return m_model && m_entry.isChanged();
 }
 
 void EditShortcutsDialogPrivate::setChanged(bool changed)
 {
-    m_buttons.setChanged(changed);
+    m_entry.setChanged(changed);
 }
 
 void EditShortcutsDialogPrivate::press(QAbstractButton *button)
@@ -265,7 +208,7 @@ void EditShortcutsDialogPrivate::commit()
 
 void EditShortcutsDialogPrivate::discard()
 {
-    dropRecording();
+    m_entry.drop();
     if (m_model)
         m_model->resetShortcuts();
     setChanged(false);

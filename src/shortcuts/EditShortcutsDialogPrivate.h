@@ -3,11 +3,10 @@
 
 #pragma once
 
-#include "ChangeButtons.h"
-#include "ConflictMessage.h"
 #include "EditShortcutsAssistance.h"
 #include "EditShortcutsForm.h"
-#include "KeyRecording.h"
+#include "KeyAssistance.h"
+#include "KeyEntry.h"
 #include "ShortcutsModel.h"
 
 #include <QCoreApplication>
@@ -18,12 +17,10 @@
 
 class QAbstractButton;
 class QDialog;
-class QEvent;
-class QKeyEvent;
 
 /**
- * What the shortcuts dialog does with keys: it follows one from the field where it is recorded,
- * past those who may have it already, until it is pending in the model.
+ * What the shortcuts dialog does with keys: it shows those of the current shortcut, and makes those
+ * pending that the user chooses.
  *
  * It is told of what happens on the form by the form itself; the functions are the steps that
  * the slots of the dialog take.
@@ -35,6 +32,8 @@ class EditShortcutsDialogPrivate
 public:
     /// Builds the form on \a dialog and shows \a shortcuts, which may be null, in it.
     EditShortcutsDialogPrivate(QDialog *dialog, ShortcutsModel *shortcuts);
+    ~EditShortcutsDialogPrivate();
+    Q_DISABLE_COPY(EditShortcutsDialogPrivate)
 
     /// Whether there is something to apply, and a model that takes it.
     bool isChanged() const;
@@ -49,16 +48,8 @@ public:
     /// No shortcut is current.
     void showNoShortcut();
 
-    /// Watches a recording: \a event goes to the key editor, unless this says that it must not.
-    bool watchKeyEditor(const QEvent &event);
-    /// Takes the key that is being recorded, before the dialog closes or accepts; false when it
-    /// is refused with a message, in which the dialog may go.
-    bool settle();
-    /// Forgets the key that is being recorded, and a message about the last one.
-    void dropRecording();
-    /// Makes \a key the pending one of the current shortcut, or refuses it with a message, in
-    /// which the dialog may go.
-    void enterKey(const QKeySequence &key);
+    /// Where keys are recorded.
+    KeyEntry &entry() { return m_entry; }
     /// Makes the default key the pending one if that is what the radio buttons say.
     void enterDefaultKey();
 
@@ -74,24 +65,20 @@ public:
     std::unique_ptr<EditShortcutsAssistance> assistance;
 
 private:
+    void connectAssistance();
     void fillTree();
     void connectKeys();
-    void showKey(const QKeySequence &key);
-    bool record(const QKeyEvent &event);
-    void leaveKeyEditor(Qt::FocusReason reason);
-    void endRecording();
-    void dropKey();
-    void finish(const QKeySequence &key);
-    bool takeKey(const QKeySequence &key);
-    bool refuseTakenKey(const QKeySequence &key);
     void setPendingKey(const QKeySequence &key);
+    void noteChange();
+    void takeKeyAway();
+    void goTo(const QString &name);
+    void takeOver(const QString &name);
     QKeySequence shownDefaultKey() const;
 
     QDialog *const m_dialog;
     const QPointer<ShortcutsModel> m_model;
-    KeyRecording m_recording;
-    ChangeButtons m_buttons;
-    ConflictMessage m_message;
+    KeyEntry m_entry;
+    std::unique_ptr<KeyAssistance> m_keyAssistance; // null for none
     /// Ends the connections: widgets and model may outlive this object.
     const QObject m_context;
 };

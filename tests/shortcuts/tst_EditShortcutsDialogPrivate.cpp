@@ -76,7 +76,7 @@ void tst_EditShortcutsDialogPrivate::followsAKeyFromTheFieldToTheModel()
 
 void tst_EditShortcutsDialogPrivate::takesTheDefaultKeyWhenItsButtonIsChosen()
 {
-    m_logic->enterKey(m_f9);
+    m_logic->entry().enter(m_f9);
     QVERIFY(m_logic->form.customKeyRB->isChecked());
     m_logic->enterDefaultKey();
     QCOMPARE(m_object->keySequence(), m_f9);
@@ -86,7 +86,7 @@ void tst_EditShortcutsDialogPrivate::takesTheDefaultKeyWhenItsButtonIsChosen()
 
 void tst_EditShortcutsDialogPrivate::putsEditsIntoForceOnlyOnCommit()
 {
-    m_logic->enterKey(m_f9);
+    m_logic->entry().enter(m_f9);
     QCOMPARE(m_object->inForce, m_f1);
     m_logic->commit();
     QCOMPARE(m_object->inForce, m_f9);
@@ -94,7 +94,7 @@ void tst_EditShortcutsDialogPrivate::putsEditsIntoForceOnlyOnCommit()
 
 void tst_EditShortcutsDialogPrivate::discardsEdits()
 {
-    m_logic->enterKey(m_f9);
+    m_logic->entry().enter(m_f9);
     m_logic->discard();
     QCOMPARE(m_object->keySequence(), m_f1);
     QVERIFY(!m_logic->isChanged());
