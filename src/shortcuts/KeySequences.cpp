@@ -5,6 +5,19 @@
 
 #include "KeyNames.h"
 
+namespace {
+
+// Almost every key is one of these, and parsing takes its time. Other names may stand for another
+// key in the user's language: in Hungarian, Enter is the name of Return.
+bool hasOneName(int code)
+{
+    const int key = code & ~int(Qt::KeyboardModifierMask);
+    const bool isNamed = key > Qt::Key_AsciiTilde && (key < Qt::Key_F1 || key > Qt::Key_F35);
+    return !isNamed && !(code & int(Qt::GroupSwitchModifier)) && KeyNames::roundTrips(code);
+}
+
+} // namespace
+
 bool KeySequences::isKnown(const QKeySequence &sequence)
 {
     for (int i = 0; i < sequence.count(); ++i) {
@@ -27,10 +40,7 @@ QKeySequence KeySequences::fromSavedText(const QString &text)
 
 bool KeySequences::survivesSaving(const QKeySequence &sequence)
 {
-    // Almost every key is one of these, and parsing takes its time.
-    const bool isUsual = sequence.count() == 1 && !(sequence[0] & int(Qt::GroupSwitchModifier))
-        && KeyNames::roundTrips(sequence[0]);
-    if (isUsual || sequence.isEmpty())
+    if (sequence.isEmpty() || (sequence.count() == 1 && hasOneName(sequence[0])))
         return true;
     const QString text = sequence.toString(QKeySequence::PortableText);
     return fromText(text, QKeySequence::PortableText) == sequence && fromSavedText(text) == sequence;

@@ -10,7 +10,9 @@
 #include <shortcuts/KeySequences.h>
 
 #include <QAction>
+#include <QLibraryInfo>
 #include <QSettings>
+#include <QTranslator>
 
 class tst_KeySequences : public TestCase
 {
@@ -19,6 +21,7 @@ class tst_KeySequences : public TestCase
 private Q_SLOTS:
     void knowsWhatSurvivesSaving_data();
     void knowsWhatSurvivesSaving();
+    void knowsWhatSurvivesSavingInTheUsersLanguage();
     void leavesTheSavedValueWhenAKeyWouldNotReadBack_data();
     void leavesTheSavedValueWhenAKeyWouldNotReadBack();
 };
@@ -46,6 +49,18 @@ void tst_KeySequences::knowsWhatSurvivesSaving()
     QCOMPARE(KeySequences::survivesSaving(sequence), survives);
     const QString text = sequence.toString(QKeySequence::PortableText);
     QCOMPARE(KeySequences::fromSavedText(text) == sequence, survives);
+}
+
+// Saved texts are read in it: in Hungarian, Enter is the name of Return.
+void tst_KeySequences::knowsWhatSurvivesSavingInTheUsersLanguage()
+{
+    QVERIFY(KeySequences::survivesSaving(QKeySequence(Qt::CTRL | Qt::Key_Enter)));
+    QTranslator translator;
+    QVERIFY(
+        translator.load(QStringLiteral("qtbase_hu"), QLibraryInfo::location(QLibraryInfo::TranslationsPath)));
+    QCoreApplication::installTranslator(&translator);
+    QVERIFY(!KeySequences::survivesSaving(QKeySequence(Qt::CTRL | Qt::Key_Enter)));
+    QVERIFY(KeySequences::survivesSaving(QKeySequence(Qt::CTRL | Qt::Key_Return)));
 }
 
 void tst_KeySequences::leavesTheSavedValueWhenAKeyWouldNotReadBack_data()
