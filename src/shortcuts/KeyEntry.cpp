@@ -58,8 +58,10 @@ void KeyEntry::show(const QKeySequence &key)
 
 bool KeyEntry::watch(const QEvent &event)
 {
-    if (event.type() == QEvent::KeyPress || event.type() == QEvent::KeyRelease)
+    if (event.type() == QEvent::KeyPress || event.type() == QEvent::KeyRelease) {
+        dropWhatIsNoKey();
         return record(static_cast<const QKeyEvent &>(event));
+    }
     if (event.type() == QEvent::FocusOut)
         leaveField(static_cast<const QFocusEvent &>(event).reason());
     return false;
@@ -70,6 +72,13 @@ bool KeyEntry::record(const QKeyEvent &event)
     const bool isWithheld = m_recording.withholds(event);
     m_buttons.setRecording(m_recording.hasChord());
     return isWithheld;
+}
+
+// With Shift the field takes what the key gives without it, which may be a dead key.
+void KeyEntry::dropWhatIsNoKey()
+{
+    if (m_recording.hasChord() && !KeySequences::survivesSaving(m_form.keyWidget->keySequence()))
+        showPendingKey();
 }
 
 // The field itself would wait a second for one more chord, while the user goes on to another row or

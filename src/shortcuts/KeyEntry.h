@@ -62,6 +62,7 @@ Q_SIGNALS:
 
 private:
     bool record(const QKeyEvent &event);
+    void dropWhatIsNoKey();
     void leaveField(Qt::FocusReason reason);
     void leave(Qt::FocusReason reason);
     void pause();

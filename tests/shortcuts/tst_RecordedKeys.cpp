@@ -39,6 +39,7 @@ class tst_RecordedKeys : public RecordingTestCase
 private Q_SLOTS:
     void recordsNothingForAKeyThatIsNoChord_data();
     void recordsNothingForAKeyThatIsNoChord();
+    void showsNoDeadKeyOfAShiftedOne();
     void recordsAKeyWithSuperAsOneChord();
     void checksAKeyWithSuperAgainstGlobalKeys();
     void checksAKeyWithSuperAgainstOtherActions();
@@ -80,6 +81,17 @@ void tst_RecordedKeys::recordsNothingForAKeyThatIsNoChord()
     XDoTool::run(script);
     QVERIFY(keysStay());
     QCOMPARE(pendingKey("open"), f9);
+    QCOMPARE(keyWidget()->keySequence(), f9);
+    QVERIFY(!isChanged());
+}
+
+// The key gives a degree sign, and a dead circumflex without Shift.
+void tst_RecordedKeys::showsNoDeadKeyOfAShiftedOne()
+{
+    const Layout keyboard(str("de"));
+    m_model->setKeySequence(row("open"), f9);
+    record("open");
+    XDoTool::run(str("keydown ctrl keydown shift key 49 keyup shift keyup ctrl"));
     QCOMPARE(keyWidget()->keySequence(), f9);
     QVERIFY(!isChanged());
 }
