@@ -73,6 +73,7 @@ void EditShortcutsDialogPrivate::connectKeys()
                      [this] { showNoShortcut(); });
     if (m_model)
         QObject::connect(m_model, &QObject::destroyed, &m_context, [this] {
+            m_entry.drop();
             showNoShortcut();
             setChanged(false);
         });
@@ -102,7 +103,8 @@ void EditShortcutsDialogPrivate::showShortcut(const QKeySequence &defaultKey, co
 
 void EditShortcutsDialogPrivate::showNoShortcut()
 {
-    m_entry.drop();
+    // A message about the last key stands, also when the click on a group ended the recording.
+    m_entry.dropKey();
     form.groupBox->setEnabled(false);
 }
 

@@ -169,11 +169,16 @@ bool KeyEntry::settle()
     return m_message.show();
 }
 
+void KeyEntry::dropKey()
+{
+    if (m_recording.isActive())
+        showPendingKey();
+}
+
 void KeyEntry::drop()
 {
     m_message.clear();
-    if (m_recording.isActive())
-        showPendingKey();
+    dropKey();
 }
 
 void KeyEntry::showPendingKey()

@@ -48,7 +48,9 @@ public:
     bool settle();
     /// Looks again whether a key that waits would be refused; enters it when it would not.
     void reconsider();
-    /// Forgets the key that is being recorded, and a message about the last one.
+    /// Forgets the key that is being recorded.
+    void dropKey();
+    /// Forgets a message about the last key, too.
     void drop();
 
     /// Whether there is something to apply.

@@ -34,6 +34,7 @@ private Q_SLOTS:
     void staysWithOneMessageWhenTheKeyIsTaken();
     void tellsOfATakenKeyAfterTheClick_data();
     void tellsOfATakenKeyAfterTheClick();
+    void choosesTheRowThatIsClickedWhenTheKeyIsTaken_data();
     void choosesTheRowThatIsClickedWhenTheKeyIsTaken();
     void dropsTheKeyWhenCancelIsClicked_data();
     void dropsTheKeyWhenCancelIsClicked();
@@ -247,19 +248,28 @@ void tst_RecordingEnds::tellsOfATakenKeyAfterTheClick()
     QVERIFY(keysStay());
 }
 
+void tst_RecordingEnds::choosesTheRowThatIsClickedWhenTheKeyIsTaken_data()
+{
+    QTest::addColumn<bool>("isGroup");
+    QTest::newRow("another action") << false;
+    QTest::newRow("a group") << true;
+}
+
 void tst_RecordingEnds::choosesTheRowThatIsClickedWhenTheKeyIsTaken()
 {
+    QFETCH(bool, isGroup);
+    const QModelIndex clicked = isGroup ? row("copy").parent() : row("copy");
     recordUnfinished("open", str("F2"));
     ModalDriver modal;
     modal.answer(localConflict("F2", "Text of save"), QMessageBox::Ok);
-    XDoTool::click(tree()->viewport(), tree()->visualRect(row("copy")).center());
+    XDoTool::click(tree()->viewport(), tree()->visualRect(clicked).center());
     QTRY_VERIFY(modal.finished() && !QApplication::activeModalWidget());
-    QCOMPARE(tree()->currentIndex(), row("copy"));
+    QCOMPARE(tree()->currentIndex(), clicked);
     QVERIFY(!isChanged());
     // No button is thought to be held: the pointer selects nothing.
     XDoTool::run(str("mousemove %1 sleep 0.2")
                      .arg(XDoTool::at(tree()->viewport(), tree()->visualRect(row("print")).center())));
-    QCOMPARE(tree()->currentIndex(), row("copy"));
+    QCOMPARE(tree()->currentIndex(), clicked);
 }
 
 void tst_RecordingEnds::dropsTheKeyWhenCancelIsClicked_data()
