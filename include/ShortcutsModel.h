@@ -187,6 +187,7 @@ public Q_SLOTS:
 
 private:
     friend class ShortcutRows; // reads all rows at once
+    friend class SpokenChanges; // has it tell screen readers of changes
     using Objects = QList<IShortcutObject *>;
     using Group = QMap<QString, Objects>;
 
@@ -195,6 +196,7 @@ private:
     Objects &entry(int group, const QString &name);
     void shiftPersistentIndexes(int group, int firstRow);
     void announceRows();
+    QVariant spokenData(const QModelIndex &index, int role) const;
     IShortcutObject *firstObject(const QModelIndex &index) const;
     QVector<QPointer<IShortcutObject>> objectsOf(int group) const;
     void emitKeysChanged(int group);
@@ -203,4 +205,5 @@ private:
     QMap<QString, QKeySequence> m_loadedKeys;
     QStringList m_groupNames;
     QVector<Group> m_groups;
+    int m_spokenChanges = 0; // how many want that it tells of changes
 };

@@ -3,14 +3,31 @@
 
 #include "EditShortcutsAssistance.h"
 
+#include "KeyColumn.h"
 #include "NoMatchLabel.h"
 #include "ShortcutFilterBar.h"
 #include "ShortcutsTreeView.h"
+#include "TreeAssistance.h"
+
+#include <frame/DialogSize.h>
 
 #include <QBoxLayout>
+#include <QEvent>
 #include <QLineEdit>
+#include <QScreen>
+#include <QSettings>
 
 namespace {
+
+QString settingsGroup()
+{
+    return QStringLiteral("EditShortcutsDialog");
+}
+
+QString keyColumnKey()
+{
+    return settingsGroup() + QLatin1String("/KeyColumnWidth");
+}
 
 // The widgets that the Tab key goes through, in its order.
 QVector<QWidget *> tabOrder(QWidget *window)
@@ -29,31 +46,68 @@ QVector<QWidget *> tabOrder(QWidget *window)
 EditShortcutsAssistance::EditShortcutsAssistance(const EditShortcutsForm &form, ShortcutsModel *shortcuts)
     : m_form(form)
     , m_model(shortcuts)
+    , m_tree(std::make_unique<TreeAssistance>(form.treeView, shortcuts))
 {
+    connect(m_tree.get(), &TreeAssistance::keysChanged, this, &EditShortcutsAssistance::keysChanged);
     addFilterBar();
+    restoreSizes();
+    dialog()->installEventFilter(this);
 }
 
 EditShortcutsAssistance::~EditShortcutsAssistance()
 {
+    if (dialog()->isVisible())
+        rememberSizes();
     m_form.treeView->setFilter(ShortcutFilter());
+}
+
+QWidget *EditShortcutsAssistance::dialog() const
+{
+    return m_form.treeView->parentWidget();
+}
+
+bool EditShortcutsAssistance::eventFilter(QObject *watched, QEvent *event)
+{
+    if (watched == dialog() && event->type() == QEvent::Hide && !event->spontaneous())
+        rememberSizes();
+    return QObject::eventFilter(watched, event);
+}
+
+// The screen may have become smaller meanwhile. A dialog that is seen keeps its size.
+void EditShortcutsAssistance::restoreSizes()
+{
+    m_tree->keyColumn()->setChosenWidth(QSettings().value(keyColumnKey()).toInt());
+    if (dialog()->isVisible())
+        return;
+    DialogSize::restore(*dialog(), settingsGroup(), dialog()->size());
+    dialog()->resize(dialog()->size().boundedTo(dialog()->screen()->availableSize()));
+}
+
+void EditShortcutsAssistance::rememberSizes() const
+{
+    if (!dialog()->isMaximized() && !dialog()->isFullScreen())
+        DialogSize::remember(*dialog(), settingsGroup());
+    QSettings settings;
+    const int width = m_tree->keyColumn()->chosenWidth();
+    if (settings.value(keyColumnKey()).toInt() != width)
+        settings.setValue(keyColumnKey(), width);
 }
 
 // Above the tree, also on the way of the Tab key.
 void EditShortcutsAssistance::addFilterBar()
 {
-    QWidget *dialog = m_form.treeView->parentWidget();
-    const QVector<QWidget *> below = tabOrder(dialog);
-    m_filterBar = std::make_unique<ShortcutFilterBar>(dialog);
+    const QVector<QWidget *> below = tabOrder(dialog());
+    m_filterBar = std::make_unique<ShortcutFilterBar>(dialog());
     m_noMatchLabel = std::make_unique<NoMatchLabel>(m_form.treeView);
-    auto *layout = qobject_cast<QBoxLayout *>(dialog->layout());
+    auto *layout = qobject_cast<QBoxLayout *>(dialog()->layout());
     layout->insertWidget(layout->indexOf(m_form.treeView), m_filterBar.get());
-    QWidget *last = tabOrder(dialog).constLast();
+    QWidget *last = tabOrder(dialog()).constLast();
     for (QWidget *widget : below) {
         QWidget::setTabOrder(last, widget);
         last = widget;
     }
 
-    if (!dialog->isVisible())
+    if (!dialog()->isVisible())
         m_filterBar->filterEdit()->setFocus();
 
     connect(m_filterBar.get(), &ShortcutFilterBar::filterChanged, this,
@@ -64,7 +118,6 @@ void EditShortcutsAssistance::addFilterBar()
         m_form.treeView->selectFirstShortcut();
         m_form.treeView->setFocus();
     });
-    connect(m_form.treeView, &ShortcutsTreeView::filtered, this, &EditShortcutsAssistance::showCount);
 }
 
 void EditShortcutsAssistance::applyFilter()
@@ -72,7 +125,7 @@ void EditShortcutsAssistance::applyFilter()
     const ShortcutFilter filter = m_filterBar->filter();
     if (!filter.isActive())
         m_noMatchLabel->say(QString());
-    m_form.treeView->setFilter(filter);
+    m_form.treeView->setFilter(filter, [this](int count) { showCount(count); });
 }
 
 void EditShortcutsAssistance::showCount(int count)

@@ -13,6 +13,7 @@
 
 class NoMatchLabel;
 class ShortcutFilterBar;
+class TreeAssistance;
 
 /**
  * What the shortcuts dialog has beyond its plain form.
@@ -36,13 +37,20 @@ Q_SIGNALS:
     /// A part made other keys pending.
     void keysChanged();
 
+protected:
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
 private:
+    QWidget *dialog() const;
     void addFilterBar();
+    void restoreSizes();
+    void rememberSizes() const;
     void applyFilter();
     void showCount(int count);
 
     const EditShortcutsForm m_form;
     const QPointer<ShortcutsModel> m_model;
+    const std::unique_ptr<TreeAssistance> m_tree;
     std::unique_ptr<ShortcutFilterBar> m_filterBar;
     std::unique_ptr<NoMatchLabel> m_noMatchLabel;
 };

@@ -5,6 +5,7 @@
 
 #include "ClashingRows.h"
 #include "KeySequences.h"
+#include "ShortcutRows.h"
 #include "ShortcutsTreeView.h"
 
 #include <QDialog>
@@ -47,7 +48,7 @@ void EditShortcutsDialogPrivate::setAssistance(bool isOn)
 void EditShortcutsDialogPrivate::connectAssistance()
 {
     QObject::connect(assistance.get(), &EditShortcutsAssistance::keysChanged, &m_context,
-                     [this] { setChanged(true); });
+                     [this] { setChanged(m_model && ShortcutRows::isAnyEdited(*m_model)); });
     const KeyAssistance *keys = m_keyAssistance.get();
     QObject::connect(keys, &KeyAssistance::noneChosen, &m_context, [this] { takeKeyAway(); });
     QObject::connect(keys, &KeyAssistance::goToRequested, &m_context,

@@ -6,7 +6,6 @@
 #include <QKeySequence>
 
 class IShortcutObject;
-class ShortcutsModel;
 
 /**
  * Which shortcuts a user has changed, now or before, and the way back.
@@ -19,7 +18,5 @@ bool isEdited(const IShortcutObject &object);
 bool isChanged(const IShortcutObject &object);
 /// The key that the way back leads to: the one in force after an edit, else the default key.
 QKeySequence keyBefore(const IShortcutObject &object);
-/// Whether a shortcut of a model is edited.
-bool isAnyEdited(const ShortcutsModel &model);
 
 } // namespace ShortcutChange

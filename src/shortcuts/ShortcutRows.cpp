@@ -3,7 +3,10 @@
 
 #include "ShortcutRows.h"
 
+#include "ShortcutChange.h"
 #include "ShortcutsModel.h"
+
+#include <algorithm>
 
 QVector<const IShortcutObject *> ShortcutRows::ofGroup(const ShortcutsModel &model, int group)
 {
@@ -18,6 +21,18 @@ QVector<const IShortcutObject *> ShortcutRows::ofGroup(const ShortcutsModel &mod
 const IShortcutObject *ShortcutRows::at(const ShortcutsModel &model, const QModelIndex &index)
 {
     return model.isShortcutItem(index) ? model.firstObject(index) : nullptr;
+}
+
+bool ShortcutRows::isAnyEdited(const ShortcutsModel &model)
+{
+    for (int group = 0; group < model.rowCount(); ++group) {
+        const auto objects = ofGroup(model, group);
+        if (std::any_of(objects.begin(), objects.end(), [](const IShortcutObject *object) {
+                return object && ShortcutChange::isEdited(*object);
+            }))
+            return true;
+    }
+    return false;
 }
 
 QVector<QPair<int, int>> ShortcutRows::empty(const ShortcutsModel &model)

@@ -25,6 +25,9 @@ public:
     /// What the row of \a index shows; null for a group, and for a row that shows nothing.
     static const IShortcutObject *at(const ShortcutsModel &model, const QModelIndex &index);
 
+    /// Whether the pending key of any row is not the one in force.
+    static bool isAnyEdited(const ShortcutsModel &model);
+
     /// Group and row of every row that shows nothing.
     static QVector<QPair<int, int>> empty(const ShortcutsModel &model);
 };

@@ -6,7 +6,9 @@
 #include "ActionObject.h"
 #include "FurtherKeys.h"
 #include "RowsChangedEvent.h"
+#include "ShortcutChange.h"
 #include "ShortcutObject.h"
+#include "ShownKeys.h"
 
 #include <QCoreApplication>
 
@@ -205,6 +207,8 @@ QVariant ShortcutsModel::data(const QModelIndex &index, int role) const
         const bool isName = index.column() == 0 && role == Qt::DisplayRole;
         return isName ? QVariant(m_groupNames.value(index.row())) : QVariant();
     }
+    if (m_spokenChanges > 0 && (role == Qt::AccessibleTextRole || role == Qt::AccessibleDescriptionRole))
+        return spokenData(index, role);
     // The object last: finding it is a walk through the group.
     const bool isText = index.column() == 0 && (role == Qt::DisplayRole || role == Qt::DecorationRole);
     const bool isKey =
@@ -217,6 +221,21 @@ QVariant ShortcutsModel::data(const QModelIndex &index, int role) const
     if (role == Qt::DisplayRole)
         return object->keySequence().toString(QKeySequence::PortableText);
     return role == Qt::EditRole ? object->keySequence() : object->defaultKeySequence();
+}
+
+// What a screen reader says instead of the text of a changed row, and beside it.
+QVariant ShortcutsModel::spokenData(const QModelIndex &index, int role) const
+{
+    const IShortcutObject *object = firstObject(index);
+    if (!object || !ShortcutChange::isChanged(*object))
+        return {};
+    if (role == Qt::AccessibleTextRole) {
+        const QString text = index.column() == 0 ? object->text() : ShownKeys::of(*object);
+        return tr("%1, changed", "%1: an action or a key").arg(text.isEmpty() ? tr("No shortcut") : text);
+    }
+    const QString defaultKey = object->defaultKeySequence().toString(QKeySequence::PortableText);
+    return defaultKey.isEmpty() ? tr("There is no default shortcut.")
+                                : tr("The default shortcut is %1.").arg(defaultKey);
 }
 
 QVariant ShortcutsModel::headerData(int section, Qt::Orientation orientation, int role) const

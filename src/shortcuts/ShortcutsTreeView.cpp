@@ -4,8 +4,10 @@
 #include "ShortcutsTreeView.h"
 
 #include "RowsChangedEvent.h"
+#include "ShortcutChange.h"
 #include "ShortcutRows.h"
 #include "ShortcutsModel.h"
+#include "ShownKeys.h"
 #include "TextWidth.h"
 
 #include <QTimer>
@@ -106,34 +108,40 @@ void ShortcutsTreeView::dataChanged(const QModelIndex &topLeft, const QModelInde
 int ShortcutsTreeView::sizeHintForColumn(int column) const
 {
     const ShortcutsModel *shortcuts = shortcutsModel();
-    if (!shortcuts || column != 0)
+    if (!shortcuts)
         return QTreeView::sizeHintForColumn(column);
     ensurePolished();
     const QStyleOptionViewItem option = viewOptions();
     int width = 0;
-    const auto items = widestItems(*shortcuts);
-    for (const QModelIndex &index : items)
-        width = qMax(width, itemDelegate(index)->sizeHint(option, index).width() + indentationOf(index));
+    const auto items = widestItems(*shortcuts, column);
+    for (const QModelIndex &index : items) {
+        const int indent = column == 0 ? indentationOf(index) : 0;
+        width = qMax(width, itemDelegate(index)->sizeHint(option, index).width() + indent);
+    }
     return width;
 }
 
 // Laying every text out would take longer than all the rest of opening the dialog.
-QVector<QModelIndex> ShortcutsTreeView::widestItems(const ShortcutsModel &shortcuts) const
+QVector<QModelIndex> ShortcutsTreeView::widestItems(const ShortcutsModel &shortcuts, int column) const
 {
     TextWidth textWidth(font());
     const int iconWidth = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
+    const auto widthOf = [&](const IShortcutObject &object) {
+        if (column == 1)
+            return textWidth.of(ShownKeys::of(object)) * (ShortcutChange::isChanged(object) ? 6 : 5) / 5;
+        return textWidth.of(object.text()) + (object.icon().isNull() ? 0 : iconWidth) + indentation();
+    };
     std::vector<Candidate> candidates;
     for (int group = 0; group < shortcuts.rowCount(); ++group) {
         const QModelIndex index = shortcuts.index(group, 0);
-        candidates.push_back({textWidth.of(index.data().toString()), group, -1});
+        if (column == 0)
+            candidates.push_back({textWidth.of(index.data().toString()), group, -1});
         if (!isExpanded(index))
             continue;
         const auto objects = ShortcutRows::ofGroup(shortcuts, group);
         for (int row = 0; row < objects.size(); ++row) {
-            if (const IShortcutObject *object = objects.at(row)) {
-                const int icon = object->icon().isNull() ? 0 : iconWidth;
-                candidates.push_back({textWidth.of(object->text()) + icon + indentation(), group, row});
-            }
+            if (const IShortcutObject *object = objects.at(row))
+                candidates.push_back({widthOf(*object), group, row});
         }
     }
     const auto end =
@@ -142,9 +150,9 @@ QVector<QModelIndex> ShortcutsTreeView::widestItems(const ShortcutsModel &shortc
                       [](const Candidate &left, const Candidate &right) { return left.width > right.width; });
     QVector<QModelIndex> items;
     std::transform(candidates.begin(), end, std::back_inserter(items),
-                   [&shortcuts](const Candidate &candidate) {
+                   [&shortcuts, column](const Candidate &candidate) {
                        const QModelIndex group = shortcuts.index(candidate.group, 0);
-                       return candidate.row < 0 ? group : shortcuts.index(candidate.row, 0, group);
+                       return candidate.row < 0 ? group : shortcuts.index(candidate.row, column, group);
                    });
     return items;
 }
@@ -199,7 +207,9 @@ void ShortcutsTreeView::hideRows(const ShortcutsModel &shortcuts, const QModelIn
         ShortcutIndex::Matches matches = m_index.matches(shortcuts, m_filter);
         if (ShortcutRows::at(shortcuts, keptRow))
             matches[keptRow.parent().row()][keptRow.row()] = true;
-        Q_EMIT filtered(m_hidden.hideOthers(shortcuts, matches));
+        const int count = m_hidden.hideOthers(shortcuts, matches);
+        if (m_tellCount)
+            m_tellCount(count);
     }
     scheduleDelayedItemsLayout();
 }
@@ -217,10 +227,11 @@ void ShortcutsTreeView::leaveHiddenRow()
     }
 }
 
-void ShortcutsTreeView::setFilter(const ShortcutFilter &filter)
+void ShortcutsTreeView::setFilter(const ShortcutFilter &filter, const Count &tell)
 {
     const bool wasActive = m_filter.isActive();
     m_filter = filter;
+    m_tellCount = tell;
     const ShortcutsModel *shortcuts = shortcutsModel();
     if (!shortcuts)
         return;

@@ -12,6 +12,8 @@
 #include <QTreeView>
 #include <QVector>
 
+#include <functional>
+
 class ShortcutsModel;
 
 /**
@@ -39,8 +41,12 @@ public:
     /// The pending key of the current item; empty when that is no shortcut.
     QKeySequence currentKeySequence() const;
 
-    /// Shows those shortcuts alone that \a filter matches, in groups that are open.
-    void setFilter(const ShortcutFilter &filter);
+    /// Hears how many shortcuts a filter lets be seen.
+    using Count = std::function<void(int)>;
+
+    /// Shows those shortcuts alone that \a filter matches, in groups that are open; \a tell is called
+    /// now, and whenever their number may have changed.
+    void setFilter(const ShortcutFilter &filter, const Count &tell = {});
     /// Does what takes time when the first filter is set.
     void prepareFilter();
     /// Makes the first shortcut that is seen current, unless one is current.
@@ -55,8 +61,6 @@ Q_SIGNALS:
     void currentShortcutChanged(QKeySequence defaultKS, QKeySequence currentKS);
     /// A group, or nothing, became current.
     void currentItemIsNotShortcut();
-    /// A filter was set, or what it matches has changed: it lets \a count shortcuts be seen.
-    void filtered(int count);
 
 protected:
     void currentChanged(const QModelIndex &current, const QModelIndex &previous) override;
@@ -74,11 +78,12 @@ private:
     void leaveHiddenRow();
     void openGroups(const ShortcutsModel &shortcuts);
     void closeGroups();
-    QVector<QModelIndex> widestItems(const ShortcutsModel &shortcuts) const;
+    QVector<QModelIndex> widestItems(const ShortcutsModel &shortcuts, int column) const;
     int indentationOf(const QModelIndex &index) const;
 
     HiddenRows m_hidden{this};
     ShortcutFilter m_filter;
+    Count m_tellCount;
     ShortcutIndex m_index;
     QPersistentModelIndex m_leftRow; // was current until it was hidden
     QVector<QPersistentModelIndex> m_closedGroups; // those that a filter opened

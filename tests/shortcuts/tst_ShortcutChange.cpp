@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "KeyTestObject.h"
-#include "ShortcutsModel.h"
 #include "TestCase.h"
 
 #include <shortcuts/ShortcutChange.h>
@@ -14,8 +13,6 @@ class tst_ShortcutChange : public TestCase
 private Q_SLOTS:
     void knowsWhatWasChangedAndTheWayBack_data();
     void knowsWhatWasChangedAndTheWayBack();
-    void findsAnEditAnywhere();
-    void findsNoEditInAModelOfGoneShortcuts();
 };
 
 void tst_ShortcutChange::knowsWhatWasChangedAndTheWayBack_data()
@@ -49,30 +46,6 @@ void tst_ShortcutChange::knowsWhatWasChangedAndTheWayBack()
     QTEST(ShortcutChange::isEdited(object), "isEdited");
     QTEST(ShortcutChange::isChanged(object), "isChanged");
     QTEST(ShortcutChange::keyBefore(object), "before");
-}
-
-void tst_ShortcutChange::findsAnEditAnywhere()
-{
-    ShortcutsModel model(nullptr, QString());
-    QVERIFY(!ShortcutChange::isAnyEdited(model));
-    model.registerShortcutObject(new KeyTestObject(QStringLiteral("open"), QStringLiteral("File")));
-    auto *copy = new KeyTestObject(QStringLiteral("copy"), QStringLiteral("Edit"));
-    model.registerShortcutObject(copy);
-    QVERIFY(!ShortcutChange::isAnyEdited(model));
-    copy->setKeySequence(QKeySequence(Qt::Key_F9));
-    QVERIFY(ShortcutChange::isAnyEdited(model));
-    copy->apply();
-    QVERIFY(!ShortcutChange::isAnyEdited(model));
-}
-
-void tst_ShortcutChange::findsNoEditInAModelOfGoneShortcuts()
-{
-    ShortcutsModel model(nullptr, QString());
-    auto *object = new KeyTestObject(QStringLiteral("open"), QStringLiteral("File"));
-    model.registerShortcutObject(object);
-    object->setKeySequence(QKeySequence(Qt::Key_F9));
-    Q_EMIT object->deleteMe();
-    QVERIFY(!ShortcutChange::isAnyEdited(model));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_ShortcutChange)

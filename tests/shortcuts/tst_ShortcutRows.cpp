@@ -17,6 +17,9 @@ private Q_SLOTS:
     void haveTheOrderOfTheModel();
     void showTheFirstOfSeveralObjects();
     void areEmptyWhenTheirShortcutIsGone();
+    void areFoundByTheirIndex();
+    void findsAnEditAnywhere();
+    void findsNoEditInAModelOfGoneShortcuts();
 
 private:
     KeyTestObject *add(const char *name, const char *group)
@@ -69,6 +72,43 @@ void tst_ShortcutRows::areEmptyWhenTheirShortcutIsGone()
     QCOMPARE(ShortcutRows::empty(*m_model), empty);
     const QVector<const IShortcutObject *> rows{nullptr, save};
     QCOMPARE(ShortcutRows::ofGroup(*m_model, 0), rows);
+}
+
+void tst_ShortcutRows::areFoundByTheirIndex()
+{
+    KeyTestObject *save = add("save", "File");
+    const QModelIndex group = m_model->index(0, 0);
+    for (int column = 0; column < 2; ++column)
+        QCOMPARE(ShortcutRows::at(*m_model, m_model->index(0, column, group)), save);
+    QVERIFY(!ShortcutRows::at(*m_model, group));
+    QVERIFY(!ShortcutRows::at(*m_model, {}));
+    const QModelIndex index = m_model->index(0, 0, group);
+    Q_EMIT save->deleteMe();
+    QVERIFY(!ShortcutRows::at(*m_model, index));
+}
+
+void tst_ShortcutRows::findsAnEditAnywhere()
+{
+    ShortcutsModel model(nullptr, QString());
+    QVERIFY(!ShortcutRows::isAnyEdited(model));
+    model.registerShortcutObject(new KeyTestObject(QStringLiteral("open"), QStringLiteral("File")));
+    auto *copy = new KeyTestObject(QStringLiteral("copy"), QStringLiteral("Edit"));
+    model.registerShortcutObject(copy);
+    QVERIFY(!ShortcutRows::isAnyEdited(model));
+    copy->setKeySequence(QKeySequence(Qt::Key_F9));
+    QVERIFY(ShortcutRows::isAnyEdited(model));
+    copy->apply();
+    QVERIFY(!ShortcutRows::isAnyEdited(model));
+}
+
+void tst_ShortcutRows::findsNoEditInAModelOfGoneShortcuts()
+{
+    ShortcutsModel model(nullptr, QString());
+    auto *object = new KeyTestObject(QStringLiteral("open"), QStringLiteral("File"));
+    model.registerShortcutObject(object);
+    object->setKeySequence(QKeySequence(Qt::Key_F9));
+    Q_EMIT object->deleteMe();
+    QVERIFY(!ShortcutRows::isAnyEdited(model));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_ShortcutRows)
