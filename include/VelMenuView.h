@@ -33,7 +33,8 @@ class VelMenuViewPrivate;
  * Indices that the operations take and return belong to the file-system model under the
  * sorting model, unless said otherwise.
  *
- * A menu directory that does not exist gives an empty tree; looking creates nothing.
+ * A menu directory that does not exist gives an empty tree until it appears; looking creates
+ * nothing.
  */
 class VELUIEXTRA_EXPORT VelMenuView : public QTreeView
 {

@@ -26,6 +26,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , find(view, menu, selection, voice)
     , filter(view, menu, selection, voice)
     , editing(view, menu, selection, find, voice)
+    , m_rootWatch(menu.directory())
 {
 }
 
@@ -59,6 +60,7 @@ void VelMenuViewPrivate::show()
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
                      &VelMenuView::setActionsEnabled);
+    QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
                      &VelMenuView::selectionChangedSlot);
 }
@@ -68,6 +70,7 @@ void VelMenuViewPrivate::showAnew()
     selection.clear();
     menu.build();
     connectFiles();
+    m_rootWatch.begin();
     showRoot();
     find.clear();
     q->setActionsEnabled();

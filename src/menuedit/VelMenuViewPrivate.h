@@ -9,6 +9,7 @@
 #include "MenuFind.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
+#include "RootWatch.h"
 #include "ShownMenu.h"
 
 #include <QTimer>
@@ -64,6 +65,7 @@ private:
     void showRoot();
     void hideTopLevel();
 
+    RootWatch m_rootWatch;
     // Rows come in many signals; the actions are looked at once afterwards.
     QTimer m_refresh;
 };

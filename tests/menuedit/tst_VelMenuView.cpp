@@ -26,6 +26,10 @@ class tst_VelMenuView : public MenuTestCase
 private Q_SLOTS:
     void showsNothingAndMakesNothingWhereThereIsNoDirectory();
     void showsNothingWhenTheDirectoryIsAFile();
+    void showsADirectoryThatAppearsLater_data();
+    void showsADirectoryThatAppearsLater();
+    void showsADirectoryThatComesBack();
+    void showsADirectoryThatReplacedAnother();
     void staysEmptyWhenTheDirectoryVanishes();
     void showsAFolderThatCannotBeReadAsEmpty();
     void survivesOddFiles();
@@ -71,6 +75,64 @@ void tst_VelMenuView::showsNothingWhenTheDirectoryIsAFile()
 }
 
 void tst_VelMenuView::staysEmptyWhenTheDirectoryVanishes()
+void tst_VelMenuView::showsADirectoryThatAppearsLater_data()
+{
+    QTest::addColumn<QString>("directory");
+    QTest::addColumn<bool>("isEditable");
+    QTest::newRow("the last part is missing") << "menu/later" << true;
+    QTest::newRow("several parts are missing") << "menu/none/of/it" << true;
+    QTest::newRow("to pick from") << "menu/later" << false;
+}
+
+void tst_VelMenuView::showsADirectoryThatAppearsLater()
+{
+    QFETCH(QString, directory);
+    QFETCH(bool, isEditable);
+    QDir().mkpath(menu());
+    VelMenuView view(path(directory), -1, isEditable);
+    view.show();
+    QVERIFY(!view.rootIndex().isValid());
+    // One after the other, as a program would that makes them.
+    const QStringList parts = directory.split(QLatin1Char('/'));
+    for (int i = 2; i <= parts.size(); ++i) {
+        QDir().mkpath(path(parts.mid(0, i).join(QLatin1Char('/'))));
+        QTest::qWait(50);
+    }
+    write(directory + QLatin1String("/a.desktop"), entryText(QStringLiteral("A")));
+    QTRY_COMPARE(names(view, path(directory)), QStringList{QStringLiteral("A")});
+    QVERIFY(view.indexAt(QPoint(5, 5)).isValid());
+    QDir().mkpath(path(directory) + QLatin1String("/sub"));
+    QTRY_COMPARE(names(view, path(directory)).size(), 2);
+}
+
+void tst_VelMenuView::showsADirectoryThatComesBack()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    QVERIFY(open(view, menu(), 1));
+    for (const char *name : {"B", "C"}) {
+        QVERIFY(QDir(menu()).removeRecursively());
+        QTRY_VERIFY(names(view, menu()).isEmpty());
+        writeEntry(QStringLiteral("b.desktop"), QLatin1String(name));
+        QTRY_COMPARE(names(view, menu()), QStringList{QLatin1String(name)});
+    }
+}
+
+void tst_VelMenuView::showsADirectoryThatReplacedAnother()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    write(QStringLiteral("other/b.desktop"), entryText(QStringLiteral("B")));
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    QVERIFY(open(view, menu(), 1));
+    QVERIFY(QDir().rename(menu(), path(QStringLiteral("former"))));
+    QVERIFY(QDir().rename(path(QStringLiteral("other")), menu()));
+    QTRY_COMPARE(names(view, menu()), QStringList{QStringLiteral("B")});
+    writeEntry(QStringLiteral("c.desktop"), QStringLiteral("C"));
+    QTRY_COMPARE(names(view, menu()).size(), 2);
+}
+
 {
     const QString entry = writeEntry(QStringLiteral("sub/a.desktop"), QStringLiteral("A"));
     VelMenuView view(menu(), -1, true);
