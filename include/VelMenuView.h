@@ -193,8 +193,8 @@ public:
      * @param row the row in the file-system model of the child that is to follow the item; the
      *        folder's row count puts it last, any other row without a child does not list it
      * @param folder the folder
-     * @return false when \a folder is invalid or has no path; a list that cannot be saved is
-     *         not noticed here
+     * @return false when \a folder is invalid or has no path; of a list that cannot be
+     *         saved told() tells
      */
     bool fixSortOrderForNew(const QString &name, int row, const QModelIndex &folder);
 

@@ -7,6 +7,7 @@
 #include "FileProgress.h"
 #include "MenuFind.h"
 #include "MenuSelection.h"
+#include "MenuVoice.h"
 #include "ShownMenu.h"
 #include "TreeRemoval.h"
 #include "VelDesktopEntryEditDialog.h"
@@ -54,36 +55,51 @@ MenuEditing::~MenuEditing() = default;
 bool MenuEditing::createNew(FreeName::Kind kind)
 {
     const QString folder = selectedFolder();
-    if (folder.isEmpty())
+    if (!QFileInfo(folder).isDir()) {
+        tell(QCoreApplication::translate("VelMenuView",
+                                         "Nothing can be created in %1, because there is no such folder.")
+                 .arg(folder));
         return false;
+    }
     const FreeName::Name name = FreeName::firstIn(folder, kind);
     const QString path = folder + QLatin1Char('/') + name.fileName;
 
     const QPointer<MenuEditing> self(this);
-    const bool kept = writeNew(path, kind, name.number) && offerNew(path, kind);
+    const bool isWritten = writeNew(path, kind, name.number);
+    const bool kept = isWritten && offerNew(path, kind);
     if (self)
         Q_EMIT changed();
+    if (self && !isWritten)
+        tell(QCoreApplication::translate("VelMenuView",
+                                         "%1 could not be saved. Make sure that the folder %2 may be written "
+                                         "and that the disk is not full, then try again.")
+                 .arg(path, folder));
     return kept;
 }
 
-// The selected folder, or the one that the selected item lies in; empty when there is none.
+// The selected folder, or the one that the selected item lies in, whether or not it is still there.
 QString MenuEditing::selectedFolder() const
 {
     QModelIndex place = m_selection.item();
     if (!place.isValid())
         place = m_menu.proxy().mapToSource(m_view->rootIndex());
     if (!place.isValid())
-        return QString();
-    const QFileInfo info(m_menu.files().filePath(place));
-    return info.isDir() ? info.filePath() : info.absolutePath();
+        return QDir::cleanPath(QFileInfo(m_menu.directory()).absoluteFilePath());
+    const QString path = m_menu.files().filePath(place);
+    return m_menu.files().isDir(place) ? path : QFileInfo(path).absolutePath();
 }
 
 // Writes the record of a new item; false when it cannot be saved.
 bool MenuEditing::writeNew(const QString &path, FreeName::Kind kind, const QString &number)
 {
     const bool isFolder = kind == FreeName::Kind::Folder;
-    if (isFolder)
-        QDir().mkpath(path);
+    // Something else may have been here that nobody saw go.
+    m_menu.files().forgetItemInfo(path);
+    if (isFolder) {
+        m_menu.proxy().invalidateSortOrder(path);
+        if (!QDir().mkdir(path))
+            return false;
+    }
     const QString recordPath = isFolder ? EntryPath::recordFileOf(path) : path;
     VelUIDesktopEntry record(recordPath);
     record.setType(isFolder ? QStringLiteral("Directory") : QStringLiteral("Application"));
@@ -137,6 +153,8 @@ bool MenuEditing::edit(const QString &path)
     if (self) {
         m_find.clear();
         m_menu.files().forgetItemInfo(recordPath);
+        if (isFolder)
+            m_menu.files().forgetItemInfo(path);
         Q_EMIT changed();
     }
     return true;
@@ -153,15 +171,34 @@ void MenuEditing::remove(const QString &path)
         QMessageBox::Yes | QMessageBox::No, QMessageBox::Yes);
     if (!self || answer != QMessageBox::Yes)
         return;
-    const QFileInfo info(path);
-    // A link to a folder is removed as a file is: what it leads to is not ours to delete.
     FileProgress nobody;
-    if (info.isDir() && !info.isSymLink())
-        TreeRemoval::remove(QFile::encodeName(path).toStdString(), nobody);
-    else
-        m_menu.files().remove(m_menu.files().index(path));
+    const TreeRemoval::Result result = TreeRemoval::remove(QFile::encodeName(path).toStdString(), nobody);
     m_menu.files().forgetItemInfo(path);
     m_find.clear();
     m_selection.leave(path);
     Q_EMIT changed();
+    if (self && !result.succeeded())
+        tellWhatStays(path, QFile::decodeName(result.path.c_str()),
+                      QString::fromLocal8Bit(result.error.message().c_str()));
+}
+
+void MenuEditing::tellWhatStays(const QString &path, const QString &left, const QString &reason)
+{
+    const QString text = left == path
+        ? QCoreApplication::translate(
+              "VelMenuView",
+              "%1 could not be deleted: %2. Make sure that the folder that holds it may "
+              "be written, then try again.")
+              .arg(path, reason)
+        : QCoreApplication::translate(
+              "VelMenuView",
+              "%1 was deleted in part only, because %2 could not be deleted: %3. Make sure "
+              "that its folder may be written, then delete the rest.")
+              .arg(path, left, reason);
+    tell(text, m_selection.shown(path));
+}
+
+void MenuEditing::tell(const QString &text, const QModelIndex &at)
+{
+    m_voice.tell(text, MenuVoice::Failure, at);
 }

@@ -5,6 +5,7 @@
 
 #include "FreeName.h"
 
+#include <QModelIndex>
 #include <QObject>
 #include <QString>
 
@@ -29,11 +30,11 @@ public:
     ~MenuEditing() override;
 
     /// Creates a folder or an entry where the selection says and opens the editor on it; whether
-    /// it was made and kept.
+    /// it was made and kept. The user is told when it cannot be made.
     bool createNew(FreeName::Kind kind);
     /// Opens the editor on the item at \a path; whether it was saved.
     bool edit(const QString &path);
-    /// Deletes the item at \a path after asking.
+    /// Deletes the item at \a path after asking; the user is told of what stays.
     void remove(const QString &path);
 
 Q_SIGNALS:
@@ -44,6 +45,8 @@ private:
     QString selectedFolder() const;
     bool writeNew(const QString &path, FreeName::Kind kind, const QString &number);
     bool offerNew(const QString &path, FreeName::Kind kind);
+    void tellWhatStays(const QString &path, const QString &left, const QString &reason);
+    void tell(const QString &text, const QModelIndex &at = QModelIndex());
 
     QTreeView *const m_view;
     const ShownMenu &m_menu;

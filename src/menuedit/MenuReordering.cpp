@@ -4,10 +4,13 @@
 #include "MenuReordering.h"
 
 #include "FolderOrder.h"
+#include "MenuVoice.h"
 #include "ShownMenu.h"
 #include "ShownOrder.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
+
+#include <QCoreApplication>
 
 #include <algorithm>
 
@@ -22,19 +25,33 @@ int rowBelow(const ShownMenu &menu, const QModelIndex &shown, const QModelIndex 
                                                      : menu.files().rowCount(sourceFolder);
 }
 
+// The order is there for the user to see only when it is there for the menu, too.
+void tellNotSaved(MenuVoice &voice, const QString &folder)
+{
+    voice.tell(
+        QCoreApplication::translate("VelMenuView",
+                                    "The order of the folder %1 could not be saved. Make sure that the "
+                                    "folder may be written and that the disk is not full, then try again.")
+            .arg(folder),
+        MenuVoice::Failure);
+}
+
 } // namespace
 
-bool MenuReordering::list(const ShownMenu &menu, const QString &name, int row, const QModelIndex &folder)
+bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row,
+                          const QModelIndex &folder)
 {
     const QString path = folder.isValid() ? menu.files().filePath(folder) : QString();
     if (path.isEmpty())
         return false;
-    FolderOrder::write(path, ShownOrder::with(menu.proxy(), name, row, folder));
+    const bool isSaved = FolderOrder::write(path, ShownOrder::with(menu.proxy(), name, row, folder));
     menu.files().noteRecordFile(path);
+    if (!isSaved)
+        tellNotSaved(voice, path);
     return true;
 }
 
-void MenuReordering::move(const ShownMenu &menu, const QModelIndex &item, bool up)
+void MenuReordering::move(const ShownMenu &menu, MenuVoice &voice, const QModelIndex &item, bool up)
 {
     if (!item.isValid())
         return;
@@ -47,6 +64,6 @@ void MenuReordering::move(const ShownMenu &menu, const QModelIndex &item, bool u
         row = rowBelow(menu, menu.proxy().index(shown.row() + 1, 0, folder), sourceFolder);
     else if (target < menu.proxy().rowCount(folder))
         row = menu.proxy().mapToSource(menu.proxy().index(std::max(target, 0), 0, folder)).row();
-    list(menu, item.data(QFileSystemModel::FileNameRole).toString(), row, sourceFolder);
+    list(menu, voice, item.data(QFileSystemModel::FileNameRole).toString(), row, sourceFolder);
     menu.proxy().invalidateSortOrder(menu.files().filePath(sourceFolder));
 }

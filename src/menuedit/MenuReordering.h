@@ -3,6 +3,7 @@
 
 #pragma once
 
+class MenuVoice;
 class QModelIndex;
 class QString;
 class ShownMenu;
@@ -13,10 +14,10 @@ class ShownMenu;
 namespace MenuReordering {
 
 /// Lists \a name in \a folder before the child at the source row \a row; see ShownOrder::with().
-/// False when there is no such folder; a list that cannot be saved is not noticed.
-bool list(const ShownMenu &menu, const QString &name, int row, const QModelIndex &folder);
+/// False when there is no such folder; of a list that cannot be saved the \a voice tells.
+bool list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row, const QModelIndex &folder);
 
 /// Moves \a item by one place up or down, and shows the new order.
-void move(const ShownMenu &menu, const QModelIndex &item, bool up);
+void move(const ShownMenu &menu, MenuVoice &voice, const QModelIndex &item, bool up);
 
 } // namespace MenuReordering

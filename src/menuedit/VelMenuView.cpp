@@ -163,12 +163,12 @@ void VelMenuView::slotDel()
 
 bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelIndex &folder)
 {
-    return MenuReordering::list(d->menu, name, row, folder);
+    return MenuReordering::list(d->menu, d->voice, name, row, folder);
 }
 
 void VelMenuView::fixSortOrderInDir(const QModelIndex &item, bool up)
 {
-    MenuReordering::move(d->menu, item, up);
+    MenuReordering::move(d->menu, d->voice, item, up);
 }
 
 void VelMenuView::invalidateSortOrder(const QModelIndex &sourceIndex)

@@ -82,7 +82,7 @@ void VelMenuViewPrivate::moveSelected(bool up)
     if (!item.isValid())
         return;
     const QString path = selection.path();
-    MenuReordering::move(menu, item, up);
+    MenuReordering::move(menu, voice, item, up);
     selection.reveal(path);
     find.clear();
     q->setActionsEnabled();

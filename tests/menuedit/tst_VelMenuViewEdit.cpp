@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "EditTestCase.h"
-
+#include "FullDisk.h"
 #include "ModalDriver.h"
 #include "VelDesktopEntryEditDialog.h"
 #include "VelMenuView.h"
@@ -11,37 +11,6 @@
 #include <QFileSystemModel>
 #include <QLineEdit>
 #include <QSignalSpy>
-
-#include <csignal>
-
-#include <sys/resource.h>
-
-namespace {
-
-/// Lets no file grow while it lives, as a full disk does.
-class FullDisk
-{
-public:
-    FullDisk()
-    {
-        m_handler = std::signal(SIGXFSZ, SIG_IGN);
-        getrlimit(RLIMIT_FSIZE, &m_limit);
-        const rlimit none{0, m_limit.rlim_max};
-        setrlimit(RLIMIT_FSIZE, &none);
-    }
-    ~FullDisk()
-    {
-        setrlimit(RLIMIT_FSIZE, &m_limit);
-        std::signal(SIGXFSZ, m_handler);
-    }
-    Q_DISABLE_COPY_MOVE(FullDisk)
-
-private:
-    rlimit m_limit{};
-    void (*m_handler)(int) = SIG_DFL;
-};
-
-} // namespace
 
 /// Creating and editing.
 class tst_VelMenuViewEdit : public EditTestCase
@@ -56,6 +25,8 @@ private Q_SLOTS:
     void writesTheRecordOfANewFolder();
     void putsANewItemIntoTheSelectedFolderOrBesideTheSelectedFile();
     void showsANewEntryAsItWasEdited();
+    void showsANewFolderAsItWasNamed();
+    void showsANewEntryWhereAHiddenOneWas();
     void doesNotListANewItem();
     void leavesNothingOfACanceledItem_data();
     void leavesNothingOfACanceledItem();
@@ -193,6 +164,36 @@ void tst_VelMenuViewEdit::showsANewEntryAsItWasEdited()
     QCOMPARE(names(view, menu()), QStringList{QStringLiteral("Xylophone")});
 }
 
+void tst_VelMenuViewEdit::showsANewFolderAsItWasNamed()
+{
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    ModalDriver modal;
+    modal.handle([](QWidget *dialog) { accept(dialog, QStringLiteral("Games")); });
+    QVERIFY(view.createNew(true));
+    QVERIFY(modal.finished());
+    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("Games")});
+}
+
+void tst_VelMenuViewEdit::showsANewEntryWhereAHiddenOneWas()
+{
+    const QString path =
+        writeEntry(QStringLiteral("shortcut.desktop"), QStringLiteral("Old"), "Exec=true\nHidden=true\n");
+    writeLetters("a");
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    QVERIFY(QFile::remove(path)); // behind the back of the model
+    ModalDriver modal;
+    modal.handle([&](QWidget *dialog) {
+        QVERIFY(shown(view, path).isValid());
+        QCOMPARE(view.selectedPath(), path);
+        accept(dialog, QStringLiteral("New"));
+    });
+    QVERIFY(view.createNew(false));
+    QVERIFY(modal.finished());
+    QCOMPARE(names(view, menu()).join(QLatin1Char(' ')), QStringLiteral("A New"));
+}
+
 void tst_VelMenuViewEdit::doesNotListANewItem()
 {
     writeFolder(QString(), QStringLiteral("Menu"), "b.desktop;a.desktop;");
@@ -322,8 +323,7 @@ void tst_VelMenuViewEdit::editsTheRecordOfAFolder()
     });
     QVERIFY(view.slotEdit());
     QVERIFY(read(sub + QLatin1String("/.directory")).contains("Name=Games\n"));
-    // The name that is shown was read before, and is kept for folders.
-    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("Sub")});
+    QCOMPARE(names(view, menu()), QStringList{QStringLiteral("Games")});
 }
 
 void tst_VelMenuViewEdit::makesTheRecordOfAFolderOnlyWhenSaved()
