@@ -131,8 +131,12 @@ void VelMenuModel::takeIn(const DropResult &result)
         forgetItemInfo(source);
     // Every file has its row at once, whether or not its folder is being watched already.
     for (const QString &target : result.targets) {
-        if (QFileInfo::exists(target))
-            index(target);
+        if (!QFileInfo::exists(target))
+            continue;
+        index(target);
+        // Nor does it show what was here before, whether or not that was seen to go.
+        m_cache->forgetTree(target);
+        refreshRow(target);
     }
 }
 

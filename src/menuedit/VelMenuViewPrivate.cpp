@@ -52,15 +52,17 @@ void VelMenuViewPrivate::show()
             hideTopLevel();
     });
     q->setModel(&menu.proxy());
+    if (q->accessibleName().isEmpty())
+        q->setAccessibleName(QCoreApplication::translate("VelMenuView", "Menu", "the tree"));
     showRoot();
     q->setSortingEnabled(true);
     if (menu.isEditable())
         makeEditable();
     QObject::connect(&editing, &MenuEditing::changed, q, &VelMenuView::changed);
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
+    QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
                      &VelMenuView::setActionsEnabled);
-    QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
                      &VelMenuView::selectionChangedSlot);
 }
@@ -68,9 +70,9 @@ void VelMenuViewPrivate::show()
 void VelMenuViewPrivate::showAnew()
 {
     selection.clear();
+    m_rootWatch.begin();
     menu.build();
     connectFiles();
-    m_rootWatch.begin();
     showRoot();
     find.clear();
     q->setActionsEnabled();

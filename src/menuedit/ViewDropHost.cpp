@@ -33,7 +33,7 @@ public:
     {
         GuardedDialog<QMessageBox> box(QMessageBox::Question, QFileSystemModel::tr("Attention"),
                                        QFileSystemModel::tr("%1 already exists. Overwrite?").arg(target),
-                                       QMessageBox::Yes, qobject_cast<QWidget *>(m_owner));
+                                       QMessageBox::Yes, asker());
         box->setTextFormat(Qt::PlainText);
         box->setDefaultButton(QMessageBox::No);
         return box.exec() != QMessageBox::No;
@@ -60,8 +60,25 @@ private:
     {
         if (result.sortAnew)
             m_view->invalidateSortOrder(result.folder);
+        forgetOrders(result.targets);
         m_view->showAndSelect(result.targets.constFirst());
         m_view->setActionsEnabled();
+    }
+
+    // What came may stand where another folder was whose order is still known.
+    void forgetOrders(const QStringList &paths) const
+    {
+        const QFileSystemModel *model = files();
+        for (const QString &path : paths) {
+            if (model && QFileInfo(path).isDir())
+                m_view->invalidateSortOrder(model->index(path));
+        }
+    }
+
+    QWidget *asker() const
+    {
+        auto *owner = qobject_cast<QWidget *>(m_owner);
+        return owner ? owner : m_view;
     }
 
     const QSortFilterProxyModel *proxy() const
@@ -69,14 +86,17 @@ private:
         return qobject_cast<const QSortFilterProxyModel *>(m_view->model());
     }
 
+    const QFileSystemModel *files() const
+    {
+        return proxy() ? qobject_cast<const QFileSystemModel *>(proxy()->sourceModel()) : nullptr;
+    }
+
     // Tells without a window: the user goes on undisturbed, the item tells why nothing happened.
     void tellAt(const QString &path, const QString &text) const
     {
         QModelIndex shown;
-        const auto *files =
-            proxy() ? qobject_cast<const QFileSystemModel *>(proxy()->sourceModel()) : nullptr;
-        if (files && QFileInfo::exists(path))
-            shown = proxy()->mapFromSource(files->index(path));
+        if (files() && QFileInfo::exists(path))
+            shown = proxy()->mapFromSource(files()->index(path));
         VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown);
     }
 

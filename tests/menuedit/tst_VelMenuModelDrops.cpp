@@ -7,12 +7,14 @@
 #include <VelMenuView.h>
 #include <menuedit/VelMenuModel.h>
 
+#include <QDir>
 #include <QMessageBox>
 #include <QMimeData>
 #include <QPushButton>
 #include <QSignalSpy>
 #include <QSortFilterProxyModel>
 #include <QToolTip>
+#include <QWindow>
 
 #include <algorithm>
 #include <memory>
@@ -41,6 +43,10 @@ private Q_SLOTS:
     void putsTheDirectoryFileBack();
     void takesAwayADirectoryFileThatWasNotThere();
     void namesTheItemToOverwriteAsItIsWritten();
+    void asksOverTheWindowOfTheView();
+    void showsWhatCameInsteadOfWhatWent_data();
+    void showsWhatCameInsteadOfWhatWent();
+    void ordersAFolderThatCameByItsOwnList();
     void tellsAtTheItemThatItWasLeft();
     void keepsThePlaceWhenRowsGoWhileItAsks_data();
     void keepsThePlaceWhenRowsGoWhileItAsks();
@@ -254,6 +260,62 @@ void tst_VelMenuModelDrops::namesTheItemToOverwriteAsItIsWritten()
     QVERIFY(!drop({QStringLiteral("menu/from/") + name}, Qt::MoveAction, 0));
 
     QVERIFY(modal.finished());
+}
+
+void tst_VelMenuModelDrops::asksOverTheWindowOfTheView()
+{
+    write(QStringLiteral("menu/to/x"), "old");
+    ModalDriver modal;
+    modal.handle([this](QWidget *box) {
+        QCOMPARE(box->parentWidget(), m_view.get());
+        QCOMPARE(box->windowHandle()->transientParent(), m_view->windowHandle());
+        qobject_cast<QMessageBox *>(box)->button(QMessageBox::Yes)->click();
+    });
+
+    QVERIFY(!drop({QStringLiteral("menu/from/x")}, Qt::MoveAction, 0));
+
+    QVERIFY(modal.finished());
+}
+
+void tst_VelMenuModelDrops::showsWhatCameInsteadOfWhatWent_data()
+{
+    QTest::addColumn<QByteArray>("more");
+    QTest::newRow("another name") << QByteArray();
+    QTest::newRow("hidden") << QByteArray("Hidden=true\n");
+}
+
+void tst_VelMenuModelDrops::showsWhatCameInsteadOfWhatWent()
+{
+    QFETCH(QByteArray, more);
+    const QByteArray head = "[Desktop Entry]\nType=Application\nExec=true\nName=";
+    const QString target = write(QStringLiteral("menu/to/d.desktop"), head + "Old\n" + more);
+    write(QStringLiteral("menu/from/d.desktop"), head + "New\n");
+    QTRY_COMPARE(m_model->rowCount(source(QStringLiteral("menu/to"))), 4);
+    QTRY_COMPARE(shown().contains(QStringLiteral("Old")), more.isEmpty());
+    QVERIFY(QFile::remove(target)); // nobody has noticed yet
+
+    QVERIFY(drop({QStringLiteral("menu/from/d.desktop")}, Qt::MoveAction, -1));
+
+    QVERIFY(shown().contains(QStringLiteral("New")));
+    QVERIFY(!shown().contains(QStringLiteral("Old")));
+}
+
+void tst_VelMenuModelDrops::ordersAFolderThatCameByItsOwnList()
+{
+    write(QStringLiteral("menu/from/to/a"), "a");
+    write(QStringLiteral("menu/from/to/b"), "b");
+    write(QStringLiteral("menu/from/to/c"), "c");
+    write(QStringLiteral("menu/from/to/.directory"),
+          "[Desktop Entry]\nType=Directory\nName=Other\nSortOrder=b;c;a;\n");
+    QVERIFY(QDir(path(QStringLiteral("menu/to"))).removeRecursively()); // nobody has noticed yet
+    QMimeData data;
+    data.setUrls({QUrl::fromLocalFile(path(QStringLiteral("menu/from/to")))});
+
+    QVERIFY(m_model->dropMimeData(&data, Qt::MoveAction, -1, -1, source(QStringLiteral("menu"))));
+
+    QTRY_COMPARE(shown().join(QString()), QStringLiteral("bca"));
+    QTRY_COMPARE(m_proxy->mapFromSource(source(QStringLiteral("menu/to"))).data().toString(),
+                 QStringLiteral("Other"));
 }
 
 void tst_VelMenuModelDrops::tellsAtTheItemThatItWasLeft()

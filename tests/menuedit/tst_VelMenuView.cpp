@@ -46,6 +46,7 @@ private Q_SLOTS:
     void startsAfreshOnAnotherDirectory();
     void goesAwayWhileItLoads();
     void assistsWhenTold();
+    void isNamedForThoseWhoCannotSeeIt();
 };
 
 void tst_VelMenuView::showsNothingAndMakesNothingWhereThereIsNoDirectory()
@@ -74,7 +75,6 @@ void tst_VelMenuView::showsNothingWhenTheDirectoryIsAFile()
     QCOMPARE(read(file), QByteArray("text"));
 }
 
-void tst_VelMenuView::staysEmptyWhenTheDirectoryVanishes()
 void tst_VelMenuView::showsADirectoryThatAppearsLater_data()
 {
     QTest::addColumn<QString>("directory");
@@ -133,6 +133,7 @@ void tst_VelMenuView::showsADirectoryThatReplacedAnother()
     QTRY_COMPARE(names(view, menu()).size(), 2);
 }
 
+void tst_VelMenuView::staysEmptyWhenTheDirectoryVanishes()
 {
     const QString entry = writeEntry(QStringLiteral("sub/a.desktop"), QStringLiteral("A"));
     VelMenuView view(menu(), -1, true);
@@ -405,6 +406,15 @@ void tst_VelMenuView::assistsWhenTold()
     QVERIFY(view.assistance());
     view.setAssistance(false);
     QCOMPARE(view.property("assistance"), QVariant(false));
+}
+
+void tst_VelMenuView::isNamedForThoseWhoCannotSeeIt()
+{
+    VelMenuView view(menu(), -1, true);
+    QCOMPARE(view.accessibleName(), QStringLiteral("Menu"));
+    view.setAccessibleName(QStringLiteral("Start menu"));
+    view.init(menu(), -1, true, nullptr);
+    QCOMPARE(view.accessibleName(), QStringLiteral("Start menu"));
 }
 
 VEL_TEST_MAIN(tst_VelMenuView)
