@@ -41,7 +41,7 @@ ClashBox::ClashBox(QWidget *parent)
 
     setFocusPolicy(Qt::NoFocus);
     updateHeight();
-    connect(verticalScrollBar(), &QScrollBar::rangeChanged, this, &ClashBox::updateFocusPolicy);
+    connect(verticalScrollBar(), &QScrollBar::rangeChanged, this, &ClashBox::followScrolling);
 }
 
 ClashBox::~ClashBox() = default;
@@ -152,11 +152,13 @@ void ClashBox::updateHeight()
 }
 
 // Lines without a button could not be scrolled to otherwise.
-void ClashBox::updateFocusPolicy()
+void ClashBox::followScrolling()
 {
     const bool scrolls = verticalScrollBar()->maximum() > 0;
     if (scrolls == (focusPolicy() != Qt::NoFocus))
         return;
     setFocusPolicy(scrolls ? Qt::StrongFocus : Qt::NoFocus);
+    const int gap = scrolls ? m_layout->spacing() : 0;
+    m_layout->setContentsMargins(isRightToLeft() ? gap : 0, 0, isRightToLeft() ? 0 : gap, 0);
     Q_EMIT tabStopsChanged();
 }

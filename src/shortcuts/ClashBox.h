@@ -52,7 +52,7 @@ private:
     void removeLines(const QVector<ClashLine *> &lines);
     void moveFocus();
     void updateHeight();
-    void updateFocusPolicy();
+    void followScrolling();
 
     QVBoxLayout *m_layout = nullptr;
     QLabel *m_hint = nullptr;

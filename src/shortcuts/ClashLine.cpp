@@ -58,6 +58,9 @@ ClashLine::ClashLine(Content content, QWidget *parent)
     auto *label = new QLabel(m_content.text, this);
     label->setTextFormat(Qt::PlainText);
     label->setWordWrap(true);
+    // Beside the icon, whatever the direction of the text is.
+    label->setAlignment((isRightToLeft() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute
+                        | Qt::AlignVCenter);
     layout->addWidget(label, 1);
     if (!m_content.otherName.isEmpty())
         addButtons(layout);

@@ -131,8 +131,7 @@ void EditShortcutsDialogPrivate::goTo(const QString &name)
     const QModelIndex row = m_model ? ClashingRows::first(*m_model, name, key) : QModelIndex();
     if (!row.isValid())
         return;
-    form.treeView->setCurrentIndex(row);
-    form.treeView->scrollTo(row);
+    form.treeView->goTo(row);
     form.treeView->setFocus();
 }
 

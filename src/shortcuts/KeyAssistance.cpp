@@ -20,6 +20,18 @@
 #include <QPushButton>
 #include <QRadioButton>
 
+namespace {
+
+QGridLayout *gridOf(const EditShortcutsForm &form)
+{
+    return static_cast<QGridLayout *>(form.groupBox->layout());
+}
+
+// The column of the key field that grows, so that the button beside it does not.
+constexpr int FieldColumn = 2;
+
+} // namespace
+
 KeyAssistance::KeyAssistance(const EditShortcutsForm &form, ShortcutsModel *shortcuts)
     : m_form(form)
     , m_model(shortcuts)
@@ -40,25 +52,25 @@ KeyAssistance::~KeyAssistance()
     disconnect(qApp, nullptr, this, nullptr);
     delete m_noneButton;
     delete m_clashBox;
+    gridOf(m_form)->setColumnStretch(FieldColumn, 0);
     describeKeyField(QString());
     showNames(QString());
 }
 
 void KeyAssistance::addNoneButton()
 {
-    auto *grid = static_cast<QGridLayout *>(m_form.groupBox->layout());
     m_noneButton = new QPushButton(EditShortcutsForm::tr("None"), m_form.groupBox);
     m_noneButton->setObjectName(QStringLiteral("noneButton"));
-    grid->addWidget(m_noneButton, 2, 3);
+    gridOf(m_form)->addWidget(m_noneButton, 2, FieldColumn + 1);
+    gridOf(m_form)->setColumnStretch(FieldColumn, 1);
     connect(m_noneButton, &QPushButton::clicked, this, &KeyAssistance::noneChosen);
     m_noneButton->show();
 }
 
 void KeyAssistance::addClashBox()
 {
-    auto *grid = static_cast<QGridLayout *>(m_form.groupBox->layout());
     m_clashBox = new ClashBox(m_form.groupBox);
-    grid->addWidget(m_clashBox, 3, 0, 1, 4);
+    gridOf(m_form)->addWidget(m_clashBox, 3, 0, 1, FieldColumn + 2);
     connect(m_clashBox, &ClashBox::goToRequested, this, &KeyAssistance::goToRequested);
     connect(m_clashBox, &ClashBox::takeOverRequested, this, &KeyAssistance::takeOverRequested);
     connect(m_clashBox, &ClashBox::tabStopsChanged, this, &KeyAssistance::orderTabs);

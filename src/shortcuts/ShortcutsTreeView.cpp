@@ -227,6 +227,14 @@ void ShortcutsTreeView::leaveHiddenRow()
     }
 }
 
+void ShortcutsTreeView::goTo(const QModelIndex &row)
+{
+    setCurrentIndex(row);
+    if (isRowHidden(row.row(), row.parent()))
+        refreshRows();
+    scrollTo(row);
+}
+
 void ShortcutsTreeView::setFilter(const ShortcutFilter &filter, const Count &tell)
 {
     const bool wasActive = m_filter.isActive();

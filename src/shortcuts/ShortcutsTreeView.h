@@ -41,6 +41,9 @@ public:
     /// The pending key of the current item; empty when that is no shortcut.
     QKeySequence currentKeySequence() const;
 
+    /// Makes a shortcut current and seen, whatever the filter hides.
+    void goTo(const QModelIndex &row);
+
     /// Hears how many shortcuts a filter lets be seen.
     using Count = std::function<void(int)>;
 
