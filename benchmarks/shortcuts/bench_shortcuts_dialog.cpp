@@ -83,6 +83,13 @@ void showOurs(Application *application)
     showUntilPainted(&dialog);
 }
 
+void showAssisted(Application *application)
+{
+    EditShortcutsDialog dialog(&application->model);
+    dialog.setAssistance(true);
+    showUntilPainted(&dialog);
+}
+
 void showPeer(Application *application)
 {
     KShortcutsDialog dialog;
@@ -97,6 +104,15 @@ bool compare(const char *title, Application *application, double limit)
     comparison.add(
         "KShortcutsDialog", [application] { showPeer(application); }, limit);
     return comparison.run(9);
+}
+
+bool compareAssisted(const char *title, Application *application)
+{
+    Comparison comparison(title);
+    comparison.add("with assistance", [application] { showAssisted(application); });
+    comparison.add(
+        "without", [application] { showOurs(application); }, 1.3);
+    return comparison.run(31);
 }
 
 } // namespace
@@ -115,6 +131,9 @@ int main(int argc, char **argv)
 
     bool kept = compare("shortcut dialog, 500 actions", &small, 0.20);
     kept = compare("shortcut dialog, 2,000 actions", &large, 0.12) && kept;
+
+    kept = compareAssisted("shortcut dialog with assistance, 500 actions", &small) && kept;
+    kept = compareAssisted("shortcut dialog with assistance, 2,000 actions", &large) && kept;
 
     Comparison growth("shortcut dialog: 2,000 actions against 500");
     growth.add("2,000 actions", [&large] { showOurs(&large); });
