@@ -5,6 +5,7 @@
 
 #include "KeyColumn.h"
 #include "NoMatchLabel.h"
+#include "SchemeMenu.h"
 #include "ShortcutFilterBar.h"
 #include "ShortcutsTreeView.h"
 #include "TreeAssistance.h"
@@ -14,6 +15,7 @@
 #include <QBoxLayout>
 #include <QEvent>
 #include <QLineEdit>
+#include <QPushButton>
 #include <QScreen>
 #include <QSettings>
 
@@ -41,6 +43,14 @@ QVector<QWidget *> tabOrder(QWidget *window)
     return widgets;
 }
 
+void putBehind(QWidget *last, const QVector<QWidget *> &widgets)
+{
+    for (QWidget *widget : widgets) {
+        QWidget::setTabOrder(last, widget);
+        last = widget;
+    }
+}
+
 } // namespace
 
 EditShortcutsAssistance::EditShortcutsAssistance(const EditShortcutsForm &form, ShortcutsModel *shortcuts)
@@ -49,7 +59,10 @@ EditShortcutsAssistance::EditShortcutsAssistance(const EditShortcutsForm &form, 
     , m_tree(std::make_unique<TreeAssistance>(form.treeView, shortcuts))
 {
     connect(m_tree.get(), &TreeAssistance::keysChanged, this, &EditShortcutsAssistance::keysChanged);
+    const QVector<QWidget *> former = tabOrder(dialog());
     addFilterBar();
+    addSchemes();
+    putBehind(tabOrder(dialog()).constLast(), former);
     restoreSizes();
     dialog()->installEventFilter(this);
 }
@@ -58,6 +71,7 @@ EditShortcutsAssistance::~EditShortcutsAssistance()
 {
     if (dialog()->isVisible())
         rememberSizes();
+    qobject_cast<QBoxLayout *>(dialog()->layout())->setStretchFactor(m_form.treeView, 0);
     m_form.treeView->setFilter(ShortcutFilter());
 }
 
@@ -93,20 +107,13 @@ void EditShortcutsAssistance::rememberSizes() const
         settings.setValue(keyColumnKey(), width);
 }
 
-// Above the tree, also on the way of the Tab key.
 void EditShortcutsAssistance::addFilterBar()
 {
-    const QVector<QWidget *> below = tabOrder(dialog());
     m_filterBar = std::make_unique<ShortcutFilterBar>(dialog());
     m_noMatchLabel = std::make_unique<NoMatchLabel>(m_form.treeView);
     auto *layout = qobject_cast<QBoxLayout *>(dialog()->layout());
     layout->insertWidget(layout->indexOf(m_form.treeView), m_filterBar.get());
-    QWidget *last = tabOrder(dialog()).constLast();
-    for (QWidget *widget : below) {
-        QWidget::setTabOrder(last, widget);
-        last = widget;
-    }
-
+    layout->setStretchFactor(m_form.treeView, 1);
     if (!dialog()->isVisible())
         m_filterBar->filterEdit()->setFocus();
 
@@ -118,6 +125,17 @@ void EditShortcutsAssistance::addFilterBar()
         m_form.treeView->selectFirstShortcut();
         m_form.treeView->setFocus();
     });
+}
+
+void EditShortcutsAssistance::addSchemes()
+{
+    auto *button = new QPushButton(tr("Schemes"), m_filterBar.get());
+    button->setObjectName(QStringLiteral("schemesButton"));
+    button->setAutoDefault(false);
+    auto *menu = new SchemeMenu(m_model, button);
+    button->setMenu(menu);
+    m_filterBar->addButton(button);
+    connect(menu, &SchemeMenu::keysChanged, this, &EditShortcutsAssistance::keysChanged);
 }
 
 void EditShortcutsAssistance::applyFilter()

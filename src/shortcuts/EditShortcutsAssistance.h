@@ -43,6 +43,7 @@ protected:
 private:
     QWidget *dialog() const;
     void addFilterBar();
+    void addSchemes();
     void restoreSizes();
     void rememberSizes() const;
     void applyFilter();
