@@ -22,6 +22,9 @@ namespace fs = std::filesystem;
 
 namespace {
 
+// By this much of a name it is ordered: marks in an odd order make a collator take very long.
+constexpr int LongestName = 255;
+
 struct MenuItem
 {
     std::string id;
@@ -75,7 +78,8 @@ void sortByShownName(MenuItems *items)
     QCollator collator(QLocale(QString::fromStdString(velLanguageCode())));
     collator.setCaseSensitivity(Qt::CaseInsensitive);
     std::sort(items->begin(), items->end(), [&collator](const MenuItem &left, const MenuItem &right) {
-        const int order = collator.compare(left.shownName, right.shownName);
+        const int order =
+            collator.compare(left.shownName.left(LongestName), right.shownName.left(LongestName));
         return order != 0 ? order < 0 : left.fileName < right.fileName;
     });
 }

@@ -33,6 +33,10 @@ enum class Rule {
 /// The rule for the children of a folder with that file name.
 Rule ruleOf(const QString &folderName);
 
+/// Compares two names as the language does, beyond the longest that a file may have by the characters:
+/// marks in an odd order would make the language's way take longer than anybody waits.
+int compareNames(const QString &left, const QString &right);
+
 /// Negative where \a left is shown above \a right, positive where it is shown below, 0 where they
 /// are equal.
 template <typename Item>
@@ -48,7 +52,7 @@ int compare(Rule rule, const Item &left, const Item &right)
         return places.left < places.right ? -1 : 1;
     if (left.isFolder() != right.isFolder())
         return left.isFolder() ? -1 : 1;
-    return QString::localeAwareCompare(left.name(), right.name());
+    return compareNames(left.name(), right.name());
 }
 
 /// Whether an item with that \a comparison to another is shown below it; of two with the same

@@ -11,6 +11,8 @@
 
 #include <unistd.h>
 
+#include <ctime>
+
 /// Which applications stand in a start menu, in which folders, and in which order.
 class tst_startmenu : public StartMenuTestCase
 {
@@ -29,6 +31,7 @@ private Q_SLOTS:
     void givesEveryFolderAnIconOfItsOwn();
     void ordersTheEntriesByTheirShownNames();
     void ordersEntriesOfOneNameByTheirFiles();
+    void ordersEntriesSoonWhoseNamesAreDear();
     void listsOddFileNames();
     void leavesOutWhatIsNotDisplayable_data();
     void leavesOutWhatIsNotDisplayable();
@@ -231,6 +234,21 @@ void tst_startmenu::ordersEntriesOfOneNameByTheirFiles()
     QCOMPARE(
         sortOrder(inMenu(QStringLiteral("Game"))),
         QStringList({QStringLiteral("a.desktop"), QStringLiteral("b.desktop"), QStringLiteral("z.desktop")}));
+}
+
+// In processor time, of which a quadratic way takes minutes.
+void tst_startmenu::ordersEntriesSoonWhoseNamesAreDear()
+{
+    const QByteArray marks = QByteArray("\u0301").repeated(100000) + QByteArray("\u0316").repeated(100000);
+    for (const char *name : {"a", "A"})
+        write(QStringLiteral("home/applications/%1.desktop").arg(QLatin1String(name)),
+              "[Desktop Entry]\nType=Application\nName=" + QByteArray(name) + marks + name
+                  + "\nExec=true\nCategories=Game;\n");
+    qputenv("LC_ALL", "de_DE.UTF-8");
+    const std::clock_t start = std::clock();
+    QVERIFY(create());
+    QVERIFY((std::clock() - start) / CLOCKS_PER_SEC < 10);
+    QCOMPARE(sortOrder(inMenu(QStringLiteral("Game"))).size(), 2);
 }
 
 void tst_startmenu::listsOddFileNames()
