@@ -40,16 +40,16 @@ bool isUserInput(QEvent::Type type)
 
 } // namespace
 
-LongWork::LongWork(QWidget *owner, const QString &title, const QString &text)
+LongWork::LongWork(QWidget *owner, const QString &title, const QString &text, End end)
     : m_owner(owner)
     , m_title(title)
     , m_text(text)
+    , m_end(end)
     , m_cursor(std::make_unique<WaitCursor>())
 {
     m_sinceBegun.start();
     m_sinceEvents.start();
-    if (!m_owner)
-        end();
+    m_isEnded = !m_owner;
 }
 
 LongWork::~LongWork()
@@ -63,9 +63,9 @@ bool LongWork::goOn()
         return !m_isEnded;
     if (!m_window && m_sinceBegun.elapsed() >= BeforeWindow)
         showWindow();
+    showProgress();
     QCoreApplication::processEvents(m_window ? QEventLoop::AllEvents : QEventLoop::ExcludeUserInputEvents);
-    if (!m_owner)
-        end();
+    m_isEnded = m_isEnded || !m_owner;
     m_sinceEvents.start();
     return !m_isEnded;
 }
@@ -83,11 +83,28 @@ void LongWork::showWindow()
     auto *label = new QLabel(m_text, m_window);
     label->setTextFormat(Qt::PlainText);
     m_window->setLabel(label);
-    m_window->setCancelButtonText(QCoreApplication::translate("VelMenuView", "Cancel"));
+    if (m_end == End::ByUser)
+        m_window->setCancelButtonText(QCoreApplication::translate("VelMenuView", "Cancel"));
+    else
+        m_window->setCancelButton(nullptr);
     m_window->setRange(0, 0);
-    connect(m_window, &QProgressDialog::canceled, this, &LongWork::end);
+    connect(m_window, &QProgressDialog::canceled, this, &LongWork::endByUser);
     QCoreApplication::instance()->installEventFilter(this);
     m_window->show();
+}
+
+void LongWork::setProgress(int done, int expected)
+{
+    m_done = done;
+    m_expected = expected;
+}
+
+void LongWork::showProgress()
+{
+    if (!m_window || m_expected == 0)
+        return;
+    m_window->setMaximum(m_expected);
+    m_window->setValue(m_done);
 }
 
 bool LongWork::isOwnWindow(const QObject *object) const
@@ -104,11 +121,11 @@ bool LongWork::isOwnWindow(const QObject *object) const
 bool LongWork::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::Close && !isOwnWindow(watched))
-        end();
+        endByUser();
     if (!isUserInput(event->type()))
         return false;
     if (event->type() == QEvent::KeyPress && static_cast<QKeyEvent *>(event)->key() == Qt::Key_Escape) {
-        end();
+        endByUser();
         return true;
     }
     return !isOwnWindow(watched);

@@ -26,9 +26,14 @@ class LongWork : public QObject
     Q_OBJECT
 
 public:
+    enum class End {
+        ByUser, ///< as said above
+        ByItself ///< only when the work is done
+    };
+
     /// For work that begins now, on behalf of \a owner, which may go away meanwhile. \a title is
     /// that of the window, \a text says in plain text what goes on.
-    LongWork(QWidget *owner, const QString &title, const QString &text);
+    LongWork(QWidget *owner, const QString &title, const QString &text, End end = End::ByUser);
     ~LongWork() override;
 
     /**
@@ -39,19 +44,26 @@ public:
      */
     bool goOn();
 
+    /// Shows that \a done of \a expected pieces are done; of none it is shown that work goes on.
+    void setProgress(int done, int expected);
+
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
     void showWindow();
+    void showProgress();
     bool isOwnWindow(const QObject *object) const;
-    void end() { m_isEnded = true; }
+    void endByUser() { m_isEnded = m_isEnded || m_end == End::ByUser; }
 
     const QPointer<QWidget> m_owner;
     const QString m_title;
     const QString m_text;
+    const End m_end;
     QElapsedTimer m_sinceBegun;
     QElapsedTimer m_sinceEvents;
     std::unique_ptr<WaitCursor> m_cursor;
     QPointer<QProgressDialog> m_window;
     bool m_isEnded = false;
+    int m_done = 0;
+    int m_expected = 0;
 };

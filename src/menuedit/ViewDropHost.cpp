@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "FileWork.h"
 #include "MenuDropHost.h"
 #include "ShownOrder.h"
 #include "VelMenuView.h"
@@ -8,6 +9,7 @@
 
 #include <frame/GuardedDialog.h>
 
+#include <QCoreApplication>
 #include <QFileInfo>
 #include <QFileSystemModel>
 #include <QMessageBox>
@@ -43,6 +45,19 @@ public:
     {
         const QSortFilterProxyModel *shown = m_view ? proxy() : nullptr;
         return shown ? std::optional<QStringList>(ShownOrder::with(*shown, name, row, folder)) : std::nullopt;
+    }
+
+    std::unique_ptr<FileProgress> follow(Qt::DropAction action) override
+    {
+        if (!m_view)
+            return MenuDropHost::follow(action);
+        const bool isMove = action == Qt::MoveAction;
+        return std::make_unique<FileWork>(
+            m_view,
+            isMove ? QCoreApplication::translate("VelMenuView", "Move")
+                   : QCoreApplication::translate("VelMenuView", "Copy"),
+            isMove ? QCoreApplication::translate("VelMenuView", "Moving files...")
+                   : QCoreApplication::translate("VelMenuView", "Copying files..."));
     }
 
     void finished(const DropResult &result) override
