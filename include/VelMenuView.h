@@ -13,6 +13,7 @@
 
 #include <memory>
 
+class QAction;
 class QMimeData;
 class VelMenuViewPrivate;
 
@@ -101,6 +102,22 @@ public:
      * @param text the words, apart by blanks; empty to show everything again
      */
     void setFilter(const QString &text);
+
+    /**
+     * The command that takes back what was done to the menu last: new items, edits, deletions,
+     * moves, copies, drops, another order, a new default menu.
+     *
+     * It belongs to the view, works with Ctrl+Z while the view has the keyboard, and is none of
+     * its actions(). Its text says what it takes back, for instance "Undo deletion of folder Games
+     * (12 entries)". Where the menu is not as it was left any more, nothing is taken back, and
+     * told() says why. A further init() forgets what was done.
+     *
+     * @return null while the view is without assistance() or cannot be edited
+     */
+    QAction *undoAction() const;
+
+    /// The command that does again what was taken back last, with Ctrl+Shift+Z; see undoAction().
+    QAction *redoAction() const;
 
     /// The menu directory that the view was built on, as it was given.
     QString menuDir() const;
@@ -232,7 +249,8 @@ public Q_SLOTS:
      * @return whether it was edited and saved
      */
     bool slotEdit();
-    /// Deletes the selected item, a folder with everything in it, after asking.
+    /// Deletes the selected item, a folder with everything in it, after asking. With assistance()
+    /// it goes into the trash without a question, and only where there is none is asked.
     void slotDel();
     /**
      * Runs the selected entry with the desktop's program "vel-open", which lives on when the

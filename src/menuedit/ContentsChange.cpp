@@ -23,7 +23,8 @@ QString writtenAt(const QString &path)
 } // namespace
 
 ContentsChange::ContentsChange(const QString &path)
-    : m_path(writtenAt(path))
+    : m_named(path)
+    , m_path(writtenAt(path))
     , m_before(FileContents::of(ExactMove::native(m_path)))
 {
 }

@@ -20,6 +20,7 @@ public:
     /// Whether it was written, and can be put back.
     bool hasHappened() const;
 
+    QStringList paths() const override { return {m_named}; }
     void note() override;
     Refusal check() const override;
     Refusal undo() override;
@@ -28,6 +29,7 @@ public:
 private:
     Refusal put(const FileContents &wanted, const FileContents &expected);
 
+    const QString m_named; // as it was given
     const QString m_path;
     const std::optional<FileContents> m_before;
     FileContents m_after;

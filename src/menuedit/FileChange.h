@@ -5,6 +5,8 @@
 
 #include "Refusal.h"
 
+#include <QStringList>
+
 /**
  * One thing on disk that an operation of the user changed, and can be changed back.
  *
@@ -19,6 +21,8 @@ public:
     FileChange(const FileChange &) = delete;
     FileChange &operator=(const FileChange &) = delete;
 
+    /// The places in which it puts or takes something.
+    virtual QStringList paths() const = 0;
     /// Looks how the disk stands after the operation, after undo() or after redo().
     virtual void note() = 0;
     /// Whether the disk still stands as it was noted; why not.

@@ -13,6 +13,15 @@ void FileStep::add(std::unique_ptr<FileChange> change)
     m_changes.push_back(std::move(change));
 }
 
+QStringList FileStep::paths() const
+{
+    QStringList paths;
+    for (const auto &change : m_changes)
+        paths += change->paths();
+    paths.removeDuplicates();
+    return paths;
+}
+
 void FileStep::note()
 {
     for (const auto &change : m_changes)

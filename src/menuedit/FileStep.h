@@ -22,6 +22,8 @@ public:
 
     /// Adds what was changed next.
     void add(std::unique_ptr<FileChange> change);
+    /// The places in which something comes or goes.
+    QStringList paths() const;
     bool isEmpty() const { return m_changes.empty(); }
     /// Looks how the disk stands, when all changes are there.
     void note();

@@ -83,6 +83,7 @@ DropResult MenuDrop::reorder()
     // What is gone must not be listed.
     if (!OnDisk::exists(m_request.sources.constFirst()))
         return refused({FileTransfer::Failure::SourceGone, m_targets.constFirst(), QString()});
+    m_host.begins(m_request.sources, m_targets, m_request.action, m_folder);
     if (m_request.action == Qt::MoveAction)
         write(
             m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder));
@@ -100,6 +101,7 @@ DropResult MenuDrop::bringIn()
     if (isListed)
         order =
             m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder);
+    m_host.begins(m_request.sources, m_targets, m_request.action, m_folder);
     if (m_request.action == Qt::LinkAction) {
         if (!link())
             return {};

@@ -57,6 +57,17 @@ public:
     /// the source row \a row; nothing where nobody shows an order.
     virtual std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) = 0;
 
+    /// The \a sources are about to become the \a targets in \a folder, a path, whose order may be
+    /// written too. What does not lie elsewhere stays where it is.
+    virtual void begins(const QStringList &sources, const QStringList &targets, Qt::DropAction action,
+                        const QString &folder)
+    {
+        Q_UNUSED(sources)
+        Q_UNUSED(targets)
+        Q_UNUSED(action)
+        Q_UNUSED(folder)
+    }
+
     /**
      * Returns what follows the copying or moving of files. An event loop may run whenever it is
      * asked whether to go on, in which the model and this object may be deleted; it says no then.

@@ -6,9 +6,11 @@
 #include "EntryDisplay.h"
 #include "FileProgress.h"
 #include "MenuFind.h"
+#include "MenuHistory.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
 #include "ShownMenu.h"
+#include "StepRecorder.h"
 #include "TreeRemoval.h"
 #include "VelDesktopEntryEditDialog.h"
 #include "VelMenuModel.h"
@@ -41,12 +43,13 @@ void takeBack(const QString &path, FreeName::Kind kind)
 } // namespace
 
 MenuEditing::MenuEditing(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
-                         MenuVoice &voice)
+                         MenuVoice &voice, MenuHistory &history)
     : m_view(view)
     , m_menu(menu)
     , m_selection(selection)
     , m_find(find)
     , m_voice(voice)
+    , m_history(history)
 {
 }
 
@@ -65,8 +68,13 @@ bool MenuEditing::createNew(FreeName::Kind kind)
     const QString path = folder + QLatin1Char('/') + name.fileName;
 
     const QPointer<MenuEditing> self(this);
+    const std::unique_ptr<StepRecorder> recorder = m_history.record();
+    if (recorder)
+        recorder->mayMake(path);
     const bool isWritten = writeNew(path, kind, name.number);
     const bool kept = isWritten && offerNew(path, kind);
+    if (self)
+        m_history.add(recorder, StepText(StepText::Kind::Create, m_history.nameOf(path)), {path});
     if (self)
         Q_EMIT changed();
     if (self && !isWritten)
@@ -120,7 +128,7 @@ bool MenuEditing::offerNew(const QString &path, FreeName::Kind kind)
     m_find.clear();
     m_selection.show(path);
     const QPointer<MenuEditing> self(this);
-    if (edit(path))
+    if (openEditor(path))
         return true;
     takeBack(path, kind);
     if (!self)
@@ -131,6 +139,18 @@ bool MenuEditing::offerNew(const QString &path, FreeName::Kind kind)
 }
 
 bool MenuEditing::edit(const QString &path)
+{
+    const QPointer<MenuEditing> self(this);
+    const std::unique_ptr<StepRecorder> recorder = m_history.record();
+    if (recorder)
+        recorder->mayWrite(QFileInfo(path).isDir() ? EntryPath::recordFileOf(path) : path);
+    const bool isSaved = openEditor(path);
+    if (self)
+        m_history.add(recorder, StepText(StepText::Kind::Edit, m_history.nameOf(path)), {path});
+    return isSaved;
+}
+
+bool MenuEditing::openEditor(const QString &path)
 {
     if (path.isEmpty())
         return false;

@@ -10,6 +10,7 @@
 #include <QString>
 
 class MenuFind;
+class MenuHistory;
 class MenuSelection;
 class MenuVoice;
 class QTreeView;
@@ -26,7 +27,7 @@ class MenuEditing : public QObject
 
 public:
     MenuEditing(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
-                MenuVoice &voice);
+                MenuVoice &voice, MenuHistory &history);
     ~MenuEditing() override;
 
     /// Creates a folder or an entry where the selection says and opens the editor on it; whether
@@ -44,6 +45,7 @@ Q_SIGNALS:
 private:
     QString selectedFolder() const;
     bool writeNew(const QString &path, FreeName::Kind kind, const QString &number);
+    bool openEditor(const QString &path);
     bool offerNew(const QString &path, FreeName::Kind kind);
     void tellWhatStays(const QString &path, const QString &left, const QString &reason);
     void tell(const QString &text, const QModelIndex &at = QModelIndex());
@@ -53,4 +55,5 @@ private:
     MenuSelection &m_selection;
     MenuFind &m_find;
     MenuVoice &m_voice;
+    MenuHistory &m_history;
 };

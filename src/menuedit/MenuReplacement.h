@@ -22,6 +22,7 @@ public:
     MenuReplacement(const QString &folder, const QString &previous, std::unique_ptr<KeptThing> older);
     ~MenuReplacement() override;
 
+    QStringList paths() const override { return {m_folder, m_previous}; }
     void note() override;
     Refusal check() const override;
     Refusal undo() override;

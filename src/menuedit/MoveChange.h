@@ -21,6 +21,7 @@ public:
     /// Whether it was moved.
     bool hasHappened() const;
 
+    QStringList paths() const override { return {m_from.path(), m_to.path()}; }
     void note() override;
     Refusal check() const override;
     Refusal undo() override;

@@ -24,6 +24,7 @@ public:
     PresenceChange(const QString &path, std::unique_ptr<KeptThing> deleted);
     ~PresenceChange() override;
 
+    QStringList paths() const override { return {path()}; }
     void note() override;
     Refusal check() const override;
     Refusal undo() override;

@@ -19,7 +19,7 @@ QString StartMenu::directory()
     return QString::fromStdString(GetVelDir(VelDir::StartMenu));
 }
 
-bool StartMenu::recreate(QWidget *asker, MenuVoice &voice)
+bool StartMenu::recreate(QWidget *asker, MenuVoice &voice, const std::function<void()> &begins)
 {
     const QPointer<QWidget> self(asker);
     const auto answer = MessageBox::show(
@@ -31,6 +31,7 @@ bool StartMenu::recreate(QWidget *asker, MenuVoice &voice)
     bool isBuilt = false;
     {
         const WaitCursor waiting;
+        begins();
         isBuilt = CreateStartMenu(QFile::encodeName(directory()).constData(), nullptr);
     }
     if (isBuilt)

@@ -5,6 +5,8 @@
 
 #include <QString>
 
+#include <functional>
+
 class MenuVoice;
 class QWidget;
 
@@ -21,8 +23,9 @@ QString directory();
  * menu cannot be built, the old one stays, a warning is logged, and the user is told.
  *
  * @param voice goes with \a asker
+ * @param begins called when the user wants it, before anything is touched
  * @return whether the user wanted it
  */
-bool recreate(QWidget *asker, MenuVoice &voice);
+bool recreate(QWidget *asker, MenuVoice &voice, const std::function<void()> &begins);
 
 } // namespace StartMenu

@@ -169,6 +169,16 @@ void VelMenuModel::noteRecordFile(const QString &path)
     m_cache->forgetPlain(path);
 }
 
+QStringList VelMenuModel::release(const QStringList &paths)
+{
+    return m_watch->release(paths);
+}
+
+void VelMenuModel::watchAgain(const QStringList &folders)
+{
+    m_watch->watchAgain(folders);
+}
+
 void VelMenuModel::setItemName(const QString &path, const QString &name)
 {
     m_cache->setDisplay(path, {name, false});

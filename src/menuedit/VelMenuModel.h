@@ -58,6 +58,10 @@ public:
     void forgetItemInfo(const QString &path);
     /// To be told that the folder at \a path has a record file now, if it had none.
     void noteRecordFile(const QString &path);
+    /// Stops watching the folders among the \a paths, which are about to move, and those below
+    /// them; returns what is to be watched again where it is still there.
+    QStringList release(const QStringList &paths);
+    void watchAgain(const QStringList &folders);
     /// Shows \a path as \a name, without reading the file.
     void setItemName(const QString &path, const QString &name);
 

@@ -7,7 +7,6 @@
 #include "ItemTransfer.h"
 #include "MenuClipboard.h"
 #include "MenuReordering.h"
-#include "StartMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuViewPrivate.h"
@@ -41,7 +40,6 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
         setParent(parent);
     const bool isAssisted = d && d->isAssisted;
     d.reset(new VelMenuViewPrivate(this, menuDir, editable));
-    d->isAssisted = isAssisted;
 
     setDefaultDropAction(Qt::MoveAction);
     setHeaderHidden(true);
@@ -50,6 +48,7 @@ void VelMenuView::init(const QString &menuDir, int iconSize, bool editable, QWid
         setIconSize(QSize(iconSize, iconSize));
     setDragDropMode(editable ? QAbstractItemView::DragDrop : QAbstractItemView::NoDragDrop);
     d->show();
+    d->setAssisted(isAssisted);
 }
 
 bool VelMenuView::assistance() const
@@ -59,9 +58,19 @@ bool VelMenuView::assistance() const
 
 void VelMenuView::setAssistance(bool assistance)
 {
-    d->isAssisted = assistance;
+    d->setAssisted(assistance);
     if (!assistance)
         d->filter.setText(QString());
+}
+
+QAction *VelMenuView::undoAction() const
+{
+    return d->history.undoAction();
+}
+
+QAction *VelMenuView::redoAction() const
+{
+    return d->history.redoAction();
 }
 
 QString VelMenuView::menuDir() const
@@ -158,7 +167,7 @@ bool VelMenuView::slotEdit()
 
 void VelMenuView::slotDel()
 {
-    d->editing.remove(selectedPath());
+    d->removeSelected();
 }
 
 bool VelMenuView::fixSortOrderForNew(const QString &name, int row, const QModelIndex &folder)
@@ -258,9 +267,5 @@ void VelMenuView::slotExe()
 
 void VelMenuView::slotRecreate()
 {
-    const QPointer<VelMenuView> self(this);
-    if (!StartMenu::recreate(this, d->voice) || !self)
-        return;
-    d->showAnew();
-    Q_EMIT changed();
+    d->recreate();
 }

@@ -5,10 +5,14 @@
 
 #include "ItemKey.h"
 #include "MenuReordering.h"
+#include "RebuildRecord.h"
 #include "StartMenu.h"
+#include "StepRecorder.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuView.h"
+
+#include <frame/EntryPath.h>
 
 #include <QAction>
 #include <QCoreApplication>
@@ -17,6 +21,7 @@
 #include <QKeyEvent>
 #include <QMenu>
 #include <QMetaMethod>
+#include <QPointer>
 
 VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directory, bool isEditable)
     : q(view)
@@ -25,7 +30,9 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , selection(view, menu)
     , find(view, menu, selection, voice)
     , filter(view, menu, selection, voice)
-    , editing(view, menu, selection, find, voice)
+    , history(view, menu, selection, find, voice)
+    , editing(view, menu, selection, find, voice, history)
+    , deletion(view, menu, selection, find, voice, history)
     , m_rootWatch(menu.directory())
 {
 }
@@ -40,6 +47,24 @@ VelMenuViewPrivate::~VelMenuViewPrivate()
 MenuVoice &VelMenuViewPrivate::voiceOf(const VelMenuView &view)
 {
     return view.d->voice;
+}
+
+MenuHistory &VelMenuViewPrivate::historyOf(const VelMenuView &view)
+{
+    return view.d->history;
+}
+
+void VelMenuViewPrivate::setAssisted(bool assisted)
+{
+    isAssisted = assisted;
+    history.setOn(assisted && menu.isEditable());
+    historyEnd.reset();
+    if (!history.isOn() || !actions)
+        return;
+    QAction *first = actions->action(MenuActions::NewFolder);
+    historyEnd = std::make_unique<QAction>();
+    historyEnd->setSeparator(true);
+    actions->menu()->insertActions(first, {history.undoAction(), history.redoAction(), historyEnd.get()});
 }
 
 void VelMenuViewPrivate::show()
@@ -59,6 +84,10 @@ void VelMenuViewPrivate::show()
     if (menu.isEditable())
         makeEditable();
     QObject::connect(&editing, &MenuEditing::changed, q, &VelMenuView::changed);
+    QObject::connect(&deletion, &MenuDeletion::changed, q, &VelMenuView::changed);
+    QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::setActionsEnabled);
+    QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::changed);
+    QObject::connect(&history, &MenuHistory::replaced, q, [this] { showAnew(); });
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
     QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
@@ -84,11 +113,49 @@ void VelMenuViewPrivate::moveSelected(bool up)
     if (!item.isValid())
         return;
     const QString path = selection.path();
+    const std::unique_ptr<StepRecorder> recorder = history.record();
+    if (recorder)
+        recorder->mayWrite(EntryPath::recordFileOf(QFileInfo(path).path()));
     MenuReordering::move(menu, voice, item, up);
     selection.reveal(path);
     find.clear();
     q->setActionsEnabled();
+    const QPointer<VelMenuView> view(q);
     Q_EMIT q->changed();
+    if (view)
+        history.add(recorder, StepText(StepText::Kind::Reorder, history.nameOf(path)), {path});
+}
+
+void VelMenuViewPrivate::removeSelected()
+{
+    if (!history.isOn()) {
+        editing.remove(selection.path());
+        return;
+    }
+    QStringList paths;
+    const QModelIndexList selected = q->selectionModel()->selectedIndexes();
+    for (const QModelIndex &index : selected)
+        paths.append(menu.files().filePath(menu.proxy().mapToSource(index)));
+    deletion.remove(paths);
+}
+
+void VelMenuViewPrivate::recreate()
+{
+    const QPointer<VelMenuView> view(q);
+    const std::unique_ptr<StepRecorder> recorder = history.record();
+    std::unique_ptr<RebuildRecord> rebuilding;
+    const auto begin = [&] {
+        if (recorder)
+            rebuilding = std::make_unique<RebuildRecord>(menu.directory(), *recorder);
+    };
+    if (!StartMenu::recreate(q, voice, begin) || !view)
+        return;
+    if (rebuilding)
+        rebuilding->finish();
+    showAnew();
+    Q_EMIT q->changed();
+    if (view)
+        history.add(recorder, StepText(StepText::Kind::Rebuild), {});
 }
 
 bool VelMenuViewPrivate::takeKey(const QKeyEvent &event)

@@ -4,9 +4,11 @@
 #pragma once
 
 #include "MenuActions.h"
+#include "MenuDeletion.h"
 #include "MenuEditing.h"
 #include "MenuFilter.h"
 #include "MenuFind.h"
+#include "MenuHistory.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
 #include "RootWatch.h"
@@ -16,6 +18,7 @@
 
 #include <memory>
 
+class QAction;
 class QKeyEvent;
 class VelMenuView;
 
@@ -35,6 +38,8 @@ public:
 
     /// How the parts of \a view tell the user.
     static MenuVoice &voiceOf(const VelMenuView &view);
+    /// What was done to the menu of \a view.
+    static MenuHistory &historyOf(const VelMenuView &view);
 
     VelMenuView *const q;
     /// See VelMenuView::setAssistance().
@@ -44,15 +49,25 @@ public:
     MenuSelection selection;
     MenuFind find;
     MenuFilter filter;
+    MenuHistory history;
     MenuEditing editing;
+    MenuDeletion deletion;
     /// Null where the view is only to be looked at.
     std::unique_ptr<MenuActions> actions;
+    /// The line under the commands of the history in the menu of the actions.
+    std::unique_ptr<QAction> historyEnd;
 
+    /// Switches on or off what goes beyond the plain tree.
+    void setAssisted(bool assisted);
     /// Has the view show the menu.
     void show();
     /// Shows the menu directory after it was replaced.
     void showAnew();
     void moveSelected(bool up);
+    /// Deletes the selected items.
+    void removeSelected();
+    /// Builds the default menu anew.
+    void recreate();
     /// Does what a key does to the item that the keyboard is on; whether it does anything.
     bool takeKey(const QKeyEvent &event);
 

@@ -3,10 +3,13 @@
 
 #include "FileWork.h"
 #include "MenuDropHost.h"
+#include "MenuHistory.h"
 #include "ShownOrder.h"
+#include "StepRecorder.h"
 #include "VelMenuView.h"
 #include "VelMenuViewPrivate.h"
 
+#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 
 #include <QCoreApplication>
@@ -60,12 +63,31 @@ public:
                    : QCoreApplication::translate("VelMenuView", "Copying files..."));
     }
 
+    void begins(const QStringList &sources, const QStringList &targets, Qt::DropAction action,
+                const QString &folder) override
+    {
+        m_recorder = m_view ? VelMenuViewPrivate::historyOf(*m_view).record() : nullptr;
+        if (!m_recorder)
+            return;
+        m_isMove = action == Qt::MoveAction;
+        m_sources = sources;
+        m_recorder->mayWrite(EntryPath::recordFileOf(folder));
+        for (int i = 0; i < sources.size(); ++i) {
+            if (m_isMove)
+                m_recorder->mayMove(sources.at(i), targets.at(i));
+            else
+                m_recorder->mayMake(targets.at(i));
+        }
+    }
+
     void finished(const DropResult &result) override
     {
         if (!m_view)
             return;
         if (result.isDone)
             show(result);
+        if (m_recorder)
+            remember(result);
         if (!result.complaint.isEmpty())
             tellAt(result.targets.constFirst(), result.complaint);
     }
@@ -96,6 +118,29 @@ private:
         return owner ? owner : m_view;
     }
 
+    // Also what was done before something failed.
+    void remember(const DropResult &result)
+    {
+        MenuHistory &history = VelMenuViewPrivate::historyOf(*m_view);
+        const QString first = result.targets.constFirst();
+        const bool isHere =
+            QFileInfo(m_sources.constFirst()).absoluteFilePath() == QFileInfo(first).absoluteFilePath();
+        history.add(m_recorder, textOf(history, first, isHere), result.targets + m_sources);
+        m_recorder.reset();
+    }
+
+    StepText textOf(const MenuHistory &history, const QString &target, bool isHere) const
+    {
+        const QString name = history.nameOf(target);
+        if (isHere && m_sources.size() == 1)
+            return StepText(StepText::Kind::Reorder, name);
+        const QString folder = history.nameOf(QFileInfo(target).path());
+        if (m_sources.size() == 1)
+            return StepText(m_isMove ? StepText::Kind::Move : StepText::Kind::Copy, name, 1, folder);
+        return StepText(m_isMove ? StepText::Kind::MoveItems : StepText::Kind::CopyItems, QString(),
+                        m_sources.size(), folder);
+    }
+
     const QSortFilterProxyModel *proxy() const
     {
         return qobject_cast<const QSortFilterProxyModel *>(m_view->model());
@@ -117,6 +162,9 @@ private:
 
     VelMenuView *const m_view;
     QObject *const m_owner;
+    std::unique_ptr<StepRecorder> m_recorder; // of the drop that has begun
+    bool m_isMove = false;
+    QStringList m_sources;
 };
 
 } // namespace

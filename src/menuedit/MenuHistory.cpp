@@ -1,0 +1,175 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "MenuHistory.h"
+
+#include "MenuFind.h"
+#include "MenuSelection.h"
+#include "MenuVoice.h"
+#include "ShownMenu.h"
+#include "StepCommand.h"
+#include "StepRecorder.h"
+#include "VelMenuModel.h"
+#include "VelMenuProxyModel.h"
+
+#include <frame/EntryPath.h>
+
+#include <QAction>
+#include <QCoreApplication>
+#include <QFileInfo>
+#include <QIcon>
+#include <QPointer>
+#include <QShortcut>
+#include <QTreeView>
+
+MenuHistory::MenuHistory(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
+                         MenuVoice &voice)
+    : m_view(view)
+    , m_menu(menu)
+    , m_selection(selection)
+    , m_find(find)
+    , m_voice(voice)
+{
+    connect(&m_stack, &QUndoStack::indexChanged, this, &MenuHistory::updateActions);
+}
+
+MenuHistory::~MenuHistory() = default;
+
+void MenuHistory::setOn(bool on)
+{
+    if (on == isOn())
+        return;
+    m_keys.clear();
+    m_undo.reset();
+    m_redo.reset();
+    m_stack.clear();
+    if (!on)
+        return;
+    m_undo = std::make_unique<QAction>(QIcon::fromTheme(QStringLiteral("edit-undo")), QString());
+    m_redo = std::make_unique<QAction>(QIcon::fromTheme(QStringLiteral("edit-redo")), QString());
+    m_undo->setObjectName(QStringLiteral("undoAction"));
+    m_redo->setObjectName(QStringLiteral("redoAction"));
+    m_undo->setShortcut(QKeySequence(QStringLiteral("Ctrl+Z")));
+    m_redo->setShortcut(QKeySequence(QStringLiteral("Ctrl+Shift+Z")));
+    for (QAction *action : {m_undo.get(), m_redo.get()}) {
+        // No widget has the actions, so that their keys need somebody who listens.
+        m_keys.push_back(std::make_unique<QShortcut>(action->shortcut(), m_view));
+        m_keys.back()->setContext(Qt::WidgetShortcut);
+        connect(m_keys.back().get(), &QShortcut::activated, action, &QAction::trigger);
+    }
+    connect(m_undo.get(), &QAction::triggered, this, &MenuHistory::undo);
+    connect(m_redo.get(), &QAction::triggered, this, &MenuHistory::redo);
+    updateActions();
+}
+
+void MenuHistory::updateActions()
+{
+    if (!isOn())
+        return;
+    const StepCommand *past = commandAt(m_stack.index() - 1);
+    const StepCommand *next = commandAt(m_stack.index());
+    m_undo->setText(past ? past->text().undo() : QCoreApplication::translate("MenuHistory", "Undo"));
+    m_redo->setText(next ? next->text().redo() : QCoreApplication::translate("MenuHistory", "Redo"));
+    m_undo->setEnabled(past);
+    m_redo->setEnabled(next);
+}
+
+const StepCommand *MenuHistory::commandAt(int index) const
+{
+    return static_cast<const StepCommand *>(m_stack.command(index));
+}
+
+std::unique_ptr<StepRecorder> MenuHistory::record() const
+{
+    return isOn() ? std::make_unique<StepRecorder>() : nullptr;
+}
+
+void MenuHistory::add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text,
+                      const QStringList &items)
+{
+    FileStep step = recorder && isOn() ? recorder->finish() : FileStep();
+    if (step.isEmpty())
+        return;
+    m_stack.push(new StepCommand(std::move(step), text, items));
+    m_voice.tell(text.done(), MenuVoice::Note);
+}
+
+QString MenuHistory::nameOf(const QString &path) const
+{
+    const QFileInfo info(path);
+    const QString name = m_menu.files().displayOf(path, info.isDir()).name;
+    return name.isEmpty() ? info.fileName() : name;
+}
+
+void MenuHistory::run(bool isUndo)
+{
+    const StepCommand *command = commandAt(m_stack.index() - (isUndo ? 1 : 0));
+    if (!command)
+        return;
+    const QStringList paths = command->step().paths();
+    const QStringList items = command->items();
+    const QString text = isUndo ? command->text().undo() : command->text().redo();
+    const QStringList released = m_menu.files().release(paths);
+    const Refusal refusal = isUndo ? command->step().undo() : command->step().redo();
+    m_menu.files().watchAgain(released);
+    if (refusal.isForGood)
+        command->giveUp();
+    if (!refusal || refusal.isForGood)
+        isUndo ? m_stack.undo() : m_stack.redo();
+    if (refusal) {
+        refuse(refusal.reason, isUndo);
+        return;
+    }
+    const QPointer<MenuHistory> self(this);
+    takeIn(paths);
+    show(items);
+    m_find.clear();
+    Q_EMIT changed();
+    if (self)
+        m_voice.tell(QCoreApplication::translate("MenuHistory", "Done: %1").arg(text), MenuVoice::Note);
+}
+
+void MenuHistory::refuse(const QString &reason, bool isUndo)
+{
+    m_voice.tell((isUndo ? QCoreApplication::translate("MenuHistory", "Nothing was undone: %1")
+                         : QCoreApplication::translate("MenuHistory", "Nothing was done again: %1"))
+                     .arg(reason),
+                 MenuVoice::Failure, m_view->currentIndex());
+}
+
+// The models learn at once what is where, and read anew what they knew of it.
+void MenuHistory::takeIn(const QStringList &paths)
+{
+    const QString menu = m_menu.files().menuDirectory();
+    for (const QString &path : paths) {
+        if (path == menu) {
+            Q_EMIT replaced();
+            return;
+        }
+        const QString item = EntryPath::describedBy(path);
+        const QString folder = item == path ? QFileInfo(path).path() : item;
+        if (folder != menu && !folder.startsWith(menu + QLatin1Char('/')))
+            continue;
+        m_menu.files().noteRecordFile(item);
+        m_menu.files().forgetItemInfo(path);
+        m_menu.files().forgetItemInfo(item);
+        if (QFileInfo::exists(item))
+            m_menu.files().index(item);
+        m_menu.proxy().invalidateSortOrder(folder);
+        if (item == path && QFileInfo(path).isDir())
+            m_menu.proxy().invalidateSortOrder(path);
+    }
+}
+
+void MenuHistory::show(const QStringList &items)
+{
+    const QString selected = m_selection.path();
+    for (const QString &item : items) {
+        if (QFileInfo::exists(item) && m_selection.shown(item).isValid()) {
+            m_selection.show(item);
+            return;
+        }
+    }
+    if (!selected.isEmpty() && !QFileInfo::exists(selected))
+        m_selection.leave(selected);
+}

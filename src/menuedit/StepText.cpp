@@ -1,0 +1,100 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "StepText.h"
+
+#include <QCoreApplication>
+
+namespace {
+
+struct Texts
+{
+    const char *undo;
+    const char *redo;
+    const char *done;
+};
+
+// In the order of StepText::Kind. %1 is the item or the number of items, %2 the folder.
+constexpr Texts AllTexts[] = {
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo creation of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo creation of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 was created.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo change of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo change of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 was changed.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo deletion of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo deletion of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 was deleted.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo deletion of folder %1 (%n entries)"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo deletion of folder %1 (%n entries)"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "The folder %1 was deleted (%n entries).")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo deletion of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo deletion of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%n items were deleted.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo moving of %1 to %2"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo moving of %1 to %2"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 was moved to %2.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo moving of %n items to %2"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo moving of %n items to %2"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%n items were moved to %2.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo copying of %1 to %2"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo copying of %1 to %2"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 was copied to %2.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo copying of %n items to %2"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo copying of %n items to %2"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%n items were copied to %2.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo reordering of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo reordering of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 has another place.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo default menu"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo default menu"),
+     QT_TRANSLATE_NOOP("MenuHistory", "The default menu was built.")},
+};
+
+// English has no catalog that would know the form for one.
+constexpr Texts FolderOfOne = {
+    QT_TRANSLATE_NOOP("MenuHistory", "Undo deletion of folder %1 (1 entry)"),
+    QT_TRANSLATE_NOOP("MenuHistory", "Redo deletion of folder %1 (1 entry)"),
+    QT_TRANSLATE_NOOP("MenuHistory", "The folder %1 was deleted (1 entry)."),
+};
+
+const Texts &textsOf(StepText::Kind kind, int count)
+{
+    return kind == StepText::Kind::DeleteFolder && count == 1 ? FolderOfOne : AllTexts[int(kind)];
+}
+
+} // namespace
+
+StepText::StepText(Kind kind, const QString &item, int count, const QString &folder)
+    : m_kind(kind)
+    , m_item(item)
+    , m_count(count)
+    , m_folder(folder)
+{
+}
+
+QString StepText::undo() const
+{
+    return filledIn(textsOf(m_kind, m_count).undo);
+}
+
+QString StepText::redo() const
+{
+    return filledIn(textsOf(m_kind, m_count).redo);
+}
+
+QString StepText::done() const
+{
+    return filledIn(textsOf(m_kind, m_count).done);
+}
+
+// Names may hold a % of their own, so all of it is filled in at once.
+QString StepText::filledIn(const char *text) const
+{
+    const QString translated = QCoreApplication::translate("MenuHistory", text, nullptr, m_count);
+    const bool hasItem = translated.contains(QLatin1String("%1"));
+    const bool hasFolder = translated.contains(QLatin1String("%2"));
+    if (hasItem && hasFolder)
+        return translated.arg(m_item, m_folder);
+    return hasItem ? translated.arg(m_item) : hasFolder ? translated.arg(m_folder) : translated;
+}

@@ -1,0 +1,321 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "EditTestCase.h"
+#include "ExactTree.h"
+#include "ModalDriver.h"
+#include "VelMenuView.h"
+
+#include <QAction>
+#include <QDir>
+#include <QFileSystemModel>
+#include <QMenu>
+#include <QSignalSpy>
+
+#include <memory>
+
+/// What a view remembers, refuses and asks.
+class tst_VelMenuViewHistory : public EditTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init();
+    void cleanup();
+    void hasNoneWithoutAssistance();
+    void hasNoneToLookAtOnly();
+    void offersItsCommandsInTheContextMenu();
+    void forgetsEverythingWhenItShowsAnotherMenu();
+    void asksOnlyWhereThereIsNoTrash_data();
+    void asksOnlyWhereThereIsNoTrash();
+    void keepsWhatStandsInTheTrashAlready();
+    void tellsWhyItRefuses();
+    void dropsWhatCanNeverBeUndone();
+    void forgetsWhatWasUndoneWhenSomethingElseIsDone();
+    void remembersNothingOfACanceledEditor();
+    void countsWhatAFolderHolds_data();
+    void countsWhatAFolderHolds();
+    void opensTheFolderOfWhatIsBack();
+    void deletesALinkAndNotWhatItLeadsTo();
+    void leavesTheDefaultMenuWhereNothingWasBuilt();
+
+private:
+    std::unique_ptr<VelMenuView> make();
+    static void remove(VelMenuView &view, const QString &path);
+    QString trash() const { return path(QStringLiteral("data/Trash")); }
+
+    QByteArray m_dataHome;
+    QString m_a;
+};
+
+void tst_VelMenuViewHistory::init()
+{
+    EditTestCase::init();
+    m_dataHome = qgetenv("XDG_DATA_HOME");
+    qputenv("XDG_DATA_HOME", QFile::encodeName(path(QStringLiteral("data"))));
+    m_a = writeLetters("abc").constFirst();
+    writeFolder(QString(), QStringLiteral("Menu"), "c.desktop;b.desktop;a.desktop;");
+}
+
+void tst_VelMenuViewHistory::cleanup()
+{
+    qputenv("XDG_DATA_HOME", m_dataHome);
+    EditTestCase::cleanup();
+}
+
+std::unique_ptr<VelMenuView> tst_VelMenuViewHistory::make()
+{
+    auto view = std::make_unique<VelMenuView>(menu(), -1, true);
+    view->setAssistance(true);
+    view->resize(300, 300);
+    view->show();
+    open(*view, menu(), QDir(menu()).entryList(QDir::AllEntries | QDir::NoDotAndDotDot).size());
+    return view;
+}
+
+void tst_VelMenuViewHistory::remove(VelMenuView &view, const QString &path)
+{
+    select(view, path);
+    view.slotDel();
+}
+
+void tst_VelMenuViewHistory::hasNoneWithoutAssistance()
+{
+    const auto view = make();
+    const int actions = view->actions().size();
+    remove(*view, m_a);
+    view->setAssistance(false);
+    QVERIFY(!view->undoAction() && !view->redoAction());
+    ModalDriver modal;
+    announceDeleteQuestion(modal, QMessageBox::No);
+    remove(*view, menu() + QStringLiteral("/b.desktop"));
+    QVERIFY(modal.finished());
+
+    view->setAssistance(true);
+    QVERIFY(!view->undoAction()->isEnabled());
+    QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo"));
+    QCOMPARE(view->redoAction()->text(), QStringLiteral("Redo"));
+    QCOMPARE(view->actions().size(), actions);
+    QVERIFY(!view->actions().contains(view->undoAction()));
+}
+
+void tst_VelMenuViewHistory::hasNoneToLookAtOnly()
+{
+    VelMenuView view(menu(), -1, false);
+    view.setAssistance(true);
+    QVERIFY(!view.undoAction() && !view.redoAction());
+}
+
+void tst_VelMenuViewHistory::offersItsCommandsInTheContextMenu()
+{
+    const auto view = make();
+    const auto *menuOfView = view->findChild<QMenu *>();
+    QCOMPARE(menuOfView->actions().value(0), view->undoAction());
+    QCOMPARE(menuOfView->actions().value(1), view->redoAction());
+    view->setAssistance(false);
+    QCOMPARE(menuOfView->actions().value(0)->objectName(), QStringLiteral("dirNewAction"));
+}
+
+void tst_VelMenuViewHistory::forgetsEverythingWhenItShowsAnotherMenu()
+{
+    const auto view = make();
+    remove(*view, m_a);
+    QVERIFY(view->undoAction()->isEnabled());
+    view->init(menu(), -1, true, nullptr);
+    QVERIFY(view->assistance());
+    QVERIFY(!view->undoAction()->isEnabled());
+}
+
+void tst_VelMenuViewHistory::asksOnlyWhereThereIsNoTrash_data()
+{
+    QTest::addColumn<bool>("isSure");
+    QTest::newRow("yes") << true;
+    QTest::newRow("no") << false;
+}
+
+void tst_VelMenuViewHistory::asksOnlyWhereThereIsNoTrash()
+{
+    QFETCH(bool, isSure);
+    const auto view = make();
+    remove(*view, menu() + QStringLiteral("/b.desktop"));
+    QVERIFY(!QFile::exists(menu() + QStringLiteral("/b.desktop")));
+    QVERIFY(QDir(trash()).removeRecursively());
+    write(QStringLiteral("data/Trash"), "no folder");
+
+    QSignalSpy changes(view.get(), &VelMenuView::changed);
+    ModalDriver modal;
+    modal.answer({QMessageBox::Warning, QStringLiteral("Attention"),
+                  QStringLiteral("There is no trash for A. It would be deleted for good: this cannot be "
+                                 "undone. Delete it?"),
+                  QMessageBox::Yes | QMessageBox::No, QMessageBox::No},
+                 isSure ? QMessageBox::Yes : QMessageBox::No);
+    remove(*view, m_a);
+    QVERIFY(modal.finished());
+
+    QCOMPARE(QFile::exists(m_a), !isSure);
+    QCOMPARE(changes.count(), isSure ? 1 : 0);
+    QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo deletion of B"));
+}
+
+void tst_VelMenuViewHistory::keepsWhatStandsInTheTrashAlready()
+{
+    const QString old = write(QStringLiteral("data/Trash/files/a.desktop"), "of another day");
+    const QByteArray bytes = read(m_a);
+    const auto view = make();
+    remove(*view, m_a);
+    QCOMPARE(everythingIn(trash() + QStringLiteral("/files")).size(), 2);
+    view->undoAction()->trigger();
+    QCOMPARE(read(m_a), bytes);
+    QCOMPARE(read(old), QByteArray("of another day"));
+    QCOMPARE(everythingIn(trash() + QStringLiteral("/files")).size(), 1);
+    QTRY_COMPARE(names(*view, menu()),
+                 QStringList({QStringLiteral("C"), QStringLiteral("B"), QStringLiteral("A")}));
+    QCOMPARE(view->selectedPath(), m_a);
+}
+
+void tst_VelMenuViewHistory::tellsWhyItRefuses()
+{
+    const auto view = make();
+    QSignalSpy told(view.get(), &VelMenuView::told);
+    remove(*view, m_a);
+    QCOMPARE(told.takeLast(), QVariantList({QStringLiteral("A was deleted."), 0}));
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("Theirs"));
+    const ExactTree before = ExactTree::of(menu());
+    QSignalSpy changes(view.get(), &VelMenuView::changed);
+
+    view->undoAction()->trigger();
+
+    QCOMPARE(told.takeLast(),
+             QVariantList({QStringLiteral("Nothing was undone: There is another %1 by now.").arg(m_a), 2}));
+    QCOMPARE(before.difference(ExactTree::of(menu())), QString());
+    QCOMPARE(changes.count(), 0);
+    // It can be undone when the place is free again.
+    QVERIFY(QFile::remove(m_a));
+    QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo deletion of A"));
+    view->undoAction()->trigger();
+    QVERIFY(QFile::exists(m_a));
+}
+
+void tst_VelMenuViewHistory::dropsWhatCanNeverBeUndone()
+{
+    const auto view = make();
+    QSignalSpy told(view.get(), &VelMenuView::told);
+    remove(*view, menu() + QStringLiteral("/b.desktop"));
+    remove(*view, m_a);
+    QVERIFY(QFile::remove(trash() + QStringLiteral("/files/a.desktop")));
+
+    view->undoAction()->trigger();
+
+    QCOMPARE(
+        told.takeLast(),
+        QVariantList({QStringLiteral("Nothing was undone: a.desktop is not in the trash any more."), 2}));
+    QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo deletion of B"));
+    QVERIFY(!view->redoAction()->isEnabled());
+    view->undoAction()->trigger();
+    QVERIFY(QFile::exists(menu() + QStringLiteral("/b.desktop")));
+}
+
+void tst_VelMenuViewHistory::forgetsWhatWasUndoneWhenSomethingElseIsDone()
+{
+    const auto view = make();
+    remove(*view, m_a);
+    view->undoAction()->trigger();
+    QCOMPARE(view->redoAction()->text(), QStringLiteral("Redo deletion of A"));
+    remove(*view, menu() + QStringLiteral("/c.desktop"));
+    QVERIFY(!view->redoAction()->isEnabled());
+    QCOMPARE(view->redoAction()->text(), QStringLiteral("Redo"));
+}
+
+void tst_VelMenuViewHistory::remembersNothingOfACanceledEditor()
+{
+    const auto view = make();
+    for (const bool isNew : {true, false}) {
+        ModalDriver modal;
+        modal.handle(reject);
+        select(*view, m_a);
+        if (isNew)
+            view->slotFileNew();
+        else
+            view->slotEdit();
+        QVERIFY(modal.finished());
+        QVERIFY(!view->undoAction()->isEnabled());
+    }
+}
+
+void tst_VelMenuViewHistory::countsWhatAFolderHolds_data()
+{
+    QTest::addColumn<int>("count");
+    QTest::addColumn<QString>("text");
+    QTest::newRow("none") << 0 << QStringLiteral("Undo deletion of folder Games (0 entries)");
+    QTest::newRow("one") << 1 << QStringLiteral("Undo deletion of folder Games (1 entry)");
+    QTest::newRow("twelve") << 12 << QStringLiteral("Undo deletion of folder Games (12 entries)");
+}
+
+void tst_VelMenuViewHistory::countsWhatAFolderHolds()
+{
+    QFETCH(int, count);
+    QFETCH(QString, text);
+    writeFolder(QStringLiteral("games"), QStringLiteral("Games"));
+    for (int i = 0; i < count; ++i)
+        writeEntry(QStringLiteral("games/%1.desktop").arg(i), QStringLiteral("Game"));
+    const auto view = make();
+    remove(*view, menu() + QStringLiteral("/games"));
+    QCOMPARE(view->undoAction()->text(), text);
+}
+
+void tst_VelMenuViewHistory::opensTheFolderOfWhatIsBack()
+{
+    writeFolder(QStringLiteral("games"), QStringLiteral("Games"), "y.desktop;x.desktop;");
+    writeLetters("xy", QStringLiteral("games/"));
+    const QString x = menu() + QStringLiteral("/games/x.desktop");
+    const auto view = make();
+    QVERIFY(open(*view, menu() + QStringLiteral("/games"), 2));
+    remove(*view, x);
+    remove(*view, menu() + QStringLiteral("/games"));
+    QTRY_COMPARE(names(*view, menu()).size(), 3);
+    view->undoAction()->trigger();
+    view->undoAction()->trigger();
+    QCOMPARE(view->selectedPath(), x);
+    QVERIFY(view->isExpanded(shown(*view, menu() + QStringLiteral("/games"))));
+    QTRY_COMPARE(names(*view, menu() + QStringLiteral("/games")),
+                 QStringList({QStringLiteral("Y"), QStringLiteral("X")}));
+    // And the view goes on to see what happens there.
+    writeEntry(QStringLiteral("games/z.desktop"), QStringLiteral("Z"));
+    QTRY_COMPARE(names(*view, menu() + QStringLiteral("/games")).size(), 3);
+}
+
+void tst_VelMenuViewHistory::deletesALinkAndNotWhatItLeadsTo()
+{
+    write(QStringLiteral("outside/o.desktop"), entryText(QStringLiteral("O")));
+    QVERIFY(QFile::link(path(QStringLiteral("outside")), menu() + QStringLiteral("/led")));
+    const ExactTree before = ExactTree::of(menu());
+    const auto view = make();
+    remove(*view, menu() + QStringLiteral("/led"));
+    QVERIFY(!QFileInfo(menu() + QStringLiteral("/led")).isSymLink());
+    QVERIFY(QFile::exists(path(QStringLiteral("outside/o.desktop"))));
+    view->undoAction()->trigger();
+    QCOMPARE(before.difference(ExactTree::of(menu())), QString());
+}
+
+void tst_VelMenuViewHistory::leavesTheDefaultMenuWhereNothingWasBuilt()
+{
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("none"))));
+    write(QStringLiteral("config/startmenu/old.desktop"), entryText(QStringLiteral("Old")));
+    write(QStringLiteral("config/startmenu.previous/older.desktop"), entryText(QStringLiteral("Older")));
+    const ExactTree before = ExactTree::of(path(QStringLiteral("config")));
+    VelMenuView view(QString(), -1, true);
+    view.setAssistance(true);
+    expectWarning(QStringLiteral("VelMenuView: can't create the start menu"));
+    ModalDriver modal;
+    modal.answer({QMessageBox::Question, QStringLiteral("Warning"),
+                  QStringLiteral("All previous shortcuts\nwill be lost. Are you sure?"),
+                  QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok},
+                 QMessageBox::Ok);
+    view.slotRecreate();
+    QVERIFY(modal.finished());
+    QCOMPARE(before.difference(ExactTree::of(path(QStringLiteral("config")))), QString());
+    QVERIFY(!view.undoAction()->isEnabled());
+}
+
+VEL_TEST_MAIN(tst_VelMenuViewHistory)
+#include "tst_VelMenuViewHistory.moc"
