@@ -5,14 +5,17 @@
 // and in which order it must be shown. VEL_TEST_ROUNDS sets another number of operations than
 // 200, up to 2,000; VEL_TEST_SEED repeats a run.
 
+#include "ExactTree.h"
 #include "ModalDriver.h"
 #include "RandomMenuTestCase.h"
 
 #include <frame/DesktopEntryRecord.h>
 
+#include <QAction>
 #include <QClipboard>
 #include <QMimeData>
 #include <QRandomGenerator>
+#include <QVector>
 
 #include <memory>
 
@@ -23,6 +26,7 @@ class tst_MenuRandomOperations : public RandomMenuTestCase
 
 private Q_SLOTS:
     void staysInStepWithAPlainModel();
+    void takesBackAndDoesAgain();
 
 private:
     /// Files that go into a folder, and where.
@@ -34,7 +38,19 @@ private:
         QString following; ///< null for nowhere, empty for the end
     };
 
+    /// What was at some point of the history.
+    struct State
+    {
+        MenuMirror mirror;
+        ExactTree tree;
+    };
+
+    int begin();
+    void finish();
+    void compareView(const QByteArray &where);
     void step();
+    bool turn(bool isUndo);
+    void note();
     void create();
     void edit();
     void moveByOne();
@@ -47,6 +63,8 @@ private:
 
     QString m_remembered; // on the clipboard; null for nothing
     bool m_isCut = false;
+    QVector<State> m_states;
+    int m_index = 0; // of the state in force
 };
 
 void tst_MenuRandomOperations::create()
@@ -271,17 +289,21 @@ void tst_MenuRandomOperations::drop()
 void tst_MenuRandomOperations::remove()
 {
     const QString path = any(shownPaths());
-    const bool isSure = chance(80);
+    bool isSure = chance(80);
     // Large folders would leave little to go on with.
     if (m_mirror.kindOf(path) == Kind::Folder && m_mirror.childrenOf(path).size() > 12 && chance(90))
         return;
     describe(QStringLiteral("delete %1, sure %2").arg(path).arg(isSure));
     selectItem(path);
     ModalDriver modal;
-    modal.answer({QMessageBox::Question, QStringLiteral("Attention"),
-                  QStringLiteral("Are you sure to delete it?"), QMessageBox::Yes | QMessageBox::No,
-                  QMessageBox::Yes},
-                 isSure ? QMessageBox::Yes : QMessageBox::No);
+    // With assistance it can be taken back, and nobody is asked.
+    if (m_view->assistance())
+        isSure = true;
+    else
+        modal.answer({QMessageBox::Question, QStringLiteral("Attention"),
+                      QStringLiteral("Are you sure to delete it?"), QMessageBox::Yes | QMessageBox::No,
+                      QMessageBox::Yes},
+                     isSure ? QMessageBox::Yes : QMessageBox::No);
     m_view->slotDel();
     QVERIFY(modal.finished());
     m_selected = isSure ? QString::fromLatin1("") : full(path);
@@ -311,7 +333,7 @@ void tst_MenuRandomOperations::step()
         remove();
 }
 
-void tst_MenuRandomOperations::staysInStepWithAPlainModel()
+int tst_MenuRandomOperations::begin()
 {
     const int wanted = qEnvironmentVariableIntValue("VEL_TEST_ROUNDS");
     const int rounds = wanted > 0 ? std::min(wanted, 2000) : 200;
@@ -321,31 +343,102 @@ void tst_MenuRandomOperations::staysInStepWithAPlainModel()
     qInfo("seed %u, %d rounds", seed, rounds);
     m_random.seed(seed);
     build();
-    const MenuMirror outside = MenuMirror::ofDisk(path(QStringLiteral("outside")));
     m_view = std::make_unique<VelMenuView>(menu(), -1, true);
     m_view->resize(400, 600);
     m_view->show();
+    return rounds;
+}
+
+void tst_MenuRandomOperations::finish()
+{
+    QGuiApplication::clipboard()->clear();
+    m_remembered.clear();
+    m_view.reset();
+}
+
+void tst_MenuRandomOperations::compareView(const QByteArray &where)
+{
+    // A folder is opened once the view has had the time to draw it.
+    QCoreApplication::processEvents();
+    QString shownWrong;
+    if (!QTest::qWaitFor(
+            [&] {
+                shownWrong = compare();
+                return shownWrong.isEmpty();
+            },
+            15000))
+        QTest::qFail((where + shownWrong.toUtf8()).constData(), __FILE__, __LINE__);
+}
+
+void tst_MenuRandomOperations::staysInStepWithAPlainModel()
+{
+    const int rounds = begin();
+    const MenuMirror outside = MenuMirror::ofDisk(path(QStringLiteral("outside")));
     for (int i = 0; i <= rounds && !QTest::currentTestFailed(); ++i) {
         if (i > 0)
             step();
         const QByteArray where = QByteArray::number(i) + ": " + m_step.toUtf8() + '\n';
         const QString onDisk = MenuMirror::difference(m_mirror, MenuMirror::ofDisk(menu()));
         QVERIFY2(onDisk.isEmpty(), (where + onDisk.toUtf8()).constData());
-        // A folder is opened once the view has had the time to draw it.
-        QCoreApplication::processEvents();
-        QString shownWrong;
-        if (!QTest::qWaitFor(
-                [&] {
-                    shownWrong = compare();
-                    return shownWrong.isEmpty();
-                },
-                15000))
-            QTest::qFail((where + shownWrong.toUtf8()).constData(), __FILE__, __LINE__);
+        compareView(where);
         m_mirror.keepFolderNames();
     }
     QCOMPARE(MenuMirror::difference(outside, MenuMirror::ofDisk(path(QStringLiteral("outside")))), QString());
-    QGuiApplication::clipboard()->clear();
-    m_view.reset();
+    finish();
+}
+
+// Goes to the state before or after; false where there is none.
+bool tst_MenuRandomOperations::turn(bool isUndo)
+{
+    const int index = m_index + (isUndo ? -1 : 1);
+    if (index < 0 || index >= m_states.size())
+        return false;
+    QAction *action = isUndo ? m_view->undoAction() : m_view->redoAction();
+    describe(action->text());
+    m_selected.clear();
+    action->trigger();
+    m_index = index;
+    m_mirror = m_states.at(m_index).mirror;
+    return true;
+}
+
+// Notes what an operation came to, unless it came to nothing.
+void tst_MenuRandomOperations::note()
+{
+    if (MenuMirror::difference(m_states.at(m_index).mirror, m_mirror).isEmpty())
+        return;
+    m_states.resize(m_index + 1);
+    m_states.append({m_mirror, ExactTree::of(menu())});
+    ++m_index;
+}
+
+void tst_MenuRandomOperations::takesBackAndDoesAgain()
+{
+    const int rounds = begin();
+    m_view->setAssistance(true);
+    m_states = {{m_mirror, ExactTree::of(menu())}};
+    m_index = 0;
+    int turns = 0;
+    for (int i = 0; i <= rounds && !QTest::currentTestFailed(); ++i) {
+        const int what = i > 0 ? number(100) : 100;
+        if ((what < 20 && turn(true)) || (what >= 20 && what < 33 && turn(false)))
+            ++turns;
+        else if (i > 0)
+            step();
+        note();
+        const QByteArray where = QByteArray::number(i) + ": " + m_step.toUtf8() + '\n';
+        const QString onDisk = m_states.at(m_index).tree.difference(ExactTree::of(menu()), {"*"});
+        QVERIFY2(onDisk.isEmpty(), (where + onDisk.toUtf8()).constData());
+        // What is shown of a folder is read again whenever it changes.
+        for (const QString &item : m_mirror.paths())
+            m_mirror.item(item).shownFirst.clear();
+        compareView(where);
+    }
+    while (!QTest::currentTestFailed() && turn(true)) { }
+    QCOMPARE(m_states.constFirst().tree.difference(ExactTree::of(menu()), {"*"}), QString());
+    QVERIFY(!m_view->undoAction()->isEnabled());
+    qInfo("%d times to and fro, then back through %d states", turns, m_states.size());
+    finish();
 }
 
 VEL_TEST_MAIN(tst_MenuRandomOperations)
