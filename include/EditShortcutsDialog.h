@@ -27,6 +27,11 @@ class ShortcutsModel;
  * These checks see equal sequences, not prefixes: "Ctrl+K" is accepted beside
  * "Ctrl+K, Ctrl+C". Qt then waits for the second chord before it triggers the first.
  *
+ * With assistance (see setAssistance()) the dialog explains clashes while a key is recorded, those
+ * of the default key and those that are only advised against, too; see ShortcutClash. A key that
+ * would be refused then waits in the field until the user has taken it over from the other
+ * shortcut, has chosen another one, or leaves it: then it is refused.
+ *
  * The edits are pending in the model until the user confirms with Ok, which puts them into
  * force. Cancel, Escape and closing the window without applying throw them away. The dialog
  * saves nothing: call ShortcutsModel::saveKeys() after it was accepted.

@@ -32,7 +32,9 @@ void ActionObject::setObjectKeySequence(const QKeySequence &key)
 
 QList<QKeySequence> ActionObject::furtherKeys() const
 {
-    QList<QKeySequence> keys = m_wrapped ? keysAfterTheFirst() : QList<QKeySequence>();
+    if (!m_wrapped)
+        return {};
+    QList<QKeySequence> keys = keysAfterTheFirst();
     keys.removeAll(keySequence());
     return keys;
 }

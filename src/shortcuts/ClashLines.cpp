@@ -24,21 +24,12 @@ bool isGlobal(const ShortcutClash &clash)
     return clash.kind == ShortcutClash::GlobalKey;
 }
 
-ClashLine::Content lineFor(const ShortcutsModel &model, const ShortcutClash &clash, const QKeySequence &key)
+ClashLine::Content lineFor(const ShortcutClash &clash, const QKeySequence &key)
 {
     ClashLine::Content line;
     line.text = clash.text;
     line.key = key.toString(QKeySequence::NativeText);
     line.isSerious = clash.kind == ShortcutClash::SameKey || isGlobal(clash);
-    if (clash.otherName.isEmpty())
-        return line;
-    const QModelIndex row = ClashingRows::first(model, clash.otherName, key);
-    if (const IShortcutObject *other = ShortcutRows::at(model, row)) {
-        line.otherName = clash.otherName;
-        line.otherText = other->text();
-        // A further key stays with its action.
-        line.canTakeOver = !ClashingRows::of(model, clash.otherName, key).isEmpty();
-    }
     return line;
 }
 
@@ -56,10 +47,17 @@ QVector<ClashLine::Content> ClashLines::of(const ShortcutsModel &model, const IS
     }
     // Nobody can take over what a global shortcut keeps.
     const bool isTakenGlobally = std::any_of(clashes.cbegin(), clashes.cend(), isGlobal);
+    const auto rows = clashes.isEmpty() ? QHash<QString, ClashingRows::Rows>() : ClashingRows::of(model, key);
     QVector<ClashLine::Content> lines;
     for (int i = 0; i < clashes.size() && i < MostLines; ++i) {
-        lines.append(lineFor(model, clashes.at(i), key));
-        lines.last().canTakeOver = lines.constLast().canTakeOver && !isTakenGlobally;
+        lines.append(lineFor(clashes.at(i), key));
+        const ClashingRows::Rows others = rows.value(clashes.at(i).otherName);
+        if (const IShortcutObject *other = ShortcutRows::at(model, others.first)) {
+            lines.last().otherName = other->name();
+            lines.last().otherText = other->text();
+            // A further key stays with its action.
+            lines.last().canTakeOver = !others.pending.isEmpty() && !isTakenGlobally;
+        }
     }
     if (clashes.size() > MostLines) {
         ClashLine::Content rest;

@@ -18,39 +18,32 @@ bool clash(const QKeySequence &left, const QKeySequence &right)
         && (left.matches(right) != QKeySequence::NoMatch || right.matches(left) != QKeySequence::NoMatch);
 }
 
-// The rows of a name for which a condition holds.
-template <typename Condition>
-QVector<QPersistentModelIndex> rowsOf(const ShortcutsModel &model, const QString &name,
-                                      const Condition &condition)
+bool hasClashingFurtherKey(const IShortcutObject &object, const QKeySequence &key)
 {
-    QVector<QPersistentModelIndex> rows;
-    for (int group = 0; group < model.rowCount(); ++group) {
-        const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
-        for (int row = 0; row < objects.size(); ++row) {
-            const IShortcutObject *object = objects.at(row);
-            if (object && object->name() == name && condition(*object))
-                rows.append(model.index(row, 0, model.index(group, 0)));
-        }
-    }
-    return rows;
+    const QList<QKeySequence> further = FurtherKeys::of(object);
+    return std::any_of(further.begin(), further.end(),
+                       [&key](const QKeySequence &other) { return clash(other, key); });
 }
 
 } // namespace
 
-QVector<QPersistentModelIndex> ClashingRows::of(const ShortcutsModel &model, const QString &name,
-                                                const QKeySequence &key)
+QHash<QString, ClashingRows::Rows> ClashingRows::of(const ShortcutsModel &model, const QKeySequence &key)
 {
-    return rowsOf(model, name,
-                  [&key](const IShortcutObject &object) { return clash(object.keySequence(), key); });
-}
-
-QModelIndex ClashingRows::first(const ShortcutsModel &model, const QString &name, const QKeySequence &key)
-{
-    const QVector<QPersistentModelIndex> rows = rowsOf(model, name, [&key](const IShortcutObject &object) {
-        const QList<QKeySequence> further = FurtherKeys::of(object);
-        return clash(object.keySequence(), key)
-            || std::any_of(further.begin(), further.end(),
-                           [&key](const QKeySequence &other) { return clash(other, key); });
-    });
-    return rows.isEmpty() ? QModelIndex() : QModelIndex(rows.constFirst());
+    QHash<QString, Rows> rows;
+    for (int group = 0; group < model.rowCount(); ++group) {
+        const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
+        for (int row = 0; row < objects.size(); ++row) {
+            const IShortcutObject *object = objects.at(row);
+            const bool isPending = object && clash(object->keySequence(), key);
+            if (!object || (!isPending && !hasClashingFurtherKey(*object, key)))
+                continue;
+            const QModelIndex index = model.index(row, 0, model.index(group, 0));
+            Rows &ofName = rows[object->name()];
+            if (!ofName.first.isValid())
+                ofName.first = index;
+            if (isPending)
+                ofName.pending.append(index);
+        }
+    }
+    return rows;
 }

@@ -3,8 +3,10 @@
 
 #pragma once
 
+#include <QHash>
 #include <QKeySequence>
 #include <QPersistentModelIndex>
+#include <QString>
 #include <QVector>
 
 class ShortcutsModel;
@@ -16,11 +18,14 @@ class ShortcutsModel;
  */
 namespace ClashingRows {
 
-/// The rows of the shortcuts with a name whose pending key clashes with a key.
-QVector<QPersistentModelIndex> of(const ShortcutsModel &model, const QString &name, const QKeySequence &key);
+/// The rows of one name.
+struct Rows
+{
+    QModelIndex first; ///< the first that has a key, be it a further one, that clashes
+    QVector<QPersistentModelIndex> pending; ///< those whose pending key clashes
+};
 
-/// The first row of the shortcuts with a name that has a key, be it a further one, that clashes with
-/// a key; invalid when there is none.
-QModelIndex first(const ShortcutsModel &model, const QString &name, const QKeySequence &key);
+/// All that stand behind clashes with \a key, by name.
+QHash<QString, Rows> of(const ShortcutsModel &model, const QKeySequence &key);
 
 } // namespace ClashingRows

@@ -128,7 +128,7 @@ void EditShortcutsDialogPrivate::goTo(const QString &name)
 {
     const QKeySequence key = m_keyAssistance->key();
     m_entry.drop();
-    const QModelIndex row = m_model ? ClashingRows::first(*m_model, name, key) : QModelIndex();
+    const QModelIndex row = m_model ? ClashingRows::of(*m_model, key).value(name).first : QModelIndex();
     if (!row.isValid())
         return;
     form.treeView->goTo(row);
@@ -140,7 +140,7 @@ void EditShortcutsDialogPrivate::takeOver(const QString &name)
     if (!m_model)
         return;
     const QKeySequence key = m_keyAssistance->key();
-    const auto rows = ClashingRows::of(*m_model, name, key);
+    const auto rows = ClashingRows::of(*m_model, key).value(name).pending;
     // Who hears of that may do anything.
     for (const QPersistentModelIndex &row : rows) {
         if (m_model)

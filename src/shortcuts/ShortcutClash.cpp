@@ -52,21 +52,17 @@ ShortcutClash shorterKey(const QKeySequence &key, const QKeySequence &shorter, c
             other.name()};
 }
 
-Clashes withShortcut(const IShortcutObject &other, const QKeySequence &key)
+void addClash(const QKeySequence &key, const IShortcutObject &other, const QKeySequence &otherKey,
+              Clashes *clashes)
 {
-    Clashes clashes;
-    const QList<QKeySequence> keys = QList<QKeySequence>{other.keySequence()} + FurtherKeys::of(other);
-    for (const QKeySequence &otherKey : keys) {
-        if (otherKey.isEmpty()) // would begin every key
-            continue;
-        if (otherKey == key)
-            clashes.append(sameKey(key, other));
-        else if (key.matches(otherKey) == QKeySequence::PartialMatch)
-            clashes.append(longerKey(key, otherKey, other));
-        else if (otherKey.matches(key) == QKeySequence::PartialMatch)
-            clashes.append(shorterKey(key, otherKey, other));
-    }
-    return clashes;
+    if (otherKey.isEmpty()) // would begin every key
+        return;
+    if (otherKey == key)
+        clashes->append(sameKey(key, other));
+    else if (key.matches(otherKey) == QKeySequence::PartialMatch)
+        clashes->append(longerKey(key, otherKey, other));
+    else if (otherKey.matches(key) == QKeySequence::PartialMatch)
+        clashes->append(shorterKey(key, otherKey, other));
 }
 
 Clashes withModel(const ShortcutsModel &model, const QString &name, const QKeySequence &key)
@@ -75,8 +71,12 @@ Clashes withModel(const ShortcutsModel &model, const QString &name, const QKeySe
     for (int group = 0; group < model.rowCount(); ++group) {
         const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
         for (const IShortcutObject *other : objects) {
-            if (other && other->name() != name)
-                clashes += withShortcut(*other, key);
+            if (!other || other->name() == name)
+                continue;
+            addClash(key, *other, other->keySequence(), &clashes);
+            const QList<QKeySequence> further = FurtherKeys::of(*other);
+            for (const QKeySequence &otherKey : further)
+                addClash(key, *other, otherKey, &clashes);
         }
     }
     std::stable_sort(
