@@ -17,8 +17,9 @@ class ShortcutsModel;
  * \endcode
  *
  * A sheet has the groups and rows of a ShortcutsModel in the order in which it shows them, with
- * the pending keys as QKeySequence::NativeText. Shortcuts without a key stand there, too; groups
- * without a shortcut do not. Line breaks and runs of blanks in names become one blank.
+ * the pending keys and the further ones of actions as QKeySequence::NativeText. Shortcuts without a
+ * key stand there, too; groups without a shortcut do not. Line breaks and runs of blanks in names
+ * become one blank.
  *
  * The functions keep no state, change nothing and cannot fail. They are to be called on the GUI
  * thread.

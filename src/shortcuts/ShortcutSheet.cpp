@@ -7,6 +7,7 @@
 #include "IShortcutObject.h"
 #include "ShortcutRows.h"
 #include "ShortcutsModel.h"
+#include "ShownKeys.h"
 
 #include <QCoreApplication>
 #include <QLocale>
@@ -48,7 +49,7 @@ QVector<Section> sectionsOf(const ShortcutsModel &model)
         for (const IShortcutObject *object : objects) {
             if (object)
                 section.lines.append({printable(object->text()),
-                                      printable(object->keySequence().toString(QKeySequence::NativeText))});
+                                      printable(ShownKeys::of(*object, QKeySequence::NativeText))});
         }
         if (!section.lines.isEmpty())
             sections.append(section);

@@ -11,12 +11,13 @@
 namespace ShownKeys {
 
 /// All keys of a shortcut in one text, the pending one first; empty when it has none.
-inline QString of(const IShortcutObject &object)
+inline QString of(const IShortcutObject &object,
+                  QKeySequence::SequenceFormat format = QKeySequence::PortableText)
 {
     QList<QKeySequence> keys = FurtherKeys::of(object);
     if (!object.keySequence().isEmpty())
         keys.prepend(object.keySequence());
-    return QKeySequence::listToString(keys, QKeySequence::PortableText);
+    return QKeySequence::listToString(keys, format);
 }
 
 } // namespace ShownKeys

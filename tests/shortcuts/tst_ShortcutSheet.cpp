@@ -39,6 +39,7 @@ private Q_SLOTS:
     void keepsEachShortcutOnOneLine();
     void namesKeysAsTheUserKnowsThem();
     void showsPendingKeys();
+    void showsFurtherKeys();
 
     void writesHtmlByGroup();
     void escapesHtml();
@@ -128,6 +129,16 @@ void tst_ShortcutSheet::showsPendingKeys()
 {
     add(str("a"), str("g"), f1);
     m_model->setKeySequence(row(0, 0), f2);
+    QCOMPARE(ShortcutSheet::plainText(*m_model), str("g\n  Text of a  F2\n"));
+}
+
+void tst_ShortcutSheet::showsFurtherKeys()
+{
+    addAction("a", "g", f1)->setShortcuts({f1, f2});
+    m_model->setKeySequence(row(0, 0), f3);
+    QCOMPARE(ShortcutSheet::plainText(*m_model), str("g\n  Text of a  F3; F2\n"));
+    QVERIFY(ShortcutSheet::html(*m_model).contains(str("<kbd>F3; F2</kbd>")));
+    m_model->setKeySequence(row(0, 0), QKeySequence());
     QCOMPARE(ShortcutSheet::plainText(*m_model), str("g\n  Text of a  F2\n"));
 }
 
