@@ -129,7 +129,7 @@ bool KeyEntry::hold(const QKeySequence &key)
 void KeyEntry::reconsider()
 {
     const QKeySequence key = m_form.keyWidget->keySequence();
-    if (m_recording.isHeld() && !hold(key))
+    if (m_recording.hasChord() && !hold(key))
         finish(key);
 }
 

@@ -46,7 +46,7 @@ public:
     /// Enters the key that is being recorded; false when it is refused with a message, in which the
     /// dialog may go.
     bool settle();
-    /// Looks again whether a key that waits would be refused; enters it when it would not.
+    /// The user has decided about the recorded key: enters it if it would not be refused any more.
     void reconsider();
     /// Forgets the key that is being recorded.
     void dropKey();

@@ -19,6 +19,7 @@ private Q_SLOTS:
 
     void takesOverAKey_data();
     void takesOverAKey();
+    void takesOverAKeyWithoutTheFocus();
     void takesOverFromOneAfterTheOther();
     void takesOverThePrefixOfARecording();
     void resetsBothKeys();
@@ -164,6 +165,21 @@ void tst_AssistedRecording::takesOverAKey()
     QVERIFY(modal.finished());
     checkThatFires(str("F2"), open);
     checkThatFires(str("F1"), nullptr);
+}
+
+// As a screen reader presses a button.
+void tst_AssistedRecording::takesOverAKeyWithoutTheFocus()
+{
+    recordClash("open", str("F2"));
+    lineButton(0, "Take over")->click();
+    QCOMPARE(pendingKey("open"), f2);
+    QCOMPARE(pendingKey("save"), QKeySequence());
+    QVERIFY(keysStay());
+    recordClash("print", str("F2"));
+    lineButton(0, "Go to")->click();
+    QCOMPARE(tree()->currentIndex(), row("open"));
+    QVERIFY(keysStay());
+    QCOMPARE(pendingKey("print"), QKeySequence());
 }
 
 void tst_AssistedRecording::takesOverFromOneAfterTheOther()
