@@ -48,7 +48,7 @@ void EditShortcutsDialogPrivate::setAssistance(bool isOn)
 void EditShortcutsDialogPrivate::connectAssistance()
 {
     QObject::connect(assistance.get(), &EditShortcutsAssistance::keysChanged, &m_context,
-                     [this] { setChanged(m_model && ShortcutRows::isAnyEdited(*m_model)); });
+                     [this] { followKeys(); });
     const KeyAssistance *keys = m_keyAssistance.get();
     QObject::connect(keys, &KeyAssistance::noneChosen, &m_context, [this] { takeKeyAway(); });
     QObject::connect(keys, &KeyAssistance::goToRequested, &m_context,
@@ -169,6 +169,13 @@ void EditShortcutsDialogPrivate::noteChange()
 {
     setChanged(true);
     form.buttonBox->button(QDialogButtonBox::RestoreDefaults)->setEnabled(true);
+}
+
+// Keys became pending in other ways; there may be no edit left.
+void EditShortcutsDialogPrivate::followKeys()
+{
+    noteChange();
+    setChanged(m_model && ShortcutRows::isAnyEdited(*m_model));
 }
 
 bool EditShortcutsDialogPrivate::isChanged() const

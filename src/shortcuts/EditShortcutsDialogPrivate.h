@@ -70,6 +70,7 @@ private:
     void connectKeys();
     void setPendingKey(const QKeySequence &key);
     void noteChange();
+    void followKeys();
     void takeKeyAway();
     void goTo(const QString &name);
     void takeOver(const QString &name);

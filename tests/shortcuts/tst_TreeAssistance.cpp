@@ -195,6 +195,14 @@ void tst_TreeAssistance::takesAnOlderChangeBackToTheDefaultKey()
 {
     m_model->setKeySequence(row("open"), f9);
     m_model->commitChanges();
+    m_dialog->processButtonBox(DialogTestCase::button(QDialogButtonBox::RestoreDefaults));
+    m_dialog->setChanged(false);
+    QVERIFY(!DialogTestCase::button(QDialogButtonBox::RestoreDefaults)->isEnabled());
+    clickButton("open");
+    QTRY_COMPARE(pendingKey("open"), f9);
+    QVERIFY(DialogTestCase::button(QDialogButtonBox::RestoreDefaults)->isEnabled());
+    QVERIFY(!isChanged());
+    QVERIFY(keysStay()); // the next click is no double one
     clickButton("open");
     QTRY_COMPARE(pendingKey("open"), f1);
     QCOMPARE(open->shortcut(), f9);
