@@ -36,6 +36,7 @@ int main(int argc, char **argv)
     const QAction *configure = menu->addAction(QStringLiteral("Configure &shortcuts..."));
     QObject::connect(configure, &QAction::triggered, &window, [&] {
         EditShortcutsDialog dialog(&model, &window);
+        dialog.setAssistance(true); // a filter, clashes told in words, keys to files and back
         if (dialog.exec() == QDialog::Accepted)
             model.saveKeys(&settings, group); // the library never saves by itself
     });

@@ -4,6 +4,7 @@
 #include "GalleryPage.h"
 #include "editor/EditorCommands.h"
 #include "editor/EditorKey.h"
+#include "editor/KeyFiles.h"
 
 #include <EditShortcutsDialog.h>
 #include <ShortcutsModel.h>
@@ -55,7 +56,7 @@ public:
         addCommands();
         addEditorKey(settings);
         addFocusShortcut();
-        addConfigureAction();
+        addConfigureActions();
     }
 
     static QString pageTitle() { return tr("Shortcuts"); }
@@ -92,6 +93,7 @@ private:
             });
             m_model->registerAction(command.name, action, command.menu);
         }
+        addKeyFiles(menus.value(EditorTexts::tr("File")), m_model, [this] { saveKeys(); });
     }
 
     // A key that is no action's; its saved key is not the model's business.
@@ -121,23 +123,39 @@ private:
                                   tr("View"));
     }
 
-    void addConfigureAction()
+    // Both dialogs: the one that helps, and the one that hosts get who ask for nothing.
+    void addConfigureActions()
     {
-        QAction *action = menuBar()->addMenu(tr("Settings"))->addAction(tr("Configure shortcuts..."));
-        action->setObjectName(QStringLiteral("configure-shortcuts"));
-        action->setShortcut(portableKey(QStringLiteral("Ctrl+F12")));
-        connect(action, &QAction::triggered, this, &ShortcutsPage::configure);
-        m_model->registerAction(action->objectName(), action, tr("Settings"));
+        QMenu *menu = menuBar()->addMenu(tr("Settings"));
+        addConfigureAction(menu, QStringLiteral("configure-shortcuts"), tr("Configure shortcuts..."),
+                           portableKey(QStringLiteral("Ctrl+F12")), true);
+        addConfigureAction(menu, QStringLiteral("configure-shortcuts-plain"),
+                           tr("Configure shortcuts in the plain dialog..."), QKeySequence(), false);
     }
 
-    void configure()
+    void addConfigureAction(QMenu *menu, const QString &name, const QString &text, const QKeySequence &key,
+                            bool assistance)
+    {
+        QAction *action = menu->addAction(text);
+        action->setObjectName(name);
+        action->setShortcut(key);
+        connect(action, &QAction::triggered, this, [this, assistance] { configure(assistance); });
+        m_model->registerAction(name, action, menu->title());
+    }
+
+    void configure(bool assistance)
     {
         const QPointer<EditShortcutsDialog> dialog(new EditShortcutsDialog(m_model, this));
-        if (dialog->exec() == QDialog::Accepted && dialog) {
-            QSettings settings(settingsName, settingsName);
-            m_model->saveKeys(&settings, settingsGroup);
-        }
+        dialog->setAssistance(assistance);
+        if (dialog->exec() == QDialog::Accepted && dialog)
+            saveKeys();
         delete dialog;
+    }
+
+    void saveKeys()
+    {
+        QSettings settings(settingsName, settingsName);
+        m_model->saveKeys(&settings, settingsGroup);
     }
 
     void showLast(const QString &command) { m_last->setText(tr("Last command: %1").arg(command)); }
@@ -163,6 +181,7 @@ model->registerShortcut("focus", focusShortcut, tr("Go to the editor"), tr("View
 model->registerShortcutObject(new EditorKey(editor, deleteLine));
 
 EditShortcutsDialog dialog(model, this);
+dialog.setAssistance(true); // a filter, clashes in words, schemes
 if (dialog.exec() == QDialog::Accepted)
     model->saveKeys(&settings, "Shortcuts");)");
     page.create = [](const GalleryContext &, QWidget *parent) { return new ShortcutsPage(parent); };

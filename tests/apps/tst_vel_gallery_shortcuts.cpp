@@ -11,15 +11,18 @@
 
 #include <EditShortcutsDialog.h>
 
+#include <QAction>
 #include <QDialogButtonBox>
 #include <QKeySequenceEdit>
 #include <QLabel>
+#include <QLineEdit>
 #include <QPlainTextEdit>
 #include <QPointer>
 #include <QProcess>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QSettings>
+#include <QTimer>
 #include <QTreeView>
 
 #include <memory>
@@ -75,7 +78,9 @@ private Q_SLOTS:
     void init();
     void cleanup();
 
+    void reassignsAnActionAndFindsItAgain_data();
     void reassignsAnActionAndFindsItAgain();
+    void exportsAndImportsKeys();
 
 private:
     void start();
@@ -86,7 +91,9 @@ private:
     void clickRow(QWidget *dialog, const QString &text);
     void clickButton(QWidget *dialog, QDialogButtonBox::StandardButton button);
     void record(QWidget *dialog, const char *key);
-    void reassign();
+    void leaveKey(QWidget *dialog);
+    void openDialog(bool isAssisted);
+    void reassign(bool isAssisted);
     void restoreDefaults();
     // Presses a key in a fresh text, whose first word tells whether it was put into capitals.
     QString textAfter(const char *key);
@@ -100,6 +107,7 @@ void tst_vel_gallery_shortcuts::init()
     TestCase::init();
     qputenv("VEL_CONFIG_HOME", QFile::encodeName(folder()));
     write(str("keyshortcutrc"), "[ShortCutKeys]\n\"None|Ctrl|Alt|j\"=\"VELWM_RUN\"\n");
+    QSettings(str("vel-gallery"), str("vel-gallery")).clear();
     start();
 }
 
@@ -185,8 +193,27 @@ QString tst_vel_gallery_shortcuts::savedKey() const
     return settings.value(str("Shortcuts/word-upper"), str("(not saved)")).toString();
 }
 
+// The assisted dialog refuses a key when the user leaves it.
+void tst_vel_gallery_shortcuts::leaveKey(QWidget *dialog)
+{
+    if (auto *filter = dialog->findChild<QLineEdit *>(str("filterEdit"))) {
+        auto *keyWidget = dialog->findChild<QKeySequenceEdit *>(str("keyWidget"));
+        QTRY_VERIFY(!keyWidget->keySequence().isEmpty());
+        click(filter);
+    }
+}
+
+void tst_vel_gallery_shortcuts::openDialog(bool isAssisted)
+{
+    if (isAssisted)
+        press("ctrl+F12");
+    else
+        QTimer::singleShot(0, m_window->findChild<QAction *>(str("configure-shortcuts-plain")),
+                           &QAction::trigger);
+}
+
 // Tries two keys that are taken, then a free one.
-void tst_vel_gallery_shortcuts::reassign()
+void tst_vel_gallery_shortcuts::reassign(bool isAssisted)
 {
     ModalDriver modal;
     int boxes = 0;
@@ -197,15 +224,19 @@ void tst_vel_gallery_shortcuts::reassign()
     modal.handle([&](QWidget *dialog) {
         const DialogEnd end(dialog);
         waitUntilSettled(dialog);
-        QVERIFY(qobject_cast<EditShortcutsDialog *>(dialog));
+        auto *shortcuts = qobject_cast<EditShortcutsDialog *>(dialog);
+        QVERIFY(shortcuts);
+        QCOMPARE(shortcuts->assistance(), isAssisted);
         auto *keyWidget = dialog->findChild<QKeySequenceEdit *>(str("keyWidget"));
         clickRow(dialog, str("To upper case"));
         auto *custom = dialog->findChild<QRadioButton *>(str("customKeyRB"));
         click(custom, QPoint(10, custom->height() / 2));
         QTRY_VERIFY(keyWidget->isEnabled());
         record(dialog, "F3");
+        leaveKey(dialog);
         QTRY_COMPARE(boxes, 1);
         record(dialog, "ctrl+alt+j");
+        leaveKey(dialog);
         QTRY_COMPARE(boxes, 2);
         record(dialog, "ctrl+shift+F8");
         auto *ok = dialog->findChild<QDialogButtonBox *>(str("buttonBox"))->button(QDialogButtonBox::Ok);
@@ -220,7 +251,7 @@ void tst_vel_gallery_shortcuts::reassign()
     modal.answerWith({QMessageBox::Critical, str("Shortcuts conflict"),
                       str("Shortcut 'Ctrl+Alt+J' is already used for global action 'VELWM_RUN'.")},
                      count);
-    press("ctrl+F12");
+    openDialog(isAssisted);
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished() && !QApplication::activeModalWidget(), 30000);
 }
 
@@ -240,13 +271,21 @@ void tst_vel_gallery_shortcuts::restoreDefaults()
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished() && !QApplication::activeModalWidget(), 30000);
 }
 
+void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain_data()
+{
+    QTest::addColumn<bool>("isAssisted");
+    QTest::newRow("assisted") << true;
+    QTest::newRow("plain") << false;
+}
+
 void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain()
 {
+    QFETCH(bool, isAssisted);
     QCOMPARE(textAfter("F7"), str("SOME text"));
     QCOMPARE(textAfter("ctrl+shift+F8"), str("some text"));
     QCOMPARE(savedKey(), str("(not saved)"));
 
-    reassign();
+    reassign(isAssisted);
     QCOMPARE(textAfter("ctrl+shift+F8"), str("SOME text"));
     QCOMPARE(textAfter("F7"), str("some text"));
     QCOMPARE(savedKey(), str("Ctrl+Shift+F8"));
@@ -260,6 +299,31 @@ void tst_vel_gallery_shortcuts::reassignsAnActionAndFindsItAgain()
     start();
     QCOMPARE(textAfter("F7"), str("SOME text"));
     QCOMPARE(textAfter("ctrl+shift+F8"), str("some text"));
+}
+
+void tst_vel_gallery_shortcuts::exportsAndImportsKeys()
+{
+    ModalDriver modal;
+    const auto choose = [&modal, this](const char *name) {
+        modal.handle([file = path(str(name))](QWidget *window) {
+            window->findChild<QLineEdit *>(str("fileNameEdit"))->setText(file);
+            qobject_cast<QDialog *>(window)->accept();
+        });
+    };
+    const auto trigger = [this](const char *name) { m_window->findChild<QAction *>(str(name))->trigger(); };
+    choose("keys.ini");
+    trigger("export-keys");
+    QByteArray keys = read(path(str("keys.ini")));
+    QVERIFY2(keys.contains("word-upper=\"F7\""), keys.constData());
+    write(str("keys.ini"), keys.replace("word-upper=\"F7\"", "word-upper=\"Ctrl+Shift+F8\""));
+    choose("keys.ini");
+    trigger("import-keys");
+    QVERIFY(modal.finished());
+    QCOMPARE(savedKey(), str("Ctrl+Shift+F8"));
+    QCOMPARE(textAfter("ctrl+shift+F8"), str("SOME text"));
+    choose("keys.html");
+    trigger("sheet-html");
+    QVERIFY(read(path(str("keys.html"))).contains("To upper case"));
 }
 
 VEL_TEST_MAIN(tst_vel_gallery_shortcuts)
