@@ -29,15 +29,16 @@
 
 namespace {
 
-// Takes an item away that was only just created.
-void takeBack(const QString &path, FreeName::Kind kind)
+// Takes an item away that was only just created; why it is still there, else an empty text. A folder
+// may hold by now what others put into it, and stays then.
+QString takeBack(const QString &path, FreeName::Kind kind)
 {
-    if (kind == FreeName::Kind::Entry) {
-        QFile::remove(path);
-        return;
-    }
-    QFile::remove(EntryPath::recordFileOf(path));
-    QDir().rmdir(path);
+    const bool isEntry = kind == FreeName::Kind::Entry;
+    QFile record(isEntry ? path : EntryPath::recordFileOf(path));
+    const bool isGone = record.remove() || !record.exists();
+    if (!isEntry)
+        QDir().rmdir(path);
+    return isGone ? QString() : record.errorString();
 }
 
 } // namespace
@@ -130,11 +131,13 @@ bool MenuEditing::offerNew(const QString &path, FreeName::Kind kind)
     const QPointer<MenuEditing> self(this);
     if (openEditor(path))
         return true;
-    takeBack(path, kind);
+    const QString whyNotGone = takeBack(path, kind);
     if (!self)
         return false;
     m_menu.files().forgetItemInfo(path);
     m_selection.leave(path);
+    if (!whyNotGone.isEmpty())
+        tellWhatStays(path, path, whyNotGone);
     return false;
 }
 

@@ -8,6 +8,7 @@
 #include "VelMenuView.h"
 
 #include <QFileSystemModel>
+#include <QPushButton>
 #include <QSignalSpy>
 
 #include <memory>
@@ -27,6 +28,8 @@ private Q_SLOTS:
     void tellsThatAnOrderCannotBeSaved();
     void tellsWhyAnEntryCannotBeDeleted();
     void tellsWhatIsLeftOfAFolder();
+    void tellsThatACanceledItemStays();
+    void saysNothingOfWhatOthersDeleted();
 
 private:
     void show(const QString &directory, int rows);
@@ -196,6 +199,41 @@ void tst_VelMenuViewFailures::tellsWhatIsLeftOfAFolder()
                  .arg(sub, kept));
     QCOMPARE(m_changes->size(), 1);
     QVERIFY(!QFile::exists(sub + QLatin1String("/y.desktop")));
+}
+
+void tst_VelMenuViewFailures::tellsThatACanceledItemStays()
+{
+    show(menu(), 0);
+    std::unique_ptr<OrdinaryUser> user;
+    ModalDriver modal;
+    modal.handle([&](QWidget *dialog) {
+        user = std::make_unique<OrdinaryUser>(folder());
+        QVERIFY(QFile::setPermissions(menu(), QFile::ReadOwner | QFile::ExeOwner));
+        reject(dialog);
+    });
+    QVERIFY(!m_view->createNew(false));
+    QVERIFY(QFile::setPermissions(menu(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+    QVERIFY(modal.finished());
+    QCOMPARE(told(),
+             QStringLiteral("%1/shortcut.desktop could not be deleted: Permission denied. Make sure that the "
+                            "folder that holds it may be written, then try again.")
+                 .arg(menu()));
+}
+
+void tst_VelMenuViewFailures::saysNothingOfWhatOthersDeleted()
+{
+    const QString a = writeLetters("a").constFirst();
+    show(menu(), 1);
+    select(*m_view, a);
+    ModalDriver modal;
+    modal.handle([&](QWidget *box) {
+        QVERIFY(QFile::remove(a));
+        qobject_cast<QMessageBox *>(box)->button(QMessageBox::Yes)->click();
+    });
+    m_view->slotDel();
+    QVERIFY(modal.finished());
+    QCOMPARE(m_told->size(), 0);
+    QCOMPARE(m_changes->size(), 1);
 }
 
 VEL_TEST_MAIN(tst_VelMenuViewFailures)
