@@ -80,7 +80,10 @@ public:
     bool assistance() const;
 
     /**
-     * Switches on what helps users beyond the plain tree. Off, as it is at first, the view has
+     * Switches on what helps users beyond the plain tree: a filter (setFilter()), gray rows for
+     * entries that the menu does not show, with the reason as their tool tips (setHiddenShown()),
+     * "Hide" and "Show again" in the context menu, and the names of files for entries that have
+     * none. Off, as it is at first, the view has
      * nothing of that. A further init() keeps it as it is.
      *
      * @param assistance whether the view is to help
@@ -118,6 +121,17 @@ public:
 
     /// The command that does again what was taken back last, with Ctrl+Shift+Z; see undoAction().
     QAction *redoAction() const;
+
+    /**
+     * Shows the entries, too, that the menu leaves out because they are marked as deleted or are
+     * meant for other desktops.
+     *
+     * Everything that the menu does not show is gray and has a tool tip that says why. Without
+     * assistance() nothing more is shown.
+     *
+     * @param shown whether to show them
+     */
+    void setHiddenShown(bool shown);
 
     /// The menu directory that the view was built on, as it was given.
     QString menuDir() const;

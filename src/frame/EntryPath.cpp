@@ -20,6 +20,11 @@ QString EntryPath::entryNamed(const QString &stem)
     return stem + EntrySuffix;
 }
 
+QString EntryPath::stemOf(const QString &fileName)
+{
+    return isEntry(fileName) ? fileName.left(fileName.size() - EntrySuffix.size()) : fileName;
+}
+
 bool EntryPath::isRecordFile(const QString &path)
 {
     return path.endsWith(RecordFileSuffix);

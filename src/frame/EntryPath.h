@@ -19,6 +19,9 @@ bool isEntry(const QString &path);
 /// The file name of an entry that is called \a stem.
 QString entryNamed(const QString &stem);
 
+/// A file name without the end that makes it that of an entry.
+QString stemOf(const QString &fileName);
+
 /// Whether \a path is that of the record file of a folder.
 bool isRecordFile(const QString &path);
 

@@ -3,9 +3,10 @@
 
 #include "EntryDisplay.h"
 
+#include "EntryState.h"
+
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
-#include <frame/Undisplayable.h>
 
 #include <QFileInfo>
 
@@ -31,7 +32,5 @@ QString EntryDisplay::shownName(const VelUIDesktopEntry &entry)
 
 bool EntryDisplay::isHidden(const VelUIDesktopEntry &entry)
 {
-    VelUIDesktopEntry::DisplayableError reason = 0;
-    return !entry.isDisplayable(&reason)
-        && (reason == Undisplayable::Hidden || reason == Undisplayable::ForOtherDesktops);
+    return EntryState::isHidden(EntryState::of(entry));
 }

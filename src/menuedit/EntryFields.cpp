@@ -9,6 +9,8 @@
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
 
+#include <algorithm>
+
 namespace {
 
 constexpr int MostCharacters = 16 * 1024 * 1024;
@@ -21,7 +23,8 @@ QString fileNameOf(const QString &path)
 EntryFields::Fields read(const QString &path, const QString &file)
 {
     const VelUIDesktopEntry entry(file);
-    const QStringList fields{fileNameOf(path),
+    const QString fileName = fileNameOf(path);
+    const QStringList fields{EntryPath::stemOf(fileName),
                              entry.getName(),
                              entry.getLocalName(),
                              entry.getGenericName(),
@@ -31,11 +34,19 @@ EntryFields::Fields read(const QString &path, const QString &file)
                              entry.getExec(),
                              entry.getKeywords().join(QLatin1Char('\n')),
                              entry.getLocalKeywords().join(QLatin1Char('\n'))};
-    return {SearchText::folded(fields.join(QLatin1Char('\n'))),
+    return {SearchText::folded(fields.join(QLatin1Char('\n'))), SearchText::folded(fileName),
             EntryPath::isEntry(file) && EntryDisplay::isHidden(entry)};
 }
 
 } // namespace
+
+bool EntryFields::match(const Fields &fields, const QStringList &words)
+{
+    return std::all_of(words.begin(), words.end(), [&fields](const QString &word) {
+        return fields.text.contains(word)
+            || (word.contains(QLatin1Char('.')) && fields.fileName.contains(word));
+    });
+}
 
 EntryFields::EntryFields()
     : m_known(MostCharacters)
@@ -46,7 +57,7 @@ EntryFields::Fields EntryFields::of(const QString &path, bool isFolder)
 {
     const QString file = EntryDisplay::describingFile(path, isFolder);
     if (file.isEmpty())
-        return {SearchText::folded(fileNameOf(path)), false};
+        return {SearchText::folded(fileNameOf(path)), QString(), false};
     const FileIdentity identity(file);
     const Known *known = m_known.object(path);
     if (known && known->identity == identity)

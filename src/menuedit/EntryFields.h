@@ -7,6 +7,7 @@
 
 #include <QCache>
 #include <QString>
+#include <QStringList>
 
 /**
  * What the items of a menu can be found by: their names, generic names, comments, commands,
@@ -21,8 +22,12 @@ public:
     struct Fields
     {
         QString text; ///< folded (see SearchText), the fields apart by line feeds
+        QString fileName; ///< folded; the text has it without ".desktop", which they all have
         bool isHidden = false; ///< the menu leaves the item out
     };
+
+    /// Whether all \a words stand in \a fields; those with a dot may stand in the file name.
+    static bool match(const Fields &fields, const QStringList &words);
 
     EntryFields();
     EntryFields(const EntryFields &) = delete;

@@ -96,7 +96,8 @@ MenuFind::End MenuFind::search(const QString &text, QVector<MenuWalk::Item> *mat
     bool isInTime = true;
     while (const std::optional<MenuWalk::Item> item = isInTime ? walk.next() : std::nullopt) {
         const RowCache::Display display = m_menu.files().displayOf(item->path, item->isFolder);
-        if (!display.isHidden && display.name.contains(text, Qt::CaseInsensitive))
+        if ((!display.isHidden || m_menu.proxy().isHiddenShown())
+            && display.name.contains(text, Qt::CaseInsensitive))
             matches->append(*item);
         if (!work.goOn() || !self) {
             if (self)

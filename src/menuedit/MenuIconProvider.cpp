@@ -3,7 +3,6 @@
 
 #include "MenuIconProvider.h"
 
-#include "EntryDisplay.h"
 #include "FileIdentity.h"
 #include "RowCache.h"
 #include "VelMimeTypeIconProvider.h"
@@ -72,7 +71,7 @@ private:
             return *known;
         const VelUIDesktopEntry entry(path);
         if (!m_cache->display(path))
-            m_cache->prefetch(path, {EntryDisplay::shownName(entry), EntryDisplay::isHidden(entry)});
+            m_cache->prefetch(path, RowCache::Display::of(entry));
         const QIcon icon = desktopEntryIcon(entry, {});
         // A dot file has no row with which its icon would be forgotten.
         if (identity.isSettled() && !isDotFile(path))

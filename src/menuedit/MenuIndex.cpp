@@ -4,7 +4,6 @@
 #include "MenuIndex.h"
 
 #include "LoadedFolders.h"
-#include "SearchText.h"
 #include "VelMenuModel.h"
 
 #include <QDir>
@@ -95,7 +94,7 @@ FilteredRows MenuIndex::find(const QStringList &words) const
     FilteredRows rows;
     for (const QVector<Item> *items : {&m_items, &m_new}) {
         for (const Item &item : *items) {
-            if ((m_isHiddenFound || !item.fields.isHidden) && SearchText::hasAll(item.fields.text, words))
+            if ((m_isHiddenFound || !item.fields.isHidden) && EntryFields::match(item.fields, words))
                 rows.add(m_root, item.path, item.isFolder);
         }
     }

@@ -3,9 +3,17 @@
 
 #include "RowCache.h"
 
+#include "EntryDisplay.h"
+
 #include <frame/EntryPath.h>
 
 #include <iterator>
+
+RowCache::Display RowCache::Display::of(const VelUIDesktopEntry &entry)
+{
+    const EntryState::Kind state = EntryState::of(entry);
+    return {EntryDisplay::shownName(entry), EntryState::isHidden(state), state};
+}
 
 RowCache::RowCache()
 {
@@ -20,7 +28,7 @@ std::optional<RowCache::Display> RowCache::display(const QString &path) const
     const auto row = m_rows.constFind(path);
     if (row == m_rows.constEnd() || !row->isNamed)
         return std::nullopt;
-    return Display{row->name, row->isHidden};
+    return Display{row->name, row->isHidden, row->state};
 }
 
 void RowCache::setDisplay(const QString &path, const Display &display)
@@ -29,6 +37,7 @@ void RowCache::setDisplay(const QString &path, const Display &display)
     row.name = display.name;
     row.isNamed = true;
     row.isHidden = row.isHidden || display.isHidden;
+    row.state = display.state;
 }
 
 void RowCache::prefetch(const QString &path, const Display &display)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "EntryState.h"
 #include "FileIdentity.h"
 
 #include <QHash>
@@ -14,6 +15,8 @@
 #include <QTimer>
 
 #include <optional>
+
+class VelUIDesktopEntry;
 
 /**
  * What a menu model remembers of its rows, by their paths; looks at no file.
@@ -32,6 +35,10 @@ public:
     {
         QString name;
         bool isHidden = false;
+        EntryState::Kind state = EntryState::Kind::Shown;
+
+        /// How \a entry is shown.
+        static Display of(const VelUIDesktopEntry &entry);
     };
 
     RowCache();
@@ -77,6 +84,7 @@ private:
         QString name;
         bool isNamed = false;
         bool isHidden = false;
+        EntryState::Kind state = EntryState::Kind::Shown;
         FileIdentity identity; // of the entry that the icon was made of
         std::optional<QIcon> icon;
     };

@@ -69,9 +69,3 @@ QStringList SearchText::words(const QString &typed)
                      [](const QString &left, const QString &right) { return left.size() > right.size(); });
     return words;
 }
-
-bool SearchText::hasAll(const QString &folded, const QStringList &words)
-{
-    return std::all_of(words.begin(), words.end(),
-                       [&folded](const QString &word) { return folded.contains(word); });
-}

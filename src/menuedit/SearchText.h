@@ -17,7 +17,4 @@ QString folded(const QString &text);
 /// The words of what a user typed, folded; a longer one comes first, as it decides sooner.
 QStringList words(const QString &typed);
 
-/// Whether every one of the \a words stands somewhere in a \a folded text.
-bool hasAll(const QString &folded, const QStringList &words);
-
 } // namespace SearchText

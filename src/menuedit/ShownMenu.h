@@ -31,6 +31,9 @@ public:
     VelMenuModel &files() const { return *m_files; }
     VelMenuProxyModel &proxy() const { return *m_proxy; }
 
+    /// Whether the rows tell more than their names; see VelMenuModel::setAssisted().
+    void setAssisted(bool isAssisted);
+
     /// Builds the model of the files under the sorting model. To be called again when the
     /// directory was replaced: what the model watched is gone then.
     void build();
@@ -38,6 +41,7 @@ public:
 private:
     const QString m_directory;
     const bool m_isEditable;
+    bool m_isAssisted = false;
     VelMenuView *const m_view;
     std::unique_ptr<VelMenuModel> m_files;
     std::unique_ptr<VelMenuProxyModel> m_proxy;

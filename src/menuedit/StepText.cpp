@@ -49,6 +49,12 @@ constexpr Texts AllTexts[] = {
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo default menu"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo default menu"),
      QT_TRANSLATE_NOOP("MenuHistory", "The default menu was built.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo hiding of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo hiding of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 is hidden: the menu no longer shows it.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo showing %1 again"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo showing %1 again"),
+     QT_TRANSLATE_NOOP("MenuHistory", "The menu shows %1 again.")},
 };
 
 // English has no catalog that would know the form for one.

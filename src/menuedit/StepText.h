@@ -23,6 +23,8 @@ public:
         CopyItems, ///< so many into the folder
         Reorder, ///< the item
         Rebuild, ///< the default menu
+        Hide, ///< the item
+        ShowAgain, ///< the item
     };
 
     /// \a item and \a folder are shown names.

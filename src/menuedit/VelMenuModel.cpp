@@ -16,6 +16,10 @@
 #include <QDir>
 #include <QFileIconProvider>
 #include <QFileInfo>
+#include <QFont>
+#include <QGuiApplication>
+#include <QPalette>
+#include <QTextDocument>
 #include <QTimer>
 
 namespace {
@@ -26,10 +30,23 @@ const QDir::Filters DefaultFilter = QDir::AllEntries | QDir::NoDotAndDotDot | QD
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
 
+// Not that of what is disabled: it is to be read.
+QColor grayText()
+{
+    constexpr double Strength = 0.55;
+    const QColor text = QGuiApplication::palette().color(QPalette::Text);
+    const QColor base = QGuiApplication::palette().color(QPalette::Base);
+    const auto mixed = [](double from, double to) { return to + (from - to) * Strength; };
+    return QColor::fromRgbF(mixed(text.redF(), base.redF()), mixed(text.greenF(), base.greenF()),
+                            mixed(text.blueF(), base.blueF()));
+}
+
 RowCache::Display readDisplay(const QString &file)
 {
     const VelUIDesktopEntry entry(file);
-    return {EntryDisplay::shownName(entry), EntryPath::isEntry(file) && EntryDisplay::isHidden(entry)};
+    if (EntryPath::isEntry(file))
+        return RowCache::Display::of(entry);
+    return {EntryDisplay::shownName(entry)};
 }
 
 } // namespace
@@ -76,6 +93,10 @@ QVariant VelMenuModel::data(const QModelIndex &index, int role) const
             return displayName(index);
         if (role == HiddenRole)
             return isHidden(index);
+        if (m_isAssisted && (role == Qt::ForegroundRole || role == Qt::FontRole))
+            return markOf(index, role);
+        if (m_isAssisted && (role == Qt::ToolTipRole || role == Qt::AccessibleDescriptionRole))
+            return explanation(index, role);
         if (role == Qt::DecorationRole && m_cache->hasEditedIcons()) {
             const std::optional<QIcon> icon = m_cache->editedIcon(pathOf(index));
             if (icon)
@@ -238,7 +259,31 @@ QVariant VelMenuModel::displayName(const QModelIndex &index) const
         return known->name;
     if (!loadItemInfo(path, isDir(index)))
         return QFileSystemModel::data(index, Qt::DisplayRole);
-    return m_cache->display(path).value_or(RowCache::Display()).name;
+    const QString name = m_cache->display(path).value_or(RowCache::Display()).name;
+    return name.isEmpty() && m_isAssisted ? QFileSystemModel::data(index, Qt::DisplayRole) : name;
+}
+
+// Gray stands for what the menu does not show, slanted for what has no name of its own.
+QVariant VelMenuModel::markOf(const QModelIndex &index, int role) const
+{
+    const EntryState::Kind state = m_cache->display(pathOf(index)).value_or(RowCache::Display()).state;
+    if (role == Qt::ForegroundRole && EntryState::isOutsideMenu(state))
+        return grayText();
+    if (role == Qt::FontRole && state != EntryState::Kind::Shown && !EntryState::isOutsideMenu(state)) {
+        QFont font;
+        font.setItalic(true);
+        return font;
+    }
+    return {};
+}
+
+QVariant VelMenuModel::explanation(const QModelIndex &index, int role) const
+{
+    const QString path = pathOf(index);
+    if (m_cache->display(path).value_or(RowCache::Display()).state == EntryState::Kind::Shown)
+        return {};
+    const QString text = EntryState::explanation(path);
+    return role == Qt::ToolTipRole && Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text, Qt::WhiteSpaceNormal) : text;
 }
 
 bool VelMenuModel::isHidden(const QModelIndex &index) const

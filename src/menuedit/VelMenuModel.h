@@ -54,6 +54,10 @@ public:
     /// Makes no row, and remembers nothing.
     RowCache::Display displayOf(const QString &path, bool isFolder) const;
 
+    /// Whether rows tell more than their names: what the menu does not show is gray and says why,
+    /// and what has no name shows that of its file. Who switches it has the rows painted anew.
+    void setAssisted(bool isAssisted) { m_isAssisted = isAssisted; }
+
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);
     /// To be told that the folder at \a path has a record file now, if it had none.
@@ -77,6 +81,8 @@ Q_SIGNALS:
     void changed();
 
 private:
+    QVariant markOf(const QModelIndex &index, int role) const;
+    QVariant explanation(const QModelIndex &index, int role) const;
     bool loadItemInfo(const QString &path, bool isFolder) const;
     QString pathOf(const QModelIndex &index) const;
     QVariant displayName(const QModelIndex &index) const;
@@ -97,6 +103,7 @@ private:
     QPointer<MenuIconProvider> m_icons;
     // The paths of the rows that are about to go.
     QStringList m_going;
+    bool m_isAssisted = false;
     bool m_isCompleting = false;
     bool m_keepsOrder = true;
     bool m_isFiltered = false;

@@ -134,6 +134,25 @@ void VelMenuProxyModel::setFilter(const std::optional<FilteredRows> &rows)
     invalidate();
 }
 
+void VelMenuProxyModel::setHiddenShown(bool isShown)
+{
+    if (m_isHiddenShown == isShown)
+        return;
+    m_isHiddenShown = isShown;
+    invalidate();
+}
+
+void VelMenuProxyModel::forgetNames()
+{
+    dropAll();
+    invalidate();
+}
+
+bool VelMenuProxyModel::isLeftOut(const QModelIndex &index) const
+{
+    return !m_isHiddenShown && index.data(VelMenuModel::HiddenRole).toBool();
+}
+
 void VelMenuProxyModel::letThrough(const QString &path)
 {
     if (!m_filter || !m_files || m_filter->contains(path))
@@ -149,7 +168,7 @@ QVector<QModelIndex> VelMenuProxyModel::allInOrder(const QModelIndex &folder) co
     const int count = sourceModel()->rowCount(folder);
     for (int row = 0; row < count; ++row) {
         const QModelIndex child = sourceModel()->index(row, 0, folder);
-        if (!child.data(VelMenuModel::HiddenRole).toBool())
+        if (!isLeftOut(child))
             children.append(child);
     }
     std::stable_sort(
@@ -172,7 +191,7 @@ bool VelMenuProxyModel::isLetThrough(const QModelIndex &index) const
 bool VelMenuProxyModel::filterAcceptsRow(int sourceRow, const QModelIndex &sourceParent) const
 {
     const QModelIndex index = sourceModel()->index(sourceRow, 0, sourceParent);
-    if (index.data(VelMenuModel::HiddenRole).toBool() || !isLetThrough(index))
+    if (isLeftOut(index) || !isLetThrough(index))
         return false;
     return QSortFilterProxyModel::filterAcceptsRow(sourceRow, sourceParent);
 }

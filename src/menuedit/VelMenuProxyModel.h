@@ -44,6 +44,13 @@ public:
 
     /// Shows only what the \a rows let through; everything for none.
     void setFilter(const std::optional<FilteredRows> &rows);
+    /// To be told that rows may have other names now; sorts anew.
+    void forgetNames();
+
+    /// Whether entries are shown that the source model marks as hidden.
+    void setHiddenShown(bool isShown);
+    bool isHiddenShown() const { return m_isHiddenShown; }
+
     bool isFiltered() const { return m_filter.has_value(); }
     /// What a filter lets through; to be asked while there is one.
     const FilteredRows &filteredRows() const { return *m_filter; }
@@ -62,6 +69,7 @@ private:
     struct Row;
     class Item;
 
+    bool isLeftOut(const QModelIndex &index) const;
     bool isLetThrough(const QModelIndex &index) const;
     void watch(QAbstractItemModel *model);
     void dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight);
@@ -88,6 +96,7 @@ private:
     QString m_menuDirectory;
     QString m_root; // the same, without a "/" at the end
     std::optional<FilteredRows> m_filter;
+    bool m_isHiddenShown = false;
     bool m_isTakingMany = false;
     mutable bool m_isOrdering = false;
     mutable bool m_needsFileOrder = false;

@@ -59,8 +59,6 @@ bool VelMenuView::assistance() const
 void VelMenuView::setAssistance(bool assistance)
 {
     d->setAssisted(assistance);
-    if (!assistance)
-        d->filter.setText(QString());
 }
 
 QAction *VelMenuView::undoAction() const
@@ -143,6 +141,12 @@ void VelMenuView::setFilter(const QString &text)
         return;
     d->filter.setText(text);
     setActionsEnabled();
+}
+
+void VelMenuView::setHiddenShown(bool shown)
+{
+    if (d->isAssisted)
+        d->setHiddenShown(shown);
 }
 
 bool VelMenuView::createNew(bool folder)

@@ -31,6 +31,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , find(view, menu, selection, voice)
     , filter(view, menu, selection, voice)
     , history(view, menu, selection, find, voice)
+    , hiding(menu, selection, find, voice, history)
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
     , m_rootWatch(menu.directory())
@@ -56,6 +57,8 @@ MenuHistory &VelMenuViewPrivate::historyOf(const VelMenuView &view)
 
 void VelMenuViewPrivate::setAssisted(bool assisted)
 {
+    if (assisted != isAssisted)
+        setAssistedTree(assisted);
     isAssisted = assisted;
     history.setOn(assisted && menu.isEditable());
     historyEnd.reset();
@@ -88,6 +91,7 @@ void VelMenuViewPrivate::show()
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::setActionsEnabled);
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::changed);
     QObject::connect(&history, &MenuHistory::replaced, q, [this] { showAnew(); });
+    QObject::connect(&hiding, &MenuHiding::changed, q, &VelMenuView::changed);
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
     QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
     QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
@@ -188,6 +192,29 @@ void VelMenuViewPrivate::editCurrent()
                                            "%1 cannot be edited, because the folder %2 may not be written.")
                    .arg(info.filePath(), info.isDir() ? info.filePath() : info.path()),
                MenuVoice::Failure, q->currentIndex());
+}
+
+void VelMenuViewPrivate::setAssistedTree(bool assisted)
+{
+    menu.setAssisted(assisted);
+    if (actions)
+        hiding.setContextMenu(assisted ? actions->menu() : nullptr);
+    if (assisted)
+        return;
+    filter.setText(QString());
+    setHiddenShown(false);
+}
+
+// What is no longer shown may not stay selected.
+void VelMenuViewPrivate::setHiddenShown(bool isShown)
+{
+    const QModelIndex selected = selection.item();
+    if (!isShown && selected.data(VelMenuModel::HiddenRole).toBool())
+        selection.clear();
+    find.clear();
+    menu.proxy().setHiddenShown(isShown);
+    filter.setHiddenFound(isShown);
+    q->setActionsEnabled();
 }
 
 void VelMenuViewPrivate::makeEditable()

@@ -8,6 +8,7 @@
 #include "MenuEditing.h"
 #include "MenuFilter.h"
 #include "MenuFind.h"
+#include "MenuHiding.h"
 #include "MenuHistory.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
@@ -50,6 +51,7 @@ public:
     MenuFind find;
     MenuFilter filter;
     MenuHistory history;
+    MenuHiding hiding;
     MenuEditing editing;
     MenuDeletion deletion;
     /// Null where the view is only to be looked at.
@@ -68,10 +70,12 @@ public:
     void removeSelected();
     /// Builds the default menu anew.
     void recreate();
+    void setHiddenShown(bool isShown);
     /// Does what a key does to the item that the keyboard is on; whether it does anything.
     bool takeKey(const QKeyEvent &event);
 
 private:
+    void setAssistedTree(bool assisted);
     void editCurrent();
     void makeEditable();
     void connectActions();

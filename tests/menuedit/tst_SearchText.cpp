@@ -13,7 +13,6 @@ private Q_SLOTS:
     void foldsCaseAndAccents_data();
     void foldsCaseAndAccents();
     void takesTextApartIntoWords();
-    void findsWordsInAnyOrder();
 };
 
 void tst_SearchText::foldsCaseAndAccents_data()
@@ -46,15 +45,6 @@ void tst_SearchText::takesTextApartIntoWords()
     QCOMPARE(SearchText::words(QStringLiteral(" \t")), QStringList());
     QCOMPARE(SearchText::words(QStringLiteral("  web É  Browser web")),
              (QStringList{QStringLiteral("browser"), QStringLiteral("web"), QStringLiteral("e")}));
-}
-
-void tst_SearchText::findsWordsInAnyOrder()
-{
-    const QString text = SearchText::folded(QStringLiteral("Firefox\nWeb Browser"));
-    QVERIFY(SearchText::hasAll(text, SearchText::words(QStringLiteral("brow FIRE"))));
-    QVERIFY(SearchText::hasAll(text, {}));
-    QVERIFY(!SearchText::hasAll(text, SearchText::words(QStringLiteral("fire mail"))));
-    QVERIFY(!SearchText::hasAll(text, SearchText::words(QStringLiteral("firefoxweb"))));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_SearchText)
