@@ -3,6 +3,7 @@
 
 #include "VelMenuDialog.h"
 
+#include "MenuDialogAssistance.h"
 #include "MenuUpdateCommand.h"
 #include "StartMenu.h"
 #include "VelMenuView.h"
@@ -25,6 +26,7 @@
 #include <QToolBar>
 #include <QVBoxLayout>
 
+#include <memory>
 #include <string>
 
 namespace {
@@ -49,6 +51,8 @@ public:
     bool anyItemSelectable = false;
     int menuKind = MenuUpdateCommand::NoKind;
     QToolBar *toolBar = nullptr;
+    // Null without assistance.
+    std::unique_ptr<MenuDialogAssistance> helper;
 
     VelMenuDialog *q;
 
@@ -183,7 +187,14 @@ bool VelMenuDialog::assistance() const
 
 void VelMenuDialog::setAssistance(bool assistance)
 {
+    if (assistance == this->assistance())
+        return;
     d->view->setAssistance(assistance);
+    d->helper.reset();
+    if (assistance) {
+        auto *layout = qobject_cast<QVBoxLayout *>(this->layout());
+        d->helper = std::make_unique<MenuDialogAssistance>(this, layout, d->view, d->toolBar);
+    }
 }
 
 QString VelMenuDialog::menuDir() const

@@ -1,0 +1,277 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "HandsOnTestCase.h"
+#include "ModalDriver.h"
+#include "VelMenuDialog.h"
+#include "VelMenuView.h"
+#include "XDoTool.h"
+
+#include <QAccessible>
+#include <QAction>
+#include <QDialogButtonBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QSignalSpy>
+#include <QVBoxLayout>
+
+#include <private/qguiapplication_p.h>
+#include <qpa/qplatformaccessibility.h>
+#include <qpa/qplatformintegration.h>
+
+namespace {
+
+QStringList alerts;
+
+void noteAlert(QAccessibleEvent *event)
+{
+    if (event->type() == QAccessible::Alert)
+        alerts.append(event->object()->objectName());
+}
+
+} // namespace
+
+/// What the menu dialog has beyond its plain form, by mouse and keyboard.
+class tst_MenuDialogAssistance : public HandsOnTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void isNotThereAtFirst();
+    void filtersWhatIsTyped();
+    void takesTheKeyToFindAnywhere();
+    void goesFromMatchToMatch();
+    void clearsByEscapeAndStaysOpen();
+    void showsHiddenEntries();
+    void tellsWhatTheViewTells_data();
+    void tellsWhatTheViewTells();
+    void tellsWhyTheMenuCannotBeChanged();
+    void helpsWhoPicksToo();
+    void leavesNothingBehind();
+
+private:
+    void openAssisted(int count);
+    QLineEdit *filterEdit() const { return dialog()->findChild<QLineEdit *>(QStringLiteral("filterEdit")); }
+    QLabel *message() const { return dialog()->findChild<QLabel *>(QStringLiteral("messageLabel")); }
+    static QStringList partsOf(const QObject *dialog);
+};
+
+void tst_MenuDialogAssistance::openAssisted(int count)
+{
+    openDialog(menu(), count);
+    dialog()->setAssistance(true);
+    dialog()->layout()->activate();
+    QTRY_VERIFY(filterEdit()->isVisible());
+    view().setFocus();
+}
+
+// The names and classes of all objects below it, but for what Qt makes by itself.
+QStringList tst_MenuDialogAssistance::partsOf(const QObject *dialog)
+{
+    QStringList parts;
+    const QList<QWidget *> widgets = dialog->findChildren<QWidget *>();
+    for (const QWidget *widget : widgets)
+        parts.append(QString::fromLatin1(widget->metaObject()->className()) + widget->objectName());
+    const QList<QAction *> actions = dialog->findChildren<QAction *>();
+    for (const QAction *action : actions)
+        parts.append(action->objectName() + action->text() + action->shortcut().toString()
+                     + QString::number(action->shortcutContext()));
+    parts.sort();
+    return parts;
+}
+
+void tst_MenuDialogAssistance::isNotThereAtFirst()
+{
+    openDialog(menu(), 0);
+    for (const char *name : {"filterEdit", "hiddenButton", "messageLabel", "messageUndoButton"})
+        QVERIFY2(!dialog()->findChild<QWidget *>(QLatin1String(name)), name);
+    QVERIFY(!dialog()->assistance());
+}
+
+void tst_MenuDialogAssistance::filtersWhatIsTyped()
+{
+    writeEntry(QStringLiteral("games/chess.desktop"), QStringLiteral("Chess"), "Exec=xboard\n");
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    openAssisted(2);
+    QCOMPARE(filterEdit()->placeholderText(), QStringLiteral("Filter by name, command or keyword"));
+    QCOMPARE(filterEdit()->accessibleName(), QStringLiteral("Filter"));
+    QVERIFY(filterEdit()->isClearButtonEnabled());
+    XDoTool::click(filterEdit());
+    XDoTool::run(QStringLiteral("type --delay 30 BOARD"));
+    QTRY_COMPARE(names(view(), menu()), QStringList{QStringLiteral("games")});
+    QTRY_COMPARE(names(view(), menu() + QLatin1String("/games")), QStringList{QStringLiteral("Chess")});
+    XDoTool::press(QStringLiteral("Return"));
+    QTRY_COMPARE(view().selectedPath(), menu() + QLatin1String("/games/chess.desktop"));
+    QVERIFY(dialog()->isVisible());
+}
+
+void tst_MenuDialogAssistance::takesTheKeyToFindAnywhere()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    openAssisted(1);
+    QTRY_VERIFY(view().hasFocus());
+    XDoTool::press(QStringLiteral("ctrl+f"));
+    QTRY_VERIFY(filterEdit()->hasFocus());
+    dialog()->findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Close)->setFocus();
+    XDoTool::press(QStringLiteral("ctrl+f"));
+    QTRY_VERIFY(filterEdit()->hasFocus());
+    XDoTool::press(QStringLiteral("Down"));
+    QTRY_VERIFY(view().hasFocus());
+}
+
+void tst_MenuDialogAssistance::goesFromMatchToMatch()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("hit a"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit b"));
+    writeEntry(QStringLiteral("c.desktop"), QStringLiteral("miss"));
+    openAssisted(3);
+    XDoTool::press(QStringLiteral("ctrl+f"));
+    QTRY_VERIFY(filterEdit()->hasFocus());
+    XDoTool::run(QStringLiteral("type --delay 30 hit"));
+    QTRY_COMPARE(names(view(), menu()).size(), 2);
+    for (const QString &path : {a, b, a}) {
+        XDoTool::press(QStringLiteral("F3"));
+        QTRY_COMPARE(view().selectedPath(), path);
+    }
+    QVERIFY(filterEdit()->hasFocus());
+    view().setFocus();
+    XDoTool::press(QStringLiteral("F3"));
+    QTRY_COMPARE(view().selectedPath(), b);
+}
+
+void tst_MenuDialogAssistance::clearsByEscapeAndStaysOpen()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    openAssisted(2);
+    for (const bool atTheTree : {false, true}) {
+        XDoTool::press(QStringLiteral("ctrl+f"));
+        QTRY_VERIFY(filterEdit()->hasFocus());
+        XDoTool::run(QStringLiteral("type --delay 30 b"));
+        QTRY_COMPARE(names(view(), menu()).size(), 1);
+        if (atTheTree) {
+            XDoTool::press(QStringLiteral("Down"));
+            QTRY_VERIFY(view().hasFocus());
+        }
+        XDoTool::press(QStringLiteral("Escape"));
+        QTRY_COMPARE(names(view(), menu()).size(), 2);
+        QVERIFY(filterEdit()->text().isEmpty());
+        QVERIFY(dialog()->isVisible());
+    }
+    XDoTool::press(QStringLiteral("Escape"));
+    QTRY_VERIFY(!dialog()->isVisible());
+}
+
+void tst_MenuDialogAssistance::showsHiddenEntries()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"), "Exec=true\nHidden=true\n");
+    openAssisted(1);
+    auto *button = dialog()->findChild<QPushButton *>(QStringLiteral("hiddenButton"));
+    QCOMPARE(button->text(), QStringLiteral("Show hidden"));
+    QVERIFY(button->isCheckable() && !button->isChecked());
+    XDoTool::click(button);
+    QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AB"));
+    XDoTool::click(button);
+    QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("A"));
+}
+
+void tst_MenuDialogAssistance::tellsWhatTheViewTells_data()
+{
+    QTest::addColumn<int>("kind");
+    QTest::addColumn<bool>("isMarked");
+    QTest::newRow("note") << 0 << false;
+    QTest::newRow("warning") << 1 << true;
+    QTest::newRow("failure") << 2 << true;
+}
+
+void tst_MenuDialogAssistance::tellsWhatTheViewTells()
+{
+    QFETCH(int, kind);
+    QFETCH(bool, isMarked);
+    openAssisted(0);
+    const QString text =
+        QStringLiteral("<b>Text</b> of a message that is longer than the line is wide, so that it "
+                       "is shown in two lines or in three.");
+    alerts.clear();
+    const int width = dialog()->width();
+    // As if a screen reader were there.
+    QPlatformAccessibility *platform = QGuiApplicationPrivate::platformIntegration()->accessibility();
+    platform->setActive(true);
+    const auto former = QAccessible::installUpdateHandler(noteAlert);
+    Q_EMIT view().told(text, kind);
+    QAccessible::installUpdateHandler(former);
+    platform->setActive(false);
+    QCOMPARE(message()->text(), text);
+    QCOMPARE(message()->textFormat(), Qt::PlainText);
+    QCOMPARE(alerts, QStringList{QStringLiteral("messageLabel")});
+    auto *icon = dialog()->findChild<QLabel *>(QStringLiteral("messageIcon"));
+    QCOMPARE(icon->isVisible(), isMarked);
+    QVERIFY(!isMarked || !icon->pixmap(Qt::ReturnByValue).isNull());
+    QCoreApplication::processEvents();
+    QCOMPARE(dialog()->width(), width);
+    // Nothing can be taken back yet.
+    QVERIFY(!dialog()->findChild<QPushButton *>(QStringLiteral("messageUndoButton"))->isVisible());
+}
+
+void tst_MenuDialogAssistance::tellsWhyTheMenuCannotBeChanged()
+{
+    openDialog(menu(), 0);
+    const WithoutPermission withoutPermission;
+    QVERIFY(QFile::setPermissions(menu(), QFile::ReadOwner | QFile::ExeOwner));
+    dialog()->setAssistance(true);
+    const QString text =
+        QStringLiteral("This menu cannot be changed: you may not write to the folder %1.").arg(menu());
+    QCOMPARE(message()->text(), text);
+    Q_EMIT view().told(QStringLiteral("Something."), 0);
+    QCOMPARE(message()->text(), QStringLiteral("Something."));
+    filterEdit()->setText(QStringLiteral("x"));
+    QTRY_COMPARE(message()->text(), QStringLiteral("Nothing in this menu matches 'x'."));
+    filterEdit()->clear();
+    QCOMPARE(message()->text(), text);
+    QVERIFY(QFile::setPermissions(menu(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+}
+
+void tst_MenuDialogAssistance::helpsWhoPicksToo()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    const QString b = writeEntry(QStringLiteral("b.desktop"), QStringLiteral("hit"));
+    VelMenuDialog picker(menu(), 22, false, false, nullptr, Qt::Window);
+    picker.setAssistance(true);
+    auto *pickerView = picker.findChild<VelMenuView *>();
+    picker.show();
+    QVERIFY(QTest::qWaitForWindowActive(&picker));
+    QVERIFY(open(*pickerView, menu(), 2));
+    auto *line = picker.findChild<QLineEdit *>(QStringLiteral("filterEdit"));
+    QVERIFY(!line->hasFocus());
+    XDoTool::press(QStringLiteral("ctrl+f"));
+    QTRY_VERIFY(line->hasFocus());
+    XDoTool::run(QStringLiteral("type --delay 30 hit"));
+    QTRY_COMPARE(names(*pickerView, menu()).size(), 1);
+    XDoTool::press(QStringLiteral("F3"));
+    QTRY_COMPARE(pickerView->selectedPath(), b);
+    QVERIFY(picker.findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Ok)->isEnabled());
+    QVERIFY(picker.findChild<QLabel *>(QStringLiteral("messageLabel"))->text().isEmpty());
+}
+
+void tst_MenuDialogAssistance::leavesNothingBehind()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    openDialog(menu(), 1);
+    const QStringList before = partsOf(dialog());
+    dialog()->setAssistance(true);
+    QVERIFY(partsOf(dialog()) != before);
+    dialog()->setAssistance(false);
+    QCOMPARE(partsOf(dialog()), before);
+    QCOMPARE(qobject_cast<QVBoxLayout *>(dialog()->layout())->count(), 3);
+    // The key asks for a text again.
+    clickItem(menu() + QLatin1String("/a.desktop"));
+    ModalDriver modal;
+    modal.handle([](QWidget *) { XDoTool::press(QStringLiteral("Escape")); });
+    XDoTool::press(QStringLiteral("ctrl+f"));
+    QTRY_VERIFY(modal.finished());
+}
+
+VEL_TEST_MAIN(tst_MenuDialogAssistance)
+#include "tst_MenuDialogAssistance.moc"
