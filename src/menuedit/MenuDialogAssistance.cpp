@@ -37,6 +37,7 @@ MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout,
     // The tree is what the keyboard belongs to when the dialog opens.
     if (!dialog->focusWidget())
         view->setFocus();
+    m_message->setUndoAction(view->undoAction());
     connect(view, &VelMenuView::told, m_message.get(), &MessageLine::tell);
     connect(m_filterBar.get(), &MenuFilterBar::textChanged, m_message.get(), &MessageLine::clear);
     takeKeys();

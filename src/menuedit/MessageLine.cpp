@@ -56,6 +56,8 @@ MessageLine::~MessageLine() = default;
 void MessageLine::tell(const QString &text, int kind)
 {
     m_isAtRest = false;
+    m_isUndoable = m_hasChanged && kind < Warning;
+    m_hasChanged = false;
     show(text, kind);
     QAccessibleEvent event(m_label, QAccessible::Alert);
     QAccessible::updateAccessibility(&event);
@@ -72,6 +74,7 @@ void MessageLine::setRest(const QString &text, int kind)
 void MessageLine::clear()
 {
     m_isAtRest = true;
+    m_isUndoable = false;
     show(m_restText, m_restKind);
 }
 
@@ -94,13 +97,16 @@ void MessageLine::setUndoAction(QAction *action)
 {
     m_undo = action;
     if (action)
-        connect(action, &QAction::changed, this, &MessageLine::updateButton);
+        connect(action, &QAction::changed, this, [this] {
+            m_hasChanged = true;
+            updateButton();
+        });
     updateButton();
 }
 
 void MessageLine::updateButton()
 {
-    m_button->setVisible(m_undo && !m_isAtRest);
+    m_button->setVisible(m_undo && m_isUndoable);
     m_button->setEnabled(m_undo && m_undo->isEnabled());
     m_button->setToolTip(m_undo ? m_undo->text() : QString());
 }

@@ -30,8 +30,8 @@ public:
     /// Goes back to what it says at rest.
     void clear();
 
-    /// The action behind the button, which is there as long as the action can be triggered; null
-    /// for no button.
+    /// The action behind the button, null for none. The button stands beside a note that follows on
+    /// a change of the action, which is how one tells that there is something to take back.
     void setUndoAction(QAction *action);
 
 private:
@@ -45,4 +45,6 @@ private:
     QString m_restText;
     int m_restKind = 0;
     bool m_isAtRest = true;
+    bool m_isUndoable = false;
+    bool m_hasChanged = false; // the action, since something was told last
 };

@@ -48,6 +48,7 @@ private Q_SLOTS:
     void tellsWhatTheViewTells();
     void tellsWhyTheMenuCannotBeChanged();
     void helpsWhoPicksToo();
+    void takesBackWhatItTells();
     void leavesNothingBehind();
 
 private:
@@ -253,6 +254,30 @@ void tst_MenuDialogAssistance::helpsWhoPicksToo()
     QTRY_COMPARE(pickerView->selectedPath(), b);
     QVERIFY(picker.findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Ok)->isEnabled());
     QVERIFY(picker.findChild<QLabel *>(QStringLiteral("messageLabel"))->text().isEmpty());
+}
+
+void tst_MenuDialogAssistance::takesBackWhatItTells()
+{
+    writeFolder(QString(), QStringLiteral("Menu"), "a.desktop;b.desktop;");
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    openAssisted(2);
+    auto *button = dialog()->findChild<QPushButton *>(QStringLiteral("messageUndoButton"));
+    QVERIFY(!button->isVisible());
+    clickItem(menu() + QLatin1String("/b.desktop"));
+    clickAction("upAction");
+    QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("BA"));
+    QCOMPARE(message()->text(), QStringLiteral("B has another place."));
+    QVERIFY(button->isVisible() && button->isEnabled());
+    QCOMPARE(button->toolTip(), QStringLiteral("Undo reordering of B"));
+    XDoTool::click(button);
+    QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AB"));
+    QVERIFY(!button->isEnabled());
+    // It does not offer to take back what it does not tell of.
+    clickAction("upAction");
+    filterEdit()->setText(QStringLiteral("nowhere"));
+    QTRY_VERIFY(message()->text().startsWith(QLatin1String("Nothing in this menu")));
+    QVERIFY(!button->isVisible());
 }
 
 void tst_MenuDialogAssistance::leavesNothingBehind()
