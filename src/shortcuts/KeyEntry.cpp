@@ -123,6 +123,9 @@ bool KeyEntry::hold(const QKeySequence &key)
         return false;
     m_recording.hold();
     m_buttons.setRecording(true);
+    // Or the field would take the next chord for a part of it.
+    const QSignalBlocker blocker(m_form.keyWidget);
+    m_form.keyWidget->setKeySequence(key);
     return true;
 }
 

@@ -27,6 +27,7 @@ void ShortcutsMirror::restart()
         action.pending = action.inForce;
     }
     m_chords.clear();
+    m_isHeld = false;
     m_isChanged = false;
     isVisible = false;
     canRestore = true;
@@ -92,6 +93,7 @@ ShortcutsMirror::Messages ShortcutsMirror::endRecording()
         return {};
     const QKeySequence key = sequenceOf(m_chords);
     m_chords.clear();
+    m_isHeld = false;
     if (key == actions[std::size_t(current)].pending)
         return {};
     const Messages messages = refuse(key);
@@ -128,13 +130,79 @@ ShortcutsMirror::Messages ShortcutsMirror::clickCustom()
 
 ShortcutsMirror::Messages ShortcutsMirror::press(int chord)
 {
+    if (m_isHeld)
+        m_chords.clear();
+    m_isHeld = false;
     m_chords.append(chord);
-    return m_chords.size() == 4 ? endRecording() : Messages();
+    return m_chords.size() == 4 ? leaveField() : Messages();
 }
 
 ShortcutsMirror::Messages ShortcutsMirror::leaveField()
 {
-    return endRecording();
+    return isAssisted ? pauseRecording() : endRecording();
+}
+
+// The user is still about the key: where it would be refused, nothing is decided.
+ShortcutsMirror::Messages ShortcutsMirror::pauseRecording()
+{
+    m_isHeld =
+        isRecording() && shownKey() != actions[std::size_t(current)].pending && !refuse(shownKey()).empty();
+    return m_isHeld ? Messages() : endRecording();
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::clickNone()
+{
+    Messages messages = pauseRecording();
+    m_chords.clear();
+    m_isHeld = false;
+    if (!actions[std::size_t(current)].pending.isEmpty())
+        setPending(QKeySequence());
+    return messages;
+}
+
+bool ShortcutsMirror::clashes(const Action &action, const QString &name, const QKeySequence &key) const
+{
+    return action.name == name && !action.pending.isEmpty()
+        && (action.pending.matches(key) != QKeySequence::NoMatch
+            || key.matches(action.pending) != QKeySequence::NoMatch);
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::goTo(const QString &name)
+{
+    const QKeySequence key = shownKey();
+    Messages messages = pauseRecording();
+    m_chords.clear();
+    m_isHeld = false;
+    current = 0;
+    while (!clashes(actions[std::size_t(current)], name, key))
+        ++current;
+    showCurrent();
+    return messages;
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::takeOver(const QString &name)
+{
+    const QKeySequence key = shownKey();
+    pauseRecording();
+    for (std::size_t i = 0; i < actions.size(); ++i) {
+        if (rowOf(int(i)) == int(i) && clashes(actions[i], name, key))
+            actions[i].pending = QKeySequence();
+    }
+    m_isChanged = true;
+    canRestore = true;
+    return pauseRecording();
+}
+
+QStringList ShortcutsMirror::holders() const
+{
+    QStringList names;
+    for (std::size_t i = 0; current >= 0 && i < actions.size(); ++i) {
+        const Action &action = actions[i];
+        if (rowOf(int(i)) == int(i) && action.name != actions[std::size_t(current)].name
+            && !action.pending.isEmpty() && action.pending == shownKey())
+            names.append(action.name);
+    }
+    return names;
 }
 
 // The button is pressed when the recording ends, and released when it may be disabled again.
@@ -203,6 +271,7 @@ ShortcutsMirror::Messages ShortcutsMirror::done(bool isAccepted)
 ShortcutsMirror::Messages ShortcutsMirror::hide()
 {
     m_chords.clear();
+    m_isHeld = false;
     isVisible = false;
     return {};
 }
@@ -210,6 +279,7 @@ ShortcutsMirror::Messages ShortcutsMirror::hide()
 void ShortcutsMirror::discard()
 {
     m_chords.clear();
+    m_isHeld = false;
     for (Action &action : actions)
         action.pending = action.inForce;
     m_isChanged = false;

@@ -5,6 +5,7 @@
 
 #include <QKeySequence>
 #include <QString>
+#include <QStringList>
 #include <QVector>
 
 #include <map>
@@ -67,6 +68,15 @@ public:
     Messages done(bool isAccepted);
     Messages hide();
 
+    /// Clicks on what only the assisted dialog has.
+    Messages clickNone();
+    Messages goTo(const QString &name);
+    Messages takeOver(const QString &name);
+    /// The names of the other shortcuts that have the key that is shown.
+    QStringList holders() const;
+
+    /// Whether a recorded key waits for what the user decides.
+    bool isHeld() const { return m_isHeld; }
     bool isRecording() const { return !m_chords.isEmpty(); }
     bool isOkEnabled() const { return m_isChanged || isRecording(); }
     bool isFieldEnabled() const { return current >= 0 && !isDefaultChosen; }
@@ -77,6 +87,7 @@ public:
 
     std::vector<Action> actions;
     std::map<QString, QString> saved;
+    bool isAssisted = false;
     int current = -1; ///< the first action of the row that is current, or -1
     bool isDefaultChosen = false;
     bool canRestore = true;
@@ -84,6 +95,8 @@ public:
 
 private:
     Messages endRecording();
+    Messages pauseRecording();
+    bool clashes(const Action &action, const QString &name, const QKeySequence &key) const;
     Messages refuse(const QKeySequence &key) const;
     void setPending(const QKeySequence &key);
     void discard();
@@ -92,5 +105,6 @@ private:
 
     std::map<QString, QString> m_globals;
     QVector<int> m_chords;
+    bool m_isHeld = false; // a key that would be refused waits in the field
     bool m_isChanged = false;
 };

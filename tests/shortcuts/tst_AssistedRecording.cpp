@@ -17,6 +17,8 @@ private Q_SLOTS:
     void recordsAnotherKeyOverOneThatClashes();
     void keepsTheKeyThatClashesAtABareModifier();
 
+    void recordsAnotherKeyWhenTheFieldIsEnteredAgain();
+
     void takesOverAKey_data();
     void takesOverAKey();
     void takesOverAKeyWithoutTheFocus();
@@ -122,6 +124,14 @@ void tst_AssistedRecording::keepsTheKeyThatClashesAtABareModifier()
     XDoTool::press(str("ctrl+shift+j"));
     const QKeySequence ctrlShiftJ(Qt::CTRL | Qt::SHIFT | Qt::Key_J);
     QTRY_COMPARE(pendingKey("open"), ctrlShiftJ);
+}
+
+void tst_AssistedRecording::recordsAnotherKeyWhenTheFieldIsEnteredAgain()
+{
+    recordClash("open", str("F2"));
+    // At once, while the field would wait for another chord.
+    XDoTool::run(str("key Tab key shift+Tab key ctrl+j"));
+    QTRY_COMPARE(pendingKey("open"), ctrlJ);
 }
 
 void tst_AssistedRecording::takesOverAKey_data()

@@ -12,6 +12,7 @@
 #include "ShortcutsModel.h"
 #include "TestCase.h"
 
+#include <shortcuts/ClashLine.h>
 #include <shortcuts/ShortcutsTreeView.h>
 
 #include <QAction>
@@ -19,10 +20,12 @@
 #include <QKeySequenceEdit>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QScrollArea>
 #include <QSettings>
 
 #include <memory>
 #include <random>
+#include <utility>
 
 namespace {
 
@@ -65,6 +68,7 @@ class tst_ShortcutSessions : public TestCase
     Q_OBJECT
 
 private Q_SLOTS:
+    void keepsWhatAPlainModelKeeps_data();
     void keepsWhatAPlainModelKeeps();
 
 private:
@@ -79,6 +83,8 @@ private:
     void clickSomeRow();
     void clickSomeButton();
     void pressSomeKey();
+    void useAssistance();
+    QVector<ClashLine *> lines() const;
     void leave();
     void closeWindow();
     /// Says what the step does, for the message of a failure.
@@ -105,6 +111,7 @@ private:
     QKeySequenceEdit *field() const { return child<QKeySequenceEdit>("keyWidget"); }
     QString settingsPath() const { return path(QStringLiteral("keys.ini")); }
 
+    bool m_isAssisted = false;
     std::mt19937 m_random;
     QStringList m_log;
     Mirror m_mirror;
@@ -120,6 +127,7 @@ void tst_ShortcutSessions::begin()
     QFile::remove(settingsPath());
     m_log.clear();
     m_mirror = Mirror();
+    m_mirror.isAssisted = m_isAssisted;
     for (const auto &row : actionRows)
         m_mirror.add(QString::fromLatin1(row.group), QString::fromLatin1(row.name),
                      QStringLiteral("Text of %1").arg(QLatin1String(row.name)), row.defaultKey);
@@ -145,6 +153,7 @@ void tst_ShortcutSessions::restart()
                                 QString::fromLatin1(row.group));
     }
     m_dialog.reset(new EditShortcutsDialog(m_model.get()));
+    m_dialog->setAssistance(m_isAssisted);
     m_hand.reset(new DialogHand(m_dialog.get()));
     m_mirror.restart();
 }
@@ -251,9 +260,40 @@ void tst_ShortcutSessions::pressSomeKey()
     expect(messages, [&] {
         m_hand->press(chord);
         // The field is full; whether it ends by itself depends on which keys it got.
-        if (!m_mirror.isRecording())
+        if (!m_mirror.isRecording() || m_mirror.isHeld())
             m_hand->press(Qt::Key_Tab);
     });
+}
+
+QVector<ClashLine *> tst_ShortcutSessions::lines() const
+{
+    QCoreApplication::processEvents();
+    QVector<ClashLine *> lines;
+    const auto all = child<QScrollArea>("clashBox")->findChildren<ClashLine *>();
+    for (ClashLine *line : all) {
+        if (line->isVisible() && !line->content().otherName.isEmpty())
+            lines.append(line);
+    }
+    return lines;
+}
+
+void tst_ShortcutSessions::useAssistance()
+{
+    const QVector<ClashLine *> clashes = lines();
+    if (clashes.isEmpty() || random(4) == 0) {
+        if (m_mirror.current < 0)
+            return;
+        describe(QStringLiteral("take the key away"));
+        expect(m_mirror.clickNone(), [&] { m_hand->click(child<QPushButton>("noneButton")); });
+        return;
+    }
+    const ClashLine *line = clashes.at(random(clashes.size()));
+    QPushButton *pressed = line->buttons().at(random(line->buttons().size()));
+    const QString name = line->content().otherName;
+    const bool isGoTo = pressed == line->buttons().constFirst();
+    describe(QStringLiteral("%1 %2").arg(pressed->text(), name));
+    child<QScrollArea>("clashBox")->ensureWidgetVisible(pressed);
+    expect(isGoTo ? m_mirror.goTo(name) : m_mirror.takeOver(name), [&] { m_hand->click(pressed); });
 }
 
 void tst_ShortcutSessions::leave()
@@ -333,6 +373,10 @@ void tst_ShortcutSessions::step()
         stepHidden();
         return;
     }
+    if (m_isAssisted && random(4) == 0) {
+        useAssistance();
+        return;
+    }
     const int choice = random(100);
     if (choice < 25)
         clickSomeRow();
@@ -368,6 +412,14 @@ void tst_ShortcutSessions::compareWidgets()
     if (m_mirror.current < 0)
         return;
     QCOMPARE(child<QRadioButton>("defaultKeyRB")->isChecked(), m_mirror.isDefaultChosen);
+    if (m_isAssisted && m_dialog->isVisible()) {
+        QStringList holders;
+        for (const ClashLine *line : lines()) {
+            if (line->content().isSerious)
+                holders.append(line->content().otherName);
+        }
+        QCOMPARE(holders, m_mirror.holders());
+    }
 }
 
 void tst_ShortcutSessions::compare()
@@ -401,8 +453,17 @@ void tst_ShortcutSessions::runSession(quint32 seed)
     m_settings.reset();
 }
 
+void tst_ShortcutSessions::keepsWhatAPlainModelKeeps_data()
+{
+    QTest::addColumn<bool>("isAssisted");
+    QTest::newRow("plain") << false;
+    QTest::newRow("assisted") << true;
+}
+
 void tst_ShortcutSessions::keepsWhatAPlainModelKeeps()
 {
+    QFETCH(bool, isAssisted);
+    m_isAssisted = isAssisted;
     const int rounds = qEnvironmentVariableIntValue("VEL_TEST_ROUNDS") > 0
         ? qEnvironmentVariableIntValue("VEL_TEST_ROUNDS")
         : 100;
@@ -410,8 +471,10 @@ void tst_ShortcutSessions::keepsWhatAPlainModelKeeps()
         ? quint32(qEnvironmentVariableIntValue("VEL_TEST_SEED"))
         : std::random_device()() & 0x3fffffff;
     qInfo("seed %u, %d sessions", seed, rounds);
-    // It reads the desktop's keys; these need no X server.
-    expectWarning(QRegularExpression(QStringLiteral("KKeyServer accessed from non-X11 platform")));
+    // It reads the desktop's keys; these need no X server. That is told once.
+    static bool isTold = false;
+    if (!std::exchange(isTold, true))
+        expectWarning(QRegularExpression(QStringLiteral("KKeyServer accessed from non-X11 platform")));
     qputenv("VEL_CONFIG_HOME", QFile::encodeName(folder()));
     write(QStringLiteral("keyshortcutrc"), "[ShortCutKeys]\nMeta|F3=VELWM_RUN\nMeta|F4=VELWM_SHOW_ICON\n");
     for (int i = 0; i < rounds && !QTest::currentTestFailed(); ++i)
