@@ -21,6 +21,10 @@
 
 namespace {
 
+constexpr int PreparationDelay = 250; // in milliseconds; shorter than a hand takes to the first key
+constexpr int MoreHeight = 120; // for the parts that a plain dialog does not have
+constexpr int WindowFrame = 40; // at most, with the title bar
+
 QString settingsGroup()
 {
     return QStringLiteral("EditShortcutsDialog");
@@ -93,8 +97,11 @@ void EditShortcutsAssistance::restoreSizes()
     m_tree->keyColumn()->setChosenWidth(QSettings().value(keyColumnKey()).toInt());
     if (dialog()->isVisible())
         return;
-    DialogSize::restore(*dialog(), settingsGroup(), dialog()->size());
-    dialog()->resize(dialog()->size().boundedTo(dialog()->screen()->availableSize()));
+    const QSize available = dialog()->screen()->availableSize();
+    const QSize roomy(dialog()->width(),
+                      qMin(dialog()->height() + MoreHeight, available.height() - WindowFrame));
+    DialogSize::restore(*dialog(), settingsGroup(), roomy);
+    dialog()->resize(dialog()->size().boundedTo(available));
 }
 
 void EditShortcutsAssistance::rememberSizes() const
@@ -119,8 +126,11 @@ void EditShortcutsAssistance::addFilterBar()
 
     connect(m_filterBar.get(), &ShortcutFilterBar::filterChanged, this,
             &EditShortcutsAssistance::applyFilter);
-    connect(m_filterBar.get(), &ShortcutFilterBar::entered, m_form.treeView,
-            &ShortcutsTreeView::prepareFilter);
+    // Not while the dialog opens.
+    m_preparation.setSingleShot(true);
+    m_preparation.setInterval(PreparationDelay);
+    connect(&m_preparation, &QTimer::timeout, m_form.treeView, &ShortcutsTreeView::prepareFilter);
+    connect(m_filterBar.get(), &ShortcutFilterBar::entered, &m_preparation, QOverload<>::of(&QTimer::start));
     connect(m_filterBar.get(), &ShortcutFilterBar::left, m_form.treeView, [this] {
         m_form.treeView->selectFirstShortcut();
         m_form.treeView->setFocus();

@@ -8,6 +8,7 @@
 
 #include <QObject>
 #include <QPointer>
+#include <QTimer>
 
 #include <memory>
 
@@ -54,4 +55,5 @@ private:
     const std::unique_ptr<TreeAssistance> m_tree;
     std::unique_ptr<ShortcutFilterBar> m_filterBar;
     std::unique_ptr<NoMatchLabel> m_noMatchLabel;
+    QTimer m_preparation; // of the filter
 };

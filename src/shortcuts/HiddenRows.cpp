@@ -8,58 +8,61 @@
 
 #include <QTreeView>
 
-#include <utility>
+namespace {
+
+ShortcutIndex::Matches allOf(const ShortcutsModel &model)
+{
+    ShortcutIndex::Matches all(model.rowCount());
+    for (int group = 0; group < all.size(); ++group)
+        all[group] = QVector<bool>(model.rowCount(model.index(group, 0)), true);
+    return all;
+}
+
+} // namespace
 
 HiddenRows::HiddenRows(QTreeView *view)
     : m_view(view)
 {
 }
 
-void HiddenRows::hideEmpty(const ShortcutsModel &model)
+ShortcutIndex::Matches HiddenRows::notEmpty(const ShortcutsModel &model)
 {
-    QVector<int> emptyRows(model.rowCount());
+    ShortcutIndex::Matches matches = allOf(model);
     const auto rows = ShortcutRows::empty(model);
-    for (const auto &[group, row] : rows) {
-        hide(model.index(row, 0, model.index(group, 0)));
-        ++emptyRows[group];
-    }
-    for (int group = 0; group < emptyRows.size(); ++group) {
-        const QModelIndex header = model.index(group, 0);
-        if (emptyRows.at(group) == model.rowCount(header))
-            hide(header);
-    }
+    for (const auto &[group, row] : rows)
+        matches[group][row] = false;
+    return matches;
 }
 
-int HiddenRows::hideOthers(const ShortcutsModel &model, const ShortcutIndex::Matches &matches)
+void HiddenRows::start(const ShortcutsModel &model)
+{
+    m_shown = allOf(model);
+}
+
+int HiddenRows::show(const ShortcutsModel &model, const ShortcutIndex::Matches &matches)
 {
     int shown = 0;
     for (int group = 0; group < matches.size(); ++group) {
         const QModelIndex header = model.index(group, 0);
-        const QVector<bool> &rows = matches.at(group);
-        const int shownBefore = shown;
-        for (int row = 0; row < rows.size(); ++row) {
-            if (rows.at(row))
-                ++shown;
-            else
-                hide(model.index(row, 0, header));
-        }
-        if (shown == shownBefore)
-            hide(header);
+        const int shownHere = showGroup(header, matches.at(group), m_shown.value(group));
+        if (m_view->isRowHidden(group, {}) != (shownHere == 0))
+            m_view->setRowHidden(group, {}, shownHere == 0);
+        shown += shownHere;
     }
+    m_shown = matches;
     return shown;
 }
 
-void HiddenRows::showAll()
+int HiddenRows::showGroup(const QModelIndex &header, const QVector<bool> &matches,
+                          const QVector<bool> &before)
 {
-    const auto hidden = std::exchange(m_hidden, {});
-    for (const QPersistentModelIndex &index : hidden) {
-        if (index.isValid())
-            m_view->setRowHidden(index.row(), index.parent(), false);
+    const bool isKnown = matches.size() == before.size();
+    int shown = 0;
+    for (int row = 0; row < matches.size(); ++row) {
+        const bool isShown = matches.at(row);
+        if (!isKnown || before.at(row) != isShown)
+            m_view->setRowHidden(row, header, !isShown);
+        shown += isShown ? 1 : 0;
     }
-}
-
-void HiddenRows::hide(const QModelIndex &index)
-{
-    m_view->setRowHidden(index.row(), index.parent(), true);
-    m_hidden.append(index);
+    return shown;
 }

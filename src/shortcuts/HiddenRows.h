@@ -5,32 +5,32 @@
 
 #include "ShortcutIndex.h"
 
-#include <QPersistentModelIndex>
-#include <QVector>
-
+class QModelIndex;
 class QTreeView;
 
 /**
  * Which rows of a tree on a ShortcutsModel are hidden: those that show nothing, those that are
  * filtered out, and groups of such rows alone.
+ *
+ * It tells the tree of what changes only: most rows are as they were from one key press to the next.
  */
 class HiddenRows
 {
 public:
     explicit HiddenRows(QTreeView *view);
 
-    /// Hides the rows of \a model that show nothing.
-    void hideEmpty(const ShortcutsModel &model);
-    /// Hides the rows of \a model that \a matches has not; returns how many it has.
-    int hideOthers(const ShortcutsModel &model, const ShortcutIndex::Matches &matches);
-    /// Shows all rows again.
-    void showAll();
-    /// Forgets what it has hidden: the view has another model.
-    void forget() { m_hidden.clear(); }
+    /// The view has \a model anew, with all rows shown.
+    void start(const ShortcutsModel &model);
+    /// Rows came or went: what was hidden has moved.
+    void forget() { m_shown.clear(); }
+    /// Shows the rows of \a model that \a matches has, and no others; returns how many these are.
+    int show(const ShortcutsModel &model, const ShortcutIndex::Matches &matches);
+    /// All rows of \a model but those that show nothing.
+    static ShortcutIndex::Matches notEmpty(const ShortcutsModel &model);
 
 private:
-    void hide(const QModelIndex &index);
+    int showGroup(const QModelIndex &header, const QVector<bool> &matches, const QVector<bool> &before);
 
     QTreeView *const m_view;
-    QVector<QPersistentModelIndex> m_hidden;
+    ShortcutIndex::Matches m_shown; // empty while that is not known
 };

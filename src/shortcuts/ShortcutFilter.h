@@ -33,6 +33,7 @@ public:
     void setChangedOnly(bool isOn) { m_changedOnly = isOn; }
 
     QKeySequence key() const { return m_key; }
+    bool isChangedOnly() const { return m_changedOnly; }
     /// Whether it asks for anything.
     bool isActive() const { return m_changedOnly || !m_key.isEmpty() || !m_words.isEmpty(); }
     /// Whether a shortcut is to be seen.

@@ -30,7 +30,8 @@ ShortcutIndex::Matches ShortcutIndex::matches(const ShortcutsModel &model, const
             Entry &entry = m_groups[group][row];
             if (entry.key != object->keySequence())
                 setKey(&entry, *object);
-            entry.row.isChanged = ShortcutChange::isChanged(*object);
+            if (filter.isChangedOnly())
+                entry.row.isChanged = ShortcutChange::isChanged(*object);
             matches[group][row] = filter.matches(entry.row);
         }
     }
@@ -75,11 +76,23 @@ void ShortcutIndex::setKey(Entry *entry, const IShortcutObject &object)
     for (const QKeySequence &key : furtherKeys)
         entry->row.keys.append(key);
     entry->row.text = entry->names;
-    for (const QKeySequence &key : qAsConst(entry->row.keys)) {
-        const QString portable = key.toString(QKeySequence::PortableText);
-        const QString native = key.toString(QKeySequence::NativeText);
-        entry->row.text += ShortcutFilter::folded(portable) + Border;
-        if (native != portable)
-            entry->row.text += ShortcutFilter::folded(native) + Border;
+    for (const QKeySequence &key : qAsConst(entry->row.keys))
+        entry->row.text += textOf(key);
+}
+
+QString ShortcutIndex::textOf(const QKeySequence &key)
+{
+    QString portable;
+    QString native;
+    for (int i = 0; i < key.count(); ++i) {
+        const int chord = key[uint(i)];
+        ChordText &text = m_chords[chord];
+        if (text.portable.isNull())
+            text = {ShortcutFilter::folded(QKeySequence(chord).toString(QKeySequence::PortableText)),
+                    ShortcutFilter::folded(QKeySequence(chord).toString(QKeySequence::NativeText))};
+        const QLatin1String separator(i > 0 ? ", " : "");
+        portable += separator + text.portable;
+        native += separator + text.native;
     }
+    return native == portable ? portable + Border : portable + Border + native + Border;
 }

@@ -5,6 +5,7 @@
 
 #include "ShortcutFilter.h"
 
+#include <QHash>
 #include <QVector>
 
 class IShortcutObject;
@@ -37,8 +38,17 @@ private:
     };
 
     bool fits(const ShortcutsModel &model) const;
-    static Entry entryOf(const IShortcutObject &object, const QString &group);
-    static void setKey(Entry *entry, const IShortcutObject &object);
+    Entry entryOf(const IShortcutObject &object, const QString &group);
+    void setKey(Entry *entry, const IShortcutObject &object);
+    QString textOf(const QKeySequence &key);
 
+    // Folded, as they are written in English and in the user's language.
+    struct ChordText
+    {
+        QString portable;
+        QString native;
+    };
+
+    QHash<int, ChordText> m_chords; // many shortcuts share a few
     QVector<QVector<Entry>> m_groups;
 };

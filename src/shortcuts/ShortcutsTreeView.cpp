@@ -4,7 +4,6 @@
 #include "ShortcutsTreeView.h"
 
 #include "RowsChangedEvent.h"
-#include "ShortcutChange.h"
 #include "ShortcutRows.h"
 #include "ShortcutsModel.h"
 #include "ShownKeys.h"
@@ -51,6 +50,7 @@ void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
     if (ShortcutsModel *shortcuts = shortcutsModel()) {
         shortcuts->installEventFilter(this);
         connect(shortcuts, &QObject::destroyed, this, [this] { setModel(nullptr); });
+        m_hidden.start(*shortcuts);
         hideRows(*shortcuts, {});
         m_groups = shortcuts->rowCount();
     }
@@ -128,7 +128,7 @@ QVector<QModelIndex> ShortcutsTreeView::widestItems(const ShortcutsModel &shortc
     const int iconWidth = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
     const auto widthOf = [&](const IShortcutObject &object) {
         if (column == 1)
-            return textWidth.of(ShownKeys::of(object)) * (ShortcutChange::isChanged(object) ? 6 : 5) / 5;
+            return ShownKeys::roughLength(object);
         return textWidth.of(object.text()) + (object.icon().isNull() ? 0 : iconWidth) + indentation();
     };
     std::vector<Candidate> candidates;
@@ -167,6 +167,7 @@ bool ShortcutsTreeView::eventFilter(QObject *watched, QEvent *event)
 {
     if (watched == model() && event->type() == RowsChangedEvent::eventType()) {
         m_index.clear();
+        m_hidden.forget();
         refreshRowsLater();
     }
     return QTreeView::eventFilter(watched, event);
@@ -200,14 +201,13 @@ void ShortcutsTreeView::refreshRows()
 
 void ShortcutsTreeView::hideRows(const ShortcutsModel &shortcuts, const QModelIndex &keptRow)
 {
-    m_hidden.showAll();
     if (!m_filter.isActive()) {
-        m_hidden.hideEmpty(shortcuts);
+        m_hidden.show(shortcuts, HiddenRows::notEmpty(shortcuts));
     } else {
         ShortcutIndex::Matches matches = m_index.matches(shortcuts, m_filter);
         if (ShortcutRows::at(shortcuts, keptRow))
             matches[keptRow.parent().row()][keptRow.row()] = true;
-        const int count = m_hidden.hideOthers(shortcuts, matches);
+        const int count = m_hidden.show(shortcuts, matches);
         if (m_tellCount)
             m_tellCount(count);
     }

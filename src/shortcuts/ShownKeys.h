@@ -3,21 +3,22 @@
 
 #pragma once
 
-#include "FurtherKeys.h"
-
 #include <QKeySequence>
 #include <QString>
+
+class IShortcutObject;
 
 namespace ShownKeys {
 
 /// All keys of a shortcut in one text, the pending one first; empty when it has none.
-inline QString of(const IShortcutObject &object,
-                  QKeySequence::SequenceFormat format = QKeySequence::PortableText)
-{
-    QList<QKeySequence> keys = FurtherKeys::of(object);
-    if (!object.keySequence().isEmpty())
-        keys.prepend(object.keySequence());
-    return QKeySequence::listToString(keys, format);
-}
+QString of(const IShortcutObject &object, QKeySequence::SequenceFormat format = QKeySequence::PortableText);
+
+/**
+ * How long the text of a shortcut's keys is, in characters, with what stands beside it when it is
+ * changed.
+ *
+ * Guessed without making the text: good enough to tell which few of many may be the longest.
+ */
+int roughLength(const IShortcutObject &object);
 
 } // namespace ShownKeys
