@@ -9,6 +9,7 @@
 
 KeyColumn::KeyColumn(QTreeView *view)
     : m_view(view)
+    , m_plainWidth(view->header()->sectionSize(0))
 {
     m_view->header()->setStretchLastSection(false);
     m_view->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
@@ -28,7 +29,7 @@ KeyColumn::~KeyColumn()
     m_view->setHorizontalScrollBarPolicy(Qt::ScrollBarAsNeeded);
     m_view->header()->setStretchLastSection(true);
     m_isArranging = true;
-    m_view->resizeColumnToContents(0);
+    m_view->header()->resizeSection(0, m_plainWidth);
 }
 
 void KeyColumn::setChosenWidth(int width)

@@ -19,7 +19,7 @@ class KeyColumn : public QObject
     Q_OBJECT
 
 public:
-    /// Arranges the columns of \a view until it is destroyed; then they are as in any tree.
+    /// Arranges the columns of \a view until it is destroyed; then they are as before.
     explicit KeyColumn(QTreeView *view);
     ~KeyColumn() override;
 
@@ -38,6 +38,7 @@ private:
     void arrange();
 
     QTreeView *const m_view;
+    const int m_plainWidth; // of the names, without this
     QTimer m_measuring; // once for many keys that change together
     int m_chosenWidth = 0;
     int m_contentsWidth = 0;

@@ -14,21 +14,29 @@ namespace {
 // Between texts that no word may span.
 constexpr QChar Border = QLatin1Char('\n');
 
+QString groupName(const ShortcutsModel &model, int group)
+{
+    return ShortcutFilter::folded(model.index(group, 0).data().toString());
+}
+
 } // namespace
 
 ShortcutIndex::Matches ShortcutIndex::matches(const ShortcutsModel &model, const ShortcutFilter &filter)
 {
-    read(model);
+    begin(model);
     Matches matches(m_groups.size());
     for (int group = 0; group < m_groups.size(); ++group) {
         const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
+        const QString name = groupName(model, group);
         matches[group].resize(objects.size());
         for (int row = 0; row < objects.size(); ++row) {
             const IShortcutObject *object = objects.at(row);
             if (!object)
                 continue;
             Entry &entry = m_groups[group][row];
-            if (entry.key != object->keySequence())
+            if (!entry.isRead)
+                entry = entryOf(*object, name);
+            else if (entry.key != object->keySequence())
                 setKey(&entry, *object);
             if (filter.isChangedOnly())
                 entry.row.isChanged = ShortcutChange::isChanged(*object);
@@ -38,18 +46,32 @@ ShortcutIndex::Matches ShortcutIndex::matches(const ShortcutsModel &model, const
     return matches;
 }
 
-void ShortcutIndex::read(const ShortcutsModel &model)
+bool ShortcutIndex::readSome(const ShortcutsModel &model, int count)
+{
+    begin(model);
+    for (; m_group < m_groups.size(); ++m_group, m_row = 0) {
+        const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, m_group);
+        const QString name = groupName(model, m_group);
+        for (; m_row < objects.size(); ++m_row) {
+            if (count-- == 0)
+                return true;
+            Entry &entry = m_groups[m_group][m_row];
+            if (objects.at(m_row) && !entry.isRead)
+                entry = entryOf(*objects.at(m_row), name);
+        }
+    }
+    return false;
+}
+
+void ShortcutIndex::begin(const ShortcutsModel &model)
 {
     if (fits(model))
         return;
     m_groups = QVector<QVector<Entry>>(model.rowCount());
-    for (int group = 0; group < m_groups.size(); ++group) {
-        const QString name = ShortcutFilter::folded(model.index(group, 0).data().toString());
-        const QVector<const IShortcutObject *> objects = ShortcutRows::ofGroup(model, group);
-        m_groups[group].reserve(objects.size());
-        for (const IShortcutObject *object : objects)
-            m_groups[group].append(object ? entryOf(*object, name) : Entry());
-    }
+    for (int group = 0; group < m_groups.size(); ++group)
+        m_groups[group].resize(model.rowCount(model.index(group, 0)));
+    m_group = 0;
+    m_row = 0;
 }
 
 bool ShortcutIndex::fits(const ShortcutsModel &model) const
@@ -65,6 +87,7 @@ ShortcutIndex::Entry ShortcutIndex::entryOf(const IShortcutObject &object, const
     Entry entry;
     entry.names = ShortcutFilter::folded(object.text()) + Border + group + Border;
     setKey(&entry, object);
+    entry.isRead = true;
     return entry;
 }
 

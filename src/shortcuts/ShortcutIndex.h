@@ -24,8 +24,9 @@ public:
 
     /// The rows of \a model that \a filter matches.
     Matches matches(const ShortcutsModel &model, const ShortcutFilter &filter);
-    /// Reads the texts of \a model if that was not done yet.
-    void read(const ShortcutsModel &model);
+    /// Reads the texts of \a count more rows of \a model, if so many were not read yet; false when
+    /// none is left.
+    bool readSome(const ShortcutsModel &model, int count);
     /// Forgets all texts: rows came or went.
     void clear() { m_groups.clear(); }
 
@@ -35,8 +36,10 @@ private:
         QString names; // of the shortcut and its group
         QKeySequence key; // the one that the row was made for
         ShortcutFilter::Row row;
+        bool isRead = false;
     };
 
+    void begin(const ShortcutsModel &model);
     bool fits(const ShortcutsModel &model) const;
     Entry entryOf(const IShortcutObject &object, const QString &group);
     void setKey(Entry *entry, const IShortcutObject &object);
@@ -51,4 +54,6 @@ private:
 
     QHash<int, ChordText> m_chords; // many shortcuts share a few
     QVector<QVector<Entry>> m_groups;
+    int m_group = 0; // the one to be read next
+    int m_row = 0; // of that group
 };

@@ -20,6 +20,11 @@ namespace {
 
 // So many of the items that seem widest are measured exactly.
 constexpr int MeasuredItems = 16;
+// So many rows are read for the filter at a time, so many milliseconds after the window was shown
+// and after the last ones.
+constexpr int PreparedRows = 200;
+constexpr int PrepareDelay = 100;
+constexpr int PreparePause = 10;
 
 struct Candidate
 {
@@ -33,6 +38,7 @@ struct Candidate
 ShortcutsTreeView::ShortcutsTreeView(QWidget *parent)
     : QTreeView(parent)
 {
+    connect(&m_preparing, &QTimer::timeout, this, &ShortcutsTreeView::prepareSome);
 }
 
 ShortcutsTreeView::~ShortcutsTreeView() = default;
@@ -253,10 +259,19 @@ void ShortcutsTreeView::setFilter(const ShortcutFilter &filter, const Count &tel
         scrollTo(currentIndex());
 }
 
+// A dialog of thousands of shortcuts is to be painted first, and to follow the mouse meanwhile.
 void ShortcutsTreeView::prepareFilter()
 {
-    if (const ShortcutsModel *shortcuts = shortcutsModel())
-        m_index.read(*shortcuts);
+    m_preparing.start(PrepareDelay);
+}
+
+void ShortcutsTreeView::prepareSome()
+{
+    const ShortcutsModel *shortcuts = shortcutsModel();
+    if (shortcuts && m_index.readSome(*shortcuts, PreparedRows))
+        m_preparing.start(PreparePause);
+    else
+        m_preparing.stop();
 }
 
 void ShortcutsTreeView::openGroups(const ShortcutsModel &shortcuts)

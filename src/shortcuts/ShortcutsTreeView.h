@@ -9,6 +9,7 @@
 
 #include <QKeySequence>
 #include <QPersistentModelIndex>
+#include <QTimer>
 #include <QTreeView>
 #include <QVector>
 
@@ -50,7 +51,7 @@ public:
     /// Shows those shortcuts alone that \a filter matches, in groups that are open; \a tell is called
     /// now, and whenever their number may have changed.
     void setFilter(const ShortcutFilter &filter, const Count &tell = {});
-    /// Does what takes time when the first filter is set.
+    /// Does bit by bit what takes time when the first filter is set.
     void prepareFilter();
     /// Makes the first shortcut that is seen current, unless one is current.
     void selectFirstShortcut();
@@ -75,6 +76,7 @@ protected:
 
 private:
     ShortcutsModel *shortcutsModel() const;
+    void prepareSome();
     void refreshRowsLater();
     void refreshRows();
     void hideRows(const ShortcutsModel &shortcuts, const QModelIndex &keptRow);
@@ -88,6 +90,7 @@ private:
     ShortcutFilter m_filter;
     Count m_tellCount;
     ShortcutIndex m_index;
+    QTimer m_preparing;
     QPersistentModelIndex m_leftRow; // was current until it was hidden
     QVector<QPersistentModelIndex> m_closedGroups; // those that a filter opened
     int m_groups = 0; // those that were there at the last look; later ones come open
