@@ -17,6 +17,7 @@
 #include <QRandomGenerator>
 #include <QVector>
 
+#include <algorithm>
 #include <memory>
 
 /// All operations of the view, mixed.
@@ -110,8 +111,6 @@ void tst_MenuRandomOperations::create()
     const QString record = isFolder ? full(path) + QLatin1String("/.directory") : full(path);
     item.bytes = read(record);
     QCOMPARE(VelUIDesktopEntry(record).getLocalName(), name);
-    if (isFolder)
-        item.shownFirst = QLatin1String("Group") + number;
 }
 
 void tst_MenuRandomOperations::edit()
@@ -139,6 +138,7 @@ void tst_MenuRandomOperations::edit()
     const QStringList order = m_mirror.sortOrderOf(path);
     const QString record = isFolder ? full(path) + QLatin1String("/.directory") : full(path);
     m_mirror.item(path).bytes = read(record);
+    m_mirror.item(path).shownFirst.clear();
     QCOMPARE(VelUIDesktopEntry(record).getLocalName(), name);
     QCOMPARE(m_mirror.sortOrderOf(path), order);
 }
@@ -207,7 +207,10 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
                       QStringLiteral("%1 already exists. Overwrite?").arg(full(target)), QMessageBox::Yes,
                       QMessageBox::NoButton},
                      QMessageBox::Yes);
-    if (isOwnFolder ? !m_mirror.contains(first) : isRefused(m_mirror, transfer))
+    const bool isOrder =
+        std::all_of(transfer.sources.begin(), transfer.sources.end(),
+                    [&](const QString &source) { return MenuMirror::folderOf(source) == transfer.folder; });
+    if (isOrder ? !m_mirror.contains(first) : isRefused(m_mirror, transfer))
         return false;
     const bool isListed = isOwnFolder ? transfer.isMove : !transfer.following.isNull();
     if (isListed)
@@ -221,7 +224,7 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
     }
     for (const QString &source : transfer.sources) {
         const QString to = MenuMirror::join(transfer.folder, MenuMirror::nameOf(source));
-        if (isOwnFolder || MenuMirror::folderOf(source) == transfer.folder)
+        if (MenuMirror::folderOf(source) == transfer.folder)
             continue;
         if (transfer.isMove)
             m_mirror.move(source, to);
