@@ -51,12 +51,12 @@ Refusal ContentsChange::check() const
     return now && !now->exists() ? Refusal::gone(m_path) : Refusal::changed(m_path);
 }
 
-Refusal ContentsChange::undo()
+Refusal ContentsChange::undo(FileProgress &)
 {
     return put(*m_before, m_after);
 }
 
-Refusal ContentsChange::redo()
+Refusal ContentsChange::redo(FileProgress &)
 {
     return put(m_after, *m_before);
 }

@@ -23,8 +23,8 @@ public:
     QStringList paths() const override { return {m_named}; }
     void note() override;
     Refusal check() const override;
-    Refusal undo() override;
-    Refusal redo() override;
+    Refusal undo(FileProgress &progress) override;
+    Refusal redo(FileProgress &progress) override;
 
 private:
     Refusal put(const FileContents &wanted, const FileContents &expected);

@@ -4,7 +4,6 @@
 #include "ExactMove.h"
 
 #include "FileDescriptor.h"
-#include "FileProgress.h"
 
 #include <QFile>
 
@@ -32,12 +31,11 @@ std::error_code renameTo(const Path &from, const Path &to)
     return ::rename(from.c_str(), to.c_str()) == 0 ? std::error_code() : lastError();
 }
 
-std::error_code carryOver(const Path &from, const Path &to)
+std::error_code carryOver(const Path &from, const Path &to, FileProgress &progress)
 {
     std::error_code error;
-    FileProgress nobody;
     if (!fs::is_symlink(fs::symlink_status(from, error)))
-        return TreeCopy::move(from, to, nobody);
+        return TreeCopy::move(from, to, progress);
     const Path text = fs::read_symlink(from, error);
     return error ? error : ExactMove::moveLink(from, to, text);
 }
@@ -49,10 +47,10 @@ Path ExactMove::native(const QString &path)
     return Path(QFile::encodeName(path).toStdString());
 }
 
-std::error_code ExactMove::move(const Path &from, const Path &to)
+std::error_code ExactMove::move(const Path &from, const Path &to, FileProgress &progress)
 {
     const std::error_code error = renameTo(from, to);
-    return error == std::errc::cross_device_link ? carryOver(from, to) : error;
+    return error == std::errc::cross_device_link ? carryOver(from, to, progress) : error;
 }
 
 std::error_code ExactMove::exchange(const Path &one, const Path &other)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "FileProgress.h"
 #include "TreeCopy.h"
 
 #include <QString>
@@ -18,7 +19,7 @@ TreeCopy::Path native(const QString &path);
 
 /// Moves what is at \a from to \a to, to another file system too; errc::file_exists where
 /// something is.
-std::error_code move(const TreeCopy::Path &from, const TreeCopy::Path &to);
+std::error_code move(const TreeCopy::Path &from, const TreeCopy::Path &to, FileProgress &progress);
 
 /// Has what is at \a one and at \a other change places in one step.
 std::error_code exchange(const TreeCopy::Path &one, const TreeCopy::Path &other);

@@ -7,6 +7,8 @@
 
 #include <QStringList>
 
+class FileProgress;
+
 /**
  * One thing on disk that an operation of the user changed, and can be changed back.
  *
@@ -27,6 +29,7 @@ public:
     virtual void note() = 0;
     /// Whether the disk still stands as it was noted; why not.
     virtual Refusal check() const = 0;
-    virtual Refusal undo() = 0;
-    virtual Refusal redo() = 0;
+    /// Changes it back; where that takes long, \a progress follows it, and may end it.
+    virtual Refusal undo(FileProgress &progress) = 0;
+    virtual Refusal redo(FileProgress &progress) = 0;
 };

@@ -114,10 +114,11 @@ std::error_code FileContents::replace(const TreeCopy::Path &path, const FileCont
     if (m_exists && !write(folder.item()))
         return lastError();
     if (!expected.m_exists)
-        return m_exists ? ExactMove::move(folder.item(), path) : std::error_code();
+        return m_exists ? ExactMove::move(folder.item(), path, nobody) : std::error_code();
 
     const auto swap = [&] {
-        return m_exists ? ExactMove::exchange(folder.item(), path) : ExactMove::move(path, folder.item());
+        return m_exists ? ExactMove::exchange(folder.item(), path)
+                        : ExactMove::move(path, folder.item(), nobody);
     };
     if (const std::error_code error = swap())
         return error;
@@ -127,7 +128,7 @@ std::error_code FileContents::replace(const TreeCopy::Path &path, const FileCont
     if (m_exists)
         ExactMove::exchange(folder.item(), path);
     else
-        ExactMove::move(folder.item(), path);
+        ExactMove::move(folder.item(), path, nobody);
     return unexpected(found);
 }
 

@@ -30,14 +30,18 @@ public:
 
     /// Takes everything back, the last change first. Nothing is changed where the disk is not as it was
     /// left, or where any change cannot be taken back.
+    Refusal undo(FileProgress &progress);
     Refusal undo();
     /// Does everything again.
+    Refusal redo(FileProgress &progress);
     Refusal redo();
 
 private:
     using Changes = std::vector<FileChange *>;
 
-    Refusal run(const Changes &changes, Refusal (FileChange::*there)(), Refusal (FileChange::*back)());
+    using Way = Refusal (FileChange::*)(FileProgress &progress);
+
+    Refusal run(const Changes &changes, Way there, Way back, FileProgress &progress);
 
     std::vector<std::unique_ptr<FileChange>> m_changes;
 };

@@ -28,7 +28,9 @@ std::unique_ptr<KeptThing> KeptThing::beside(const QString &path)
     std::unique_ptr<KeptThing> kept(new KeptThing(path));
     kept->m_folder = std::make_unique<StagingFolder>(native.parent_path(), kept->m_nobody);
     kept->m_place = kept->m_folder->item();
-    return kept->m_folder->error() || ExactMove::move(native, kept->m_place) ? nullptr : std::move(kept);
+    return kept->m_folder->error() || ExactMove::move(native, kept->m_place, kept->m_nobody)
+        ? nullptr
+        : std::move(kept);
 }
 
 bool KeptThing::isThere() const
@@ -36,9 +38,9 @@ bool KeptThing::isThere() const
     return m_state.isAt(m_place);
 }
 
-std::error_code KeptThing::bringBack(const QString &path)
+std::error_code KeptThing::bringBack(const QString &path, FileProgress &progress)
 {
-    if (const std::error_code error = ExactMove::move(m_place, ExactMove::native(path)))
+    if (const std::error_code error = ExactMove::move(m_place, ExactMove::native(path), progress))
         return error;
     if (!m_inTrash.isEmpty())
         Trash::forget(m_inTrash);

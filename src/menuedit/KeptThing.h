@@ -34,7 +34,7 @@ public:
     /// How it was when it was put away.
     const TreeState &state() const { return m_state; }
     /// Moves it to \a path; nothing is overwritten.
-    std::error_code bringBack(const QString &path);
+    std::error_code bringBack(const QString &path, FileProgress &progress);
 
 private:
     explicit KeptThing(const QString &path);

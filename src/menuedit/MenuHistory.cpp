@@ -3,6 +3,7 @@
 
 #include "MenuHistory.h"
 
+#include "FileWork.h"
 #include "MenuFind.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
@@ -110,7 +111,13 @@ void MenuHistory::run(bool isUndo)
     const QStringList items = command->items();
     const QString text = isUndo ? command->text().undo() : command->text().redo();
     const QStringList released = m_menu.files().release(paths);
-    const Refusal refusal = isUndo ? command->step().undo() : command->step().redo();
+    const QPointer<MenuHistory> self(this);
+    // The view may go while this takes long, and the stack with it.
+    FileStep step = std::move(command->step());
+    const Refusal refusal = follow(step, isUndo);
+    if (!self)
+        return;
+    command->step() = std::move(step);
     m_menu.files().watchAgain(released);
     if (refusal.isForGood)
         command->giveUp();
@@ -120,13 +127,21 @@ void MenuHistory::run(bool isUndo)
         refuse(refusal.reason, isUndo);
         return;
     }
-    const QPointer<MenuHistory> self(this);
     takeIn(paths);
     show(items);
     m_find.clear();
     Q_EMIT changed();
     if (self)
         m_voice.tell(QCoreApplication::translate("MenuHistory", "Done: %1").arg(text), MenuVoice::Note);
+}
+
+Refusal MenuHistory::follow(FileStep &step, bool isUndo) const
+{
+    FileWork work(m_view,
+                  isUndo ? QCoreApplication::translate("MenuHistory", "Undo")
+                         : QCoreApplication::translate("MenuHistory", "Redo"),
+                  QCoreApplication::translate("MenuHistory", "Moving files..."));
+    return isUndo ? step.undo(work) : step.redo(work);
 }
 
 void MenuHistory::refuse(const QString &reason, bool isUndo)
@@ -164,8 +179,9 @@ void MenuHistory::takeIn(const QStringList &paths)
 void MenuHistory::show(const QStringList &items)
 {
     const QString selected = m_selection.path();
+    const QString menu = m_menu.files().menuDirectory() + QLatin1Char('/');
     for (const QString &item : items) {
-        if (QFileInfo::exists(item) && m_selection.shown(item).isValid()) {
+        if (item.startsWith(menu) && QFileInfo::exists(item)) {
             m_selection.show(item);
             return;
         }

@@ -12,6 +12,7 @@
 #include <memory>
 #include <vector>
 
+class FileStep;
 class MenuFind;
 class MenuSelection;
 class MenuVoice;
@@ -21,6 +22,7 @@ class QTreeView;
 class ShownMenu;
 class StepCommand;
 class StepRecorder;
+struct Refusal;
 
 /**
  * What was done to a menu, to be undone and done again.
@@ -69,6 +71,7 @@ Q_SIGNALS:
 
 private:
     void run(bool isUndo);
+    Refusal follow(FileStep &step, bool isUndo) const;
     void refuse(const QString &reason, bool isUndo);
     void takeIn(const QStringList &paths);
     void show(const QStringList &items);

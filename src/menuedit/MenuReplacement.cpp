@@ -48,7 +48,7 @@ Refusal MenuReplacement::check() const
 }
 
 // The old folder is back in one step, whatever becomes of the rest.
-Refusal MenuReplacement::undo()
+Refusal MenuReplacement::undo(FileProgress &)
 {
     if (const Refusal refusal = Refusal::failed(m_folder, exchange()))
         return refusal;
@@ -62,11 +62,11 @@ Refusal MenuReplacement::undo()
     return Refusal::notTrashed(m_folder);
 }
 
-Refusal MenuReplacement::redo()
+Refusal MenuReplacement::redo(FileProgress &progress)
 {
     if (OnDisk::exists(m_previous) && !(m_older = keep(m_previous)))
         return Refusal::notTrashed(m_previous);
-    std::error_code error = m_newer->bringBack(m_previous);
+    std::error_code error = m_newer->bringBack(m_previous, progress);
     if (!error) {
         error = exchange();
         if (!error) {
@@ -87,7 +87,8 @@ std::error_code MenuReplacement::exchange() const
 
 bool MenuReplacement::putBack(std::unique_ptr<KeptThing> &kept)
 {
-    if (kept && kept->bringBack(m_previous))
+    FileProgress nobody;
+    if (kept && kept->bringBack(m_previous, nobody))
         return false;
     kept.reset();
     return true;

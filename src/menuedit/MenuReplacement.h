@@ -25,8 +25,9 @@ public:
     QStringList paths() const override { return {m_folder, m_previous}; }
     void note() override;
     Refusal check() const override;
-    Refusal undo() override;
-    Refusal redo() override;
+    // Nothing of it takes long: all of it lies in one folder or in the trash.
+    Refusal undo(FileProgress &progress) override;
+    Refusal redo(FileProgress &progress) override;
 
 private:
     std::error_code exchange() const;

@@ -33,24 +33,24 @@ Refusal MoveChange::check() const
     return (m_isMoved ? m_from : m_to).checkFree();
 }
 
-Refusal MoveChange::undo()
+Refusal MoveChange::undo(FileProgress &progress)
 {
-    return move(m_from, m_linkTextBefore);
+    return move(m_from, m_linkTextBefore, progress);
 }
 
-Refusal MoveChange::redo()
+Refusal MoveChange::redo(FileProgress &progress)
 {
-    return move(m_to, m_linkTextAfter);
+    return move(m_to, m_linkTextAfter, progress);
 }
 
-Refusal MoveChange::move(const FilePlace &to, const QByteArray &linkText)
+Refusal MoveChange::move(const FilePlace &to, const QByteArray &linkText, FileProgress &progress)
 {
     const TreeCopy::Path from = ExactMove::native((m_isMoved ? m_to : m_from).path());
     const TreeCopy::Path target = ExactMove::native(to.path());
     const bool isSameText = m_linkTextBefore == m_linkTextAfter;
     const Refusal refusal =
         Refusal::failed(to.path(),
-                        isSameText ? ExactMove::move(from, target)
+                        isSameText ? ExactMove::move(from, target, progress)
                                    : ExactMove::moveLink(from, target, linkText.toStdString()));
     if (!refusal)
         m_isMoved = !m_isMoved;

@@ -24,11 +24,11 @@ public:
     QStringList paths() const override { return {m_from.path(), m_to.path()}; }
     void note() override;
     Refusal check() const override;
-    Refusal undo() override;
-    Refusal redo() override;
+    Refusal undo(FileProgress &progress) override;
+    Refusal redo(FileProgress &progress) override;
 
 private:
-    Refusal move(const FilePlace &to, const QByteArray &linkText);
+    Refusal move(const FilePlace &to, const QByteArray &linkText, FileProgress &progress);
 
     const FilePlace m_from;
     const FilePlace m_to;

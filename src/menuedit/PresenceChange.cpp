@@ -36,14 +36,14 @@ Refusal PresenceChange::check() const
     return m_kept->isThere() ? m_place.checkFree() : Refusal::lost(path());
 }
 
-Refusal PresenceChange::undo()
+Refusal PresenceChange::undo(FileProgress &progress)
 {
-    return m_wasMade ? putAway() : bringBack();
+    return m_wasMade ? putAway() : bringBack(progress);
 }
 
-Refusal PresenceChange::redo()
+Refusal PresenceChange::redo(FileProgress &progress)
 {
-    return m_wasMade ? bringBack() : putAway();
+    return m_wasMade ? bringBack(progress) : putAway();
 }
 
 // What is kept beside goes with the history: only what the user has taken back may be lost then.
@@ -55,9 +55,9 @@ Refusal PresenceChange::putAway()
     return m_kept ? Refusal::none() : Refusal::notTrashed(path());
 }
 
-Refusal PresenceChange::bringBack()
+Refusal PresenceChange::bringBack(FileProgress &progress)
 {
-    const Refusal refusal = Refusal::failed(path(), m_kept->bringBack(path()));
+    const Refusal refusal = Refusal::failed(path(), m_kept->bringBack(path(), progress));
     if (!refusal)
         m_kept.reset();
     return refusal;

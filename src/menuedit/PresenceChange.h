@@ -27,12 +27,12 @@ public:
     QStringList paths() const override { return {path()}; }
     void note() override;
     Refusal check() const override;
-    Refusal undo() override;
-    Refusal redo() override;
+    Refusal undo(FileProgress &progress) override;
+    Refusal redo(FileProgress &progress) override;
 
 private:
     Refusal putAway();
-    Refusal bringBack();
+    Refusal bringBack(FileProgress &progress);
     QString path() const { return m_place.path(); }
 
     const FilePlace m_place;

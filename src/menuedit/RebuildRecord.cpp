@@ -40,8 +40,9 @@ RebuildRecord::~RebuildRecord() = default;
 
 void RebuildRecord::finish()
 {
+    FileProgress nobody;
     if (m_before.exists() && m_before.isAt(m_previous))
         m_recorder.changed(std::make_unique<MenuReplacement>(m_folder, m_previous, std::move(m_older)));
     else if (m_older && !OnDisk::exists(m_previous))
-        m_older->bringBack(m_previous);
+        m_older->bringBack(m_previous, nobody);
 }

@@ -47,6 +47,8 @@ Refusal Refusal::failed(const QString &path, const std::error_code &error)
         return none();
     if (error == std::errc::file_exists)
         return taken(path);
+    if (error == std::errc::operation_canceled)
+        return {QCoreApplication::translate("MenuHistory", "It was canceled.")};
     return {QCoreApplication::translate("MenuHistory", "%1 cannot be changed: %2")
                 .arg(path, QString::fromLocal8Bit(error.message().c_str()))};
 }

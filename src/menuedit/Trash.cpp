@@ -65,11 +65,12 @@ QString putLink(const QString &trash, const QString &path)
     if (!QDir(trash).mkpath(QStringLiteral("files")) || !QDir(trash).mkpath(QStringLiteral("info"))
         || !folder.isWritable())
         return QString();
+    FileProgress nobody;
     QFile note;
     const QString place = freePlace(trash, QFileInfo(path).fileName(), &note);
     const QByteArray text = noteFor(path);
     if (!place.isEmpty() && note.write(text) == text.size() && note.flush()
-        && !ExactMove::move(ExactMove::native(path), ExactMove::native(place)))
+        && !ExactMove::move(ExactMove::native(path), ExactMove::native(place), nobody))
         return place;
     if (note.isOpen())
         note.remove();

@@ -43,6 +43,7 @@ private Q_SLOTS:
     void leavesTheTreeAsItWas_data();
     void leavesTheTreeAsItWas();
     void leavesTheTreeAsItWasAcrossFileSystems();
+    void changesNothingWhenItIsCanceled();
     void keepsEverythingOfAFolderOfOddThings();
     void keepsTheAttributesOfARecord();
     void writesThroughALink();
@@ -238,6 +239,39 @@ void tst_FileStep::leavesTheTreeAsItWasAcrossFileSystems()
         QCOMPARE(step.redo().reason, QString());
         QCOMPARE(after.difference(state(), {"*"}), QString());
     }
+}
+
+void tst_FileStep::changesNothingWhenItIsCanceled()
+{
+    const QString other = otherFileSystem(folder());
+    if (other.isEmpty())
+        QSKIP("there is no second file system to write to");
+    class Impatient : public FileProgress
+    {
+    public:
+        bool goOn() override { return ++m_asked < 40; }
+
+    private:
+        int m_asked = 0;
+    };
+    const QTemporaryDir target(other + QStringLiteral("/tst_FileStep-XXXXXX"));
+    for (int i = 0; i < 50; ++i)
+        make(qPrintable(QStringLiteral("games/%1.desktop").arg(i)));
+    const ExactTree before = ExactTree::of(menu());
+    FileStep step = run([&](StepRecorder &recorder) {
+        transfer(recorder, "games", target.path(), FileTransfer::Action::Move);
+        edit(recorder, "a", "new");
+    });
+    const ExactTree after = ExactTree::of(menu());
+    const ExactTree there = ExactTree::of(target.path());
+
+    Impatient progress;
+    QCOMPARE(step.undo(progress).reason, QStringLiteral("It was canceled."));
+
+    QCOMPARE(after.difference(ExactTree::of(menu()), {"*"}), QString());
+    QCOMPARE(there.difference(ExactTree::of(target.path()), {"*"}), QString());
+    QCOMPARE(step.undo().reason, QString());
+    QCOMPARE(before.difference(ExactTree::of(menu()), {"*"}), QString());
 }
 
 // Names that are no text, links that lead nowhere, what may not be written.

@@ -36,6 +36,7 @@ private Q_SLOTS:
     void countsWhatAFolderHolds_data();
     void countsWhatAFolderHolds();
     void opensTheFolderOfWhatIsBack();
+    void worksWhileAFilterIsSet();
     void deletesALinkAndNotWhatItLeadsTo();
     void leavesTheDefaultMenuWhereNothingWasBuilt();
 
@@ -282,6 +283,20 @@ void tst_VelMenuViewHistory::opensTheFolderOfWhatIsBack()
     // And the view goes on to see what happens there.
     writeEntry(QStringLiteral("games/z.desktop"), QStringLiteral("Z"));
     QTRY_COMPARE(names(*view, menu() + QStringLiteral("/games")).size(), 3);
+}
+
+void tst_VelMenuViewHistory::worksWhileAFilterIsSet()
+{
+    const auto view = make();
+    remove(*view, m_a);
+    view->setFilter(QStringLiteral("b"));
+    QTRY_COMPARE(names(*view, menu()), QStringList{QStringLiteral("B")});
+    view->undoAction()->trigger();
+    QVERIFY(QFile::exists(m_a));
+    QTRY_COMPARE(names(*view, menu()), QStringList({QStringLiteral("B"), QStringLiteral("A")}));
+    QCOMPARE(view->selectedPath(), m_a);
+    view->redoAction()->trigger();
+    QTRY_COMPARE(names(*view, menu()), QStringList{QStringLiteral("B")});
 }
 
 void tst_VelMenuViewHistory::deletesALinkAndNotWhatItLeadsTo()
