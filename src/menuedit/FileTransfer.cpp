@@ -5,10 +5,10 @@
 
 #include "FileProgress.h"
 #include "OnDisk.h"
+#include "StagedCopies.h"
 #include "StagingFolder.h"
 #include "TreeCopy.h"
 #include "TreeLimits.h"
-#include "TreeRemoval.h"
 
 #include <QDir>
 #include <QFile>
@@ -16,6 +16,7 @@
 #include <QSet>
 #include <QVector>
 
+#include <algorithm>
 #include <cerrno>
 #include <system_error>
 
@@ -51,16 +52,6 @@ bool wouldContainItself(const QFileInfo &source, const QString &canonicalDirecto
     return source.isDir() && !source.isSymLink() && isBelow(canonicalDirectory, source.canonicalFilePath());
 }
 
-std::error_code transferOne(const Pair &pair, Action action, FileProgress &progress)
-{
-    if (!progress.goOn())
-        return std::make_error_code(std::errc::operation_canceled);
-    const TreeCopy::Path source = native(pair.source);
-    const TreeCopy::Path target = native(pair.target);
-    return action == Action::Move ? TreeCopy::move(source, target, progress)
-                                  : TreeCopy::copy(source, target, progress);
-}
-
 // Counts what is to be done; why it is too much, if it is.
 std::error_code count(const QString &source, Action action, FileProgress &progress)
 {
@@ -68,18 +59,6 @@ std::error_code count(const QString &source, Action action, FileProgress &progre
         return TreeLimits::check(native(source), progress);
     progress.expect(1);
     return {};
-}
-
-// Takes back what was done, the last first. What cannot be moved back stays whole where it is.
-void takeBack(const QVector<Pair> &done, Action action, FileProgress &progress)
-{
-    UnstoppableProgress toTheEnd(progress);
-    for (auto it = done.crbegin(); it != done.crend(); ++it) {
-        if (action == Action::Copy)
-            TreeRemoval::removeOwn(native(it->target), toTheEnd);
-        else
-            TreeCopy::move(native(it->target), native(it->source), toTheEnd);
-    }
 }
 
 Result failed(const Pair &pair, const std::error_code &error)
@@ -90,6 +69,61 @@ Result failed(const Pair &pair, const std::error_code &error)
         return {Failure::Canceled, pair.source, QString()};
     return {Failure::Failed, pair.source, QString::fromLocal8Bit(error.message().c_str())};
 }
+
+// One transfer: what can be moved in one step is at once, all else appears together in the end.
+class Transfer
+{
+public:
+    Transfer(Action action, FileProgress &progress)
+        : m_action(action)
+        , m_progress(progress)
+        , m_copies(action == Action::Move ? FileCopy::Kind::Move : FileCopy::Kind::Copy, progress)
+    {
+    }
+
+    Result carryOut(const QVector<Pair> &pairs)
+    {
+        for (const Pair &pair : pairs) {
+            if (const std::error_code error = transfer(pair))
+                return takeBack(pair, error);
+        }
+        const std::error_code error = m_copies.reveal();
+        if (!error)
+            return {};
+        const auto isFailed = [this](const Pair &pair) { return native(pair.source) == m_copies.failed(); };
+        return takeBack(*std::find_if(pairs.begin(), pairs.end(), isFailed), error);
+    }
+
+private:
+    std::error_code transfer(const Pair &pair)
+    {
+        if (!m_progress.goOn())
+            return std::make_error_code(std::errc::operation_canceled);
+        if (m_action == Action::Move) {
+            const std::error_code error =
+                TreeCopy::moveAtOnce(native(pair.source), native(pair.target), m_progress);
+            if (!error)
+                m_moved.append(pair);
+            if (error != std::errc::cross_device_link)
+                return error;
+        }
+        return m_copies.add(native(pair.source), native(pair.target));
+    }
+
+    // The last first. What cannot be moved back stays whole where it is.
+    Result takeBack(const Pair &pair, const std::error_code &error)
+    {
+        UnstoppableProgress toTheEnd(m_progress);
+        for (auto it = m_moved.crbegin(); it != m_moved.crend(); ++it)
+            TreeCopy::move(native(it->target), native(it->source), toTheEnd);
+        return failed(pair, error);
+    }
+
+    const Action m_action;
+    FileProgress &m_progress;
+    StagedCopies m_copies;
+    QVector<Pair> m_moved;
+};
 
 } // namespace
 
@@ -142,13 +176,7 @@ Result transfer(const QStringList &sources, const QString &targetDirectory, Acti
             return failed(pair, error);
     }
     StagingFolder::removeLeftovers(native(targetDirectory));
-    for (auto pair = pairs.cbegin(); pair != pairs.cend(); ++pair) {
-        if (const std::error_code error = transferOne(*pair, action, progress)) {
-            takeBack(pairs.mid(0, int(pair - pairs.cbegin())), action, progress);
-            return failed(*pair, error);
-        }
-    }
-    return {};
+    return Transfer(action, progress).carryOut(pairs);
 }
 
 Result transfer(const QStringList &sources, const QString &targetDirectory, Action action)

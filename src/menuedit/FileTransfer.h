@@ -11,7 +11,8 @@ class FileProgress;
 /**
  * Copying and moving of files and folders into a directory. All or nothing: when one item
  * fails, those already done are taken back. Nothing is ever overwritten, and an item appears
- * under its name only when it is there completely. Shows nothing; the caller tells the user.
+ * under its name only when it is there completely; what has to be copied appears together. Shows nothing; the
+ * caller tells the user.
  */
 namespace FileTransfer {
 

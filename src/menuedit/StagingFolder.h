@@ -4,6 +4,7 @@
 #pragma once
 
 #include <filesystem>
+#include <string>
 #include <string_view>
 #include <system_error>
 
@@ -25,8 +26,8 @@ public:
 
     /// Why there is none.
     std::error_code error() const { return m_error; }
-    /// The one path in it that is used.
-    std::filesystem::path item() const { return m_path / "item"; }
+    /// The path in it of that number.
+    std::filesystem::path item(int number = 0) const { return m_path / ("item" + std::to_string(number)); }
 
     /// Whether a file or folder called \a name may be one of ours.
     static bool isNameOfOne(std::string_view name);

@@ -27,4 +27,7 @@ std::error_code copy(const Path &source, const Path &target, FileProgress &progr
 /// stay, set-id bits only together with owner and group.
 std::error_code move(const Path &source, const Path &target, FileProgress &progress);
 
+/// The same where that takes one step; errc::cross_device_link where a copy has to be made.
+std::error_code moveAtOnce(const Path &source, const Path &target, FileProgress &progress);
+
 } // namespace TreeCopy

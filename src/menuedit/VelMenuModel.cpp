@@ -27,6 +27,9 @@ namespace {
 // The filter that the base class begins with.
 const QDir::Filters DefaultFilter = QDir::AllEntries | QDir::NoDotAndDotDot | QDir::AllDirs;
 
+// The files of a drop that get their rows at once.
+constexpr int MostAtOnce = 20;
+
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
 
@@ -150,14 +153,16 @@ void VelMenuModel::takeIn(const DropResult &result)
         noteRecordFile(filePath(result.folder));
     for (const QString &source : result.moved)
         forgetItemInfo(source);
-    // Every file has its row at once, whether or not its folder is being watched already.
-    for (const QString &target : result.targets) {
-        if (!QFileInfo::exists(target))
-            continue;
-        index(target);
-        // Nor does it show what was here before, whether or not that was seen to go.
+    // None shows what was there before, whether or not that was seen to go.
+    for (const QString &target : result.targets)
         m_cache->forgetTree(target);
-        refreshRow(target);
+    // A few have their rows at once, whether or not their folder is being watched already. Thousands
+    // would stop the window for as long as each row takes; they come with the folder.
+    for (const QString &target : result.targets.mid(0, MostAtOnce)) {
+        if (QFileInfo::exists(target)) {
+            index(target);
+            refreshRow(target);
+        }
     }
 }
 
