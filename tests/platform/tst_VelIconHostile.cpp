@@ -7,6 +7,9 @@
 #include <QDir>
 #include <QDirIterator>
 
+#include <QtEndian>
+
+#include <sys/resource.h>
 #include <sys/stat.h>
 #include <zlib.h>
 
@@ -24,6 +27,40 @@ QByteArray picture(int width, int height, const char *format = "png")
     QBuffer buffer;
     image.save(&buffer, format);
     return buffer.data();
+}
+
+QByteArray chunk(const QByteArray &named)
+{
+    const auto bigEndian = [](quint32 value) {
+        value = qToBigEndian(value);
+        return QByteArray(reinterpret_cast<const char *>(&value), 4);
+    };
+    const auto sum = crc32(0, reinterpret_cast<const Bytef *>(named.constData()), uInt(named.size()));
+    return bigEndian(quint32(named.size()) - 4) + named + bigEndian(quint32(sum));
+}
+
+/// A black square; made without ever having all of it in memory.
+QByteArray hugePicture(int edge)
+{
+    QByteArray packed(1024 * 1024, Qt::Uninitialized);
+    QByteArray row(edge / 8 + 2, '\0');
+    z_stream stream = {};
+    stream.next_out = reinterpret_cast<Bytef *>(packed.data());
+    stream.avail_out = uInt(packed.size());
+    if (deflateInit(&stream, 9) != Z_OK)
+        return {};
+    for (int i = 0; i < edge; ++i) {
+        stream.next_in = reinterpret_cast<Bytef *>(row.data());
+        stream.avail_in = uInt(row.size() - (edge % 8 == 0 ? 1 : 0));
+        deflate(&stream, i + 1 == edge ? Z_FINISH : Z_NO_FLUSH);
+    }
+    packed.truncate(int(stream.total_out));
+    deflateEnd(&stream);
+    QByteArray size(8, '\0');
+    qToBigEndian<quint32>(quint32(edge), size.data());
+    qToBigEndian<quint32>(quint32(edge), size.data() + 4);
+    return "\x89PNG\r\n\x1a\n" + chunk("IHDR" + size + QByteArray("\1\0\0\0\0", 5)) + chunk("IDAT" + packed)
+        + chunk("IEND");
 }
 
 QByteArray image(const QByteArray &reference)
@@ -99,8 +136,17 @@ private Q_SLOTS:
     void aNameLeadsNowhereOutsideTheTheme();
     void takesTheFallbackForATruncatedPicture();
     void takesTheFallbackForATruncatedPictureOfTheTheme();
+    void takesTheFallbackForTooLargeAFileOfTheTheme_data();
+    void takesTheFallbackForTooLargeAFileOfTheTheme();
+    void takesTheFallbackForTooLargeAFileOfNoTheme();
+    void takesTheFallbackForAPipeInTheTheme();
+    void takesNoMemoryForAPictureOfTheTheme();
 
 private:
+    static QString inTheme(int size, const QString &file)
+    {
+        return QStringLiteral("icons/first/%1/%2").arg(QString::number(size), file);
+    }
     QColor shown(const QString &name)
     {
         return painted(VelIcon::fromTheme(name, Emblems(), plainIcon(Qt::yellow)), 22).pixelColor(11, 11);
@@ -249,6 +295,73 @@ void tst_VelIconHostile::takesTheFallbackForATruncatedPictureOfTheTheme()
     const QIcon icon = VelIcon::fromTheme(QStringLiteral("cut"), Emblems(), plainIcon(Qt::yellow));
     QCOMPARE(painted(icon, 22).pixelColor(11, 11), QColor(Qt::yellow));
     QCOMPARE(icon.pixmap(22).toImage().pixelColor(11, 11), QColor(Qt::yellow));
+}
+
+void tst_VelIconHostile::takesTheFallbackForTooLargeAFileOfTheTheme_data()
+{
+    QTest::addColumn<QString>("suffix");
+    QTest::addColumn<QByteArray>("bytes");
+    const auto row = [](const char *name, const char *suffix, const QByteArray &bytes) {
+        QTest::newRow(name) << QString::fromLatin1(suffix) << bytes;
+    };
+    row("wide picture", ".png", picture(4097, 4096));
+    row("high picture", ".png", picture(4096, 4097));
+    row("picture of another kind", ".png", picture(4097, 4096, "bmp"));
+    row("drawing with a picture", ".svg", drawing(image(embedded(picture(4097, 8)))));
+    row("picture in another encoding", ".svg",
+        "<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?>" + drawing(image(embedded(picture(4097, 8)))));
+    row("entity in a drawing", ".svg",
+        "<!DOCTYPE svg [<!ENTITY a \"" + embedded(picture(4097, 8)) + "\">]>" + drawing(image("&a;")));
+    row("drawing with the name of a picture", ".png", drawing(image(embedded(picture(4097, 8)))));
+}
+
+void tst_VelIconHostile::takesTheFallbackForTooLargeAFileOfTheTheme()
+{
+    QFETCH(QString, suffix);
+    QFETCH(QByteArray, bytes);
+    const QString name = QStringLiteral("large");
+    m_theme->add(name, Qt::red, 32);
+    write(inTheme(22, name + suffix), bytes);
+    const QIcon icon = VelIcon::fromTheme(name, Emblems(), plainIcon(Qt::yellow));
+    QCOMPARE(painted(icon, 22).pixelColor(11, 11), QColor(Qt::yellow));
+    QCOMPARE(icon.pixmap(22).toImage().pixelColor(11, 11), QColor(Qt::yellow));
+    // The other file is as good as any.
+    QCOMPARE(painted(icon, 32).pixelColor(11, 11), QColor(Qt::red));
+}
+
+void tst_VelIconHostile::takesTheFallbackForTooLargeAFileOfNoTheme()
+{
+    write(QStringLiteral("pixmaps/large.png"), picture(4097, 8));
+    write(QStringLiteral("pixmaps/small.png"), picture(64, 64));
+    const QStringList before = QIcon::fallbackSearchPaths();
+    QIcon::setFallbackSearchPaths({path(QStringLiteral("pixmaps"))});
+    const QColor large = shown(QStringLiteral("large"));
+    const QColor small = shown(QStringLiteral("small"));
+    QIcon::setFallbackSearchPaths(before);
+    QCOMPARE(large, QColor(Qt::yellow));
+    QCOMPARE(small, QColor(Qt::magenta));
+}
+
+// Whoever opens it would wait for ever.
+void tst_VelIconHostile::takesTheFallbackForAPipeInTheTheme()
+{
+    for (const char *name : {"one.png", "two.svg"})
+        QCOMPARE(::mkfifo(QFile::encodeName(path(inTheme(22, QLatin1String(name)))).constData(), 0600), 0);
+    QCOMPARE(shown(QStringLiteral("one")), QColor(Qt::yellow));
+    QCOMPARE(shown(QStringLiteral("two")), QColor(Qt::yellow));
+}
+
+void tst_VelIconHostile::takesNoMemoryForAPictureOfTheTheme()
+{
+    m_theme->add(QStringLiteral("huge"), Qt::red, 32);
+    write(inTheme(22, QStringLiteral("huge.png")), hugePicture(30000));
+    rusage before = {};
+    rusage after = {};
+    getrusage(RUSAGE_SELF, &before);
+    QCOMPARE(shown(QStringLiteral("huge")), QColor(Qt::yellow));
+    getrusage(RUSAGE_SELF, &after);
+    QVERIFY2(after.ru_maxrss - before.ru_maxrss < 50 * 1024, // in KiB
+             qPrintable(QString::number(after.ru_maxrss - before.ru_maxrss)));
 }
 
 VEL_TEST_MAIN(tst_VelIconHostile)

@@ -10,6 +10,8 @@
 #include <QImageReader>
 #include <QXmlStreamReader>
 
+#include <cstring>
+
 namespace {
 
 // Without regard to namespaces, as the reader of drawings has it.
@@ -59,10 +61,24 @@ bool isSafeElement(const QXmlStreamReader &xml, PictureLimits::Sum *sum)
     return true;
 }
 
+// Plain text without the words for pictures, other files and entities, which is nearly every drawing.
+bool isPlainlySafe(const QByteArray &bytes)
+{
+    if (bytes.contains('\0') || bytes.contains("image") || bytes.contains("xml-stylesheet")
+        || bytes.contains("<!DOCTYPE"))
+        return false;
+    // In another encoding the words may look otherwise.
+    const int declaration = bytes.indexOf("encoding");
+    const QByteArray encoding = bytes.mid(declaration, int(std::strlen("encoding=\"UTF-8\""))).toLower();
+    return declaration < 0 || encoding == "encoding=\"utf-8\"" || encoding == "encoding='utf-8'";
+}
+
 } // namespace
 
 bool DrawingContents::isSafe(const QByteArray &bytes)
 {
+    if (isPlainlySafe(bytes))
+        return true;
     QXmlStreamReader xml(bytes);
     xml.setNamespaceProcessing(false);
     PictureLimits::Sum sum;

@@ -19,13 +19,17 @@ qreal ratioOfQt()
 
 } // namespace
 
-QPixmap IconDrawing::pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode,
-                            QIcon::State state)
+IconDrawing::Request IconDrawing::request(const QSize &pixels)
 {
     // Asked for a logical size, QIcon multiplies it by its own ratio.
     const qreal ratio = ratioOfQt();
-    const QSize size(qFloor(pixels.width() / ratio), qFloor(pixels.height() / ratio));
-    QPixmap pixmap = icon.pixmap(size, mode, state);
+    return {QSize(qFloor(pixels.width() / ratio), qFloor(pixels.height() / ratio)), qCeil(ratio)};
+}
+
+QPixmap IconDrawing::pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode,
+                            QIcon::State state)
+{
+    QPixmap pixmap = icon.pixmap(request(pixels).size, mode, state);
     pixmap.setDevicePixelRatio(1);
     if (fit == Fit::Exactly && !pixmap.isNull() && pixmap.size() != pixels)
         pixmap = pixmap.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);

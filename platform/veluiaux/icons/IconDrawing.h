@@ -17,6 +17,16 @@ enum class Fit {
     Exactly ///< scaled where the icon has no pixmap of that size
 };
 
+/// What QIcon is asked for, and at which ratio it looks for a file.
+struct Request
+{
+    QSize size;
+    int scale;
+};
+
+/// What QIcon is asked for to have a pixmap for \a pixels of the device.
+Request request(const QSize &pixels);
+
 /**
  * The pixmap of \a icon for \a pixels of the device, with a pixel ratio of 1; null when the
  * icon has none.

@@ -5,9 +5,12 @@
 
 #include "PictureFile.h"
 
+#include <QDataStream>
 #include <QDateTime>
 #include <QDir>
 #include <QFileInfo>
+
+#include <algorithm>
 
 namespace {
 
@@ -34,17 +37,56 @@ QIcon iconOfFile(const QString &path)
     return icon;
 }
 
+// The platform's own theme may have its own way to find files.
+bool isFoundByQt(const QIcon &icon)
+{
+    QByteArray bytes;
+    QDataStream out(&bytes, QIODevice::WriteOnly);
+    out << icon;
+    QDataStream in(bytes);
+    QString engine;
+    in >> engine;
+    return engine == QLatin1String("QIconLoaderEngine");
+}
+
+bool isSafe(const ThemeFiles::File &file)
+{
+    return PictureFile::isSafeOfTheme(file.path);
+}
+
+IconLookup::Found iconOfTheme(const QString &name)
+{
+    IconLookup::Found found;
+    found.files = ThemeFiles::find(name);
+    // To tell the sizes of such a one, the file itself is read.
+    if (found.files.size() == 1 && found.files.constFirst().folder.kind == ThemeFolder::Kind::Unsorted
+        && !isSafe(found.files.constFirst()))
+        return {};
+    found.icon = QIcon::fromTheme(name);
+    if (found.icon.isNull() || found.icon.availableSizes().isEmpty())
+        return {};
+    found.isChosenByQt = isFoundByQt(found.icon);
+    return found;
+}
+
 } // namespace
 
-QIcon IconLookup::find(const QString &name)
+bool IconLookup::Found::mayBeDrawn(const QSize &size, int scale) const
+{
+    if (!isChosenByQt)
+        return std::all_of(files.cbegin(), files.cend(), isSafe);
+    const ThemeFiles::File *const file = ThemeFiles::forSize(files, size, scale);
+    return !file || isSafe(*file);
+}
+
+IconLookup::Found IconLookup::find(const QString &name)
 {
     if (QDir::isAbsolutePath(name))
-        return iconOfFile(name);
+        return {iconOfFile(name), {}};
     // From the folders of a theme such a name would lead to any other.
     if (name.contains(QLatin1Char('/')))
-        return QIcon();
-    const QIcon icon = QIcon::fromTheme(withoutImageSuffix(name));
-    return icon.isNull() || icon.availableSizes().isEmpty() ? QIcon() : icon;
+        return {};
+    return iconOfTheme(withoutImageSuffix(name));
 }
 
 QString IconLookup::identity(const QString &name)

@@ -3,15 +3,30 @@
 
 #pragma once
 
+#include "ThemeFiles.h"
+
 #include <QIcon>
 #include <QString>
+#include <QVector>
 
 /// Finds icons by the names that desktop entries use.
 namespace IconLookup {
 
+/// An icon, and where the theme has it, its files.
+struct Found
+{
+    QIcon icon; ///< null when there is none
+    QVector<ThemeFiles::File> files;
+    /// Whether Qt chooses among the files; or else something else does, in its own way.
+    bool isChosenByQt = true;
+
+    /// Whether the file that is drawn in \a size, in pixels of the ratio \a scale, may be read. Until
+    /// then none of the theme's files was looked at.
+    bool mayBeDrawn(const QSize &size, int scale) const;
+};
+
 /// The icon \a name: a theme name, one with the suffix of an image file, or an absolute path.
-/// Null when there is none.
-QIcon find(const QString &name);
+Found find(const QString &name);
 
 /// A text that is another one when \a name means another icon, as long as the theme stays.
 QString identity(const QString &name);

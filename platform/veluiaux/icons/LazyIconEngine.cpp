@@ -4,7 +4,6 @@
 #include "LazyIconEngine.h"
 
 #include "EmblemLayout.h"
-#include "IconLookup.h"
 #include "IconMemory.h"
 #include "ThemeState.h"
 
@@ -33,12 +32,22 @@ const QIcon &LazyIconEngine::base() const
 {
     const quint64 generation = ThemeState::generation();
     if (m_baseGeneration != generation) {
-        m_base = m_name.isEmpty() ? QIcon() : IconLookup::find(m_name);
-        if (m_base.isNull())
-            m_base = m_plain;
+        m_base = m_name.isEmpty() ? IconLookup::Found() : IconLookup::find(m_name);
+        if (m_base.icon.isNull())
+            m_base = {m_plain, {}};
         m_baseGeneration = generation;
     }
-    return m_base;
+    return m_base.icon;
+}
+
+QPixmap LazyIconEngine::basePixmap(const QSize &pixels, IconDrawing::Fit fit, QIcon::Mode mode,
+                                   QIcon::State state) const
+{
+    const QIcon &icon = base();
+    const IconDrawing::Request request = IconDrawing::request(pixels);
+    if (!m_base.mayBeDrawn(request.size, request.scale))
+        return QPixmap();
+    return IconDrawing::pixmap(icon, pixels, fit, mode, state);
 }
 
 const QString &LazyIconEngine::baseKey() const
@@ -77,8 +86,8 @@ QPixmap LazyIconEngine::scaledPixmap(const QSize &pixels, qreal ratio, IconDrawi
     QPixmap pixmap;
     if (memory.findPixmap(key, &pixmap))
         return pixmap;
-    pixmap = IconDrawing::pixmap(base(), pixels, fit, mode, state);
-    if (pixmap.isNull()) // a file of the theme may be damaged
+    pixmap = basePixmap(pixels, fit, mode, state);
+    if (pixmap.isNull())
         pixmap = IconDrawing::pixmap(m_plain, pixels, fit, mode, state);
     if (pixmap.isNull())
         return pixmap;

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "IconDrawing.h"
+#include "IconLookup.h"
 
 #include <QIcon>
 #include <QIconEngine>
@@ -44,6 +45,8 @@ private:
     QMap<Qt::Corner, QPixmap> emblemPixmaps(const QSize &size, qreal ratio, QIcon::Mode mode) const;
     /// The icon without emblems, as the theme now has it.
     const QIcon &base() const;
+    /// A pixmap of it; null where the file for it is damaged or too large to be read.
+    QPixmap basePixmap(const QSize &pixels, IconDrawing::Fit fit, QIcon::Mode mode, QIcon::State state) const;
     bool isEmpty() const;
     /// Names the parts, without the emblems, for what is remembered.
     const QString &baseKey() const;
@@ -54,7 +57,7 @@ private:
     const QMap<Qt::Corner, QString> m_emblems;
     const QIcon m_plain;
 
-    mutable QIcon m_base;
+    mutable IconLookup::Found m_base;
     mutable quint64 m_baseGeneration = 0;
     mutable QString m_baseKey;
 };

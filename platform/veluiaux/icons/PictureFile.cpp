@@ -12,10 +12,13 @@
 #include <QFileInfo>
 #include <QGuiApplication>
 #include <QImageReader>
+#include <QtEndian>
 
 #include <optional>
 
 namespace {
+
+constexpr int PngBegin = 24; // bytes, with the size
 
 std::optional<QByteArray> contents(const QString &path)
 {
@@ -57,6 +60,27 @@ bool isSafeFile(const QString &path)
     return bytes && PictureContents::fits(*bytes, format, &sum);
 }
 
+// The size of a PNG picture stands at its begin.
+std::optional<QSize> sizeOfPng(const QByteArray &begin)
+{
+    static const QByteArray mark("\x89PNG\r\n\x1a\n\0\0\0\rIHDR", 16);
+    if (begin.size() < PngBegin || !begin.startsWith(mark))
+        return std::nullopt;
+    const quint32 width = qFromBigEndian<quint32>(begin.constData() + mark.size());
+    const quint32 height = qFromBigEndian<quint32>(begin.constData() + mark.size() + 4);
+    constexpr quint32 Most = PictureLimits::Edge + 1;
+    return QSize(int(qMin(width, Most)), int(qMin(height, Most)));
+}
+
+bool isSafePicture(const QString &path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly))
+        return true; // whoever reads it next tells
+    const auto size = sizeOfPng(file.read(PngBegin));
+    return size ? PictureLimits::fits(*size) : isSafeFile(path);
+}
+
 // As Qt names the variant of a file for \a ratio.
 QString variant(const QString &path, int ratio)
 {
@@ -68,12 +92,8 @@ QString variant(const QString &path, int ratio)
     return QString(path).insert(place, QStringLiteral("@%1x").arg(ratio));
 }
 
-} // namespace
-
-bool PictureFile::isSafe(const QString &path)
+bool areVariantsSafe(const QString &path)
 {
-    if (!isSafeFile(path))
-        return false;
     if (qGuiApp->devicePixelRatio() <= 1)
         return true;
     for (int ratio = 2; ratio <= 9; ++ratio) {
@@ -82,4 +102,24 @@ bool PictureFile::isSafe(const QString &path)
             return false;
     }
     return true;
+}
+
+} // namespace
+
+bool PictureFile::isSafe(const QString &path)
+{
+    return isSafeFile(path) && areVariantsSafe(path);
+}
+
+bool PictureFile::isSafeOfTheme(const QString &path)
+{
+    // Opening a pipe would wait for whoever writes into it.
+    if (!QFileInfo(path).isFile())
+        return false;
+    if (path.endsWith(QLatin1String(".png")))
+        return isSafePicture(path) && areVariantsSafe(path);
+    if (!path.endsWith(QLatin1String(".svg")))
+        return isSafe(path);
+    const std::optional<QByteArray> bytes = contents(path);
+    return bytes && DrawingContents::isSafe(*bytes) && areVariantsSafe(path);
 }

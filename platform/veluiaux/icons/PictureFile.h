@@ -16,4 +16,7 @@ namespace PictureFile {
  */
 bool isSafe(const QString &path);
 
+/// The same for a file of an icon theme, which mostly is a small one of the usual kinds: cheap for those.
+bool isSafeOfTheme(const QString &path);
+
 } // namespace PictureFile
