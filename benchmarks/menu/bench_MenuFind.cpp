@@ -1,0 +1,189 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+// Finding and filtering in large menus: how long it takes, and how long the window does not answer
+// meanwhile. Needs a display.
+
+#include "MenuFiles.h"
+
+#include <VelMenuView.h>
+
+#include <QApplication>
+#include <QDir>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QFileInfo>
+#include <QIcon>
+#include <QInputDialog>
+#include <QLineEdit>
+#include <QTemporaryDir>
+#include <QTimer>
+
+#include <algorithm>
+#include <cstdio>
+#include <functional>
+#include <vector>
+
+namespace {
+
+constexpr double MostAnswer = 1000; // milliseconds, as the others
+constexpr double MostFreeze = 200;
+constexpr double MostKey = 50;
+constexpr int Rounds = 7;
+
+double milliseconds(const QElapsedTimer &timer)
+{
+    return double(timer.nsecsElapsed()) / 1e6;
+}
+
+/// Notes the longest time in which the event loop did not turn.
+class FreezeMeter
+{
+public:
+    FreezeMeter()
+    {
+        QObject::connect(&m_ticks, &QTimer::timeout, &m_ticks, [this] { tick(); });
+        m_ticks.start(0);
+        m_since.start();
+    }
+
+    double longest()
+    {
+        tick();
+        return m_longest;
+    }
+
+private:
+    void tick()
+    {
+        m_longest = std::max(m_longest, milliseconds(m_since));
+        m_since.start();
+    }
+
+    QTimer m_ticks;
+    QElapsedTimer m_since;
+    double m_longest = 0;
+};
+
+void settle(int forMilliseconds)
+{
+    QElapsedTimer timer;
+    for (timer.start(); timer.elapsed() < forMilliseconds;)
+        QCoreApplication::processEvents(QEventLoop::AllEvents, 5);
+}
+
+double median(std::vector<double> values)
+{
+    std::sort(values.begin(), values.end());
+    return values.at(values.size() / 2);
+}
+
+bool report(const char *what, const std::vector<double> &values, double most)
+{
+    const double longest = *std::max_element(values.begin(), values.end());
+    std::printf("  %-46s median %7.1f ms, longest %7.1f ms, aim %4.0f ms%s\n", what, median(values), longest,
+                most, longest > most ? " (missed)" : "");
+    return longest <= most;
+}
+
+// The time from the text being entered until the match is selected.
+double findOnce(VelMenuView *view, double *freeze)
+{
+    QElapsedTimer timer;
+    QTimer::singleShot(0, view, [&] {
+        auto *question = qobject_cast<QInputDialog *>(QApplication::activeModalWidget());
+        question->setTextValue(QStringLiteral("Needle"));
+        timer.start();
+        question->accept();
+    });
+    FreezeMeter meter;
+    view->slotFind();
+    const double time = milliseconds(timer);
+    if (!view->selectedPath().endsWith(QLatin1String("needle.desktop")))
+        std::printf("  the needle was not found\n");
+    settle(300);
+    *freeze = meter.longest();
+    return time;
+}
+
+bool measureFind(const char *title, const QString &menu)
+{
+    std::printf("%s\n", title);
+    std::vector<double> times;
+    std::vector<double> freezes;
+    for (int round = 0; round < Rounds; ++round) {
+        VelMenuView view(menu, -1, true);
+        view.resize(400, 480);
+        view.show();
+        settle(500);
+        double freeze = 0;
+        times.push_back(findOnce(&view, &freeze));
+        freezes.push_back(freeze);
+    }
+    const bool isSoon = report("answer", times, MostAnswer);
+    return report("longest freeze", freezes, MostFreeze) && isSoon;
+}
+
+// One key after the other, as somebody types and deletes again.
+bool measureFilter(const char *title, const QString &menu)
+{
+    std::printf("%s\n", title);
+    std::vector<double> first;
+    std::vector<double> keys;
+    std::vector<double> freezes;
+    for (int round = 0; round < Rounds; ++round) {
+        VelMenuView view(menu, -1, true);
+        view.setAssistance(true);
+        view.resize(400, 480);
+        view.show();
+        settle(1500);
+        const QString text = QStringLiteral("entry 123");
+        FreezeMeter meter;
+        for (int length = 1; length <= 2 * text.size(); ++length) {
+            QElapsedTimer timer;
+            timer.start();
+            view.setFilter(text.left(length <= text.size() ? length : 2 * text.size() - length));
+            // Until it is painted, too.
+            QCoreApplication::processEvents();
+            (length == 1 ? first : keys).push_back(milliseconds(timer));
+            settle(length == 1 ? 1500 : 100);
+        }
+        freezes.push_back(meter.longest());
+    }
+    const bool isFirstSoon = report("first key, menu not read yet", first, MostKey);
+    const bool isSoon = report("each further key", keys, MostKey);
+    return report("longest freeze", freezes, MostFreeze) && isFirstSoon && isSoon;
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    QApplication application(argc, argv);
+    QIcon::setThemeSearchPaths({QStringLiteral("/usr/share/icons")});
+    QIcon::setThemeName(QStringLiteral("breeze"));
+    MenuFiles files;
+    const QString menu = files.nested(200, 50);
+    const QString last = QDir(menu).entryInfoList(QDir::Dirs | QDir::NoDotAndDotDot).constLast().filePath();
+    QFile needle(last + QLatin1String("/needle.desktop"));
+    if (!needle.open(QIODevice::WriteOnly)
+        || needle.write("[Desktop Entry]\nType=Application\nName=Needle\nExec=true\n") < 0)
+        return 2;
+    needle.close();
+    bool kept = measureFind("find in 10,000 entries", menu);
+
+    // In memory where that can be had: a disk takes minutes to make and to remove it.
+    QTemporaryDir large(QFileInfo(QStringLiteral("/dev/shm")).isWritable()
+                            ? QStringLiteral("/dev/shm/vel-XXXXXX")
+                            : QString());
+    for (int i = 0; i < 20000; ++i)
+        QDir(large.path()).mkdir(QString::number(i));
+    if (!QFile::link(large.path(), menu + QLatin1String("/link")))
+        return 2;
+    kept = measureFind("find in 10,000 entries beside a link to 20,000 folders", menu) && kept;
+    QFile::remove(menu + QLatin1String("/link"));
+
+    kept = measureFilter("filter of 5,000 entries in 100 folders", files.nested(100, 50)) && kept;
+    kept = measureFilter("filter of 5,000 entries in one folder", files.flat(5000, false)) && kept;
+    return kept ? 0 : 1;
+}
