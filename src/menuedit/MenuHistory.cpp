@@ -17,8 +17,10 @@
 
 #include <QAction>
 #include <QCoreApplication>
+#include <QDir>
 #include <QFileInfo>
 #include <QIcon>
+#include <QItemSelectionModel>
 #include <QPointer>
 #include <QShortcut>
 #include <QTreeView>
@@ -46,21 +48,23 @@ void MenuHistory::setOn(bool on)
     m_stack.clear();
     if (!on)
         return;
-    m_undo = std::make_unique<QAction>(QIcon::fromTheme(QStringLiteral("edit-undo")), QString());
-    m_redo = std::make_unique<QAction>(QIcon::fromTheme(QStringLiteral("edit-redo")), QString());
-    m_undo->setObjectName(QStringLiteral("undoAction"));
-    m_redo->setObjectName(QStringLiteral("redoAction"));
-    m_undo->setShortcut(QKeySequence(QStringLiteral("Ctrl+Z")));
-    m_redo->setShortcut(QKeySequence(QStringLiteral("Ctrl+Shift+Z")));
-    for (QAction *action : {m_undo.get(), m_redo.get()}) {
-        // No widget has the actions, so that their keys need somebody who listens.
-        m_keys.push_back(std::make_unique<QShortcut>(action->shortcut(), m_view));
-        m_keys.back()->setContext(Qt::WidgetShortcut);
-        connect(m_keys.back().get(), &QShortcut::activated, action, &QAction::trigger);
-    }
+    m_undo = makeAction("undoAction", "edit-undo", QStringLiteral("Ctrl+Z"));
+    m_redo = makeAction("redoAction", "edit-redo", QStringLiteral("Ctrl+Shift+Z"));
     connect(m_undo.get(), &QAction::triggered, this, &MenuHistory::undo);
     connect(m_redo.get(), &QAction::triggered, this, &MenuHistory::redo);
     updateActions();
+}
+
+std::unique_ptr<QAction> MenuHistory::makeAction(const char *name, const char *icon, const QString &keys)
+{
+    auto action = std::make_unique<QAction>(QIcon::fromTheme(QLatin1String(icon)), QString());
+    action->setObjectName(QLatin1String(name));
+    action->setShortcut(QKeySequence(keys));
+    // No widget has the action, so that its keys need somebody who listens.
+    m_keys.push_back(std::make_unique<QShortcut>(action->shortcut(), m_view));
+    m_keys.back()->setContext(Qt::WidgetShortcut);
+    connect(m_keys.back().get(), &QShortcut::activated, action.get(), &QAction::trigger);
+    return action;
 }
 
 void MenuHistory::updateActions()
@@ -105,30 +109,46 @@ QString MenuHistory::nameOf(const QString &path) const
 void MenuHistory::run(bool isUndo)
 {
     const StepCommand *command = commandAt(m_stack.index() - (isUndo ? 1 : 0));
-    if (!command)
+    if (!command || m_isRunning)
         return;
     const QStringList paths = command->step().paths();
-    const QStringList items = command->items();
-    const QString text = isUndo ? command->text().undo() : command->text().redo();
     const QStringList released = m_menu.files().release(paths);
     const QPointer<MenuHistory> self(this);
     // The view may go while this takes long, and the stack with it.
     FileStep step = std::move(command->step());
+    m_isRunning = true;
     const Refusal refusal = follow(step, isUndo);
     if (!self)
         return;
+    m_isRunning = false;
     command->step() = std::move(step);
     m_menu.files().watchAgain(released);
-    if (refusal.isForGood)
-        command->giveUp();
-    if (!refusal || refusal.isForGood)
-        isUndo ? m_stack.undo() : m_stack.redo();
-    if (refusal) {
-        refuse(refusal.reason, isUndo);
+    if (!refusal) {
+        takeIn(paths);
+        finish(*command, isUndo);
         return;
     }
-    takeIn(paths);
-    show(items);
+    if (refusal.isForGood) {
+        command->giveUp();
+        turnStack(isUndo);
+    }
+    refuse(refusal.reason, isUndo);
+}
+
+void MenuHistory::turnStack(bool isUndo)
+{
+    if (isUndo)
+        m_stack.undo();
+    else
+        m_stack.redo();
+}
+
+void MenuHistory::finish(const StepCommand &command, bool isUndo)
+{
+    const QString text = isUndo ? command.text().undo() : command.text().redo();
+    const QPointer<MenuHistory> self(this);
+    turnStack(isUndo);
+    show(command.items());
     m_find.clear();
     Q_EMIT changed();
     if (self)
@@ -155,9 +175,10 @@ void MenuHistory::refuse(const QString &reason, bool isUndo)
 // The models learn at once what is where, and read anew what they knew of it.
 void MenuHistory::takeIn(const QStringList &paths)
 {
-    const QString menu = m_menu.files().menuDirectory();
+    const QString menu = menuDirectory();
+    const QString target = QFileInfo(menu).canonicalFilePath();
     for (const QString &path : paths) {
-        if (path == menu) {
+        if (path == menu || path == target) {
             Q_EMIT replaced();
             return;
         }
@@ -176,16 +197,25 @@ void MenuHistory::takeIn(const QStringList &paths)
     }
 }
 
+QString MenuHistory::menuDirectory() const
+{
+    return QDir::cleanPath(m_menu.files().menuDirectory());
+}
+
 void MenuHistory::show(const QStringList &items)
 {
     const QString selected = m_selection.path();
-    const QString menu = m_menu.files().menuDirectory() + QLatin1Char('/');
+    QStringList there;
     for (const QString &item : items) {
-        if (item.startsWith(menu) && QFileInfo::exists(item)) {
-            m_selection.show(item);
-            return;
-        }
+        if (item.startsWith(menuDirectory() + QLatin1Char('/')) && QFileInfo::exists(item))
+            there.append(item);
     }
-    if (!selected.isEmpty() && !QFileInfo::exists(selected))
+    if (!there.isEmpty())
+        m_selection.show(there.takeFirst());
+    else if (!selected.isEmpty() && !QFileInfo::exists(selected))
         m_selection.leave(selected);
+    if (m_view->selectionMode() == QAbstractItemView::SingleSelection)
+        return;
+    for (const QString &item : qAsConst(there))
+        m_view->selectionModel()->select(m_selection.shown(item), QItemSelectionModel::Select);
 }

@@ -70,7 +70,11 @@ Q_SIGNALS:
     void replaced();
 
 private:
+    std::unique_ptr<QAction> makeAction(const char *name, const char *icon, const QString &keys);
     void run(bool isUndo);
+    void turnStack(bool isUndo);
+    void finish(const StepCommand &command, bool isUndo);
+    QString menuDirectory() const;
     Refusal follow(FileStep &step, bool isUndo) const;
     void refuse(const QString &reason, bool isUndo);
     void takeIn(const QStringList &paths);
@@ -84,6 +88,7 @@ private:
     MenuFind &m_find;
     MenuVoice &m_voice;
     QUndoStack m_stack;
+    bool m_isRunning = false;
     std::unique_ptr<QAction> m_undo;
     std::unique_ptr<QAction> m_redo;
     std::vector<std::unique_ptr<QShortcut>> m_keys;

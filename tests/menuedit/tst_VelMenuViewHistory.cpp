@@ -6,6 +6,8 @@
 #include "ModalDriver.h"
 #include "VelMenuView.h"
 
+#include <menuedit/StepText.h>
+
 #include <QAction>
 #include <QDir>
 #include <QFileSystemModel>
@@ -39,10 +41,16 @@ private Q_SLOTS:
     void worksWhileAFilterIsSet();
     void deletesALinkAndNotWhatItLeadsTo();
     void leavesTheDefaultMenuWhereNothingWasBuilt();
+    void bringsTheMenuBackThatALinkLeadsTo();
+    void takesAMenuAwayThatWasTheFirst();
+    void deletesSeveralInOneStep();
+    void namesEveryStep_data();
+    void namesEveryStep();
 
 private:
     std::unique_ptr<VelMenuView> make();
     static void remove(VelMenuView &view, const QString &path);
+    static void rebuild(VelMenuView &view);
     QString trash() const { return path(QStringLiteral("data/Trash")); }
 
     QByteArray m_dataHome;
@@ -78,6 +86,17 @@ void tst_VelMenuViewHistory::remove(VelMenuView &view, const QString &path)
 {
     select(view, path);
     view.slotDel();
+}
+
+void tst_VelMenuViewHistory::rebuild(VelMenuView &view)
+{
+    ModalDriver modal;
+    modal.answer({QMessageBox::Question, QStringLiteral("Warning"),
+                  QStringLiteral("All previous shortcuts\nwill be lost. Are you sure?"),
+                  QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok},
+                 QMessageBox::Ok);
+    view.slotRecreate();
+    QVERIFY(modal.finished());
 }
 
 void tst_VelMenuViewHistory::hasNoneWithoutAssistance()
@@ -321,15 +340,106 @@ void tst_VelMenuViewHistory::leavesTheDefaultMenuWhereNothingWasBuilt()
     VelMenuView view(QString(), -1, true);
     view.setAssistance(true);
     expectWarning(QStringLiteral("VelMenuView: can't create the start menu"));
-    ModalDriver modal;
-    modal.answer({QMessageBox::Question, QStringLiteral("Warning"),
-                  QStringLiteral("All previous shortcuts\nwill be lost. Are you sure?"),
-                  QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok},
-                 QMessageBox::Ok);
-    view.slotRecreate();
-    QVERIFY(modal.finished());
+    rebuild(view);
     QCOMPARE(before.difference(ExactTree::of(path(QStringLiteral("config")))), QString());
     QVERIFY(!view.undoAction()->isEnabled());
+}
+
+void tst_VelMenuViewHistory::bringsTheMenuBackThatALinkLeadsTo()
+{
+    write(QStringLiteral("apps/applications/p.desktop"),
+          entryText(QStringLiteral("Piano"), "Exec=true\nCategories=Game;\n"));
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("apps"))));
+    write(QStringLiteral("real/old.desktop"), entryText(QStringLiteral("Old")));
+    QDir().mkpath(path(QStringLiteral("config")));
+    QVERIFY(QFile::link(path(QStringLiteral("real")), startMenu()));
+    const ExactTree before = ExactTree::of(path(QStringLiteral("real")));
+    VelMenuView view(QString(), -1, true);
+    view.setAssistance(true);
+    view.show();
+    QVERIFY(open(view, startMenu(), 1));
+    rebuild(view);
+    QTRY_COMPARE(names(view, startMenu()), QStringList{QStringLiteral("Games")});
+    QVERIFY(QFileInfo(startMenu()).isSymLink());
+
+    view.undoAction()->trigger();
+
+    QCOMPARE(before.difference(ExactTree::of(path(QStringLiteral("real")))), QString());
+    QVERIFY(QFileInfo(startMenu()).isSymLink());
+    QTRY_COMPARE(names(view, startMenu()), QStringList{QStringLiteral("Old")});
+    view.redoAction()->trigger();
+    QTRY_COMPARE(names(view, startMenu()), QStringList{QStringLiteral("Games")});
+}
+
+void tst_VelMenuViewHistory::takesAMenuAwayThatWasTheFirst()
+{
+    write(QStringLiteral("apps/applications/p.desktop"),
+          entryText(QStringLiteral("Piano"), "Exec=true\nCategories=Game;\n"));
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("apps"))));
+    VelMenuView view(QString(), -1, true);
+    view.setAssistance(true);
+    view.show();
+    rebuild(view);
+    QVERIFY(QFileInfo(startMenu()).isDir());
+    view.undoAction()->trigger();
+    QVERIFY(!QFileInfo::exists(startMenu()));
+    QCOMPARE(view.undoAction()->text(), QStringLiteral("Undo"));
+    view.redoAction()->trigger();
+    QTRY_COMPARE(names(view, startMenu()), QStringList{QStringLiteral("Games")});
+}
+
+void tst_VelMenuViewHistory::deletesSeveralInOneStep()
+{
+    const auto view = make();
+    view->setSelectionMode(QAbstractItemView::ExtendedSelection);
+    const ExactTree before = ExactTree::of(menu());
+    const QStringList paths{menu() + QStringLiteral("/c.desktop"), m_a};
+    select(*view, paths.constFirst());
+    view->selectionModel()->select(shown(*view, m_a), QItemSelectionModel::Select);
+    view->slotDel();
+    QCOMPARE(everythingIn(menu()), QStringList({QStringLiteral(".directory"), QStringLiteral("b.desktop")}));
+    QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo deletion of 2 items"));
+    view->undoAction()->trigger();
+    QCOMPARE(before.difference(ExactTree::of(menu())), QString());
+    QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo"));
+    QTRY_COMPARE(view->selectionModel()->selectedIndexes().size(), 2);
+}
+
+void tst_VelMenuViewHistory::namesEveryStep_data()
+{
+    QTest::addColumn<int>("kind");
+    QTest::addColumn<QStringList>("texts");
+    using Kind = StepText::Kind;
+    const auto row = [](Kind kind, const char *undo, const char *redo, const char *done) {
+        QTest::newRow(undo) << int(kind)
+                            << QStringList{QString::fromLatin1(undo), QString::fromLatin1(redo),
+                                           QString::fromLatin1(done)};
+    };
+    row(Kind::Create, "Undo creation of 5%2 %1", "Redo creation of 5%2 %1", "5%2 %1 was created.");
+    row(Kind::Edit, "Undo change of 5%2 %1", "Redo change of 5%2 %1", "5%2 %1 was changed.");
+    row(Kind::Delete, "Undo deletion of 5%2 %1", "Redo deletion of 5%2 %1", "5%2 %1 was deleted.");
+    row(Kind::DeleteFolder, "Undo deletion of folder 5%2 %1 (3 entries)",
+        "Redo deletion of folder 5%2 %1 (3 entries)", "The folder 5%2 %1 was deleted (3 entries).");
+    row(Kind::DeleteItems, "Undo deletion of 3 items", "Redo deletion of 3 items", "3 items were deleted.");
+    row(Kind::Move, "Undo moving of 5%2 %1 to %1 B", "Redo moving of 5%2 %1 to %1 B",
+        "5%2 %1 was moved to %1 B.");
+    row(Kind::MoveItems, "Undo moving of 3 items to %1 B", "Redo moving of 3 items to %1 B",
+        "3 items were moved to %1 B.");
+    row(Kind::Copy, "Undo copying of 5%2 %1 to %1 B", "Redo copying of 5%2 %1 to %1 B",
+        "5%2 %1 was copied to %1 B.");
+    row(Kind::CopyItems, "Undo copying of 3 items to %1 B", "Redo copying of 3 items to %1 B",
+        "3 items were copied to %1 B.");
+    row(Kind::Reorder, "Undo reordering of 5%2 %1", "Redo reordering of 5%2 %1", "5%2 %1 has another place.");
+    row(Kind::Rebuild, "Undo default menu", "Redo default menu", "The default menu was built.");
+}
+
+// Names are shown as they are, whatever they hold.
+void tst_VelMenuViewHistory::namesEveryStep()
+{
+    QFETCH(int, kind);
+    QFETCH(QStringList, texts);
+    const StepText text(StepText::Kind(kind), QStringLiteral("5%2 %1"), 3, QStringLiteral("%1 B"));
+    QCOMPARE(QStringList({text.undo(), text.redo(), text.done()}), texts);
 }
 
 VEL_TEST_MAIN(tst_VelMenuViewHistory)
