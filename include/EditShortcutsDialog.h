@@ -32,6 +32,13 @@ class ShortcutsModel;
  * would be refused then waits in the field until the user has taken it over from the other
  * shortcut, has chosen another one, or leaves it: then it is refused.
  *
+ * With assistance there is also a filter above the tree, by text, by keys that are pressed and by
+ * what was changed, to which Ctrl+F leads; Escape takes it away before it closes the dialog. While
+ * the filter hides the current shortcut none is current. The keys stay in view, those that were
+ * changed stand out and can be taken back one by one, and all of them can be written to a file,
+ * read from one and put on a sheet; see ShortcutScheme and ShortcutSheet. Size and columns are kept
+ * in the application's QSettings, in the group "EditShortcutsDialog".
+ *
  * The edits are pending in the model until the user confirms with Ok, which puts them into
  * force. Cancel, Escape and closing the window without applying throw them away. The dialog
  * saves nothing: call ShortcutsModel::saveKeys() after it was accepted.

@@ -19,7 +19,6 @@ ShortcutFilterBar::ShortcutFilterBar(QWidget *parent)
     setObjectName(QStringLiteral("filterBar"));
     m_edit->setObjectName(QStringLiteral("filterEdit"));
     m_edit->setAccessibleName(tr("Filter"));
-    m_edit->setClearButtonEnabled(true);
     m_edit->installEventFilter(this);
     m_pressKeysButton->setToolTip(tr("Shows who has the keys that you press; Escape ends it."));
     m_changedOnlyButton->setToolTip(
@@ -47,10 +46,7 @@ QPushButton *ShortcutFilterBar::makeButton(const char *name, const QString &text
 
 void ShortcutFilterBar::connectParts()
 {
-    connect(m_edit, &QLineEdit::textChanged, this, [this] {
-        if (!m_pressKeysButton->isChecked())
-            Q_EMIT filterChanged();
-    });
+    connect(m_edit, &QLineEdit::textChanged, this, &ShortcutFilterBar::filterChanged);
     connect(m_changedOnlyButton, &QPushButton::toggled, this, &ShortcutFilterBar::filterChanged);
     connect(m_pressKeysButton, &QPushButton::toggled, this, [this](bool isOn) {
         setPressingKeys(isOn);
@@ -107,6 +103,7 @@ void ShortcutFilterBar::setPressingKeys(bool isOn)
     m_pressed.clear();
     m_edit->setText(isOn ? QString() : m_text);
     m_edit->setReadOnly(isOn);
+    m_edit->setClearButtonEnabled(!isOn); // does nothing where one cannot write
     m_edit->setPlaceholderText(isOn ? tr("Press the keys to look for")
                                     : tr("Filter by name, group or shortcut"));
 }
@@ -159,7 +156,6 @@ bool ShortcutFilterBar::watchPressedKey(QEvent *event)
     }
     if (m_pressed.take(*key)) {
         m_edit->setText(m_pressed.keys().toString(QKeySequence::NativeText));
-        Q_EMIT filterChanged();
     }
     return true;
 }

@@ -205,10 +205,12 @@ void tst_EditShortcutsFilter::bringsTheTextBackAfterPressingKeys()
     QTRY_COMPARE(shown(), str("copy"));
     pressKeys("F2");
     QTRY_COMPARE(shown(), str("save"));
+    QVERIFY(!filterEdit()->isClearButtonEnabled());
     XDoTool::click(pressKeysButton());
     QTRY_COMPARE(shown(), str("copy"));
     QCOMPARE(filterEdit()->text(), str("copy"));
     QVERIFY(!filterEdit()->isReadOnly());
+    QVERIFY(filterEdit()->isClearButtonEnabled());
 }
 
 void tst_EditShortcutsFilter::leavesTheFieldWithTabWhileKeysArePressed()
