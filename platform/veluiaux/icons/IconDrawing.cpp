@@ -5,7 +5,9 @@
 
 #include "EmblemLayout.h"
 
+#include <QBuffer>
 #include <QGuiApplication>
+#include <QImageReader>
 #include <QPainter>
 #include <QtMath>
 
@@ -15,6 +17,13 @@ namespace {
 qreal ratioOfQt()
 {
     return QCoreApplication::testAttribute(Qt::AA_UseHighDpiPixmaps) ? qGuiApp->devicePixelRatio() : 1.0;
+}
+
+QPixmap fitted(const QPixmap &pixmap, const QSize &pixels, IconDrawing::Fit fit)
+{
+    if (fit == IconDrawing::Fit::AtMost || pixmap.isNull() || pixmap.size() == pixels)
+        return pixmap;
+    return pixmap.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
 }
 
 } // namespace
@@ -31,9 +40,24 @@ QPixmap IconDrawing::pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIc
 {
     QPixmap pixmap = icon.pixmap(request(pixels).size, mode, state);
     pixmap.setDevicePixelRatio(1);
-    if (fit == Fit::Exactly && !pixmap.isNull() && pixmap.size() != pixels)
-        pixmap = pixmap.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
-    return pixmap;
+    return fitted(pixmap, pixels, fit);
+}
+
+// QIcon parses a drawing when it is made, and once more for each pixmap.
+QPixmap IconDrawing::drawing(const QByteArray &bytes, const QSize &pixels, Fit fit)
+{
+    QBuffer buffer;
+    buffer.setData(bytes);
+    buffer.open(QIODevice::ReadOnly);
+    QImageReader reader(&buffer, QByteArrayLiteral("svg"));
+    QSize size = reader.size();
+    if (size.isEmpty())
+        return QPixmap();
+    size.scale(pixels, Qt::KeepAspectRatio);
+    if (size.isEmpty())
+        return QPixmap();
+    reader.setScaledSize(size);
+    return fitted(QPixmap::fromImage(reader.read()), pixels, fit);
 }
 
 void IconDrawing::overlayEmblems(QPixmap &pixmap, const QMap<Qt::Corner, QPixmap> &emblems, qreal ratio)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <QByteArray>
 #include <QIcon>
 #include <QMap>
 #include <QPixmap>
@@ -32,6 +33,12 @@ Request request(const QSize &pixels);
  * icon has none.
  */
 QPixmap pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode, QIcon::State state);
+
+/**
+ * The pixmap of the SVG drawing \a bytes for \a pixels, as that of an icon of its file; null when it
+ * cannot be drawn.
+ */
+QPixmap drawing(const QByteArray &bytes, const QSize &pixels, Fit fit);
 
 /// Draws \a emblems over the corners of \a pixmap, which has \a ratio pixels for one logical
 /// pixel; EmblemLayout says how large they may be. A null emblem is left out.

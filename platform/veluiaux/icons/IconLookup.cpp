@@ -79,6 +79,12 @@ bool IconLookup::Found::mayBeDrawn(const QSize &size, int scale) const
     return !file || isSafe(*file);
 }
 
+const ThemeFiles::File *IconLookup::Found::drawing(const QSize &size) const
+{
+    const ThemeFiles::File *const file = isChosenByQt ? ThemeFiles::forSize(files, size) : nullptr;
+    return file && file->isDrawing() ? file : nullptr;
+}
+
 IconLookup::Found IconLookup::find(const QString &name)
 {
     if (QDir::isAbsolutePath(name))

@@ -23,6 +23,9 @@ struct Found
     /// Whether the file that is drawn in \a size, in pixels of the ratio \a scale, may be read. Until
     /// then none of the theme's files was looked at.
     bool mayBeDrawn(const QSize &size, int scale) const;
+
+    /// The drawing that Qt takes for \a size at the ratio 1; null where it takes something else.
+    const ThemeFiles::File *drawing(const QSize &size) const;
 };
 
 /// The icon \a name: a theme name, one with the suffix of an image file, or an absolute path.

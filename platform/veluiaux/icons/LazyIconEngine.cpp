@@ -5,6 +5,7 @@
 
 #include "EmblemLayout.h"
 #include "IconMemory.h"
+#include "PictureFile.h"
 #include "ThemeState.h"
 
 #include <QGuiApplication>
@@ -45,6 +46,12 @@ QPixmap LazyIconEngine::basePixmap(const QSize &pixels, IconDrawing::Fit fit, QI
 {
     const QIcon &icon = base();
     const IconDrawing::Request request = IconDrawing::request(pixels);
+    // Other modes are made by the style, which only QIcon asks.
+    const bool isPlain = request.scale == 1 && mode == QIcon::Normal;
+    if (const ThemeFiles::File *const file = isPlain ? m_base.drawing(pixels) : nullptr) {
+        const auto bytes = PictureFile::readSafeDrawing(file->path);
+        return bytes ? IconDrawing::drawing(*bytes, pixels, fit) : QPixmap();
+    }
     if (!m_base.mayBeDrawn(request.size, request.scale))
         return QPixmap();
     return IconDrawing::pixmap(icon, pixels, fit, mode, state);

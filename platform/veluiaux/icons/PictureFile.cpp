@@ -14,8 +14,6 @@
 #include <QImageReader>
 #include <QtEndian>
 
-#include <optional>
-
 namespace {
 
 constexpr int PngBegin = 24; // bytes, with the size
@@ -25,7 +23,9 @@ std::optional<QByteArray> contents(const QString &path)
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
         return QByteArray(); // whoever reads it next tells
-    const QByteArray bytes = file.read(PictureLimits::Bytes + 1);
+    // As much memory is taken as is asked for; what has no size yet may have contents.
+    const qint64 expected = file.size() > 0 ? file.size() : qint64(PictureLimits::Bytes);
+    const QByteArray bytes = file.read(qMin(expected, qint64(PictureLimits::Bytes)) + 1);
     if (bytes.size() > PictureLimits::Bytes)
         return std::nullopt;
     return Gzip::isCompressed(bytes) ? Gzip::decompressed(bytes, PictureLimits::Bytes) : bytes;
@@ -118,8 +118,14 @@ bool PictureFile::isSafeOfTheme(const QString &path)
         return false;
     if (path.endsWith(QLatin1String(".png")))
         return isSafePicture(path) && areVariantsSafe(path);
-    if (!path.endsWith(QLatin1String(".svg")))
-        return isSafe(path);
+    return path.endsWith(QLatin1String(".svg")) ? readSafeDrawing(path) && areVariantsSafe(path)
+                                                : isSafe(path);
+}
+
+std::optional<QByteArray> PictureFile::readSafeDrawing(const QString &path)
+{
+    if (!QFileInfo(path).isFile())
+        return std::nullopt;
     const std::optional<QByteArray> bytes = contents(path);
-    return bytes && DrawingContents::isSafe(*bytes) && areVariantsSafe(path);
+    return bytes && DrawingContents::isSafe(*bytes) ? bytes : std::nullopt;
 }

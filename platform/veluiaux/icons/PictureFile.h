@@ -3,7 +3,10 @@
 
 #pragma once
 
+#include <QByteArray>
 #include <QString>
+
+#include <optional>
 
 /// Judges picture files without decoding them.
 namespace PictureFile {
@@ -18,5 +21,8 @@ bool isSafe(const QString &path);
 
 /// The same for a file of an icon theme, which mostly is a small one of the usual kinds: cheap for those.
 bool isSafeOfTheme(const QString &path);
+
+/// The contents of a drawing, not compressed; none where no icon may be made of it.
+std::optional<QByteArray> readSafeDrawing(const QString &path);
 
 } // namespace PictureFile
