@@ -151,7 +151,7 @@ void tst_ThemeFiles::takesTheFilesThatQtTakes()
         const QIcon icon = QIcon::fromTheme(name);
         const auto files = ThemeFiles::find(name);
         QCOMPARE(files.isEmpty(), icon.isNull());
-        for (int size = 8; !icon.isNull() && size <= 64; size += 4) {
+        for (int size = 8; !icon.isNull() && size <= 64; size += 8) {
             const auto *const file = ThemeFiles::forSize(files, QSize(size, size));
             QVERIFY2(
                 shown(icon, size) == shown(QIcon(file->path), size),

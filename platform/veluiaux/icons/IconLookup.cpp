@@ -4,6 +4,7 @@
 #include "IconLookup.h"
 
 #include "PictureFile.h"
+#include "ThemeState.h"
 
 #include <QDataStream>
 #include <QDateTime>
@@ -54,19 +55,34 @@ bool isSafe(const ThemeFiles::File &file)
     return PictureFile::isSafeOfTheme(file.path);
 }
 
+// The same for all icons, so that one has to be made to tell.
+bool isQtTheFinder(const QString &nameOfOne)
+{
+    static quint64 generation = 0;
+    static bool isQt = false;
+    if (generation == ThemeState::generation())
+        return isQt;
+    const QIcon icon = QIcon::fromTheme(nameOfOne);
+    if (icon.isNull())
+        return false;
+    isQt = isFoundByQt(icon);
+    generation = ThemeState::generation();
+    return isQt;
+}
+
 IconLookup::Found iconOfTheme(const QString &name)
 {
     IconLookup::Found found;
     found.files = ThemeFiles::find(name);
+    found.themeName = name;
+    found.isChosenByQt = !found.files.isEmpty() && isQtTheFinder(name);
+    if (found.isChosenByQt && found.files.constFirst().folder.kind != ThemeFolder::Kind::Unsorted)
+        return found;
     // To tell the sizes of such a one, the file itself is read.
-    if (found.files.size() == 1 && found.files.constFirst().folder.kind == ThemeFolder::Kind::Unsorted
-        && !isSafe(found.files.constFirst()))
+    if (!std::all_of(found.files.cbegin(), found.files.cend(), isSafe))
         return {};
-    found.icon = QIcon::fromTheme(name);
-    if (found.icon.isNull() || found.icon.availableSizes().isEmpty())
-        return {};
-    found.isChosenByQt = isFoundByQt(found.icon);
-    return found;
+    found.makeIcon();
+    return found.icon.availableSizes().isEmpty() ? IconLookup::Found() : found;
 }
 
 } // namespace
@@ -85,10 +101,16 @@ const ThemeFiles::File *IconLookup::Found::drawing(const QSize &size) const
     return file && file->isDrawing() ? file : nullptr;
 }
 
+void IconLookup::Found::makeIcon()
+{
+    if (icon.isNull() && !themeName.isEmpty())
+        icon = QIcon::fromTheme(themeName);
+}
+
 IconLookup::Found IconLookup::find(const QString &name)
 {
     if (QDir::isAbsolutePath(name))
-        return {iconOfFile(name), {}};
+        return {iconOfFile(name), {}, {}};
     // From the folders of a theme such a name would lead to any other.
     if (name.contains(QLatin1Char('/')))
         return {};

@@ -15,8 +15,9 @@ namespace IconLookup {
 /// An icon, and where the theme has it, its files.
 struct Found
 {
-    QIcon icon; ///< null when there is none
+    QIcon icon; ///< null when there is none, and as long as its files are enough
     QVector<ThemeFiles::File> files;
+    QString themeName; ///< the name by which Qt makes an icon of the files
     /// Whether Qt chooses among the files; or else something else does, in its own way.
     bool isChosenByQt = true;
 
@@ -26,6 +27,9 @@ struct Found
 
     /// The drawing that Qt takes for \a size at the ratio 1; null where it takes something else.
     const ThemeFiles::File *drawing(const QSize &size) const;
+
+    /// Has Qt make the icon where that was not done yet.
+    void makeIcon();
 };
 
 /// The icon \a name: a theme name, one with the suffix of an image file, or an absolute path.

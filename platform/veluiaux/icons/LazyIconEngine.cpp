@@ -31,20 +31,26 @@ LazyIconEngine::~LazyIconEngine() = default;
 
 const QIcon &LazyIconEngine::base() const
 {
-    const quint64 generation = ThemeState::generation();
-    if (m_baseGeneration != generation) {
-        m_base = m_name.isEmpty() ? IconLookup::Found() : IconLookup::find(m_name);
-        if (m_base.icon.isNull())
-            m_base = {m_plain, {}};
-        m_baseGeneration = generation;
-    }
+    lookUp();
+    m_base.makeIcon();
+    if (m_base.icon.isNull())
+        m_base = {m_plain, {}, {}};
     return m_base.icon;
+}
+
+void LazyIconEngine::lookUp() const
+{
+    const quint64 generation = ThemeState::generation();
+    if (m_baseGeneration == generation)
+        return;
+    m_base = m_name.isEmpty() ? IconLookup::Found() : IconLookup::find(m_name);
+    m_baseGeneration = generation;
 }
 
 QPixmap LazyIconEngine::basePixmap(const QSize &pixels, IconDrawing::Fit fit, QIcon::Mode mode,
                                    QIcon::State state) const
 {
-    const QIcon &icon = base();
+    lookUp();
     const IconDrawing::Request request = IconDrawing::request(pixels);
     // Other modes are made by the style, which only QIcon asks.
     const bool isPlain = request.scale == 1 && mode == QIcon::Normal;
@@ -54,7 +60,7 @@ QPixmap LazyIconEngine::basePixmap(const QSize &pixels, IconDrawing::Fit fit, QI
     }
     if (!m_base.mayBeDrawn(request.size, request.scale))
         return QPixmap();
-    return IconDrawing::pixmap(icon, pixels, fit, mode, state);
+    return IconDrawing::pixmap(base(), pixels, fit, mode, state);
 }
 
 const QString &LazyIconEngine::baseKey() const

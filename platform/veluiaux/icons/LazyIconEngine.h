@@ -45,6 +45,8 @@ private:
     QMap<Qt::Corner, QPixmap> emblemPixmaps(const QSize &size, qreal ratio, QIcon::Mode mode) const;
     /// The icon without emblems, as the theme now has it.
     const QIcon &base() const;
+    /// Looks up what it is made of, unless that is known for the theme as it is now.
+    void lookUp() const;
     /// A pixmap of it; null where the file for it is damaged or too large to be read.
     QPixmap basePixmap(const QSize &pixels, IconDrawing::Fit fit, QIcon::Mode mode, QIcon::State state) const;
     bool isEmpty() const;
