@@ -32,8 +32,8 @@ MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout,
 {
     layout->insertWidget(layout->indexOf(view), m_filterBar.get());
     layout->insertWidget(layout->indexOf(view) + 1, m_message.get());
-    QWidget::setTabOrder(m_filterBar.get(), view);
-    QWidget::setTabOrder(view, m_message.get());
+    m_filterBar->setTabOrderBefore(view);
+    m_message->setTabOrderAfter(view);
     // The tree is what the keyboard belongs to when the dialog opens.
     if (!dialog->focusWidget())
         view->setFocus();

@@ -17,6 +17,14 @@
 
 #include <algorithm>
 
+namespace {
+
+// What the model reads comes all at once, and the window does not answer meanwhile.
+constexpr int FoldersAtOnce = 8;
+constexpr int Pause = 15; // milliseconds
+
+} // namespace
+
 MenuFilter::MenuFilter(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuVoice &voice)
     : m_view(view)
     , m_menu(menu)
@@ -25,13 +33,8 @@ MenuFilter::MenuFilter(QTreeView *view, const ShownMenu &menu, MenuSelection &se
 {
     // Folders that lead to a match may lie in one that was read only now.
     connect(&menu.proxy(), &QAbstractItemModel::rowsInserted, this, [this] {
-        if (!isOn() || m_isOpening)
-            return;
-        m_isOpening = true;
-        QTimer::singleShot(0, this, [this] {
-            m_isOpening = false;
-            openFolders();
-        });
+        if (isOn())
+            openFoldersSoon();
     });
     connect(&menu.proxy(), &QAbstractProxyModel::sourceModelChanged, this, &MenuFilter::takeModel);
     takeModel();
@@ -51,8 +54,9 @@ void MenuFilter::takeModel()
     const QAbstractItemModel *files = &m_menu.files();
     connect(files, &QAbstractItemModel::rowsInserted, m_index.get(), readSoon);
     connect(files, &QAbstractItemModel::dataChanged, m_index.get(), readSoon);
+    // Not now: the sorting model is being given the other model.
     if (isOn())
-        m_index->read();
+        m_index->readSoon();
 }
 
 void MenuFilter::setText(const QString &text)
@@ -82,7 +86,9 @@ void MenuFilter::setHiddenFound(bool isFound)
 void MenuFilter::begin()
 {
     m_openedBefore = openedFolders();
+    m_isBeginning = true;
     m_index->read();
+    m_isBeginning = false;
 }
 
 void MenuFilter::end()
@@ -107,6 +113,8 @@ void MenuFilter::showNew()
 
 void MenuFilter::showMore()
 {
+    if (m_isBeginning)
+        return;
     FilteredRows rows = m_index->find(m_words);
     if (m_menu.proxy().isFiltered())
         rows.unite(m_menu.proxy().filteredRows());
@@ -139,6 +147,7 @@ void MenuFilter::openFolders()
     QStringList paths(wanted.begin(), wanted.end());
     std::sort(paths.begin(), paths.end());
     QSet<QString> known;
+    int asked = 0;
     for (const QString &path : qAsConst(paths)) {
         const QString above = path.left(path.lastIndexOf(QLatin1Char('/')));
         if (wanted.contains(above) && !known.contains(above))
@@ -147,11 +156,25 @@ void MenuFilter::openFolders()
         if (!folder.isValid())
             continue;
         // A view that is not shown has nothing read.
-        if (m_menu.files().canFetchMore(folder))
+        if (m_menu.files().canFetchMore(folder)) {
+            if (++asked > FoldersAtOnce)
+                return openFoldersSoon();
             m_menu.files().fetchMore(folder);
+        }
         m_view->expand(m_menu.proxy().mapFromSource(folder));
         known.insert(path);
     }
+}
+
+void MenuFilter::openFoldersSoon()
+{
+    if (m_isOpening)
+        return;
+    m_isOpening = true;
+    QTimer::singleShot(Pause, this, [this] {
+        m_isOpening = false;
+        openFolders();
+    });
 }
 
 QSet<QString> MenuFilter::openedFolders() const
@@ -192,6 +215,7 @@ bool MenuFilter::selectNext()
     return false;
 }
 
+// Last: who is told may take the view away.
 void MenuFilter::tellIfNothing()
 {
     if (m_isTold || m_index->isReading() || !m_menu.proxy().filteredRows().isEmpty())

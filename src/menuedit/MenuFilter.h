@@ -34,7 +34,7 @@ public:
     MenuFilter(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuVoice &voice);
     ~MenuFilter() override;
 
-    /// Filters by \a text; by none, if it has no words.
+    /// Filters by \a text; by none, if it has no words. This object may go away meanwhile.
     void setText(const QString &text);
     bool isOn() const { return !m_words.isEmpty(); }
     /// Whether entries that the menu leaves out are found.
@@ -51,6 +51,7 @@ private:
     void showMore();
     void apply(const FilteredRows &rows);
     void openFolders();
+    void openFoldersSoon();
     QSet<QString> openedFolders() const;
     void tellIfNothing();
 
@@ -65,4 +66,5 @@ private:
     bool m_isHiddenFound = false;
     bool m_isTold = false;
     bool m_isOpening = false;
+    bool m_isBeginning = false;
 };

@@ -44,6 +44,13 @@ MenuFilterBar::MenuFilterBar(VelMenuView *view, QWidget *parent)
 
 MenuFilterBar::~MenuFilterBar() = default;
 
+void MenuFilterBar::setTabOrderBefore(QWidget *next)
+{
+    setTabOrder(next->previousInFocusChain(), m_line);
+    setTabOrder(m_line, m_hiddenButton);
+    setTabOrder(m_hiddenButton, next);
+}
+
 void MenuFilterBar::focusLine()
 {
     m_line->setFocus(Qt::ShortcutFocusReason);

@@ -25,6 +25,9 @@ public:
     MenuFilterBar(VelMenuView *view, QWidget *parent);
     ~MenuFilterBar() override;
 
+    /// Has the Tab key come by before \a next, behind what it comes by before that now.
+    void setTabOrderBefore(QWidget *next);
+
     /// Gives the line the keyboard, with what is in it selected.
     void focusLine();
 

@@ -13,7 +13,7 @@
 namespace {
 
 // All in milliseconds.
-constexpr int AtOnce = 25;
+constexpr int AtOnce = 15;
 constexpr int InOneTurn = 10;
 constexpr int BetweenNews = 200;
 constexpr int Pause = 100;

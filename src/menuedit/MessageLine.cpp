@@ -63,6 +63,11 @@ void MessageLine::tell(const QString &text, int kind)
     QAccessible::updateAccessibility(&event);
 }
 
+void MessageLine::setTabOrderAfter(QWidget *previous)
+{
+    setTabOrder(previous, m_button);
+}
+
 void MessageLine::setRest(const QString &text, int kind)
 {
     m_restText = text;

@@ -25,6 +25,9 @@ public:
 
     /// Tells \a text in plain text; \a kind as VelMenuView::told() has it.
     void tell(const QString &text, int kind);
+    /// Has the Tab key come by behind \a previous.
+    void setTabOrderAfter(QWidget *previous);
+
     /// What the line says while there is nothing else to tell; may be empty.
     void setRest(const QString &text, int kind);
     /// Goes back to what it says at rest.

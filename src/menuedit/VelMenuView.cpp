@@ -139,8 +139,10 @@ void VelMenuView::setFilter(const QString &text)
 {
     if (!d->isAssisted)
         return;
+    const QPointer<VelMenuView> self(this);
     d->filter.setText(text);
-    setActionsEnabled();
+    if (self)
+        setActionsEnabled();
 }
 
 void VelMenuView::setHiddenShown(bool shown)

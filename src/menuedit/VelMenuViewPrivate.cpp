@@ -213,8 +213,10 @@ void VelMenuViewPrivate::setHiddenShown(bool isShown)
         selection.clear();
     find.clear();
     menu.proxy().setHiddenShown(isShown);
+    const QPointer<VelMenuView> view(q);
     filter.setHiddenFound(isShown);
-    q->setActionsEnabled();
+    if (view)
+        view->setActionsEnabled();
 }
 
 void VelMenuViewPrivate::makeEditable()

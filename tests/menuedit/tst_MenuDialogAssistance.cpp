@@ -41,6 +41,7 @@ private Q_SLOTS:
     void isNotThereAtFirst();
     void filtersWhatIsTyped();
     void takesTheKeyToFindAnywhere();
+    void isReachedByTheTabKey();
     void goesFromMatchToMatch();
     void clearsByEscapeAndStaysOpen();
     void showsHiddenEntries();
@@ -119,6 +120,23 @@ void tst_MenuDialogAssistance::takesTheKeyToFindAnywhere()
     QTRY_VERIFY(filterEdit()->hasFocus());
     XDoTool::press(QStringLiteral("Down"));
     QTRY_VERIFY(view().hasFocus());
+}
+
+void tst_MenuDialogAssistance::isReachedByTheTabKey()
+{
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    openAssisted(1);
+    QTRY_VERIFY(view().hasFocus());
+    auto *hidden = dialog()->findChild<QPushButton *>(QStringLiteral("hiddenButton"));
+    auto *close = dialog()->findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Close);
+    XDoTool::press(QStringLiteral("shift+Tab"));
+    QTRY_VERIFY(hidden->hasFocus());
+    XDoTool::press(QStringLiteral("shift+Tab"));
+    QTRY_VERIFY(filterEdit()->hasFocus());
+    for (QWidget *next : QVector<QWidget *>{hidden, &view(), close}) {
+        XDoTool::press(QStringLiteral("Tab"));
+        QTRY_VERIFY(next->hasFocus());
+    }
 }
 
 void tst_MenuDialogAssistance::goesFromMatchToMatch()
