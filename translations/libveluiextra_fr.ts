@@ -13,6 +13,29 @@
     </message>
 </context>
 <context>
+    <name>ClashLine</name>
+    <message>
+        <source>Go to</source>
+        <translation>Aller à</translation>
+    </message>
+    <message>
+        <source>Go to action &apos;%1&apos;</source>
+        <translation>Aller à l&apos;action « %1 »</translation>
+    </message>
+    <message>
+        <source>Take over</source>
+        <translation>Reprendre</translation>
+    </message>
+    <message>
+        <source>Take over &apos;%1&apos; from action &apos;%2&apos;</source>
+        <translation>Reprendre « %1 » à l&apos;action « %2 »</translation>
+    </message>
+    <message>
+        <source>Further clashes: %1</source>
+        <translation>Autres conflits : %1</translation>
+    </message>
+</context>
+<context>
     <name>EditActionsDialog</name>
     <message>
         <source>Actions</source>
@@ -47,6 +70,21 @@
     </message>
 </context>
 <context>
+    <name>EditShortcutsAssistance</name>
+    <message>
+        <source>Schemes</source>
+        <translation>Profils</translation>
+    </message>
+    <message>
+        <source>No action matches the filter.</source>
+        <translation>Aucune action ne correspond au filtre.</translation>
+    </message>
+    <message>
+        <source>No action has the shortcut %1.</source>
+        <translation>Aucune action n&apos;a le raccourci %1.</translation>
+    </message>
+</context>
+<context>
     <name>EditShortcutsDialog</name>
     <message>
         <source>None</source>
@@ -62,19 +100,19 @@
     </message>
     <message>
         <source>Default key:</source>
-        <translation>Touche par défaut :</translation>
+        <translation>Touche par défaut&#xa0;:</translation>
     </message>
     <message>
         <source>Assign key:</source>
-        <translation>Affecter une touche :</translation>
+        <translation>Affecter une touche&#xa0;:</translation>
     </message>
     <message>
         <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
-        <translation>Le raccourci « %1 » est déjà utilisé pour l&apos;action globale « %2 ».</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» est déjà utilisé pour l&apos;action globale «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;. Please try another.</source>
-        <translation>Le raccourci « %1 » est déjà utilisé pour l&apos;action « %2 ». Veuillez en essayer un autre.</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» est déjà utilisé pour l&apos;action «&#xa0;%2&#xa0;». Veuillez en essayer un autre.</translation>
     </message>
     <message>
         <source>Shortcuts conflict</source>
@@ -86,7 +124,7 @@
     </message>
     <message>
         <source>Some shortcuts have been changed. Do you want to apply changes?</source>
-        <translation>Certains raccourcis ont été modifiés. Voulez-vous appliquer les modifications ?</translation>
+        <translation>Certains raccourcis ont été modifiés. Voulez-vous appliquer les modifications&#xa0;?</translation>
     </message>
 </context>
 <context>
@@ -124,6 +162,302 @@
     </message>
 </context>
 <context>
+    <name>KeyAssistance</name>
+    <message>
+        <source>Press the keys of the shortcut. Tab leaves the field.</source>
+        <translation>Appuyez sur les touches du raccourci. Tab quitte le champ.</translation>
+    </message>
+    <message>
+        <source>Key for action &apos;%1&apos;</source>
+        <translation>Touche pour l&apos;action « %1 »</translation>
+    </message>
+    <message>
+        <source>None: no key for action &apos;%1&apos;</source>
+        <translation>Aucune : aucun raccourci pour l&apos;action « %1 »</translation>
+    </message>
+    <message>
+        <source>What speaks against the key for action &apos;%1&apos;</source>
+        <translation>Ce qui s&apos;oppose au raccourci de l&apos;action « %1 »</translation>
+    </message>
+</context>
+<context>
+    <name>MenuDeletion</name>
+    <message>
+        <source>There is no trash for %1. It would be deleted for good: this cannot be undone. Delete it?</source>
+        <translation>Il n&apos;y a pas de corbeille pour %1. La suppression serait définitive et ne pourrait pas être annulée. Voulez-vous supprimer ?</translation>
+    </message>
+    <message numerus="yes">
+        <source>There is no trash for %n of these items. They would be deleted for good: this cannot be undone. Delete them?</source>
+        <translation>
+            <numerusform>Il n&apos;y a pas de corbeille pour %n de ces éléments. La suppression serait définitive et ne pourrait pas être annulée. Voulez-vous supprimer ?</numerusform>
+            <numerusform>Il n&apos;y a pas de corbeille pour %n de ces éléments. La suppression serait définitive et ne pourrait pas être annulée. Voulez-vous supprimer ?</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 cannot be deleted: %2</source>
+        <translation>Impossible de supprimer %1 : %2</translation>
+    </message>
+</context>
+<context>
+    <name>MenuHistory</name>
+    <message>
+        <source>Undo</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Rétablir</translation>
+    </message>
+    <message>
+        <source>Done: %1</source>
+        <translation>Fait : %1</translation>
+    </message>
+    <message>
+        <source>Moving files...</source>
+        <translation>Déplacement des fichiers...</translation>
+    </message>
+    <message>
+        <source>Nothing was undone: %1</source>
+        <translation>Rien n&apos;a été annulé : %1</translation>
+    </message>
+    <message>
+        <source>Nothing was done again: %1</source>
+        <translation>Rien n&apos;a été rétabli : %1</translation>
+    </message>
+    <message>
+        <source>%1 is not there any more.</source>
+        <translation>%1 n&apos;est plus là.</translation>
+    </message>
+    <message>
+        <source>There is another %1 by now.</source>
+        <translation>Il y a maintenant un autre %1.</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program.</source>
+        <translation>%1 a été modifié par un autre programme.</translation>
+    </message>
+    <message>
+        <source>%1 is not in the trash any more.</source>
+        <translation>%1 n&apos;est plus dans la corbeille.</translation>
+    </message>
+    <message>
+        <source>%1 cannot be put into the trash.</source>
+        <translation>%1 ne peut pas être mis à la corbeille.</translation>
+    </message>
+    <message>
+        <source>It was canceled.</source>
+        <translation>L&apos;opération a été interrompue.</translation>
+    </message>
+    <message>
+        <source>%1 cannot be changed: %2</source>
+        <translation>Impossible de modifier %1 : %2</translation>
+    </message>
+    <message>
+        <source>Undo creation of %1</source>
+        <translation>Annuler la création de %1</translation>
+    </message>
+    <message>
+        <source>Redo creation of %1</source>
+        <translation>Rétablir la création de %1</translation>
+    </message>
+    <message>
+        <source>%1 was created.</source>
+        <translation>%1 a été créé.</translation>
+    </message>
+    <message>
+        <source>Undo change of %1</source>
+        <translation>Annuler la modification de %1</translation>
+    </message>
+    <message>
+        <source>Redo change of %1</source>
+        <translation>Rétablir la modification de %1</translation>
+    </message>
+    <message>
+        <source>%1 was changed.</source>
+        <translation>%1 a été modifié.</translation>
+    </message>
+    <message>
+        <source>Undo deletion of %1</source>
+        <translation>Annuler la suppression de %1</translation>
+    </message>
+    <message>
+        <source>Redo deletion of %1</source>
+        <translation>Rétablir la suppression de %1</translation>
+    </message>
+    <message>
+        <source>%1 was deleted.</source>
+        <translation>%1 a été supprimé.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo deletion of folder %1 (%n entries)</source>
+        <translation>
+            <numerusform>Annuler la suppression du dossier %1 (%n entrée)</numerusform>
+            <numerusform>Annuler la suppression du dossier %1 (%n entrées)</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of folder %1 (%n entries)</source>
+        <translation>
+            <numerusform>Rétablir la suppression du dossier %1 (%n entrée)</numerusform>
+            <numerusform>Rétablir la suppression du dossier %1 (%n entrées)</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The folder %1 was deleted (%n entries).</source>
+        <translation>
+            <numerusform>Le dossier %1 a été supprimé (%n entrée).</numerusform>
+            <numerusform>Le dossier %1 a été supprimé (%n entrées).</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo deletion of %n items</source>
+        <translation>
+            <numerusform>Annuler la suppression de %n élément</numerusform>
+            <numerusform>Annuler la suppression de %n éléments</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of %n items</source>
+        <translation>
+            <numerusform>Rétablir la suppression de %n élément</numerusform>
+            <numerusform>Rétablir la suppression de %n éléments</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were deleted.</source>
+        <translation>
+            <numerusform>%n élément a été supprimé.</numerusform>
+            <numerusform>%n éléments ont été supprimés.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo moving of %1 to %2</source>
+        <translation>Annuler le déplacement de %1 vers %2</translation>
+    </message>
+    <message>
+        <source>Redo moving of %1 to %2</source>
+        <translation>Rétablir le déplacement de %1 vers %2</translation>
+    </message>
+    <message>
+        <source>%1 was moved to %2.</source>
+        <translation>%1 a été déplacé vers %2.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo moving of %n items to %2</source>
+        <translation>
+            <numerusform>Annuler le déplacement de %n élément vers %2</numerusform>
+            <numerusform>Annuler le déplacement de %n éléments vers %2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo moving of %n items to %2</source>
+        <translation>
+            <numerusform>Rétablir le déplacement de %n élément vers %2</numerusform>
+            <numerusform>Rétablir le déplacement de %n éléments vers %2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were moved to %2.</source>
+        <translation>
+            <numerusform>%n élément a été déplacé vers %2.</numerusform>
+            <numerusform>%n éléments ont été déplacés vers %2.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo copying of %1 to %2</source>
+        <translation>Annuler la copie de %1 vers %2</translation>
+    </message>
+    <message>
+        <source>Redo copying of %1 to %2</source>
+        <translation>Rétablir la copie de %1 vers %2</translation>
+    </message>
+    <message>
+        <source>%1 was copied to %2.</source>
+        <translation>%1 a été copié vers %2.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo copying of %n items to %2</source>
+        <translation>
+            <numerusform>Annuler la copie de %n élément vers %2</numerusform>
+            <numerusform>Annuler la copie de %n éléments vers %2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo copying of %n items to %2</source>
+        <translation>
+            <numerusform>Rétablir la copie de %n élément vers %2</numerusform>
+            <numerusform>Rétablir la copie de %n éléments vers %2</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were copied to %2.</source>
+        <translation>
+            <numerusform>%n élément a été copié vers %2.</numerusform>
+            <numerusform>%n éléments ont été copiés vers %2.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo reordering of %1</source>
+        <translation>Annuler le réordonnancement de %1</translation>
+    </message>
+    <message>
+        <source>Redo reordering of %1</source>
+        <translation>Rétablir le réordonnancement de %1</translation>
+    </message>
+    <message>
+        <source>%1 has another place.</source>
+        <translation>%1 a changé de place.</translation>
+    </message>
+    <message>
+        <source>Undo default menu</source>
+        <translation>Annuler le menu par défaut</translation>
+    </message>
+    <message>
+        <source>Redo default menu</source>
+        <translation>Rétablir le menu par défaut</translation>
+    </message>
+    <message>
+        <source>The default menu was built.</source>
+        <translation>Le menu par défaut a été construit.</translation>
+    </message>
+    <message>
+        <source>Undo hiding of %1</source>
+        <translation>Annuler le masquage de %1</translation>
+    </message>
+    <message>
+        <source>Redo hiding of %1</source>
+        <translation>Rétablir le masquage de %1</translation>
+    </message>
+    <message>
+        <source>%1 is hidden: the menu no longer shows it.</source>
+        <translation>%1 est masqué : le menu ne l&apos;affiche plus.</translation>
+    </message>
+    <message>
+        <source>Undo showing %1 again</source>
+        <translation>Annuler le réaffichage de %1</translation>
+    </message>
+    <message>
+        <source>Redo showing %1 again</source>
+        <translation>Rétablir le réaffichage de %1</translation>
+    </message>
+    <message>
+        <source>The menu shows %1 again.</source>
+        <translation>Le menu affiche de nouveau %1.</translation>
+    </message>
+    <message>
+        <source>Undo deletion of folder %1 (1 entry)</source>
+        <translation>Annuler la suppression du dossier %1 (1 entrée)</translation>
+    </message>
+    <message>
+        <source>Redo deletion of folder %1 (1 entry)</source>
+        <translation>Rétablir la suppression du dossier %1 (1 entrée)</translation>
+    </message>
+    <message>
+        <source>The folder %1 was deleted (1 entry).</source>
+        <translation>Le dossier %1 a été supprimé (1 entrée).</translation>
+    </message>
+</context>
+<context>
     <name>QFileSystemModel</name>
     <message>
         <source>%1 does not exist.</source>
@@ -143,11 +477,11 @@
     </message>
     <message>
         <source>Can&apos;t move %1: %2</source>
-        <translation>Impossible de déplacer %1 : %2</translation>
+        <translation>Impossible de déplacer %1&#xa0;: %2</translation>
     </message>
     <message>
         <source>Can&apos;t copy %1: %2</source>
-        <translation>Impossible de copier %1 : %2</translation>
+        <translation>Impossible de copier %1&#xa0;: %2</translation>
     </message>
     <message>
         <source>Attention</source>
@@ -155,46 +489,200 @@
     </message>
     <message>
         <source>%1 already exists. Overwrite?</source>
-        <translation>%1 existe déjà. Voulez-vous l&apos;écraser ?</translation>
+        <translation>%1 existe déjà. Voulez-vous l&apos;écraser&#xa0;?</translation>
+    </message>
+</context>
+<context>
+    <name>SchemeMenu</name>
+    <message>
+        <source>This is not a regular file.</source>
+        <translation>Ce n&apos;est pas un fichier ordinaire.</translation>
+    </message>
+    <message>
+        <source>Shortcuts taken over: %1, left out: %2. Ok puts them into force, Reset takes them back.</source>
+        <translation>Raccourcis repris : %1, laissés de côté : %2. OK les met en vigueur, Réinitialiser les retire.</translation>
+    </message>
+    <message>
+        <source>%3
+Shortcuts taken over: %1, left out: %2. Ok puts them into force, Reset takes them back.</source>
+        <comment>%3: a sentence about lines that were skipped</comment>
+        <translation>%3
+Raccourcis repris : %1, laissés de côté : %2. OK les met en vigueur, Réinitialiser les retire.</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>&amp;Exporter les touches...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Importer les touches...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Enregistrer l&apos;aide-mémoire en &amp;HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;text...</source>
+        <translation>Enregistrer l&apos;aide-mémoire en &amp;texte...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>&amp;Copier l&apos;aide-mémoire</translation>
+    </message>
+    <message>
+        <source>Export keys</source>
+        <translation>Exporter les touches</translation>
+    </message>
+    <message>
+        <source>Keys (*.ini);;All files (*)</source>
+        <translation>Touches (*.ini);;Tous les fichiers (*)</translation>
+    </message>
+    <message>
+        <source>%1
+Choose another folder or another name, and try again.</source>
+        <translation>%1
+Choisissez un autre dossier ou un autre nom, puis réessayez.</translation>
+    </message>
+    <message>
+        <source>Import keys</source>
+        <translation>Importer les touches</translation>
+    </message>
+    <message>
+        <source>%1
+Choose a file that was written with &apos;Export keys...&apos;.</source>
+        <translation>%1
+Choisissez un fichier écrit avec « Exporter les touches... ».</translation>
+    </message>
+    <message>
+        <source>HTML documents (*.html);;All files (*)</source>
+        <translation>Documents HTML (*.html);;Tous les fichiers (*)</translation>
+    </message>
+    <message>
+        <source>Plain text (*.txt);;All files (*)</source>
+        <translation>Texte brut (*.txt);;Tous les fichiers (*)</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet</source>
+        <translation>Enregistrer l&apos;aide-mémoire</translation>
+    </message>
+    <message>
+        <source>The cheat sheet could not be saved to %1: %2
+Choose another folder or another name, and try again.</source>
+        <comment>%2: what the system says</comment>
+        <translation>L&apos;aide-mémoire n&apos;a pas pu être enregistré dans %1 : %2
+Choisissez un autre dossier ou un autre nom, puis réessayez.</translation>
+    </message>
+</context>
+<context>
+    <name>SchemeQuestion</name>
+    <message>
+        <source>Import keys</source>
+        <translation>Importer les touches</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Remplacer</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Ignorer</translation>
+    </message>
+    <message>
+        <source>&amp;Do the same with all further ones</source>
+        <translation>&amp;Faire de même pour toutes les suivantes</translation>
+    </message>
+    <message>
+        <source>The file has shortcut &apos;%1&apos; for action &apos;%2&apos;, but the global action &apos;%3&apos; has it. Skip leaves action &apos;%2&apos; as it is; Cancel takes nothing over.</source>
+        <translation>Le fichier contient le raccourci « %1 » pour l&apos;action « %2 », mais l&apos;action globale « %3 » l&apos;utilise. Ignorer laisse l&apos;action « %2 » telle quelle ; Annuler ne reprend rien.</translation>
+    </message>
+    <message>
+        <source>The file has shortcut &apos;%1&apos; for action &apos;%2&apos;, but action &apos;%3&apos; has it, too. Replace takes it away from action &apos;%3&apos;, Skip leaves action &apos;%2&apos; as it is; Cancel takes nothing over.</source>
+        <translation>Le fichier contient le raccourci « %1 » pour l&apos;action « %2 », mais l&apos;action « %3 » l&apos;utilise aussi. Remplacer le retire à l&apos;action « %3 », Ignorer laisse l&apos;action « %2 » telle quelle ; Annuler ne reprend rien.</translation>
     </message>
 </context>
 <context>
     <name>ShortcutClash</name>
     <message>
         <source>Shortcut &apos;%1&apos; is already used for action &apos;%2&apos;.</source>
-        <translation>Le raccourci « %1 » est déjà utilisé pour l&apos;action « %2 ».</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» est déjà utilisé pour l&apos;action «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>Shortcut &apos;%2&apos; of action &apos;%3&apos; begins with &apos;%1&apos;.</source>
-        <translation>Le raccourci « %2 » de l&apos;action « %3 » commence par « %1 ».</translation>
+        <translation>Le raccourci «&#xa0;%2&#xa0;» de l&apos;action «&#xa0;%3&#xa0;» commence par «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>Shortcut &apos;%2&apos; begins with &apos;%1&apos;, the shortcut of action &apos;%3&apos;.</source>
-        <translation>Le raccourci « %2 » commence par « %1 », le raccourci de l&apos;action « %3 ».</translation>
+        <translation>Le raccourci «&#xa0;%2&#xa0;» commence par «&#xa0;%1&#xa0;», le raccourci de l&apos;action «&#xa0;%3&#xa0;».</translation>
     </message>
     <message>
         <source>Shortcut &apos;%1&apos; opens the menu &apos;%2&apos;.</source>
-        <translation>Le raccourci « %1 » ouvre le menu « %2 ».</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» ouvre le menu «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>Shortcut &apos;%1&apos; leads to &apos;%2&apos; in the window.</source>
-        <translation>Le raccourci « %1 » mène à « %2 » dans la fenêtre.</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» mène à «&#xa0;%2&#xa0;» dans la fenêtre.</translation>
     </message>
     <message>
         <source>Shortcut &apos;%1&apos; is the standard shortcut for &apos;%2&apos;.</source>
-        <translation>Le raccourci « %1 » est le raccourci standard pour « %2 ».</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» est le raccourci standard pour «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>Shortcut &apos;%1&apos; is already used for global action &apos;%2&apos;.</source>
-        <translation>Le raccourci « %1 » est déjà utilisé pour l&apos;action globale « %2 ».</translation>
+        <translation>Le raccourci «&#xa0;%1&#xa0;» est déjà utilisé pour l&apos;action globale «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>With &apos;%1&apos; as a shortcut this key cannot be typed into texts.</source>
-        <translation>Avec « %1 » comme raccourci, cette touche ne peut plus être saisie dans les textes.</translation>
+        <translation>Avec «&#xa0;%1&#xa0;» comme raccourci, cette touche ne peut plus être saisie dans les textes.</translation>
     </message>
     <message>
         <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
-        <translation>La disposition de clavier actuelle ne permet pas de produire « %1 ».</translation>
+        <translation>La disposition de clavier actuelle ne permet pas de produire «&#xa0;%1&#xa0;».</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is a further shortcut of action &apos;%2&apos;.</source>
+        <translation>Le raccourci « %1 » est un autre raccourci de l&apos;action « %2 ».</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutDelegate</name>
+    <message>
+        <source>Back to no shortcut</source>
+        <translation>Revenir à aucun raccourci</translation>
+    </message>
+    <message>
+        <source>Back to %1</source>
+        <translation>Revenir à %1</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutFilterBar</name>
+    <message>
+        <source>Press keys</source>
+        <translation>Appuyer sur des touches</translation>
+    </message>
+    <message>
+        <source>Changed only</source>
+        <translation>Modifiés seulement</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Filtre</translation>
+    </message>
+    <message>
+        <source>Shows who has the keys that you press; Escape ends it.</source>
+        <translation>Montre qui a les touches sur lesquelles vous appuyez ; Échap y met fin.</translation>
+    </message>
+    <message>
+        <source>Shows the actions alone whose shortcut is not the default one, or was edited.</source>
+        <translation>Ne montre que les actions dont le raccourci n&apos;est pas celui par défaut ou a été modifié.</translation>
+    </message>
+    <message>
+        <source>Press the keys to look for</source>
+        <translation>Appuyez sur les touches à chercher</translation>
+    </message>
+    <message>
+        <source>Filter by name, group or shortcut</source>
+        <translation>Filtrer par nom, groupe ou raccourci</translation>
     </message>
 </context>
 <context>
@@ -202,12 +690,12 @@
     <message>
         <source>The shortcuts could not be saved to %1: %2</source>
         <comment>%2: what the system says</comment>
-        <translation>Impossible d&apos;enregistrer les raccourcis dans %1 : %2</translation>
+        <translation>Impossible d&apos;enregistrer les raccourcis dans %1&#xa0;: %2</translation>
     </message>
     <message>
         <source>The shortcuts could not be read from %1: %2</source>
         <comment>%2: what the system says</comment>
-        <translation>Impossible de lire les raccourcis dans %1 : %2</translation>
+        <translation>Impossible de lire les raccourcis dans %1&#xa0;: %2</translation>
     </message>
     <message>
         <source>%1 is not a regular file.</source>
@@ -224,7 +712,7 @@
     <message>
         <source>Unreadable shortcuts in %1 were skipped: %2</source>
         <comment>%2: their number</comment>
-        <translation>Des raccourcis illisibles dans %1 ont été ignorés : %2</translation>
+        <translation>Des raccourcis illisibles dans %1 ont été ignorés&#xa0;: %2</translation>
     </message>
 </context>
 <context>
@@ -245,6 +733,23 @@
         <source>Shortcut</source>
         <translation>Raccourci</translation>
     </message>
+    <message>
+        <source>%1, changed</source>
+        <comment>%1: an action or a key</comment>
+        <translation>%1, modifié</translation>
+    </message>
+    <message>
+        <source>No shortcut</source>
+        <translation>Aucun raccourci</translation>
+    </message>
+    <message>
+        <source>There is no default shortcut.</source>
+        <translation>Il n&apos;y a pas de raccourci par défaut.</translation>
+    </message>
+    <message>
+        <source>The default shortcut is %1.</source>
+        <translation>Le raccourci par défaut est %1.</translation>
+    </message>
 </context>
 <context>
     <name>StandardKeyNames</name>
@@ -254,7 +759,7 @@
     </message>
     <message>
         <source>What&apos;s this?</source>
-        <translation>Qu&apos;est-ce que c&apos;est ?</translation>
+        <translation>Qu&apos;est-ce que c&apos;est&#xa0;?</translation>
     </message>
     <message>
         <source>Open</source>
@@ -413,6 +918,13 @@
     </message>
 </context>
 <context>
+    <name>TreeAssistance</name>
+    <message>
+        <source>&amp;Reset this shortcut</source>
+        <translation>&amp;Réinitialiser ce raccourci</translation>
+    </message>
+</context>
+<context>
     <name>VelDesktopEntryEditDialog</name>
     <message>
         <source>Warning</source>
@@ -468,7 +980,7 @@
     </message>
     <message>
         <source>&lt;b&gt;Desktop entry&lt;/b&gt; is a multipurpose info file for installed apps, devices, etc. It can be used to build menu entries, shortcuts, etc. This dialog implements the &apos;Desktop Entry Standard&apos; of &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt;.&lt;br&gt;&lt;br&gt;Desktop entry file is a text ini-like file with one main section [Desktop Entry] and possible additional sections for each action defined in the main section field &apos;Actions&apos;. All fields are text string pairs: key=value. Value can also be a semicolon separated string list.</source>
-        <translation>Une &lt;b&gt;entrée de bureau&lt;/b&gt; est un fichier d&apos;informations polyvalent pour les applications installées, les périphériques, etc. Elle peut servir à construire des éléments de menu, des raccourcis, etc. Cette boîte de dialogue met en œuvre le « Desktop Entry Standard » de &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt;.&lt;br&gt;&lt;br&gt;Le fichier d&apos;une entrée de bureau est un fichier texte de type INI avec une section principale [Desktop Entry] et éventuellement des sections supplémentaires pour chaque action définie dans le champ « Actions » de la section principale. Tous les champs sont des paires de chaînes de texte : clé=valeur. La valeur peut aussi être une liste de chaînes séparées par des points-virgules.</translation>
+        <translation>Une &lt;b&gt;entrée de bureau&lt;/b&gt; est un fichier d&apos;informations polyvalent pour les applications installées, les périphériques, etc. Elle peut servir à construire des éléments de menu, des raccourcis, etc. Cette boîte de dialogue met en œuvre le «&#xa0;Desktop Entry Standard&#xa0;» de &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt;.&lt;br&gt;&lt;br&gt;Le fichier d&apos;une entrée de bureau est un fichier texte de type INI avec une section principale [Desktop Entry] et éventuellement des sections supplémentaires pour chaque action définie dans le champ «&#xa0;Actions&#xa0;» de la section principale. Tous les champs sont des paires de chaînes de texte&#xa0;: clé=valeur. La valeur peut aussi être une liste de chaînes séparées par des points-virgules.</translation>
     </message>
 </context>
 <context>
@@ -487,15 +999,15 @@
     </message>
     <message>
         <source>Add desktop environment:</source>
-        <translation>Ajouter un environnement de bureau :</translation>
+        <translation>Ajouter un environnement de bureau&#xa0;:</translation>
     </message>
     <message>
         <source>Edit desktop environment:</source>
-        <translation>Modifier l&apos;environnement de bureau :</translation>
+        <translation>Modifier l&apos;environnement de bureau&#xa0;:</translation>
     </message>
     <message>
         <source>MIME type or file name extension:</source>
-        <translation>Type MIME ou extension de nom de fichier :</translation>
+        <translation>Type MIME ou extension de nom de fichier&#xa0;:</translation>
     </message>
     <message>
         <source>MIME type</source>
@@ -519,7 +1031,7 @@
     </message>
     <message>
         <source>Category:</source>
-        <translation>Catégorie :</translation>
+        <translation>Catégorie&#xa0;:</translation>
     </message>
     <message>
         <source>Edit category</source>
@@ -535,7 +1047,7 @@
     </message>
     <message>
         <source>Keyword:</source>
-        <translation>Mot-clé :</translation>
+        <translation>Mot-clé&#xa0;:</translation>
     </message>
     <message>
         <source>Edit keyword</source>
@@ -575,7 +1087,7 @@ Some field values may be lost...
 Continue?</source>
         <translation>Le type de l&apos;entrée de bureau a été modifié.
 Certaines valeurs de champs risquent d&apos;être perdues...
-Continuer ?</translation>
+Continuer&#xa0;?</translation>
     </message>
     <message>
         <source>Type</source>
@@ -658,6 +1170,38 @@ Continuer ?</translation>
         <source>Can&apos;t send command to vel-wm</source>
         <translation>Impossible d&apos;envoyer la commande à vel-wm</translation>
     </message>
+    <message>
+        <source>This menu cannot be changed: the folder %1 does not exist.</source>
+        <translation>Ce menu ne peut pas être modifié : le dossier %1 n&apos;existe pas.</translation>
+    </message>
+    <message>
+        <source>This menu cannot be changed: you may not write to the folder %1.</source>
+        <translation>Ce menu ne peut pas être modifié : vous n&apos;avez pas le droit d&apos;écrire dans le dossier %1.</translation>
+    </message>
+    <message>
+        <source>Show hidden</source>
+        <translation>Afficher les masqués</translation>
+    </message>
+    <message>
+        <source>Filter by name, command or keyword</source>
+        <translation>Filtrer par nom, commande ou mot-clé</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Filtre</translation>
+    </message>
+    <message>
+        <source>Also show the entries that the menu leaves out</source>
+        <translation>Afficher aussi les entrées que le menu omet</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Erreur</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -668,14 +1212,14 @@ Continuer ?</translation>
     <message>
         <source>Can&apos;t start:
 %1 %2</source>
-        <translation>Impossible de démarrer :
+        <translation>Impossible de démarrer&#xa0;:
 %1 %2</translation>
     </message>
     <message>
         <source>All previous shortcuts
 will be lost. Are you sure?</source>
         <translation>Tous les raccourcis précédents
-seront perdus. Voulez-vous vraiment continuer ?</translation>
+seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>Edit</source>
@@ -747,7 +1291,7 @@ seront perdus. Voulez-vous vraiment continuer ?</translation>
     </message>
     <message>
         <source>Can&apos;t edit non desktop file</source>
-        <translation>Impossible de modifier un fichier qui n&apos;est pas un fichier « desktop »</translation>
+        <translation>Impossible de modifier un fichier qui n&apos;est pas un fichier «&#xa0;desktop&#xa0;»</translation>
     </message>
     <message>
         <source>Desktop Entry %1</source>
@@ -759,15 +1303,120 @@ seront perdus. Voulez-vous vraiment continuer ?</translation>
     </message>
     <message>
         <source>Are you sure to delete it?</source>
-        <translation>Voulez-vous vraiment supprimer cet élément ?</translation>
+        <translation>Voulez-vous vraiment supprimer cet élément&#xa0;?</translation>
     </message>
     <message>
         <source>Find string:</source>
-        <translation>Chaîne à chercher :</translation>
+        <translation>Chaîne à chercher&#xa0;:</translation>
     </message>
     <message>
         <source>&apos;%1&apos; not found .</source>
-        <translation>« %1 » est introuvable.</translation>
+        <translation>«&#xa0;%1&#xa0;» est introuvable.</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is not meant for this desktop.</source>
+        <translation>Absent du menu : l&apos;entrée n&apos;est pas destinée à cet environnement.</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is meant for other desktops only (%1).</source>
+        <translation>Absent du menu : l&apos;entrée n&apos;est destinée qu&apos;à d&apos;autres environnements (%1).</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is marked as deleted (Hidden).</source>
+        <translation>Absent du menu : l&apos;entrée est marquée comme supprimée (Hidden).</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is marked not to be displayed (NoDisplay).</source>
+        <translation>Absent du menu : l&apos;entrée est marquée comme à ne pas afficher (NoDisplay).</translation>
+    </message>
+    <message>
+        <source>Not in the menu: the program %1 is not installed (TryExec).</source>
+        <translation>Absent du menu : le programme %1 n&apos;est pas installé (TryExec).</translation>
+    </message>
+    <message>
+        <source>This file is not a desktop entry, whatever its name says.</source>
+        <translation>Ce fichier n&apos;est pas une entrée de bureau, quoi qu&apos;en dise son nom.</translation>
+    </message>
+    <message>
+        <source>This file cannot be read.</source>
+        <translation>Ce fichier ne peut pas être lu.</translation>
+    </message>
+    <message>
+        <source>This entry has no name. The name of its file is shown.</source>
+        <translation>Cette entrée n&apos;a pas de nom. Le nom de son fichier est affiché.</translation>
+    </message>
+    <message>
+        <source>Taking back what was done...</source>
+        <translation>Annulation de ce qui a été fait...</translation>
+    </message>
+    <message>
+        <source>The program that holds the clipboard does not answer. Nothing was pasted.</source>
+        <translation>Le programme qui détient le presse-papiers ne répond pas. Rien n&apos;a été collé.</translation>
+    </message>
+    <message>
+        <source>Nothing can be created in %1, because there is no such folder.</source>
+        <translation>Rien ne peut être créé dans %1, car ce dossier n&apos;existe pas.</translation>
+    </message>
+    <message>
+        <source>%1 could not be saved. Make sure that the folder %2 may be written and that the disk is not full, then try again.</source>
+        <translation>%1 n&apos;a pas pu être enregistré. Assurez-vous que l&apos;écriture dans le dossier %2 est permise et que le disque n&apos;est pas plein, puis réessayez.</translation>
+    </message>
+    <message>
+        <source>%1 could not be deleted: %2. Make sure that the folder that holds it may be written, then try again.</source>
+        <translation>%1 n&apos;a pas pu être supprimé : %2. Assurez-vous que l&apos;écriture dans le dossier qui le contient est permise, puis réessayez.</translation>
+    </message>
+    <message>
+        <source>%1 was deleted in part only, because %2 could not be deleted: %3. Make sure that its folder may be written, then delete the rest.</source>
+        <translation>%1 n&apos;a été supprimé qu&apos;en partie, car %2 n&apos;a pas pu être supprimé : %3. Assurez-vous que l&apos;écriture dans son dossier est permise, puis supprimez le reste.</translation>
+    </message>
+    <message>
+        <source>Nothing in this menu matches &apos;%1&apos;.</source>
+        <translation>Rien dans ce menu ne correspond à « %1 ».</translation>
+    </message>
+    <message>
+        <source>Searching the menu for &apos;%1&apos;...</source>
+        <translation>Recherche de « %1 » dans le menu...</translation>
+    </message>
+    <message>
+        <source>The menu is too large to be searched as a whole. Only a part of it was searched.</source>
+        <translation>Le menu est trop grand pour être parcouru en entier. Seule une partie l&apos;a été.</translation>
+    </message>
+    <message>
+        <source>Hide</source>
+        <translation>Masquer</translation>
+    </message>
+    <message>
+        <source>Show again</source>
+        <translation>Afficher de nouveau</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; was not changed: the file %2 cannot be written.</source>
+        <translation>« %1 » n&apos;a pas été modifié : l&apos;écriture dans le fichier %2 est impossible.</translation>
+    </message>
+    <message>
+        <source>The order of the folder %1 could not be saved. Make sure that the folder may be written and that the disk is not full, then try again.</source>
+        <translation>L&apos;ordre du dossier %1 n&apos;a pas pu être enregistré. Assurez-vous que l&apos;écriture dans le dossier est permise et que le disque n&apos;est pas plein, puis réessayez.</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1. The menu was left as it is.</source>
+        <translation>Le menu par défaut n&apos;a pas pu être construit dans %1. Le menu est resté tel quel.</translation>
+    </message>
+    <message>
+        <source>Menu</source>
+        <comment>the tree</comment>
+        <translation>Menu</translation>
+    </message>
+    <message>
+        <source>%1 cannot be edited, because the folder %2 may not be written.</source>
+        <translation>%1 ne peut pas être édité, car l&apos;écriture dans le dossier %2 n&apos;est pas permise.</translation>
+    </message>
+    <message>
+        <source>Moving files...</source>
+        <translation>Déplacement des fichiers...</translation>
+    </message>
+    <message>
+        <source>Copying files...</source>
+        <translation>Copie des fichiers...</translation>
     </message>
 </context>
 <context>
@@ -794,11 +1443,11 @@ seront perdus. Voulez-vous vraiment continuer ?</translation>
     </message>
     <message>
         <source>Add desktop environment:</source>
-        <translation>Ajouter un environnement de bureau :</translation>
+        <translation>Ajouter un environnement de bureau&#xa0;:</translation>
     </message>
     <message>
         <source>Edit desktop environment:</source>
-        <translation>Modifier l&apos;environnement de bureau :</translation>
+        <translation>Modifier l&apos;environnement de bureau&#xa0;:</translation>
     </message>
     <message>
         <source>Not show in</source>
@@ -829,7 +1478,7 @@ seront perdus. Voulez-vous vraiment continuer ?</translation>
     </message>
     <message>
         <source>String:</source>
-        <translation>Chaîne :</translation>
+        <translation>Chaîne&#xa0;:</translation>
     </message>
     <message>
         <source>Edit string</source>

@@ -13,6 +13,29 @@
     </message>
 </context>
 <context>
+    <name>ClashLine</name>
+    <message>
+        <source>Go to</source>
+        <translation>移動</translation>
+    </message>
+    <message>
+        <source>Go to action &apos;%1&apos;</source>
+        <translation>アクション「%1」に移動</translation>
+    </message>
+    <message>
+        <source>Take over</source>
+        <translation>引き継ぐ</translation>
+    </message>
+    <message>
+        <source>Take over &apos;%1&apos; from action &apos;%2&apos;</source>
+        <translation>「%1」をアクション「%2」から引き継ぐ</translation>
+    </message>
+    <message>
+        <source>Further clashes: %1</source>
+        <translation>その他の衝突: %1</translation>
+    </message>
+</context>
+<context>
     <name>EditActionsDialog</name>
     <message>
         <source>Actions</source>
@@ -44,6 +67,21 @@
     <message>
         <source>Down</source>
         <translation>下へ</translation>
+    </message>
+</context>
+<context>
+    <name>EditShortcutsAssistance</name>
+    <message>
+        <source>Schemes</source>
+        <translation>スキーム</translation>
+    </message>
+    <message>
+        <source>No action matches the filter.</source>
+        <translation>フィルタに一致するアクションはありません。</translation>
+    </message>
+    <message>
+        <source>No action has the shortcut %1.</source>
+        <translation>ショートカット %1 を持つアクションはありません。</translation>
     </message>
 </context>
 <context>
@@ -124,6 +162,289 @@
     </message>
 </context>
 <context>
+    <name>KeyAssistance</name>
+    <message>
+        <source>Press the keys of the shortcut. Tab leaves the field.</source>
+        <translation>ショートカットのキーを押してください。Tab でフィールドを離れます。</translation>
+    </message>
+    <message>
+        <source>Key for action &apos;%1&apos;</source>
+        <translation>アクション「%1」のキー</translation>
+    </message>
+    <message>
+        <source>None: no key for action &apos;%1&apos;</source>
+        <translation>なし: アクション「%1」にキーを割り当てない</translation>
+    </message>
+    <message>
+        <source>What speaks against the key for action &apos;%1&apos;</source>
+        <translation>アクション「%1」のキーの問題点</translation>
+    </message>
+</context>
+<context>
+    <name>MenuDeletion</name>
+    <message>
+        <source>There is no trash for %1. It would be deleted for good: this cannot be undone. Delete it?</source>
+        <translation>%1 にはゴミ箱がありません。完全に削除され、元に戻すことはできません。削除しますか?</translation>
+    </message>
+    <message numerus="yes">
+        <source>There is no trash for %n of these items. They would be deleted for good: this cannot be undone. Delete them?</source>
+        <translation>
+            <numerusform>これらの項目のうち %n 個にはゴミ箱がありません。完全に削除され、元に戻すことはできません。削除しますか?</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 cannot be deleted: %2</source>
+        <translation>%1 を削除できません: %2</translation>
+    </message>
+</context>
+<context>
+    <name>MenuHistory</name>
+    <message>
+        <source>Undo</source>
+        <translation>元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>やり直す</translation>
+    </message>
+    <message>
+        <source>Done: %1</source>
+        <translation>完了: %1</translation>
+    </message>
+    <message>
+        <source>Moving files...</source>
+        <translation>ファイルを移動しています...</translation>
+    </message>
+    <message>
+        <source>Nothing was undone: %1</source>
+        <translation>何も元に戻されませんでした: %1</translation>
+    </message>
+    <message>
+        <source>Nothing was done again: %1</source>
+        <translation>何もやり直されませんでした: %1</translation>
+    </message>
+    <message>
+        <source>%1 is not there any more.</source>
+        <translation>%1 はもうありません。</translation>
+    </message>
+    <message>
+        <source>There is another %1 by now.</source>
+        <translation>別の %1 があります。</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program.</source>
+        <translation>%1 は他のプログラムによって変更されました。</translation>
+    </message>
+    <message>
+        <source>%1 is not in the trash any more.</source>
+        <translation>%1 はもうゴミ箱にありません。</translation>
+    </message>
+    <message>
+        <source>%1 cannot be put into the trash.</source>
+        <translation>%1 をゴミ箱に入れられません。</translation>
+    </message>
+    <message>
+        <source>It was canceled.</source>
+        <translation>キャンセルされました。</translation>
+    </message>
+    <message>
+        <source>%1 cannot be changed: %2</source>
+        <translation>%1 を変更できません: %2</translation>
+    </message>
+    <message>
+        <source>Undo creation of %1</source>
+        <translation>%1 の作成を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo creation of %1</source>
+        <translation>%1 の作成をやり直す</translation>
+    </message>
+    <message>
+        <source>%1 was created.</source>
+        <translation>%1 を作成しました。</translation>
+    </message>
+    <message>
+        <source>Undo change of %1</source>
+        <translation>%1 の変更を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo change of %1</source>
+        <translation>%1 の変更をやり直す</translation>
+    </message>
+    <message>
+        <source>%1 was changed.</source>
+        <translation>%1 を変更しました。</translation>
+    </message>
+    <message>
+        <source>Undo deletion of %1</source>
+        <translation>%1 の削除を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo deletion of %1</source>
+        <translation>%1 の削除をやり直す</translation>
+    </message>
+    <message>
+        <source>%1 was deleted.</source>
+        <translation>%1 を削除しました。</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo deletion of folder %1 (%n entries)</source>
+        <translation>
+            <numerusform>フォルダ %1 (%n 個のエントリ) の削除を元に戻す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of folder %1 (%n entries)</source>
+        <translation>
+            <numerusform>フォルダ %1 (%n 個のエントリ) の削除をやり直す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The folder %1 was deleted (%n entries).</source>
+        <translation>
+            <numerusform>フォルダ %1 (%n 個のエントリ) を削除しました。</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo deletion of %n items</source>
+        <translation>
+            <numerusform>%n 個の項目の削除を元に戻す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of %n items</source>
+        <translation>
+            <numerusform>%n 個の項目の削除をやり直す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were deleted.</source>
+        <translation>
+            <numerusform>%n 個の項目を削除しました。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo moving of %1 to %2</source>
+        <translation>%1 の %2 への移動を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo moving of %1 to %2</source>
+        <translation>%1 の %2 への移動をやり直す</translation>
+    </message>
+    <message>
+        <source>%1 was moved to %2.</source>
+        <translation>%1 を %2 に移動しました。</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo moving of %n items to %2</source>
+        <translation>
+            <numerusform>%n 個の項目の %2 への移動を元に戻す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo moving of %n items to %2</source>
+        <translation>
+            <numerusform>%n 個の項目の %2 への移動をやり直す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were moved to %2.</source>
+        <translation>
+            <numerusform>%n 個の項目を %2 に移動しました。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo copying of %1 to %2</source>
+        <translation>%1 の %2 へのコピーを元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo copying of %1 to %2</source>
+        <translation>%1 の %2 へのコピーをやり直す</translation>
+    </message>
+    <message>
+        <source>%1 was copied to %2.</source>
+        <translation>%1 を %2 にコピーしました。</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo copying of %n items to %2</source>
+        <translation>
+            <numerusform>%n 個の項目の %2 へのコピーを元に戻す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo copying of %n items to %2</source>
+        <translation>
+            <numerusform>%n 個の項目の %2 へのコピーをやり直す</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were copied to %2.</source>
+        <translation>
+            <numerusform>%n 個の項目を %2 にコピーしました。</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo reordering of %1</source>
+        <translation>%1 の並べ替えを元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo reordering of %1</source>
+        <translation>%1 の並べ替えをやり直す</translation>
+    </message>
+    <message>
+        <source>%1 has another place.</source>
+        <translation>%1 の位置を変えました。</translation>
+    </message>
+    <message>
+        <source>Undo default menu</source>
+        <translation>標準メニューを元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo default menu</source>
+        <translation>標準メニューをやり直す</translation>
+    </message>
+    <message>
+        <source>The default menu was built.</source>
+        <translation>標準メニューを作成しました。</translation>
+    </message>
+    <message>
+        <source>Undo hiding of %1</source>
+        <translation>%1 を隠す操作を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo hiding of %1</source>
+        <translation>%1 を隠す操作をやり直す</translation>
+    </message>
+    <message>
+        <source>%1 is hidden: the menu no longer shows it.</source>
+        <translation>%1 は隠されています: メニューには表示されません。</translation>
+    </message>
+    <message>
+        <source>Undo showing %1 again</source>
+        <translation>%1 の再表示を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo showing %1 again</source>
+        <translation>%1 の再表示をやり直す</translation>
+    </message>
+    <message>
+        <source>The menu shows %1 again.</source>
+        <translation>%1 は再びメニューに表示されます。</translation>
+    </message>
+    <message>
+        <source>Undo deletion of folder %1 (1 entry)</source>
+        <translation>フォルダ %1 (1 個のエントリ) の削除を元に戻す</translation>
+    </message>
+    <message>
+        <source>Redo deletion of folder %1 (1 entry)</source>
+        <translation>フォルダ %1 (1 個のエントリ) の削除をやり直す</translation>
+    </message>
+    <message>
+        <source>The folder %1 was deleted (1 entry).</source>
+        <translation>フォルダ %1 (1 個のエントリ) を削除しました。</translation>
+    </message>
+</context>
+<context>
     <name>QFileSystemModel</name>
     <message>
         <source>%1 does not exist.</source>
@@ -156,6 +477,114 @@
     <message>
         <source>%1 already exists. Overwrite?</source>
         <translation>%1 は既に存在します。上書きしますか?</translation>
+    </message>
+</context>
+<context>
+    <name>SchemeMenu</name>
+    <message>
+        <source>This is not a regular file.</source>
+        <translation>これは通常のファイルではありません。</translation>
+    </message>
+    <message>
+        <source>Shortcuts taken over: %1, left out: %2. Ok puts them into force, Reset takes them back.</source>
+        <translation>引き継いだショートカット: %1、除外: %2。OK で有効になり、リセットで取り消されます。</translation>
+    </message>
+    <message>
+        <source>%3
+Shortcuts taken over: %1, left out: %2. Ok puts them into force, Reset takes them back.</source>
+        <comment>%3: a sentence about lines that were skipped</comment>
+        <translation>%3
+引き継いだショートカット: %1、除外: %2。OK で有効になり、リセットで取り消されます。</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>キーをエクスポート(&amp;E)...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>キーをインポート(&amp;I)...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>一覧表を HTML として保存(&amp;H)...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;text...</source>
+        <translation>一覧表をテキストとして保存(&amp;T)...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>一覧表をコピー(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Export keys</source>
+        <translation>キーをエクスポート</translation>
+    </message>
+    <message>
+        <source>Keys (*.ini);;All files (*)</source>
+        <translation>キー (*.ini);;すべてのファイル (*)</translation>
+    </message>
+    <message>
+        <source>%1
+Choose another folder or another name, and try again.</source>
+        <translation>%1
+別のフォルダまたは別の名前を選んで、もう一度試してください。</translation>
+    </message>
+    <message>
+        <source>Import keys</source>
+        <translation>キーをインポート</translation>
+    </message>
+    <message>
+        <source>%1
+Choose a file that was written with &apos;Export keys...&apos;.</source>
+        <translation>%1
+「キーをエクスポート...」で書き出したファイルを選んでください。</translation>
+    </message>
+    <message>
+        <source>HTML documents (*.html);;All files (*)</source>
+        <translation>HTML 文書 (*.html);;すべてのファイル (*)</translation>
+    </message>
+    <message>
+        <source>Plain text (*.txt);;All files (*)</source>
+        <translation>プレーンテキスト (*.txt);;すべてのファイル (*)</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet</source>
+        <translation>一覧表を保存</translation>
+    </message>
+    <message>
+        <source>The cheat sheet could not be saved to %1: %2
+Choose another folder or another name, and try again.</source>
+        <comment>%2: what the system says</comment>
+        <translation>一覧表を %1 に保存できませんでした: %2
+別のフォルダまたは別の名前を選んで、もう一度試してください。</translation>
+    </message>
+</context>
+<context>
+    <name>SchemeQuestion</name>
+    <message>
+        <source>Import keys</source>
+        <translation>キーをインポート</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>置き換える(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>スキップ(&amp;S)</translation>
+    </message>
+    <message>
+        <source>&amp;Do the same with all further ones</source>
+        <translation>以降もすべて同じようにする(&amp;D)</translation>
+    </message>
+    <message>
+        <source>The file has shortcut &apos;%1&apos; for action &apos;%2&apos;, but the global action &apos;%3&apos; has it. Skip leaves action &apos;%2&apos; as it is; Cancel takes nothing over.</source>
+        <translation>ファイルではショートカット「%1」がアクション「%2」に割り当てられていますが、グローバルアクション「%3」が使用しています。スキップするとアクション「%2」はそのまま、キャンセルすると何も引き継がれません。</translation>
+    </message>
+    <message>
+        <source>The file has shortcut &apos;%1&apos; for action &apos;%2&apos;, but action &apos;%3&apos; has it, too. Replace takes it away from action &apos;%3&apos;, Skip leaves action &apos;%2&apos; as it is; Cancel takes nothing over.</source>
+        <translation>ファイルではショートカット「%1」がアクション「%2」に割り当てられていますが、アクション「%3」も使用しています。置き換えるとアクション「%3」から外され、スキップするとアクション「%2」はそのまま、キャンセルすると何も引き継がれません。</translation>
     </message>
 </context>
 <context>
@@ -195,6 +624,52 @@
     <message>
         <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
         <translation>現在のキーボード配列では「%1」を入力できません。</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is a further shortcut of action &apos;%2&apos;.</source>
+        <translation>ショートカット「%1」はアクション「%2」の追加のショートカットです。</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutDelegate</name>
+    <message>
+        <source>Back to no shortcut</source>
+        <translation>ショートカットなしに戻す</translation>
+    </message>
+    <message>
+        <source>Back to %1</source>
+        <translation>%1 に戻す</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutFilterBar</name>
+    <message>
+        <source>Press keys</source>
+        <translation>キーを押す</translation>
+    </message>
+    <message>
+        <source>Changed only</source>
+        <translation>変更のみ</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>フィルタ</translation>
+    </message>
+    <message>
+        <source>Shows who has the keys that you press; Escape ends it.</source>
+        <translation>押したキーを持つアクションを表示します。Escape で終了します。</translation>
+    </message>
+    <message>
+        <source>Shows the actions alone whose shortcut is not the default one, or was edited.</source>
+        <translation>ショートカットが標準と異なるか編集されたアクションだけを表示します。</translation>
+    </message>
+    <message>
+        <source>Press the keys to look for</source>
+        <translation>探すキーを押してください</translation>
+    </message>
+    <message>
+        <source>Filter by name, group or shortcut</source>
+        <translation>名前、グループ、ショートカットで絞り込む</translation>
     </message>
 </context>
 <context>
@@ -244,6 +719,23 @@
     <message>
         <source>Shortcut</source>
         <translation>ショートカット</translation>
+    </message>
+    <message>
+        <source>%1, changed</source>
+        <comment>%1: an action or a key</comment>
+        <translation>%1、変更あり</translation>
+    </message>
+    <message>
+        <source>No shortcut</source>
+        <translation>ショートカットなし</translation>
+    </message>
+    <message>
+        <source>There is no default shortcut.</source>
+        <translation>標準のショートカットはありません。</translation>
+    </message>
+    <message>
+        <source>The default shortcut is %1.</source>
+        <translation>標準のショートカットは %1 です。</translation>
     </message>
 </context>
 <context>
@@ -410,6 +902,13 @@
     <message>
         <source>...</source>
         <translation>...</translation>
+    </message>
+</context>
+<context>
+    <name>TreeAssistance</name>
+    <message>
+        <source>&amp;Reset this shortcut</source>
+        <translation>このショートカットをリセット(&amp;R)</translation>
     </message>
 </context>
 <context>
@@ -658,6 +1157,38 @@ Continue?</source>
         <source>Can&apos;t send command to vel-wm</source>
         <translation>vel-wm にコマンドを送れません</translation>
     </message>
+    <message>
+        <source>This menu cannot be changed: the folder %1 does not exist.</source>
+        <translation>このメニューは変更できません: フォルダ %1 がありません。</translation>
+    </message>
+    <message>
+        <source>This menu cannot be changed: you may not write to the folder %1.</source>
+        <translation>このメニューは変更できません: フォルダ %1 に書き込めません。</translation>
+    </message>
+    <message>
+        <source>Show hidden</source>
+        <translation>隠れた項目を表示</translation>
+    </message>
+    <message>
+        <source>Filter by name, command or keyword</source>
+        <translation>名前、コマンド、キーワードで絞り込む</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>フィルタ</translation>
+    </message>
+    <message>
+        <source>Also show the entries that the menu leaves out</source>
+        <translation>メニューに出ないエントリも表示する</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>元に戻す</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>エラー</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -768,6 +1299,111 @@ will be lost. Are you sure?</source>
     <message>
         <source>&apos;%1&apos; not found .</source>
         <translation>「%1」は見つかりませんでした。</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is not meant for this desktop.</source>
+        <translation>メニューに出ません: このデスクトップ用ではありません。</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is meant for other desktops only (%1).</source>
+        <translation>メニューに出ません: 他のデスクトップ専用です (%1)。</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is marked as deleted (Hidden).</source>
+        <translation>メニューに出ません: 削除済みと記されています (Hidden)。</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is marked not to be displayed (NoDisplay).</source>
+        <translation>メニューに出ません: 表示しないと記されています (NoDisplay)。</translation>
+    </message>
+    <message>
+        <source>Not in the menu: the program %1 is not installed (TryExec).</source>
+        <translation>メニューに出ません: プログラム %1 がインストールされていません (TryExec)。</translation>
+    </message>
+    <message>
+        <source>This file is not a desktop entry, whatever its name says.</source>
+        <translation>このファイルは名前に反してデスクトップエントリではありません。</translation>
+    </message>
+    <message>
+        <source>This file cannot be read.</source>
+        <translation>このファイルは読み込めません。</translation>
+    </message>
+    <message>
+        <source>This entry has no name. The name of its file is shown.</source>
+        <translation>このエントリには名前がありません。ファイル名を表示しています。</translation>
+    </message>
+    <message>
+        <source>Taking back what was done...</source>
+        <translation>操作を元に戻しています...</translation>
+    </message>
+    <message>
+        <source>The program that holds the clipboard does not answer. Nothing was pasted.</source>
+        <translation>クリップボードを所有するプログラムが応答しません。何も貼り付けられませんでした。</translation>
+    </message>
+    <message>
+        <source>Nothing can be created in %1, because there is no such folder.</source>
+        <translation>%1 には何も作成できません。そのフォルダがありません。</translation>
+    </message>
+    <message>
+        <source>%1 could not be saved. Make sure that the folder %2 may be written and that the disk is not full, then try again.</source>
+        <translation>%1 を保存できませんでした。フォルダ %2 に書き込めること、ディスクに空きがあることを確かめて、もう一度試してください。</translation>
+    </message>
+    <message>
+        <source>%1 could not be deleted: %2. Make sure that the folder that holds it may be written, then try again.</source>
+        <translation>%1 を削除できませんでした: %2。それを含むフォルダに書き込めることを確かめて、もう一度試してください。</translation>
+    </message>
+    <message>
+        <source>%1 was deleted in part only, because %2 could not be deleted: %3. Make sure that its folder may be written, then delete the rest.</source>
+        <translation>%1 は一部しか削除されていません。%2 を削除できませんでした: %3。そのフォルダに書き込めることを確かめて、残りを削除してください。</translation>
+    </message>
+    <message>
+        <source>Nothing in this menu matches &apos;%1&apos;.</source>
+        <translation>このメニューに「%1」に一致するものはありません。</translation>
+    </message>
+    <message>
+        <source>Searching the menu for &apos;%1&apos;...</source>
+        <translation>メニューで「%1」を検索しています...</translation>
+    </message>
+    <message>
+        <source>The menu is too large to be searched as a whole. Only a part of it was searched.</source>
+        <translation>メニューが大きすぎて全体を検索できません。一部だけを検索しました。</translation>
+    </message>
+    <message>
+        <source>Hide</source>
+        <translation>隠す</translation>
+    </message>
+    <message>
+        <source>Show again</source>
+        <translation>再び表示</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; was not changed: the file %2 cannot be written.</source>
+        <translation>「%1」は変更されませんでした: ファイル %2 に書き込めません。</translation>
+    </message>
+    <message>
+        <source>The order of the folder %1 could not be saved. Make sure that the folder may be written and that the disk is not full, then try again.</source>
+        <translation>フォルダ %1 の並び順を保存できませんでした。フォルダに書き込めること、ディスクに空きがあることを確かめて、もう一度試してください。</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1. The menu was left as it is.</source>
+        <translation>標準メニューを %1 に作成できませんでした。メニューは元のままです。</translation>
+    </message>
+    <message>
+        <source>Menu</source>
+        <comment>the tree</comment>
+        <translation>メニュー</translation>
+    </message>
+    <message>
+        <source>%1 cannot be edited, because the folder %2 may not be written.</source>
+        <translation>%1 は編集できません。フォルダ %2 に書き込めません。</translation>
+    </message>
+    <message>
+        <source>Moving files...</source>
+        <translation>ファイルを移動しています...</translation>
+    </message>
+    <message>
+        <source>Copying files...</source>
+        <translation>ファイルをコピーしています...</translation>
     </message>
 </context>
 <context>

@@ -13,6 +13,29 @@
     </message>
 </context>
 <context>
+    <name>ClashLine</name>
+    <message>
+        <source>Go to</source>
+        <translation>Git</translation>
+    </message>
+    <message>
+        <source>Go to action &apos;%1&apos;</source>
+        <translation>&apos;%1&apos; eylemine git</translation>
+    </message>
+    <message>
+        <source>Take over</source>
+        <translation>Devral</translation>
+    </message>
+    <message>
+        <source>Take over &apos;%1&apos; from action &apos;%2&apos;</source>
+        <translation>&apos;%1&apos; kısayolunu &apos;%2&apos; eyleminden devral</translation>
+    </message>
+    <message>
+        <source>Further clashes: %1</source>
+        <translation>Diğer çakışmalar: %1</translation>
+    </message>
+</context>
+<context>
     <name>EditActionsDialog</name>
     <message>
         <source>Actions</source>
@@ -44,6 +67,21 @@
     <message>
         <source>Down</source>
         <translation>Aşağı</translation>
+    </message>
+</context>
+<context>
+    <name>EditShortcutsAssistance</name>
+    <message>
+        <source>Schemes</source>
+        <translation>Şemalar</translation>
+    </message>
+    <message>
+        <source>No action matches the filter.</source>
+        <translation>Süzgece uyan eylem yok.</translation>
+    </message>
+    <message>
+        <source>No action has the shortcut %1.</source>
+        <translation>%1 kısayolu olan eylem yok.</translation>
     </message>
 </context>
 <context>
@@ -124,6 +162,289 @@
     </message>
 </context>
 <context>
+    <name>KeyAssistance</name>
+    <message>
+        <source>Press the keys of the shortcut. Tab leaves the field.</source>
+        <translation>Kısayolun tuşlarına basın. Tab alandan çıkar.</translation>
+    </message>
+    <message>
+        <source>Key for action &apos;%1&apos;</source>
+        <translation>&apos;%1&apos; eylemi için tuş</translation>
+    </message>
+    <message>
+        <source>None: no key for action &apos;%1&apos;</source>
+        <translation>Hiçbiri: &apos;%1&apos; eylemi için tuş yok</translation>
+    </message>
+    <message>
+        <source>What speaks against the key for action &apos;%1&apos;</source>
+        <translation>&apos;%1&apos; eyleminin tuşuna karşı olanlar</translation>
+    </message>
+</context>
+<context>
+    <name>MenuDeletion</name>
+    <message>
+        <source>There is no trash for %1. It would be deleted for good: this cannot be undone. Delete it?</source>
+        <translation>%1 için çöp kutusu yok. Kalıcı olarak silinir, bu geri alınamaz. Silinsin mi?</translation>
+    </message>
+    <message numerus="yes">
+        <source>There is no trash for %n of these items. They would be deleted for good: this cannot be undone. Delete them?</source>
+        <translation>
+            <numerusform>Bu ögelerden %n tanesi için çöp kutusu yok. Kalıcı olarak silinirler, bu geri alınamaz. Silinsinler mi?</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>%1 cannot be deleted: %2</source>
+        <translation>%1 silinemiyor: %2</translation>
+    </message>
+</context>
+<context>
+    <name>MenuHistory</name>
+    <message>
+        <source>Undo</source>
+        <translation>Geri al</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Yinele</translation>
+    </message>
+    <message>
+        <source>Done: %1</source>
+        <translation>Tamamlandı: %1</translation>
+    </message>
+    <message>
+        <source>Moving files...</source>
+        <translation>Dosyalar taşınıyor...</translation>
+    </message>
+    <message>
+        <source>Nothing was undone: %1</source>
+        <translation>Hiçbir şey geri alınmadı: %1</translation>
+    </message>
+    <message>
+        <source>Nothing was done again: %1</source>
+        <translation>Hiçbir şey yinelenmedi: %1</translation>
+    </message>
+    <message>
+        <source>%1 is not there any more.</source>
+        <translation>%1 artık yok.</translation>
+    </message>
+    <message>
+        <source>There is another %1 by now.</source>
+        <translation>Artık başka bir %1 var.</translation>
+    </message>
+    <message>
+        <source>%1 was changed by another program.</source>
+        <translation>%1 başka bir program tarafından değiştirildi.</translation>
+    </message>
+    <message>
+        <source>%1 is not in the trash any more.</source>
+        <translation>%1 artık çöp kutusunda değil.</translation>
+    </message>
+    <message>
+        <source>%1 cannot be put into the trash.</source>
+        <translation>%1 çöp kutusuna atılamıyor.</translation>
+    </message>
+    <message>
+        <source>It was canceled.</source>
+        <translation>İptal edildi.</translation>
+    </message>
+    <message>
+        <source>%1 cannot be changed: %2</source>
+        <translation>%1 değiştirilemiyor: %2</translation>
+    </message>
+    <message>
+        <source>Undo creation of %1</source>
+        <translation>%1 oluşturmayı geri al</translation>
+    </message>
+    <message>
+        <source>Redo creation of %1</source>
+        <translation>%1 oluşturmayı yinele</translation>
+    </message>
+    <message>
+        <source>%1 was created.</source>
+        <translation>%1 oluşturuldu.</translation>
+    </message>
+    <message>
+        <source>Undo change of %1</source>
+        <translation>%1 değişikliğini geri al</translation>
+    </message>
+    <message>
+        <source>Redo change of %1</source>
+        <translation>%1 değişikliğini yinele</translation>
+    </message>
+    <message>
+        <source>%1 was changed.</source>
+        <translation>%1 değiştirildi.</translation>
+    </message>
+    <message>
+        <source>Undo deletion of %1</source>
+        <translation>%1 silmeyi geri al</translation>
+    </message>
+    <message>
+        <source>Redo deletion of %1</source>
+        <translation>%1 silmeyi yinele</translation>
+    </message>
+    <message>
+        <source>%1 was deleted.</source>
+        <translation>%1 silindi.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo deletion of folder %1 (%n entries)</source>
+        <translation>
+            <numerusform>%1 klasörünü (%n girdi) silmeyi geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of folder %1 (%n entries)</source>
+        <translation>
+            <numerusform>%1 klasörünü (%n girdi) silmeyi yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The folder %1 was deleted (%n entries).</source>
+        <translation>
+            <numerusform>%1 klasörü silindi (%n girdi).</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo deletion of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi silmeyi geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi silmeyi yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were deleted.</source>
+        <translation>
+            <numerusform>%n öge silindi.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo moving of %1 to %2</source>
+        <translation>%1 ögesini %2 konumuna taşımayı geri al</translation>
+    </message>
+    <message>
+        <source>Redo moving of %1 to %2</source>
+        <translation>%1 ögesini %2 konumuna taşımayı yinele</translation>
+    </message>
+    <message>
+        <source>%1 was moved to %2.</source>
+        <translation>%1, %2 konumuna taşındı.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo moving of %n items to %2</source>
+        <translation>
+            <numerusform>%n ögeyi %2 konumuna taşımayı geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo moving of %n items to %2</source>
+        <translation>
+            <numerusform>%n ögeyi %2 konumuna taşımayı yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were moved to %2.</source>
+        <translation>
+            <numerusform>%n öge %2 konumuna taşındı.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo copying of %1 to %2</source>
+        <translation>%1 ögesini %2 konumuna kopyalamayı geri al</translation>
+    </message>
+    <message>
+        <source>Redo copying of %1 to %2</source>
+        <translation>%1 ögesini %2 konumuna kopyalamayı yinele</translation>
+    </message>
+    <message>
+        <source>%1 was copied to %2.</source>
+        <translation>%1, %2 konumuna kopyalandı.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo copying of %n items to %2</source>
+        <translation>
+            <numerusform>%n ögeyi %2 konumuna kopyalamayı geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo copying of %n items to %2</source>
+        <translation>
+            <numerusform>%n ögeyi %2 konumuna kopyalamayı yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were copied to %2.</source>
+        <translation>
+            <numerusform>%n öge %2 konumuna kopyalandı.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo reordering of %1</source>
+        <translation>%1 sıralamasını geri al</translation>
+    </message>
+    <message>
+        <source>Redo reordering of %1</source>
+        <translation>%1 sıralamasını yinele</translation>
+    </message>
+    <message>
+        <source>%1 has another place.</source>
+        <translation>%1 başka bir yerde.</translation>
+    </message>
+    <message>
+        <source>Undo default menu</source>
+        <translation>Öntanımlı menüyü geri al</translation>
+    </message>
+    <message>
+        <source>Redo default menu</source>
+        <translation>Öntanımlı menüyü yinele</translation>
+    </message>
+    <message>
+        <source>The default menu was built.</source>
+        <translation>Öntanımlı menü oluşturuldu.</translation>
+    </message>
+    <message>
+        <source>Undo hiding of %1</source>
+        <translation>%1 gizlemeyi geri al</translation>
+    </message>
+    <message>
+        <source>Redo hiding of %1</source>
+        <translation>%1 gizlemeyi yinele</translation>
+    </message>
+    <message>
+        <source>%1 is hidden: the menu no longer shows it.</source>
+        <translation>%1 gizlendi: menü artık göstermiyor.</translation>
+    </message>
+    <message>
+        <source>Undo showing %1 again</source>
+        <translation>%1 ögesini yeniden göstermeyi geri al</translation>
+    </message>
+    <message>
+        <source>Redo showing %1 again</source>
+        <translation>%1 ögesini yeniden göstermeyi yinele</translation>
+    </message>
+    <message>
+        <source>The menu shows %1 again.</source>
+        <translation>Menü %1 ögesini yeniden gösteriyor.</translation>
+    </message>
+    <message>
+        <source>Undo deletion of folder %1 (1 entry)</source>
+        <translation>%1 klasörünü (1 girdi) silmeyi geri al</translation>
+    </message>
+    <message>
+        <source>Redo deletion of folder %1 (1 entry)</source>
+        <translation>%1 klasörünü (1 girdi) silmeyi yinele</translation>
+    </message>
+    <message>
+        <source>The folder %1 was deleted (1 entry).</source>
+        <translation>%1 klasörü silindi (1 girdi).</translation>
+    </message>
+</context>
+<context>
     <name>QFileSystemModel</name>
     <message>
         <source>%1 does not exist.</source>
@@ -156,6 +477,114 @@
     <message>
         <source>%1 already exists. Overwrite?</source>
         <translation>%1 zaten var. Üzerine yazılsın mı?</translation>
+    </message>
+</context>
+<context>
+    <name>SchemeMenu</name>
+    <message>
+        <source>This is not a regular file.</source>
+        <translation>Bu sıradan bir dosya değil.</translation>
+    </message>
+    <message>
+        <source>Shortcuts taken over: %1, left out: %2. Ok puts them into force, Reset takes them back.</source>
+        <translation>Devralınan kısayollar: %1, dışarıda bırakılanlar: %2. Tamam bunları geçerli kılar, Sıfırla geri alır.</translation>
+    </message>
+    <message>
+        <source>%3
+Shortcuts taken over: %1, left out: %2. Ok puts them into force, Reset takes them back.</source>
+        <comment>%3: a sentence about lines that were skipped</comment>
+        <translation>%3
+Devralınan kısayollar: %1, dışarıda bırakılanlar: %2. Tamam bunları geçerli kılar, Sıfırla geri alır.</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>Tuşları &amp;dışa aktar...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>Tuşları &amp;içe aktar...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Özet sayfasını &amp;HTML olarak kaydet...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;text...</source>
+        <translation>Özet sayfasını &amp;metin olarak kaydet...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>Özet sayfasını &amp;kopyala</translation>
+    </message>
+    <message>
+        <source>Export keys</source>
+        <translation>Tuşları dışa aktar</translation>
+    </message>
+    <message>
+        <source>Keys (*.ini);;All files (*)</source>
+        <translation>Tuşlar (*.ini);;Tüm dosyalar (*)</translation>
+    </message>
+    <message>
+        <source>%1
+Choose another folder or another name, and try again.</source>
+        <translation>%1
+Başka bir klasör veya ad seçip yeniden deneyin.</translation>
+    </message>
+    <message>
+        <source>Import keys</source>
+        <translation>Tuşları içe aktar</translation>
+    </message>
+    <message>
+        <source>%1
+Choose a file that was written with &apos;Export keys...&apos;.</source>
+        <translation>%1
+&apos;Tuşları dışa aktar...&apos; ile yazılmış bir dosya seçin.</translation>
+    </message>
+    <message>
+        <source>HTML documents (*.html);;All files (*)</source>
+        <translation>HTML belgeleri (*.html);;Tüm dosyalar (*)</translation>
+    </message>
+    <message>
+        <source>Plain text (*.txt);;All files (*)</source>
+        <translation>Düz metin (*.txt);;Tüm dosyalar (*)</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet</source>
+        <translation>Özet sayfasını kaydet</translation>
+    </message>
+    <message>
+        <source>The cheat sheet could not be saved to %1: %2
+Choose another folder or another name, and try again.</source>
+        <comment>%2: what the system says</comment>
+        <translation>Özet sayfası %1 konumuna kaydedilemedi: %2
+Başka bir klasör veya ad seçip yeniden deneyin.</translation>
+    </message>
+</context>
+<context>
+    <name>SchemeQuestion</name>
+    <message>
+        <source>Import keys</source>
+        <translation>Tuşları içe aktar</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Değiştir</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Atla</translation>
+    </message>
+    <message>
+        <source>&amp;Do the same with all further ones</source>
+        <translation>Sonrakilerin &amp;tümü için aynısını yap</translation>
+    </message>
+    <message>
+        <source>The file has shortcut &apos;%1&apos; for action &apos;%2&apos;, but the global action &apos;%3&apos; has it. Skip leaves action &apos;%2&apos; as it is; Cancel takes nothing over.</source>
+        <translation>Dosyada &apos;%1&apos; kısayolu &apos;%2&apos; eylemi için, ama genel &apos;%3&apos; eylemi bunu kullanıyor. Atla &apos;%2&apos; eylemini olduğu gibi bırakır; İptal hiçbir şey devralmaz.</translation>
+    </message>
+    <message>
+        <source>The file has shortcut &apos;%1&apos; for action &apos;%2&apos;, but action &apos;%3&apos; has it, too. Replace takes it away from action &apos;%3&apos;, Skip leaves action &apos;%2&apos; as it is; Cancel takes nothing over.</source>
+        <translation>Dosyada &apos;%1&apos; kısayolu &apos;%2&apos; eylemi için, ama &apos;%3&apos; eylemi de bunu kullanıyor. Değiştir onu &apos;%3&apos; eyleminden alır, Atla &apos;%2&apos; eylemini olduğu gibi bırakır; İptal hiçbir şey devralmaz.</translation>
     </message>
 </context>
 <context>
@@ -195,6 +624,52 @@
     <message>
         <source>The current keyboard layout cannot produce &apos;%1&apos;.</source>
         <translation>Geçerli klavye düzeni &apos;%1&apos; üretemiyor.</translation>
+    </message>
+    <message>
+        <source>Shortcut &apos;%1&apos; is a further shortcut of action &apos;%2&apos;.</source>
+        <translation>&apos;%1&apos; kısayolu &apos;%2&apos; eyleminin ek bir kısayoludur.</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutDelegate</name>
+    <message>
+        <source>Back to no shortcut</source>
+        <translation>Kısayolsuza dön</translation>
+    </message>
+    <message>
+        <source>Back to %1</source>
+        <translation>%1 kısayoluna dön</translation>
+    </message>
+</context>
+<context>
+    <name>ShortcutFilterBar</name>
+    <message>
+        <source>Press keys</source>
+        <translation>Tuşlara bas</translation>
+    </message>
+    <message>
+        <source>Changed only</source>
+        <translation>Yalnızca değişenler</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Süzgeç</translation>
+    </message>
+    <message>
+        <source>Shows who has the keys that you press; Escape ends it.</source>
+        <translation>Bastığınız tuşların kimde olduğunu gösterir; Escape bitirir.</translation>
+    </message>
+    <message>
+        <source>Shows the actions alone whose shortcut is not the default one, or was edited.</source>
+        <translation>Yalnızca kısayolu öntanımlı olmayan veya düzenlenmiş eylemleri gösterir.</translation>
+    </message>
+    <message>
+        <source>Press the keys to look for</source>
+        <translation>Aranacak tuşlara basın</translation>
+    </message>
+    <message>
+        <source>Filter by name, group or shortcut</source>
+        <translation>Ada, gruba veya kısayola göre süz</translation>
     </message>
 </context>
 <context>
@@ -244,6 +719,23 @@
     <message>
         <source>Shortcut</source>
         <translation>Kısayol</translation>
+    </message>
+    <message>
+        <source>%1, changed</source>
+        <comment>%1: an action or a key</comment>
+        <translation>%1, değiştirildi</translation>
+    </message>
+    <message>
+        <source>No shortcut</source>
+        <translation>Kısayol yok</translation>
+    </message>
+    <message>
+        <source>There is no default shortcut.</source>
+        <translation>Öntanımlı kısayol yok.</translation>
+    </message>
+    <message>
+        <source>The default shortcut is %1.</source>
+        <translation>Öntanımlı kısayol: %1.</translation>
     </message>
 </context>
 <context>
@@ -410,6 +902,13 @@
     <message>
         <source>...</source>
         <translation>...</translation>
+    </message>
+</context>
+<context>
+    <name>TreeAssistance</name>
+    <message>
+        <source>&amp;Reset this shortcut</source>
+        <translation>Bu kısayolu &amp;sıfırla</translation>
     </message>
 </context>
 <context>
@@ -658,6 +1157,38 @@ Devam edilsin mi?</translation>
         <source>Can&apos;t send command to vel-wm</source>
         <translation>vel-wm programına komut gönderilemiyor</translation>
     </message>
+    <message>
+        <source>This menu cannot be changed: the folder %1 does not exist.</source>
+        <translation>Bu menü değiştirilemez: %1 klasörü yok.</translation>
+    </message>
+    <message>
+        <source>This menu cannot be changed: you may not write to the folder %1.</source>
+        <translation>Bu menü değiştirilemez: %1 klasörüne yazamazsınız.</translation>
+    </message>
+    <message>
+        <source>Show hidden</source>
+        <translation>Gizlileri göster</translation>
+    </message>
+    <message>
+        <source>Filter by name, command or keyword</source>
+        <translation>Ada, komuta veya anahtar sözcüğe göre süz</translation>
+    </message>
+    <message>
+        <source>Filter</source>
+        <translation>Süzgeç</translation>
+    </message>
+    <message>
+        <source>Also show the entries that the menu leaves out</source>
+        <translation>Menünün dışarıda bıraktığı girdileri de göster</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Geri al</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Hata</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -768,6 +1299,111 @@ kaybolacak. Emin misiniz?</translation>
     <message>
         <source>&apos;%1&apos; not found .</source>
         <translation>&apos;%1&apos; bulunamadı.</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is not meant for this desktop.</source>
+        <translation>Menüde değil: bu masaüstü için değil.</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is meant for other desktops only (%1).</source>
+        <translation>Menüde değil: yalnızca başka masaüstleri için (%1).</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is marked as deleted (Hidden).</source>
+        <translation>Menüde değil: silinmiş olarak işaretli (Hidden).</translation>
+    </message>
+    <message>
+        <source>Not in the menu: it is marked not to be displayed (NoDisplay).</source>
+        <translation>Menüde değil: gösterilmeyecek olarak işaretli (NoDisplay).</translation>
+    </message>
+    <message>
+        <source>Not in the menu: the program %1 is not installed (TryExec).</source>
+        <translation>Menüde değil: %1 programı kurulu değil (TryExec).</translation>
+    </message>
+    <message>
+        <source>This file is not a desktop entry, whatever its name says.</source>
+        <translation>Adı ne derse desin, bu dosya bir masaüstü girdisi değil.</translation>
+    </message>
+    <message>
+        <source>This file cannot be read.</source>
+        <translation>Bu dosya okunamıyor.</translation>
+    </message>
+    <message>
+        <source>This entry has no name. The name of its file is shown.</source>
+        <translation>Bu girdinin adı yok. Dosyasının adı gösteriliyor.</translation>
+    </message>
+    <message>
+        <source>Taking back what was done...</source>
+        <translation>Yapılanlar geri alınıyor...</translation>
+    </message>
+    <message>
+        <source>The program that holds the clipboard does not answer. Nothing was pasted.</source>
+        <translation>Panonun sahibi olan program yanıt vermiyor. Hiçbir şey yapıştırılmadı.</translation>
+    </message>
+    <message>
+        <source>Nothing can be created in %1, because there is no such folder.</source>
+        <translation>%1 içinde bir şey oluşturulamaz, çünkü böyle bir klasör yok.</translation>
+    </message>
+    <message>
+        <source>%1 could not be saved. Make sure that the folder %2 may be written and that the disk is not full, then try again.</source>
+        <translation>%1 kaydedilemedi. %2 klasörüne yazılabildiğinden ve diskin dolu olmadığından emin olup yeniden deneyin.</translation>
+    </message>
+    <message>
+        <source>%1 could not be deleted: %2. Make sure that the folder that holds it may be written, then try again.</source>
+        <translation>%1 silinemedi: %2. İçinde bulunduğu klasöre yazılabildiğinden emin olup yeniden deneyin.</translation>
+    </message>
+    <message>
+        <source>%1 was deleted in part only, because %2 could not be deleted: %3. Make sure that its folder may be written, then delete the rest.</source>
+        <translation>%1 yalnızca kısmen silindi, çünkü %2 silinemedi: %3. Klasörüne yazılabildiğinden emin olup kalanı silin.</translation>
+    </message>
+    <message>
+        <source>Nothing in this menu matches &apos;%1&apos;.</source>
+        <translation>Bu menüde &apos;%1&apos; ile eşleşen bir şey yok.</translation>
+    </message>
+    <message>
+        <source>Searching the menu for &apos;%1&apos;...</source>
+        <translation>Menüde &apos;%1&apos; aranıyor...</translation>
+    </message>
+    <message>
+        <source>The menu is too large to be searched as a whole. Only a part of it was searched.</source>
+        <translation>Menü tümüyle aranamayacak kadar büyük. Yalnızca bir bölümü arandı.</translation>
+    </message>
+    <message>
+        <source>Hide</source>
+        <translation>Gizle</translation>
+    </message>
+    <message>
+        <source>Show again</source>
+        <translation>Yeniden göster</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; was not changed: the file %2 cannot be written.</source>
+        <translation>&apos;%1&apos; değiştirilmedi: %2 dosyasına yazılamıyor.</translation>
+    </message>
+    <message>
+        <source>The order of the folder %1 could not be saved. Make sure that the folder may be written and that the disk is not full, then try again.</source>
+        <translation>%1 klasörünün sırası kaydedilemedi. Klasöre yazılabildiğinden ve diskin dolu olmadığından emin olup yeniden deneyin.</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1. The menu was left as it is.</source>
+        <translation>Öntanımlı menü %1 içinde oluşturulamadı. Menü olduğu gibi kaldı.</translation>
+    </message>
+    <message>
+        <source>Menu</source>
+        <comment>the tree</comment>
+        <translation>Menü</translation>
+    </message>
+    <message>
+        <source>%1 cannot be edited, because the folder %2 may not be written.</source>
+        <translation>%1 düzenlenemez, çünkü %2 klasörüne yazılamıyor.</translation>
+    </message>
+    <message>
+        <source>Moving files...</source>
+        <translation>Dosyalar taşınıyor...</translation>
+    </message>
+    <message>
+        <source>Copying files...</source>
+        <translation>Dosyalar kopyalanıyor...</translation>
     </message>
 </context>
 <context>

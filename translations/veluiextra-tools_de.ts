@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Text</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Kurzbefehle</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>Die Datei hat %1 für %2, doch auch %3 hat ihn.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Ersetzen</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Auslassen</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>Kurzbefehle &amp;exportieren...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>Kurzbefehle &amp;importieren...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Übersicht als &amp;HTML speichern...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Übersicht als Te&amp;xt speichern...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>Übersicht &amp;kopieren</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Menü- und Eintragsdialoge</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Unterstützung</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ und eine dritte
     <message>
         <source>Shortcuts</source>
         <translation>Kurzbefehle</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Kurzbefehle im einfachen Dialog einrichten...</translation>
     </message>
 </context>
 <context>

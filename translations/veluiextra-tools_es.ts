@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Texto</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Teclas</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>El archivo tiene %1 para %2, pero también lo tiene %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Sustituir</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Omitir</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>&amp;Exportar teclas...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Importar teclas...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Guardar &amp;la chuleta como HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Guardar la chuleta como te&amp;xto...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>&amp;Copiar la chuleta</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Diálogos de menú y de entrada</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Ayudas</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ y una tercera
     <message>
         <source>Shortcuts</source>
         <translation>Accesos rápidos</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Configurar accesos rápidos en el diálogo sencillo...</translation>
     </message>
 </context>
 <context>

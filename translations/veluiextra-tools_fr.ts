@@ -56,7 +56,7 @@
     </message>
     <message>
         <source>Line:</source>
-        <translation>Ligne :</translation>
+        <translation>Ligne&#xa0;:</translation>
     </message>
     <message>
         <source>File</source>
@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Texte</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Touches</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>Le fichier contient %1 pour %2, mais %3 l&apos;utilise aussi.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Remplacer</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Ignorer</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>Exporter les &amp;touches...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Importer les touches...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>En&amp;registrer l&apos;aide-mémoire en HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Enregistrer l&apos;aide-mémoire en te&amp;xte...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>&amp;Copier l&apos;aide-mémoire</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -349,19 +385,19 @@
     <name>KeyNamesPage</name>
     <message>
         <source>&amp;Press keys:</source>
-        <translation>&amp;Appuyer sur des touches :</translation>
+        <translation>&amp;Appuyer sur des touches&#xa0;:</translation>
     </message>
     <message>
         <source>In the window manager&apos;s notation:</source>
-        <translation>Telles que les écrit le gestionnaire de fenêtres :</translation>
+        <translation>Telles que les écrit le gestionnaire de fenêtres&#xa0;:</translation>
     </message>
     <message>
         <source>Read back:</source>
-        <translation>Relu :</translation>
+        <translation>Relu&#xa0;:</translation>
     </message>
     <message>
         <source>Global action with these keys:</source>
-        <translation>Action globale avec ces touches :</translation>
+        <translation>Action globale avec ces touches&#xa0;:</translation>
     </message>
     <message>
         <source>Key names</source>
@@ -398,6 +434,10 @@
         <source>Menu and entry dialogs</source>
         <translation>Boîtes de dialogue de menu et d&apos;entrée</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Assistance</translation>
+    </message>
 </context>
 <context>
     <name>RadioGroupBoxPage</name>
@@ -407,7 +447,7 @@
     </message>
     <message>
         <source>Script address:</source>
-        <translation>Adresse du script :</translation>
+        <translation>Adresse du script&#xa0;:</translation>
     </message>
     <message>
         <source>Ask again at every start</source>
@@ -419,15 +459,15 @@
     </message>
     <message>
         <source>Host:</source>
-        <translation>Hôte :</translation>
+        <translation>Hôte&#xa0;:</translation>
     </message>
     <message>
         <source>Port:</source>
-        <translation>Port :</translation>
+        <translation>Port&#xa0;:</translation>
     </message>
     <message>
         <source>Protocol:</source>
-        <translation>Protocole :</translation>
+        <translation>Protocole&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Direct connection</source>
@@ -462,15 +502,15 @@
     </message>
     <message>
         <source>S&amp;ection:</source>
-        <translation>&amp;Section :</translation>
+        <translation>&amp;Section&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Font:</source>
-        <translation>P&amp;olice :</translation>
+        <translation>P&amp;olice&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Size:</source>
-        <translation>&amp;Taille :</translation>
+        <translation>&amp;Taille&#xa0;:</translation>
     </message>
     <message>
         <source>Contents of the file on disk</source>
@@ -493,7 +533,7 @@
     </message>
     <message>
         <source>Last command: %1</source>
-        <translation>Dernière commande : %1</translation>
+        <translation>Dernière commande&#xa0;: %1</translation>
     </message>
     <message>
         <source>one line
@@ -524,6 +564,10 @@ et une troisième
     <message>
         <source>Shortcuts</source>
         <translation>Raccourcis clavier</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Configurer les raccourcis clavier dans la boîte de dialogue simple...</translation>
     </message>
 </context>
 <context>
@@ -604,11 +648,11 @@ et une troisième
     </message>
     <message>
         <source>no such directory: %1</source>
-        <translation>ce dossier n&apos;existe pas : %1</translation>
+        <translation>ce dossier n&apos;existe pas&#xa0;: %1</translation>
     </message>
     <message>
         <source>not a directory: %1</source>
-        <translation>n&apos;est pas un dossier : %1</translation>
+        <translation>n&apos;est pas un dossier&#xa0;: %1</translation>
     </message>
     <message>
         <source>cannot read the directory %1</source>
@@ -644,7 +688,7 @@ et une troisième
     </message>
     <message>
         <source>unexpected argument: %1</source>
-        <translation>argument inattendu : %1</translation>
+        <translation>argument inattendu&#xa0;: %1</translation>
     </message>
     <message>
         <source>only one of --dir, --desktop and --toolbar can be given</source>
@@ -652,7 +696,7 @@ et une troisième
     </message>
     <message>
         <source>--icon-size needs a number of pixels from 1 to 512, not &quot;%1&quot;</source>
-        <translation>--icon-size attend un nombre de pixels de 1 à 512, pas « %1 »</translation>
+        <translation>--icon-size attend un nombre de pixels de 1 à 512, pas «&#xa0;%1&#xa0;»</translation>
     </message>
 </context>
 <context>
@@ -663,15 +707,15 @@ et une troisième
     </message>
     <message>
         <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (un menu « pipe »), json ou text (par défaut).</translation>
+        <translation>openbox (un menu «&#xa0;pipe&#xa0;»), json ou text (par défaut).</translation>
     </message>
     <message>
         <source>The menu directory; the start menu when none is given.</source>
-        <translation>Le dossier de menu ; le menu de démarrage si aucun n&apos;est indiqué.</translation>
+        <translation>Le dossier de menu&#xa0;; le menu de démarrage si aucun n&apos;est indiqué.</translation>
     </message>
     <message>
         <source>unknown format: %1</source>
-        <translation>format inconnu : %1</translation>
+        <translation>format inconnu&#xa0;: %1</translation>
     </message>
     <message>
         <source>more than one directory</source>
@@ -679,7 +723,7 @@ et une troisième
     </message>
     <message>
         <source>no such directory: %1</source>
-        <translation>ce dossier n&apos;existe pas : %1</translation>
+        <translation>ce dossier n&apos;existe pas&#xa0;: %1</translation>
     </message>
     <message>
         <source>cannot read the directory %1</source>
@@ -687,7 +731,7 @@ et une troisième
     </message>
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
-        <translation>Le menu a plus de %1 éléments ou %2 niveaux ; le reste a été omis. Cherchez des liens qui mènent encore et encore aux mêmes dossiers.</translation>
+        <translation>Le menu a plus de %1 éléments ou %2 niveaux&#xa0;; le reste a été omis. Cherchez des liens qui mènent encore et encore aux mêmes dossiers.</translation>
     </message>
 </context>
 <context>
@@ -718,7 +762,7 @@ et une troisième
     </message>
     <message>
         <source>unexpected argument: %1</source>
-        <translation>argument inattendu : %1</translation>
+        <translation>argument inattendu&#xa0;: %1</translation>
     </message>
     <message>
         <source>cannot run the command for %1</source>
@@ -730,7 +774,7 @@ et une troisième
     </message>
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
-        <translation>impossible de prendre le canal : il n&apos;y a pas d&apos;affichage ou un autre programme le tient</translation>
+        <translation>impossible de prendre le canal&#xa0;: il n&apos;y a pas d&apos;affichage ou un autre programme le tient</translation>
     </message>
 </context>
 </TS>

@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Testo</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Tasti</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>Il file ha %1 per %2, ma la usa anche %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Sostituisci</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Tralascia</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>&amp;Esporta tasti...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Importa tasti...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Salva il promemoria come &amp;HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Salva il &amp;promemoria come testo...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>&amp;Copia il promemoria</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Finestre di menu e di voce</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Assistenza</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ e una terza
     <message>
         <source>Shortcuts</source>
         <translation>Scorciatoie</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Configura le scorciatoie nella finestra semplice...</translation>
     </message>
 </context>
 <context>

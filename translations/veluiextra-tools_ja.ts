@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>テキスト</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>キー</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>ファイルでは %1 が %2 に割り当てられていますが、%3 も使用しています。</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>置き換える(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>スキップ(&amp;S)</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>キーをエクスポート(&amp;E)...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>キーをインポート(&amp;I)...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>一覧表を HTML として保存(&amp;H)...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>一覧表をテキストとして保存(&amp;X)...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>一覧表をコピー(&amp;C)</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>メニューとエントリのダイアログ</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>アシスタンス(&amp;A)</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>ショートカット</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>簡易ダイアログでショートカットを設定...</translation>
     </message>
 </context>
 <context>

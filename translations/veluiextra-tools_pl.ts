@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Tekst</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Klawisze</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>Plik zawiera %1 dla %2, ale ma to też %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Zastąp</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Pomiń</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>&amp;Eksportuj klawisze...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Importuj klawisze...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Zapisz ściągę jako &amp;HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Zapisz ściągę jako te&amp;kst...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>Kopiuj ś&amp;ciągę</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Okna dialogowe menu i wpisu</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Pomoc w pracy</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ i jeszcze trzeci
     <message>
         <source>Shortcuts</source>
         <translation>Skróty</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Ustaw skróty w prostym oknie...</translation>
     </message>
 </context>
 <context>

@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Texto</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Teclas</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>O arquivo tem %1 para %2, mas %3 também o usa.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Substituir</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Pular</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>&amp;Exportar teclas...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Importar teclas...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Salvar &amp;a folha de consulta como HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Salvar a folha de consulta como te&amp;xto...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>&amp;Copiar a folha de consulta</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Diálogos de menu e de entrada</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Assistência</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ e uma terceira
     <message>
         <source>Shortcuts</source>
         <translation>Atalhos</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Configurar atalhos no diálogo simples...</translation>
     </message>
 </context>
 <context>

@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Metin</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Tuşlar</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>Dosyada %1 kısayolu %2 için, ama %3 de bunu kullanıyor.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Değiştir</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Atla</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>Tuşları &amp;dışa aktar...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>Tuşları &amp;içe aktar...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Özet sayfasını &amp;HTML olarak kaydet...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Özet sayfasını &amp;metin olarak kaydet...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>&amp;Özet sayfasını kopyala</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Menü ve girdi iletişim kutuları</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Yardımcı</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ ve bir üçüncüsü
     <message>
         <source>Shortcuts</source>
         <translation>Kısayollar</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Kısayolları yalın pencerede yapılandır...</translation>
     </message>
 </context>
 <context>

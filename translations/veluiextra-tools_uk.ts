@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>Текст</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>Клавіші</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>У файлі %1 призначено для %2, але це використовує й %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Замінити</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Пропустити</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>&amp;Експорт клавіш...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>&amp;Імпорт клавіш...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>Зберегти пам&apos;ятку як &amp;HTML...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>Зберегти пам&apos;ятку як те&amp;кст...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>Копіювати &amp;пам&apos;ятку</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>Діалогові вікна меню і запису</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Допомога в роботі</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>Скорочення</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>Налаштувати скорочення у простому вікні...</translation>
     </message>
 </context>
 <context>

@@ -318,6 +318,42 @@
         <source>Text</source>
         <translation>文本</translation>
     </message>
+    <message>
+        <source>Keys</source>
+        <translation>按键</translation>
+    </message>
+    <message>
+        <source>The file has %1 for %2, but %3 has it, too.</source>
+        <translation>文件中 %1 用于 %2，但 %3 也使用它。</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>替换(&amp;R)</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>跳过(&amp;S)</translation>
+    </message>
+    <message>
+        <source>&amp;Export keys...</source>
+        <translation>导出按键(&amp;E)...</translation>
+    </message>
+    <message>
+        <source>&amp;Import keys...</source>
+        <translation>导入按键(&amp;I)...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as &amp;HTML...</source>
+        <translation>将速查表保存为 HTML(&amp;H)...</translation>
+    </message>
+    <message>
+        <source>Save cheat sheet as te&amp;xt...</source>
+        <translation>将速查表保存为文本(&amp;X)...</translation>
+    </message>
+    <message>
+        <source>&amp;Copy cheat sheet</source>
+        <translation>复制速查表(&amp;C)</translation>
+    </message>
 </context>
 <context>
     <name>FileIconsPage</name>
@@ -397,6 +433,10 @@
     <message>
         <source>Menu and entry dialogs</source>
         <translation>菜单和条目对话框</translation>
+    </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>辅助(&amp;A)</translation>
     </message>
 </context>
 <context>
@@ -524,6 +564,10 @@ and a third one
     <message>
         <source>Shortcuts</source>
         <translation>快捷键</translation>
+    </message>
+    <message>
+        <source>Configure shortcuts in the plain dialog...</source>
+        <translation>在简单对话框中配置快捷键...</translation>
     </message>
 </context>
 <context>

@@ -6,6 +6,8 @@
 #include <QFile>
 #include <QXmlStreamReader>
 
+#include <iterator>
+
 namespace {
 
 QString escaped(QString text)
@@ -14,13 +16,41 @@ QString escaped(QString text)
         .replace(QLatin1Char('\n'), QLatin1String("\\n"));
 }
 
-Message readMessage(QXmlStreamReader *xml, const QString &context)
+// Numbers that take the first, second and third form in all languages that have so many.
+constexpr int Numbers[] = {1, 2, 5};
+
+QStringList readForms(QXmlStreamReader *xml)
 {
+    QStringList forms;
+    while (xml->readNextStartElement())
+        forms.append(xml->readElementText());
+    return forms;
+}
+
+QVector<Message> formsOf(Message message, const QStringList &forms)
+{
+    QVector<Message> messages;
+    for (int i = 0; i < forms.size() && i < int(std::size(Numbers)); ++i) {
+        message.translation = forms.at(i);
+        message.number = Numbers[i];
+        messages.append(message);
+    }
+    return messages;
+}
+
+QVector<Message> readMessage(QXmlStreamReader *xml, const QString &context)
+{
+    const bool hasNumber = xml->attributes().hasAttribute(QLatin1String("numerus"));
+    QStringList forms;
     Message message;
     message.context = context;
     while (xml->readNextStartElement()) {
         if (xml->name() == QLatin1String("translation"))
             message.type = xml->attributes().value(QLatin1String("type")).toString();
+        if (hasNumber && xml->name() == QLatin1String("translation")) {
+            forms = readForms(xml);
+            continue;
+        }
         QString *text = xml->name() == QLatin1String("source") ? &message.source
             : xml->name() == QLatin1String("comment")          ? &message.comment
             : xml->name() == QLatin1String("translation")      ? &message.translation
@@ -30,7 +60,7 @@ Message readMessage(QXmlStreamReader *xml, const QString &context)
         else
             xml->skipCurrentElement();
     }
-    return message;
+    return hasNumber ? formsOf(message, forms) : QVector<Message>{message};
 }
 
 void readContext(QXmlStreamReader *xml, QVector<Message> *messages)
@@ -40,7 +70,7 @@ void readContext(QXmlStreamReader *xml, QVector<Message> *messages)
         if (xml->name() == QLatin1String("name"))
             context = xml->readElementText();
         else if (xml->name() == QLatin1String("message"))
-            messages->append(readMessage(xml, context));
+            *messages += readMessage(xml, context);
         else
             xml->skipCurrentElement();
     }
@@ -84,6 +114,7 @@ QStringList Catalog::lines() const
     QStringList lines;
     for (const Message &message : messages)
         lines.append(message.line());
+    lines.removeDuplicates();
     lines.sort();
     return lines;
 }

@@ -7,7 +7,7 @@
 #include <QStringList>
 #include <QVector>
 
-/// One text of a catalog's source file.
+/// One text of a catalog's source file; a text with a number is there once for each of its forms.
 struct Message
 {
     QString context;
@@ -15,6 +15,7 @@ struct Message
     QString comment;
     QString translation;
     QString type; ///< of the translation; empty when it is finished
+    int number = -1; ///< one that takes this form of the translation; -1 where no number is told
 
     /// The text's line in a list of texts.
     QString line() const;
@@ -29,6 +30,6 @@ struct Catalog
 
     static Catalog read(const QString &path);
 
-    /// The lines of all texts, sorted.
+    /// The lines of all texts, each once, sorted.
     QStringList lines() const;
 };

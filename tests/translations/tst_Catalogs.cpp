@@ -33,8 +33,15 @@ const QVector<QStringList> &together()
         list("&Automatic configuration|&Manual configuration|&Direct connection"),
         list("F&lat buttons|S&ection:|&Font:|&Size:"),
         list("&Press keys:"),
-        list("Edit the &menu...|Edit an e&ntry...|&Pick an entry..."),
-        list("&New|&Open...|&Save...|Insert &date|Insert &time|Insert &rule"),
+        list("Edit the &menu...|Edit an e&ntry...|&Pick an entry...|&Assistance"),
+        list("&New|&Open...|&Save...|Insert &date|Insert &time|Insert &rule|&Export keys...|&Import "
+             "keys...|Save "
+             "cheat sheet as &HTML...|Save cheat sheet as te&xt...|&Copy cheat sheet"),
+        list(
+            "&Export keys...|&Import keys...|Save cheat sheet as &HTML...|Save cheat sheet as &text...|&Copy "
+            "cheat sheet"),
+        list("&Replace|&Skip|&Do the same with all further ones"),
+        list("&Reset this shortcut"),
         list("&Undo|&Redo|Cu&t|&Copy|&Paste|Select &all|Find selected a&gain|Go to &line..."),
         list("Zoom &in|Zoom &out|&Wrap lines|&Fixed-width font|&Proportional font|O&verwrite|&Read only|Wide "
              "cur&sor|"
@@ -256,7 +263,7 @@ void tst_Catalogs::translateWhenCompiled()
     for (const Message &message : Catalog::read(sourcePath(name, language)).messages) {
         QCOMPARE(translator.translate(message.context.toUtf8().constData(),
                                       message.source.toUtf8().constData(),
-                                      message.comment.toUtf8().constData()),
+                                      message.comment.toUtf8().constData(), message.number),
                  message.translation);
     }
 }
