@@ -12,6 +12,7 @@
 #include <QDialogButtonBox>
 #include <QFileSystemModel>
 #include <QItemSelectionModel>
+#include <QKeyEvent>
 #include <QPushButton>
 #include <QSignalSpy>
 
@@ -178,8 +179,13 @@ void tst_VelMenuDialogEnter::takesAHeldKeyOnce()
 {
     openDialog(menu(), 2);
     clickItem(m_folder);
-    XDoTool::run(QStringLiteral("keydown Return sleep 1.2 keyup Return"));
-    QVERIFY(view().isExpanded(shown(view(), m_folder)));
+    // Not by hand: on a busy machine the repetitions of the X server come as further presses.
+    for (const bool isRepetition : {false, true, true}) {
+        QKeyEvent press(QEvent::KeyPress, Qt::Key_Return, Qt::NoModifier, QStringLiteral("\r"), isRepetition);
+        QCoreApplication::sendEvent(&view(), &press);
+        QVERIFY(press.isAccepted());
+        QVERIFY(view().isExpanded(shown(view(), m_folder)));
+    }
     QVERIFY(dialog()->isVisible());
 }
 
