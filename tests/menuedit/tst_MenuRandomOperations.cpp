@@ -345,6 +345,8 @@ int tst_MenuRandomOperations::begin()
         : QRandomGenerator::global()->generate() & 0x7fffffff;
     qInfo("seed %u, %d rounds", seed, rounds);
     m_random.seed(seed);
+    m_step.clear();
+    m_selected.clear();
     build();
     m_view = std::make_unique<VelMenuView>(menu(), -1, true);
     m_view->resize(400, 600);
