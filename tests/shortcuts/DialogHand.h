@@ -32,7 +32,9 @@ public:
     void clickRow(QAbstractItemView *view, const QModelIndex &index) const
     {
         view->scrollTo(index);
-        click(view->viewport(), view->visualRect(index).center());
+        // The other columns may grow when a recording ends.
+        const QRect rect = view->visualRect(index);
+        click(view->viewport(), QPoint(rect.left() + 8, rect.center().y()));
     }
 
     /// Presses a key with its modifiers, as in Qt::CTRL | Qt::Key_J.

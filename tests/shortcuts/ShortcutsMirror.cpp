@@ -3,12 +3,25 @@
 
 #include "ShortcutsMirror.h"
 
+#include <algorithm>
+
 namespace {
 
 QKeySequence sequenceOf(QVector<int> chords)
 {
     chords.resize(4);
     return {chords.at(0), chords.at(1), chords.at(2), chords.at(3)};
+}
+
+// Whether one is the beginning of the other, or the same.
+bool clash(const QKeySequence &left, const QKeySequence &right)
+{
+    const int count = qMin(left.count(), right.count());
+    for (int i = 0; i < count; ++i) {
+        if (left[uint(i)] != right[uint(i)])
+            return false;
+    }
+    return count > 0;
 }
 
 } // namespace
@@ -26,9 +39,10 @@ void ShortcutsMirror::restart()
         action.inForce = it == saved.end() ? action.defaultKey : QKeySequence(it->second);
         action.pending = action.inForce;
     }
-    m_chords.clear();
-    m_isHeld = false;
+    stopRecording();
     m_isChanged = false;
+    m_filter.clear();
+    m_leftRow = -1;
     isVisible = false;
     canRestore = true;
     isDefaultChosen = false;
@@ -72,14 +86,18 @@ void ShortcutsMirror::setPending(const QKeySequence &key)
     showCurrent();
 }
 
-ShortcutsMirror::Messages ShortcutsMirror::refuse(const QKeySequence &key) const
+bool ShortcutsMirror::isGlobal(const QKeySequence &key) const
 {
     const auto global = m_globals.find(key.toString());
-    const bool isBlocked = global != m_globals.end()
+    return global != m_globals.end()
         && !(global->second.startsWith(QLatin1String("VELWM_"))
              && global->second.contains(QLatin1String("_ICON")));
-    if (isBlocked)
-        return {{Message::Global, key.toString(), global->second}};
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::refuse(const QKeySequence &key) const
+{
+    if (isGlobal(key))
+        return {{Message::Global, key.toString(), m_globals.at(key.toString())}};
     for (std::size_t i = 0; i < actions.size(); ++i) {
         if (rowOf(int(i)) == int(i) && actions[i].pending == key)
             return {{Message::Local, key.toString(), actions[i].text}};
@@ -87,13 +105,18 @@ ShortcutsMirror::Messages ShortcutsMirror::refuse(const QKeySequence &key) const
     return {};
 }
 
+void ShortcutsMirror::stopRecording()
+{
+    m_chords.clear();
+    m_isHeld = false;
+}
+
 ShortcutsMirror::Messages ShortcutsMirror::endRecording()
 {
     if (!isRecording())
         return {};
     const QKeySequence key = sequenceOf(m_chords);
-    m_chords.clear();
-    m_isHeld = false;
+    stopRecording();
     if (key == actions[std::size_t(current)].pending)
         return {};
     const Messages messages = refuse(key);
@@ -102,11 +125,22 @@ ShortcutsMirror::Messages ShortcutsMirror::endRecording()
     return messages;
 }
 
+// Assistance keeps a key that would be refused, for as long as the user is about it.
+ShortcutsMirror::Messages ShortcutsMirror::pause()
+{
+    if (hasAssistance && isRecording()) {
+        const QKeySequence key = sequenceOf(m_chords);
+        m_isHeld = key != actions[std::size_t(current)].pending && !refuse(key).empty();
+    }
+    return m_isHeld ? Messages() : endRecording();
+}
+
 ShortcutsMirror::Messages ShortcutsMirror::clickRow(int row)
 {
     const Messages messages = endRecording();
     const bool isOther = row != current;
     current = row;
+    m_leftRow = -1;
     if (isOther)
         showCurrent();
     return messages;
@@ -131,78 +165,14 @@ ShortcutsMirror::Messages ShortcutsMirror::clickCustom()
 ShortcutsMirror::Messages ShortcutsMirror::press(int chord)
 {
     if (m_isHeld)
-        m_chords.clear();
-    m_isHeld = false;
+        stopRecording();
     m_chords.append(chord);
-    return m_chords.size() == 4 ? leaveField() : Messages();
+    return m_chords.size() == 4 ? pause() : Messages();
 }
 
 ShortcutsMirror::Messages ShortcutsMirror::leaveField()
 {
-    return isAssisted ? pauseRecording() : endRecording();
-}
-
-// The user is still about the key: where it would be refused, nothing is decided.
-ShortcutsMirror::Messages ShortcutsMirror::pauseRecording()
-{
-    m_isHeld =
-        isRecording() && shownKey() != actions[std::size_t(current)].pending && !refuse(shownKey()).empty();
-    return m_isHeld ? Messages() : endRecording();
-}
-
-ShortcutsMirror::Messages ShortcutsMirror::clickNone()
-{
-    Messages messages = pauseRecording();
-    m_chords.clear();
-    m_isHeld = false;
-    if (!actions[std::size_t(current)].pending.isEmpty())
-        setPending(QKeySequence());
-    return messages;
-}
-
-bool ShortcutsMirror::clashes(const Action &action, const QString &name, const QKeySequence &key) const
-{
-    return action.name == name && !action.pending.isEmpty()
-        && (action.pending.matches(key) != QKeySequence::NoMatch
-            || key.matches(action.pending) != QKeySequence::NoMatch);
-}
-
-ShortcutsMirror::Messages ShortcutsMirror::goTo(const QString &name)
-{
-    const QKeySequence key = shownKey();
-    Messages messages = pauseRecording();
-    m_chords.clear();
-    m_isHeld = false;
-    current = 0;
-    while (!clashes(actions[std::size_t(current)], name, key))
-        ++current;
-    showCurrent();
-    return messages;
-}
-
-ShortcutsMirror::Messages ShortcutsMirror::takeOver(const QString &name)
-{
-    const QKeySequence key = shownKey();
-    pauseRecording();
-    for (std::size_t i = 0; i < actions.size(); ++i) {
-        if (rowOf(int(i)) == int(i) && clashes(actions[i], name, key))
-            actions[i].pending = QKeySequence();
-    }
-    m_isChanged = true;
-    canRestore = true;
-    return pauseRecording();
-}
-
-QStringList ShortcutsMirror::holders() const
-{
-    QStringList names;
-    for (std::size_t i = 0; current >= 0 && i < actions.size(); ++i) {
-        const Action &action = actions[i];
-        if (rowOf(int(i)) == int(i) && action.name != actions[std::size_t(current)].name
-            && !action.pending.isEmpty() && action.pending == shownKey())
-            names.append(action.name);
-    }
-    return names;
+    return endRecording();
 }
 
 // The button is pressed when the recording ends, and released when it may be disabled again.
@@ -270,16 +240,14 @@ ShortcutsMirror::Messages ShortcutsMirror::done(bool isAccepted)
 
 ShortcutsMirror::Messages ShortcutsMirror::hide()
 {
-    m_chords.clear();
-    m_isHeld = false;
+    stopRecording();
     isVisible = false;
     return {};
 }
 
 void ShortcutsMirror::discard()
 {
-    m_chords.clear();
-    m_isHeld = false;
+    stopRecording();
     for (Action &action : actions)
         action.pending = action.inForce;
     m_isChanged = false;
@@ -292,4 +260,89 @@ void ShortcutsMirror::commit()
         action.inForce = action.pending;
     m_isChanged = false;
     isVisible = false;
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::clickNone()
+{
+    pause();
+    stopRecording();
+    if (!actions[std::size_t(current)].pending.isEmpty())
+        setPending({});
+    return {};
+}
+
+QStringList ShortcutsMirror::holders() const
+{
+    QStringList names;
+    if (current < 0 || isGlobal(shownKey()))
+        return names;
+    const Action &own = actions[std::size_t(current)];
+    for (std::size_t i = 0; i < actions.size(); ++i) {
+        if (rowOf(int(i)) == int(i) && actions[i].name != own.name && clash(actions[i].pending, shownKey()))
+            names.append(actions[i].name);
+    }
+    return names;
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::takeOver(const QString &name)
+{
+    const QKeySequence key = shownKey();
+    pause();
+    for (std::size_t i = 0; i < actions.size(); ++i) {
+        if (actions[i].name == name && rowOf(int(i)) == int(i) && clash(actions[i].pending, key))
+            actions[i].pending = QKeySequence();
+    }
+    m_isChanged = true;
+    canRestore = true;
+    return pause();
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::goTo(const QString &name)
+{
+    const QKeySequence key = shownKey();
+    pause();
+    stopRecording();
+    const auto isOther = [&](const Action &action) {
+        return action.name == name && clash(action.pending, key);
+    };
+    current = int(std::find_if(actions.begin(), actions.end(), isOther) - actions.begin());
+    m_leftRow = -1;
+    showCurrent();
+    return {};
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::takeBack()
+{
+    Action &action = actions[std::size_t(current)];
+    const bool isEdited = action.pending != action.inForce;
+    if (!isEdited && action.pending == action.defaultKey)
+        return {};
+    action.pending = isEdited ? action.inForce : action.defaultKey;
+    m_isChanged = false;
+    for (const Action &each : actions)
+        m_isChanged = m_isChanged || each.pending != each.inForce;
+    canRestore = true;
+    showCurrent();
+    return {};
+}
+
+bool ShortcutsMirror::isSeen(int row) const
+{
+    const Action &action = actions[std::size_t(row)];
+    return action.group.contains(m_filter, Qt::CaseInsensitive)
+        || action.text.contains(m_filter, Qt::CaseInsensitive);
+}
+
+ShortcutsMirror::Messages ShortcutsMirror::setFilter(const QString &text)
+{
+    const Messages messages = endRecording();
+    m_filter = text;
+    if (current >= 0 && !isSeen(current)) {
+        m_leftRow = current;
+        current = -1;
+    } else if (current < 0 && m_leftRow >= 0 && isSeen(m_leftRow)) {
+        current = m_leftRow;
+        showCurrent();
+    }
+    return messages;
 }

@@ -52,14 +52,16 @@ public:
 
     /// Shows the dialog that is hidden.
     void show() { isVisible = true; }
-    /// Clicks on the row of an action, or of a group: -1.
+    /// Clicks on the row of an action; -1 for that of a group.
     Messages clickRow(int row);
     Messages clickDefault();
     Messages clickCustom();
     /// Presses a key in the key field, which has the focus then.
     Messages press(int chord);
-    /// Goes on to another part of the dialog, or waits.
+    /// Goes on to another part of the dialog.
     Messages leaveField();
+    /// Waits until the recording ends, or goes on to what belongs to the key.
+    Messages pause();
     Messages click(Button button);
     /// Closes the window; the answer is the one to the question, if there is one.
     Messages close(Answer answer);
@@ -68,35 +70,46 @@ public:
     Messages done(bool isAccepted);
     Messages hide();
 
-    /// Clicks on what only the assisted dialog has.
+    // With assistance.
     Messages clickNone();
-    Messages goTo(const QString &name);
+    /// Takes the shown key over from the actions of a name.
     Messages takeOver(const QString &name);
-    /// The names of the other shortcuts that have the key that is shown.
+    /// Goes to the first action of a name that clashes with the shown key.
+    Messages goTo(const QString &name);
+    /// The names of the actions that it can be taken over from.
     QStringList holders() const;
+    /// Takes back what was changed of the current action.
+    Messages takeBack();
+    /// Filters by a text that is in names of actions or groups.
+    Messages setFilter(const QString &text);
+    /// The tree made a group current by itself.
+    void forgetLeftRow() { m_leftRow = -1; }
+    bool isSeen(int row) const;
 
-    /// Whether a recorded key waits for what the user decides.
-    bool isHeld() const { return m_isHeld; }
     bool isRecording() const { return !m_chords.isEmpty(); }
+    /// Whether no more chords go into the recording after the next one.
+    bool isNextTheLast() const { return !m_isHeld && m_chords.size() == 3; }
+    /// Whether what was recorded waits for the user.
+    bool isHeld() const { return m_isHeld; }
     bool isOkEnabled() const { return m_isChanged || isRecording(); }
     bool isFieldEnabled() const { return current >= 0 && !isDefaultChosen; }
-    /// What the key field shows, if it is enabled.
+    /// The key that is recorded, or else the pending one of the current action.
     QKeySequence shownKey() const;
     /// The row that an action stands in.
     int rowOf(int action) const;
 
     std::vector<Action> actions;
     std::map<QString, QString> saved;
-    bool isAssisted = false;
     int current = -1; ///< the first action of the row that is current, or -1
     bool isDefaultChosen = false;
     bool canRestore = true;
     bool isVisible = false;
+    bool hasAssistance = false;
 
 private:
     Messages endRecording();
-    Messages pauseRecording();
-    bool clashes(const Action &action, const QString &name, const QKeySequence &key) const;
+    void stopRecording();
+    bool isGlobal(const QKeySequence &key) const;
     Messages refuse(const QKeySequence &key) const;
     void setPending(const QKeySequence &key);
     void discard();
@@ -105,6 +118,8 @@ private:
 
     std::map<QString, QString> m_globals;
     QVector<int> m_chords;
-    bool m_isHeld = false; // a key that would be refused waits in the field
+    bool m_isHeld = false; // what was recorded waits for the user
     bool m_isChanged = false;
+    QString m_filter;
+    int m_leftRow = -1; // was current until the filter hid it
 };
