@@ -11,6 +11,7 @@
 
 #include <QAction>
 #include <QDialogButtonBox>
+#include <QLayout>
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QPushButton>
@@ -67,6 +68,9 @@ void tst_MenuHistoryByHand::init()
     openDialog(startMenu(), 4);
     QVERIFY(open(view(), in("games"), 2));
     dialog()->setAssistance(true);
+    // The lines above and below the tree take their room from it before anything is clicked.
+    dialog()->layout()->activate();
+    QCoreApplication::processEvents();
 }
 
 void tst_MenuHistoryByHand::cleanup()
