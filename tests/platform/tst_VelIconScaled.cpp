@@ -21,6 +21,7 @@ private Q_SLOTS:
     void laysEmblemsInTheirLogicalSize();
     void paintsOnADeviceOfAnotherRatio();
     void tellsTheSizesThatQtTells();
+    void looksAtTheFileForTheScreen();
 
 private:
     QIcon icon() const
@@ -80,6 +81,33 @@ void tst_VelIconScaled::tellsTheSizesThatQtTells()
         QCOMPARE(icon().pixmap(size).size(), qt.pixmap(size).size());
         QCOMPARE(icon().pixmap(size).devicePixelRatio(), qt.pixmap(size).devicePixelRatio());
     }
+}
+
+// The file for this ratio is too large, the one for the other is not.
+void tst_VelIconScaled::looksAtTheFileForTheScreen()
+{
+    write(QStringLiteral("two/index.theme"),
+          "[Icon Theme]\nName=Two\n[16]\nSize=16\nType=Fixed\n[16@2]\nSize=16\nScale=2\nType=Fixed\n");
+    QImage large(4097, 4096, QImage::Format_Mono);
+    large.fill(0);
+    QImage good(16, 16, QImage::Format_RGB32);
+    good.fill(Qt::red);
+    QImage twice(32, 32, QImage::Format_RGB32);
+    twice.fill(Qt::green);
+    for (const char *name : {"16/large.png", "16@2/large.png", "16/good.png", "16@2/good.png"}) {
+        const QByteArray file(name);
+        const QImage &image = file == "16@2/large.png" ? large : file.startsWith("16@") ? twice : good;
+        QVERIFY(image.save(write(QStringLiteral("two/") + QLatin1String(name), QByteArray())));
+    }
+    QIcon::setThemeName(QStringLiteral("two"));
+    QPixmap plain(32, 32);
+    plain.fill(Qt::yellow);
+    const auto shown = [&plain](const char *name) {
+        const QIcon icon = VelIcon::fromTheme(QLatin1String(name), QMap<Qt::Corner, QString>(), QIcon(plain));
+        return icon.pixmap(16).toImage().pixelColor(10, 10);
+    };
+    QCOMPARE(shown("good"), QColor(Qt::green));
+    QCOMPARE(shown("large"), QColor(Qt::yellow));
 }
 
 int main(int argc, char **argv)
