@@ -86,6 +86,8 @@ void tst_VelMenuViewRecreate::leavesTheStartMenuWhenItCannotBeRebuilt()
 {
     write(QStringLiteral("config/startmenu"), "in the way");
     VelMenuView view(QString(), -1, true);
+    QSignalSpy told(&view, &VelMenuView::told);
+    QSignalSpy changes(&view, &VelMenuView::changed);
     ModalDriver modal;
     modal.handle(
         [](QWidget *window) { qobject_cast<QMessageBox *>(window)->button(QMessageBox::Ok)->click(); });
@@ -93,6 +95,10 @@ void tst_VelMenuViewRecreate::leavesTheStartMenuWhenItCannotBeRebuilt()
     view.slotRecreate();
     QVERIFY(modal.finished());
     QVERIFY(!QGuiApplication::overrideCursor());
+    QCOMPARE(told.size(), 1);
+    QVERIFY(told.at(0).at(0).toString().contains(startMenu()));
+    QCOMPARE(told.at(0).at(1).toInt(), 2);
+    QCOMPARE(changes.size(), 1);
     QCOMPARE(read(startMenu()), QByteArray("in the way"));
     QVERIFY(!view.selectedItem().isValid());
     QVERIFY(!view.rootIndex().isValid() || view.model()->rowCount(view.rootIndex()) == 0);
