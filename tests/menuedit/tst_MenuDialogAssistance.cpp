@@ -7,6 +7,8 @@
 #include "VelMenuView.h"
 #include "XDoTool.h"
 
+#include <frame/DesktopEntryRecord.h>
+
 #include <QAccessible>
 #include <QAction>
 #include <QDialogButtonBox>
@@ -45,6 +47,7 @@ private Q_SLOTS:
     void goesFromMatchToMatch();
     void clearsByEscapeAndStaysOpen();
     void showsHiddenEntries();
+    void hidesAnEntryAndShowsItAgain();
     void tellsWhatTheViewTells_data();
     void tellsWhatTheViewTells();
     void tellsWhyTheMenuCannotBeChanged();
@@ -194,6 +197,24 @@ void tst_MenuDialogAssistance::showsHiddenEntries()
     QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AB"));
     XDoTool::click(button);
     QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("A"));
+}
+
+void tst_MenuDialogAssistance::hidesAnEntryAndShowsItAgain()
+{
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    openAssisted(1);
+    for (const bool isToBeHidden : {true, false}) {
+        clickItem(a);
+        ModalDriver modal;
+        pickInDropMenu(modal, isToBeHidden ? QStringLiteral("Hide") : QStringLiteral("Show again"));
+        XDoTool::press(QStringLiteral("Menu"));
+        QTRY_VERIFY(modal.finished());
+        QTRY_COMPARE(VelUIDesktopEntry(a).getNoDisplay(), isToBeHidden);
+        QTRY_COMPARE(shown(view(), a).data(Qt::ForegroundRole).isValid(), isToBeHidden);
+        QCOMPARE(message()->text(),
+                 isToBeHidden ? QStringLiteral("A is hidden: the menu no longer shows it.")
+                              : QStringLiteral("The menu shows A again."));
+    }
 }
 
 void tst_MenuDialogAssistance::tellsWhatTheViewTells_data()
