@@ -66,11 +66,13 @@ bool ItemTransfer::paste(VelMenuModel &files, const QModelIndex &selected, Clipb
     return true;
 }
 
-Qt::DropAction ItemTransfer::askForDropAction(QWidget *view, const QPoint &position)
+Qt::DropAction ItemTransfer::askForDropAction(QWidget *view, const QPoint &position, Qt::DropActions possible)
 {
     const QPointer<QMenu> menu(new QMenu(view));
-    const QAction *move = menu->addAction(QCoreApplication::translate("VelMenuView", "Move"));
-    const QAction *copy = menu->addAction(QCoreApplication::translate("VelMenuView", "Copy"));
+    QAction *const move = menu->addAction(QCoreApplication::translate("VelMenuView", "Move"));
+    move->setEnabled(possible & Qt::MoveAction);
+    QAction *const copy = menu->addAction(QCoreApplication::translate("VelMenuView", "Copy"));
+    copy->setEnabled(possible & Qt::CopyAction);
     menu->addSeparator();
     menu->addAction(QIcon::fromTheme(QStringLiteral("dialog-cancel")),
                     QCoreApplication::translate("VelMenuView", "Cancel"));

@@ -31,8 +31,8 @@ void put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction acti
  */
 bool paste(VelMenuModel &files, const QModelIndex &item, ClipboardContents *contents, MenuVoice &voice);
 
-/// Asks in a menu at the global \a position what is to be done with dropped files;
-/// Qt::IgnoreAction for nothing. The \a view may go away meanwhile.
-Qt::DropAction askForDropAction(QWidget *view, const QPoint &position);
+/// Asks in a menu at the global \a position which of the \a possible actions is to be done with
+/// dropped files; Qt::IgnoreAction for nothing. The \a view may go away meanwhile.
+Qt::DropAction askForDropAction(QWidget *view, const QPoint &position, Qt::DropActions possible);
 
 } // namespace ItemTransfer

@@ -240,6 +240,11 @@ QList<QUrl> VelMenuView::dndUrls(const QMimeData *mimeData, const QString &forma
 
 void VelMenuView::keyPressEvent(QKeyEvent *event)
 {
+    // The base copies the name of the item that the keyboard is on, whether or not it is selected.
+    if (event->matches(QKeySequence::Copy) && (d->menu.isEditable() || !selectedItem().isValid())) {
+        event->ignore();
+        return;
+    }
     const QPointer<VelMenuView> self(this);
     QTreeView::keyPressEvent(event);
     // What the base ignores would go on to the default button of a dialog.
@@ -250,8 +255,8 @@ void VelMenuView::keyPressEvent(QKeyEvent *event)
 void VelMenuView::dropEvent(QDropEvent *event)
 {
     const QPointer<VelMenuView> self(this);
-    const Qt::DropAction action =
-        ItemTransfer::askForDropAction(this, viewport()->mapToGlobal(event->posF().toPoint()));
+    const Qt::DropAction action = ItemTransfer::askForDropAction(
+        this, viewport()->mapToGlobal(event->posF().toPoint()), event->possibleActions());
     if (!self)
         return;
     event->setDropAction(action);

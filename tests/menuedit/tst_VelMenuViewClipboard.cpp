@@ -20,6 +20,7 @@ private Q_SLOTS:
     void emptiesTheClipboardForNoItem();
     void cutsAndCopiesTheSelectedItem();
     void leavesTheClipboardWithoutASelection();
+    void leavesTheClipboardToAKeyWithoutASelection();
     void tellsTheFormat_data();
     void tellsTheFormat();
     void decodesLists_data();
@@ -85,6 +86,22 @@ void tst_VelMenuViewClipboard::leavesTheClipboardWithoutASelection()
     view.slotCopy();
     view.slotPaste();
     QCOMPARE(QGuiApplication::clipboard()->text(), QStringLiteral("text"));
+}
+
+// The keyboard stays on the item that was selected last.
+void tst_VelMenuViewClipboard::leavesTheClipboardToAKeyWithoutASelection()
+{
+    for (const bool isEditable : {true, false}) {
+        VelMenuView view(menu(), -1, isEditable);
+        view.show();
+        QVERIFY(open(view, menu(), 2));
+        select(view, m_a);
+        view.clearSelection();
+        QVERIFY(view.currentIndex().isValid());
+        QGuiApplication::clipboard()->setText(QStringLiteral("text"));
+        QTest::keyClick(&view, Qt::Key_C, Qt::ControlModifier);
+        QCOMPARE(QGuiApplication::clipboard()->text(), QStringLiteral("text"));
+    }
 }
 
 void tst_VelMenuViewClipboard::tellsTheFormat_data()

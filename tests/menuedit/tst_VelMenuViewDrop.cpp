@@ -22,7 +22,8 @@ private Q_SLOTS:
     void asksWhatToDoWithADrop();
     void listsADropBetweenTwoRowsThere();
     void tellsTheSourceWhatWasDone();
-    void keepsToWhatTheSourceAllows();
+    void offersWhatTheSourceAllows_data();
+    void offersWhatTheSourceAllows();
     void offersTheChoiceAtTheDrop();
     void goesAwayWhileItAsksWhatToDo();
     void removesNothingAfterADrag();
@@ -134,15 +135,46 @@ void tst_VelMenuViewDrop::tellsTheSourceWhatWasDone()
     QCOMPARE(m_told, Qt::MoveAction);
 }
 
-void tst_VelMenuViewDrop::keepsToWhatTheSourceAllows()
+void tst_VelMenuViewDrop::offersWhatTheSourceAllows_data()
 {
+    QTest::addColumn<int>("allowed");
+    QTest::addColumn<QStringList>("enabled");
+    QTest::newRow("all") << int(Qt::CopyAction | Qt::MoveAction | Qt::LinkAction)
+                         << QStringList{QStringLiteral("Move"), QStringLiteral("Copy"),
+                                        QStringLiteral("Cancel")};
+    QTest::newRow("copy") << int(Qt::CopyAction)
+                          << QStringList{QStringLiteral("Copy"), QStringLiteral("Cancel")};
+    QTest::newRow("move") << int(Qt::MoveAction)
+                          << QStringList{QStringLiteral("Move"), QStringLiteral("Cancel")};
+    QTest::newRow("link") << int(Qt::LinkAction) << QStringList{QStringLiteral("Cancel")};
+}
+
+void tst_VelMenuViewDrop::offersWhatTheSourceAllows()
+{
+    QFETCH(int, allowed);
+    QFETCH(QStringList, enabled);
     VelMenuView view(menu(), -1, true);
     view.show();
     QVERIFY(QTest::qWaitForWindowExposed(&view));
     QVERIFY(open(view, menu(), 2));
-    dropOn(view, m_a, m_sub, QStringLiteral("Move"), Qt::CopyAction);
+    QMimeData data;
+    data.setUrls({QUrl::fromLocalFile(m_a)});
+    QDropEvent event(view.visualRect(shown(view, m_sub)).center(), Qt::DropActions(allowed), &data,
+                     Qt::LeftButton, Qt::NoModifier);
+    ModalDriver modal;
+    QStringList found;
+    modal.handle([&found](QWidget *window) {
+        const QList<QAction *> actions = window->actions();
+        for (const QAction *one : actions) {
+            if (!one->isSeparator() && one->isEnabled())
+                found.append(one->text());
+        }
+        QTest::keyClick(window, Qt::Key_Escape);
+    });
+    view.dropEvent(&event);
+    QVERIFY(modal.finished());
+    QCOMPARE(found, enabled);
     QVERIFY(QFile::exists(m_a));
-    QCOMPARE(m_told, Qt::CopyAction);
 }
 
 void tst_VelMenuViewDrop::offersTheChoiceAtTheDrop()
