@@ -4,7 +4,7 @@
 #include "MenuEditing.h"
 
 #include "EntryDisplay.h"
-#include "FileProgress.h"
+#include "FileWork.h"
 #include "MenuFind.h"
 #include "MenuHistory.h"
 #include "MenuSelection.h"
@@ -39,6 +39,14 @@ QString takeBack(const QString &path, FreeName::Kind kind)
     if (!isEntry)
         QDir().rmdir(path);
     return isGone ? QString() : record.errorString();
+}
+
+// Removes the item, with a window that tells when it takes long.
+TreeRemoval::Result removeTree(QWidget *view, const QString &path)
+{
+    FileWork work(view, QCoreApplication::translate("VelMenuView", "Delete"),
+                  QCoreApplication::translate("VelMenuView", "Deleting files..."));
+    return TreeRemoval::remove(QFile::encodeName(path).toStdString(), work);
 }
 
 } // namespace
@@ -194,13 +202,21 @@ void MenuEditing::remove(const QString &path)
         QMessageBox::Yes | QMessageBox::No, QMessageBox::Yes);
     if (!self || answer != QMessageBox::Yes)
         return;
-    FileProgress nobody;
-    const TreeRemoval::Result result = TreeRemoval::remove(QFile::encodeName(path).toStdString(), nobody);
+    const TreeRemoval::Result result = removeTree(m_view, path);
+    if (!self)
+        return;
     m_menu.files().forgetItemInfo(path);
     m_find.clear();
     m_selection.leave(path);
     Q_EMIT changed();
-    if (self && !result.succeeded())
+    if (self && result.error == std::errc::operation_canceled)
+        m_voice.tell(
+            QCoreApplication::translate("VelMenuView",
+                                        "The deletion of %1 was canceled. What was not yet deleted is "
+                                        "still there.")
+                .arg(path),
+            MenuVoice::Warning, m_selection.shown(path));
+    else if (self && !result.succeeded())
         tellWhatStays(path, QFile::decodeName(result.path.c_str()),
                       QString::fromLocal8Bit(result.error.message().c_str()));
 }

@@ -11,6 +11,7 @@
 #include <QAction>
 #include <QApplication>
 #include <QClipboard>
+#include <QMessageBox>
 #include <QMimeData>
 #include <QProgressDialog>
 #include <QPushButton>
@@ -20,6 +21,7 @@
 #include <atomic>
 #include <functional>
 
+#include <sys/syscall.h>
 #include <unistd.h>
 
 namespace {
@@ -57,6 +59,12 @@ extern "C" int fsync(int)
     return 0;
 }
 
+extern "C" int unlinkat(int folder, const char *name, int flags) noexcept
+{
+    usleep(SlowDisk::s_delay);
+    return int(syscall(SYS_unlinkat, folder, name, flags));
+}
+
 /// Pastes of thousands of files, and what a person can do meanwhile.
 class tst_LongTransfers : public HandsOnTestCase
 {
@@ -72,12 +80,15 @@ private Q_SLOTS:
     void leavesNothingWhenItsViewGoes_data();
     void leavesNothingWhenItsViewGoes();
     void leavesTheWindowAlive();
+    void endsADeletionWhenItIsCanceled();
+    void survivesItsViewWhileItDeletes();
 
 private:
     void put(const QString &folder, bool asFiles, bool isCut);
     static void whenInSight(QObject *context, const std::function<void(QProgressDialog *)> &act);
     QString source(bool isElsewhere);
     void paste();
+    void answerTheQuestion();
 
     QString m_sub;
     std::unique_ptr<QTemporaryDir> m_other;
@@ -135,7 +146,7 @@ void tst_LongTransfers::whenInSight(QObject *context, const std::function<void(Q
     auto *timer = new QTimer(context);
     connect(timer, &QTimer::timeout, context, [timer, act] {
         QProgressDialog *const window = progressWindow();
-        if (!window || window->value() <= 0 || !window->isActiveWindow())
+        if (!window || (window->maximum() > 0 && window->value() <= 0) || !window->isActiveWindow())
             return;
         timer->stop();
         act(window);
@@ -148,6 +159,20 @@ void tst_LongTransfers::paste()
     clickItem(m_sub);
     QTRY_VERIFY(action(view(), QStringLiteral("pasteAction"))->isEnabled());
     XDoTool::press(QStringLiteral("ctrl+v"));
+}
+
+// Before a deletion.
+void tst_LongTransfers::answerTheQuestion()
+{
+    auto *timer = new QTimer(this);
+    connect(timer, &QTimer::timeout, timer, [timer] {
+        auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
+        if (!box)
+            return;
+        timer->deleteLater();
+        box->button(QMessageBox::Yes)->click();
+    });
+    timer->start(10);
 }
 
 void tst_LongTransfers::showsHowFarItIs()
@@ -263,6 +288,51 @@ void tst_LongTransfers::leavesTheWindowAlive()
     qInfo("%d files: the window stood still for %lld ms at most", Files,
           static_cast<long long>(freeze.longest()));
     QVERIFY(freeze.longest() < 2000);
+}
+
+void tst_LongTransfers::endsADeletionWhenItIsCanceled()
+{
+    const QString big = source(false);
+    QVERIFY(QDir().rename(big, m_sub + QStringLiteral("/big")));
+    openDialog(menu(), 2);
+    clickItem(m_sub);
+    QSignalSpy told(&view(), &VelMenuView::told);
+    const SlowDisk slow;
+    answerTheQuestion();
+    bool wasCanceled = false;
+    whenInSight(&view(), [&](QProgressDialog *window) {
+        QCOMPARE(window->labelText(), QStringLiteral("Deleting files..."));
+        wasCanceled = true;
+        XDoTool::press(QStringLiteral("Escape"));
+    });
+    XDoTool::press(QStringLiteral("Delete"));
+    QTRY_COMPARE_WITH_TIMEOUT(told.count(), 1, 30000);
+    QVERIFY(wasCanceled);
+    QCOMPARE(told.constFirst().at(0).toString(),
+             QStringLiteral("The deletion of %1 was canceled. What was not yet deleted is still there.")
+                 .arg(m_sub));
+    const int left = everythingIn(m_sub).size();
+    QVERIFY2(left > 0 && left < Files, qPrintable(QString::number(left)));
+}
+
+void tst_LongTransfers::survivesItsViewWhileItDeletes()
+{
+    const QString big = source(false);
+    QVERIFY(QDir().rename(big, m_sub + QStringLiteral("/big")));
+    openDialog(menu(), 2);
+    clickItem(m_sub);
+    bool isGone = false;
+    QObject context;
+    whenInSight(&context, [&](QProgressDialog *) {
+        closeDialog();
+        isGone = true;
+    });
+    const SlowDisk slow;
+    answerTheQuestion();
+    view().slotDel();
+    QVERIFY(isGone);
+    QVERIFY(!progressWindow());
+    QVERIFY(!QGuiApplication::overrideCursor());
 }
 
 VEL_TEST_MAIN(tst_LongTransfers)
