@@ -22,6 +22,10 @@ TreeAssistance::TreeAssistance(ShortcutsTreeView *view, ShortcutsModel *shortcut
     m_keyColumn = std::make_unique<KeyColumn>(m_view);
     connect(m_delegate.get(), &ShortcutDelegate::resetRequested, this, &TreeAssistance::reset);
     addResetAction();
+    // The name of a changed row stands out, too, and the view paints the cell of the key alone.
+    if (m_model)
+        connect(m_model, &QAbstractItemModel::dataChanged, m_delegate.get(),
+                [this](const QModelIndex &topLeft) { m_view->update(topLeft.siblingAtColumn(0)); });
 }
 
 TreeAssistance::~TreeAssistance()

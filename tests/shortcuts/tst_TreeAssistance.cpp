@@ -34,6 +34,7 @@ private Q_SLOTS:
     void cutsARememberedSizeToTheScreen();
     void leavesAPlainDialogItsSize();
     void showsFurtherKeys();
+    void paintsTheNameOfAChangedRowAnew();
     void takesAnEditBackWithItsButton();
     void takesAnOlderChangeBackToTheDefaultKey();
     void takesNothingBackFromBesideTheButton();
@@ -175,6 +176,29 @@ void tst_TreeAssistance::showsFurtherKeys()
     m_model->resetShortcuts();
     QTRY_VERIFY(tree()->columnWidth(1) > before);
     QCOMPARE(m_model->data(row("paste").siblingAtColumn(1)).toString(), str("Ctrl+V"));
+}
+
+void tst_TreeAssistance::paintsTheNameOfAChangedRowAnew()
+{
+    const auto isShownAsItIs = [this] {
+        const QRect name = tree()->visualRect(row("open"));
+        const QPoint place = tree()->viewport()->mapTo(m_dialog.get(), name.topLeft());
+        const QPixmap shown = m_dialog->screen()->grabWindow(m_dialog->winId(), place.x(), place.y(),
+                                                             name.width(), name.height());
+        return shown.toImage() == tree()->viewport()->grab(name).toImage();
+    };
+    // What comes changes neither the height of the row nor the width of the columns.
+    QPixmap icon(24, 24);
+    icon.fill(Qt::red);
+    tree()->setIconSize(icon.size());
+    open->setIcon(icon);
+    m_model->setKeySequence(row("copy"), QKeySequence(str("Ctrl+K, Ctrl+Alt+Shift+F12")));
+    tree()->doItemsLayout();
+    QCoreApplication::processEvents();
+    tree()->viewport()->repaint();
+    QTRY_VERIFY(isShownAsItIs());
+    m_model->setKeySequence(row("open"), f9);
+    QTRY_VERIFY(isShownAsItIs());
 }
 
 void tst_TreeAssistance::takesAnEditBackWithItsButton()
