@@ -23,14 +23,16 @@ const IShortcutObject *ShortcutRows::at(const ShortcutsModel &model, const QMode
     return model.isShortcutItem(index) ? model.firstObject(index) : nullptr;
 }
 
+// Also those that share a row with another one: they take part in what is reset and committed.
 bool ShortcutRows::isAnyEdited(const ShortcutsModel &model)
 {
     for (int group = 0; group < model.rowCount(); ++group) {
-        const auto objects = ofGroup(model, group);
-        if (std::any_of(objects.begin(), objects.end(), [](const IShortcutObject *object) {
-                return object && ShortcutChange::isEdited(*object);
-            }))
-            return true;
+        const ShortcutsModel::Group &names = model.m_groups.at(group);
+        for (const ShortcutsModel::Objects &objects : names) {
+            if (std::any_of(objects.begin(), objects.end(),
+                            [](const IShortcutObject *object) { return ShortcutChange::isEdited(*object); }))
+                return true;
+        }
     }
     return false;
 }

@@ -19,6 +19,7 @@ private Q_SLOTS:
     void areEmptyWhenTheirShortcutIsGone();
     void areFoundByTheirIndex();
     void findsAnEditAnywhere();
+    void findsAnEditOfOneThatSharesARow();
     void findsNoEditInAModelOfGoneShortcuts();
 
 private:
@@ -99,6 +100,16 @@ void tst_ShortcutRows::findsAnEditAnywhere()
     QVERIFY(ShortcutRows::isAnyEdited(model));
     copy->apply();
     QVERIFY(!ShortcutRows::isAnyEdited(model));
+}
+
+void tst_ShortcutRows::findsAnEditOfOneThatSharesARow()
+{
+    ShortcutsModel model(nullptr, QString());
+    model.registerShortcutObject(new KeyTestObject(QStringLiteral("copy"), QStringLiteral("Edit")));
+    auto *twin = new KeyTestObject(QStringLiteral("copy"), QStringLiteral("Edit"));
+    model.registerShortcutObject(twin);
+    twin->setKeySequence(QKeySequence(Qt::Key_F9));
+    QVERIFY(ShortcutRows::isAnyEdited(model));
 }
 
 void tst_ShortcutRows::findsNoEditInAModelOfGoneShortcuts()
