@@ -104,6 +104,16 @@ QRect ShortcutDelegate::buttonRect(const QStyleOptionViewItem &option, const QMo
     return m_view->style()->subElementRect(QStyle::SE_ItemViewItemDecoration, &cell, m_view);
 }
 
+// Styles give a decoration a margin, but a row is not to become higher when it gets its button.
+QSize ShortcutDelegate::sizeHint(const QStyleOptionViewItem &option, const QModelIndex &index) const
+{
+    const QSize size = QStyledItemDelegate::sizeHint(option, index);
+    if (index.column() != 1)
+        return size;
+    const QSize name = QStyledItemDelegate::sizeHint(option, index.siblingAtColumn(0));
+    return {size.width(), name.height()};
+}
+
 void ShortcutDelegate::paint(QPainter *painter, const QStyleOptionViewItem &option,
                              const QModelIndex &index) const
 {

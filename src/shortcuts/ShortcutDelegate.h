@@ -24,6 +24,7 @@ public:
     explicit ShortcutDelegate(QAbstractItemView *view);
     ~ShortcutDelegate() override;
 
+    QSize sizeHint(const QStyleOptionViewItem &option, const QModelIndex &index) const override;
     void paint(QPainter *painter, const QStyleOptionViewItem &option,
                const QModelIndex &index) const override;
     bool helpEvent(QHelpEvent *event, QAbstractItemView *view, const QStyleOptionViewItem &option,

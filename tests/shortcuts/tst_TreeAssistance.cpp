@@ -34,6 +34,7 @@ private Q_SLOTS:
     void cutsARememberedSizeToTheScreen();
     void leavesAPlainDialogItsSize();
     void showsFurtherKeys();
+    void keepsTheHeightOfAChangedRow();
     void paintsTheNameOfAChangedRowAnew();
     void takesAnEditBackWithItsButton();
     void takesAnOlderChangeBackToTheDefaultKey();
@@ -176,6 +177,14 @@ void tst_TreeAssistance::showsFurtherKeys()
     m_model->resetShortcuts();
     QTRY_VERIFY(tree()->columnWidth(1) > before);
     QCOMPARE(m_model->data(row("paste").siblingAtColumn(1)).toString(), str("Ctrl+V"));
+}
+
+void tst_TreeAssistance::keepsTheHeightOfAChangedRow()
+{
+    const int height = tree()->visualRect(row("open")).height();
+    m_model->setKeySequence(row("open"), f9);
+    tree()->doItemsLayout();
+    QCOMPARE(tree()->visualRect(row("open")).height(), height);
 }
 
 void tst_TreeAssistance::paintsTheNameOfAChangedRowAnew()
