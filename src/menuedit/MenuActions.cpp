@@ -121,6 +121,12 @@ void MenuActions::add(QWidget *view, Action which)
     m_actions[which] = action;
 }
 
+void MenuActions::setMovedByKeys(bool moved)
+{
+    action(Up)->setShortcut(moved ? QKeySequence(QStringLiteral("Alt+Up")) : QKeySequence());
+    action(Down)->setShortcut(moved ? QKeySequence(QStringLiteral("Alt+Down")) : QKeySequence());
+}
+
 void MenuActions::enable(Action which, bool isEnabled)
 {
     m_actions.at(which)->setEnabled(isEnabled);

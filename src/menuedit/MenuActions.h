@@ -51,6 +51,9 @@ public:
     /// Null for what is not offered.
     QAction *action(Action which) const { return m_actions.at(which); }
 
+    /// Whether Up and Down have keys of their own.
+    void setMovedByKeys(bool moved);
+
     /// What of the clipboard Paste depends on.
     ClipboardContents &clipboard() { return m_clipboard; }
 

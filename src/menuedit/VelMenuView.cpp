@@ -245,6 +245,11 @@ void VelMenuView::keyPressEvent(QKeyEvent *event)
         event->ignore();
         return;
     }
+    // At the end of its folder an item stays selected: the next press would move another one.
+    if (d->isKeyToMove(*event)) {
+        event->accept();
+        return;
+    }
     const QPointer<VelMenuView> self(this);
     QTreeView::keyPressEvent(event);
     // What the base ignores would go on to the default button of a dialog.

@@ -179,6 +179,12 @@ bool VelMenuViewPrivate::takeKey(const QKeyEvent &event)
     return true;
 }
 
+bool VelMenuViewPrivate::isKeyToMove(const QKeyEvent &event) const
+{
+    return isAssisted && actions && (event.modifiers() & ~Qt::KeypadModifier) == Qt::AltModifier
+        && (event.key() == Qt::Key_Up || event.key() == Qt::Key_Down);
+}
+
 void VelMenuViewPrivate::editCurrent()
 {
     if (!q->selectionModel()->isSelected(q->currentIndex()))
@@ -197,8 +203,10 @@ void VelMenuViewPrivate::editCurrent()
 void VelMenuViewPrivate::setAssistedTree(bool assisted)
 {
     menu.setAssisted(assisted);
-    if (actions)
+    if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);
+        actions->setMovedByKeys(assisted);
+    }
     if (assisted)
         return;
     filter.setText(QString());

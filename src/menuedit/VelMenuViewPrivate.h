@@ -73,6 +73,9 @@ public:
     void setHiddenShown(bool isShown);
     /// Does what a key does to the item that the keyboard is on; whether it does anything.
     bool takeKey(const QKeyEvent &event);
+    /// Whether \a event is a key to move an item with, which means nothing else even when there is
+    /// nothing to move.
+    bool isKeyToMove(const QKeyEvent &event) const;
 
 private:
     void setAssistedTree(bool assisted);

@@ -1,0 +1,76 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "HandsOnTestCase.h"
+#include "VelMenuDialog.h"
+#include "VelMenuView.h"
+#include "XDoTool.h"
+
+#include <QAction>
+#include <QLayout>
+
+/// What makes the work with a menu easier while there is assistance, by hand.
+class tst_MenuComfortByHand : public HandsOnTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void movesItemsByKeys();
+    void leavesTheKeysAloneWithoutAssistance();
+
+private:
+    void openAssisted(int count);
+    QString in(const char *file) const { return menu() + QLatin1Char('/') + QLatin1String(file); }
+    QString rows(const QString &folder) { return names(view(), folder).join(QLatin1Char(' ')); }
+};
+
+void tst_MenuComfortByHand::openAssisted(int count)
+{
+    openDialog(menu(), count);
+    dialog()->setAssistance(true);
+    dialog()->layout()->activate();
+    QCoreApplication::processEvents();
+    view().setFocus();
+}
+
+void tst_MenuComfortByHand::movesItemsByKeys()
+{
+    writeFolder(QString(), QStringLiteral("Menu"), "sub;");
+    writeFolder(QStringLiteral("sub"), QStringLiteral("Sub"), "a.desktop;b.desktop;c.desktop;");
+    for (const char *name : {"a", "b", "c"})
+        writeEntry(QStringLiteral("sub/%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    openAssisted(1);
+    QVERIFY(open(view(), in("sub"), 3));
+    view().expand(shown(view(), in("sub")));
+    clickItem(in("sub/b.desktop"));
+    XDoTool::press(QStringLiteral("alt+Up"));
+    QTRY_COMPARE(rows(in("sub")), QStringLiteral("b a c"));
+    // There it stays, and stays selected.
+    XDoTool::press(QStringLiteral("alt+Up"));
+    XDoTool::press(QStringLiteral("alt+Down"));
+    QTRY_COMPARE(rows(in("sub")), QStringLiteral("a b c"));
+    XDoTool::press(QStringLiteral("alt+Down"));
+    QTRY_COMPARE(rows(in("sub")), QStringLiteral("a c b"));
+    QCOMPARE(view().selectedPath(), in("sub/b.desktop"));
+    XDoTool::press(QStringLiteral("ctrl+z"));
+    QTRY_COMPARE(rows(in("sub")), QStringLiteral("a b c"));
+}
+
+void tst_MenuComfortByHand::leavesTheKeysAloneWithoutAssistance()
+{
+    for (const char *name : {"a", "b"})
+        writeEntry(QStringLiteral("%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    openAssisted(2);
+    dialog()->setAssistance(false);
+    dialog()->layout()->activate();
+    QCoreApplication::processEvents();
+    for (const char *name : {"upAction", "downAction"})
+        QVERIFY(action(view(), QLatin1String(name))->shortcut().isEmpty());
+    clickItem(in("b.desktop"));
+    XDoTool::press(QStringLiteral("alt+Up"));
+    QTRY_COMPARE(view().selectedPath(), in("a.desktop"));
+    QCOMPARE(rows(menu()), QStringLiteral("a b"));
+}
+
+VEL_TEST_MAIN(tst_MenuComfortByHand)
+#include "tst_MenuComfortByHand.moc"
