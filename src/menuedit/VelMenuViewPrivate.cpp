@@ -34,6 +34,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , hiding(menu, selection, find, voice, history)
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
+    , reloading(view, menu, selection, [this] { showAnew(); })
     , m_rootWatch(menu.directory())
 {
 }
@@ -203,6 +204,7 @@ void VelMenuViewPrivate::editCurrent()
 void VelMenuViewPrivate::setAssistedTree(bool assisted)
 {
     menu.setAssisted(assisted);
+    reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);
         actions->setMovedByKeys(assisted);

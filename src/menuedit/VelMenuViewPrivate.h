@@ -10,6 +10,7 @@
 #include "MenuFind.h"
 #include "MenuHiding.h"
 #include "MenuHistory.h"
+#include "MenuReload.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
 #include "RootWatch.h"
@@ -54,6 +55,7 @@ public:
     MenuHiding hiding;
     MenuEditing editing;
     MenuDeletion deletion;
+    MenuReload reloading;
     /// Null where the view is only to be looked at.
     std::unique_ptr<MenuActions> actions;
     /// The line under the commands of the history in the menu of the actions.

@@ -17,6 +17,7 @@ class tst_MenuComfortByHand : public HandsOnTestCase
 private Q_SLOTS:
     void movesItemsByKeys();
     void leavesTheKeysAloneWithoutAssistance();
+    void readsTheMenuAnew();
 
 private:
     void openAssisted(int count);
@@ -70,6 +71,38 @@ void tst_MenuComfortByHand::leavesTheKeysAloneWithoutAssistance()
     XDoTool::press(QStringLiteral("alt+Up"));
     QTRY_COMPARE(view().selectedPath(), in("a.desktop"));
     QCOMPARE(rows(menu()), QStringLiteral("a b"));
+}
+
+void tst_MenuComfortByHand::readsTheMenuAnew()
+{
+    writeFolder(QStringLiteral("sub"), QStringLiteral("Sub"), "a.desktop;b.desktop;");
+    writeFolder(QStringLiteral("sub/inner"), QStringLiteral("Inner"), "");
+    writeEntry(QStringLiteral("sub/inner/x.desktop"), QStringLiteral("x"));
+    for (const char *name : {"a", "b", "c"})
+        writeEntry(QStringLiteral("sub/%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    openAssisted(1);
+    for (const char *folder : {"sub", "sub/inner"})
+        view().expand(shown(view(), in(folder)));
+    QVERIFY(open(view(), in("sub"), 4));
+    QVERIFY(open(view(), in("sub/inner"), 1));
+    clickItem(in("sub/inner/x.desktop"));
+    QCOMPARE(rows(in("sub")), QStringLiteral("a b Inner c"));
+    // Written into the files that are there, which nobody is told of.
+    writeFolder(QStringLiteral("sub"), QStringLiteral("Other"), "c.desktop;inner;");
+    writeEntry(QStringLiteral("sub/a.desktop"), QStringLiteral("new"));
+    writeEntry(QStringLiteral("sub/b.desktop"), QStringLiteral("b"), "Exec=true\nHidden=true\n");
+
+    XDoTool::press(QStringLiteral("F5"));
+
+    QTRY_COMPARE(rows(in("sub")), QStringLiteral("c Inner new"));
+    QCOMPARE(rows(menu()), QStringLiteral("Other"));
+    QTRY_COMPARE(rows(in("sub/inner")), QStringLiteral("x"));
+    for (const char *folder : {"sub", "sub/inner"})
+        QVERIFY(view().isExpanded(shown(view(), in(folder))));
+    QCOMPARE(view().selectedPath(), in("sub/inner/x.desktop"));
+    QCOMPARE(view().currentIndex(), shown(view(), in("sub/inner/x.desktop")));
+    dialog()->setAssistance(false);
+    QVERIFY(!action(view(), QStringLiteral("reloadAction")));
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)
