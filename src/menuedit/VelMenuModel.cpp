@@ -3,6 +3,7 @@
 
 #include "VelMenuModel.h"
 
+#include "DimmedIcon.h"
 #include "EntryDisplay.h"
 #include "FolderWatch.h"
 #include "MenuClipboard.h"
@@ -100,11 +101,8 @@ QVariant VelMenuModel::data(const QModelIndex &index, int role) const
             return markOf(index, role);
         if (m_isAssisted && (role == Qt::ToolTipRole || role == Qt::AccessibleDescriptionRole))
             return explanation(index, role);
-        if (role == Qt::DecorationRole && m_cache->hasEditedIcons()) {
-            const std::optional<QIcon> icon = m_cache->editedIcon(pathOf(index));
-            if (icon)
-                return *icon;
-        }
+        if (role == Qt::DecorationRole)
+            return iconOf(index);
     }
     return QFileSystemModel::data(index, role);
 }
@@ -268,11 +266,13 @@ QVariant VelMenuModel::displayName(const QModelIndex &index) const
     return name.isEmpty() && m_isAssisted ? QFileSystemModel::data(index, Qt::DisplayRole) : name;
 }
 
-// Gray stands for what the menu does not show, slanted for what has no name of its own.
+// Gray stands for what the menu does not show or is about to lose, slanted for what has no name of
+// its own.
 QVariant VelMenuModel::markOf(const QModelIndex &index, int role) const
 {
-    const EntryState::Kind state = m_cache->display(pathOf(index)).value_or(RowCache::Display()).state;
-    if (role == Qt::ForegroundRole && EntryState::isOutsideMenu(state))
+    const QString path = pathOf(index);
+    const EntryState::Kind state = m_cache->display(path).value_or(RowCache::Display()).state;
+    if (role == Qt::ForegroundRole && (EntryState::isOutsideMenu(state) || m_cut.contains(path)))
         return grayText();
     if (role == Qt::FontRole && state != EntryState::Kind::Shown && !EntryState::isOutsideMenu(state)) {
         QFont font;
@@ -282,13 +282,27 @@ QVariant VelMenuModel::markOf(const QModelIndex &index, int role) const
     return {};
 }
 
+QVariant VelMenuModel::iconOf(const QModelIndex &index) const
+{
+    QVariant icon;
+    if (m_cache->hasEditedIcons()) {
+        if (const std::optional<QIcon> edited = m_cache->editedIcon(pathOf(index)))
+            icon = *edited;
+    }
+    if (icon.isNull())
+        icon = QFileSystemModel::data(index, Qt::DecorationRole);
+    return m_cut.isEmpty() || !m_cut.contains(pathOf(index)) ? icon : DimmedIcon::of(icon.value<QIcon>());
+}
+
 QVariant VelMenuModel::explanation(const QModelIndex &index, int role) const
 {
     const QString path = pathOf(index);
     if (m_cache->display(path).value_or(RowCache::Display()).state == EntryState::Kind::Shown)
         return {};
     const QString text = EntryState::explanation(path);
-    return role == Qt::ToolTipRole && Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text, Qt::WhiteSpaceNormal) : text;
+    return role == Qt::ToolTipRole && Qt::mightBeRichText(text)
+        ? Qt::convertFromPlainText(text, Qt::WhiteSpaceNormal)
+        : text;
 }
 
 bool VelMenuModel::isHidden(const QModelIndex &index) const

@@ -58,6 +58,9 @@ public:
     /// and what has no name shows that of its file. Who switches it has the rows painted anew.
     void setAssisted(bool isAssisted) { m_isAssisted = isAssisted; }
 
+    /// The items at \a paths are to be dimmed, and no others. Who says so has the rows painted anew.
+    void setCut(const QStringList &paths) { m_cut = paths; }
+
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);
     /// To be told that the folder at \a path has a record file now, if it had none.
@@ -82,6 +85,7 @@ Q_SIGNALS:
 
 private:
     QVariant markOf(const QModelIndex &index, int role) const;
+    QVariant iconOf(const QModelIndex &index) const;
     QVariant explanation(const QModelIndex &index, int role) const;
     bool loadItemInfo(const QString &path, bool isFolder) const;
     QString pathOf(const QModelIndex &index) const;
@@ -103,6 +107,7 @@ private:
     QPointer<MenuIconProvider> m_icons;
     // The paths of the rows that are about to go.
     QStringList m_going;
+    QStringList m_cut;
     bool m_isAssisted = false;
     bool m_isCompleting = false;
     bool m_keepsOrder = true;

@@ -35,6 +35,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
     , reloading(view, menu, selection, [this] { showAnew(); })
+    , cutMark(view, menu)
     , m_rootWatch(menu.directory())
 {
 }
@@ -204,6 +205,7 @@ void VelMenuViewPrivate::editCurrent()
 void VelMenuViewPrivate::setAssistedTree(bool assisted)
 {
     menu.setAssisted(assisted);
+    cutMark.setOn(assisted);
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "CutMark.h"
 #include "MenuActions.h"
 #include "MenuDeletion.h"
 #include "MenuEditing.h"
@@ -56,6 +57,7 @@ public:
     MenuEditing editing;
     MenuDeletion deletion;
     MenuReload reloading;
+    CutMark cutMark;
     /// Null where the view is only to be looked at.
     std::unique_ptr<MenuActions> actions;
     /// The line under the commands of the history in the menu of the actions.

@@ -7,6 +7,7 @@
 #include "XDoTool.h"
 
 #include <QAction>
+#include <QImage>
 #include <QLayout>
 
 /// What makes the work with a menu easier while there is assistance, by hand.
@@ -18,9 +19,11 @@ private Q_SLOTS:
     void movesItemsByKeys();
     void leavesTheKeysAloneWithoutAssistance();
     void readsTheMenuAnew();
+    void dimsWhatWasCut();
 
 private:
     void openAssisted(int count);
+    QImage imageOf(const QModelIndex &row) const;
     QString in(const char *file) const { return menu() + QLatin1Char('/') + QLatin1String(file); }
     QString rows(const QString &folder) { return names(view(), folder).join(QLatin1Char(' ')); }
 };
@@ -103,6 +106,53 @@ void tst_MenuComfortByHand::readsTheMenuAnew()
     QCOMPARE(view().currentIndex(), shown(view(), in("sub/inner/x.desktop")));
     dialog()->setAssistance(false);
     QVERIFY(!action(view(), QStringLiteral("reloadAction")));
+}
+
+QImage tst_MenuComfortByHand::imageOf(const QModelIndex &row) const
+{
+    return view().viewport()->grab(view().visualRect(row)).toImage();
+}
+
+void tst_MenuComfortByHand::dimsWhatWasCut()
+{
+    for (const char *name : {"a", "b"})
+        writeEntry(QStringLiteral("%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    writeFolder(QStringLiteral("sub"), QStringLiteral("Sub"), "");
+    openAssisted(3);
+    const auto isDimmed = [this] {
+        return shown(view(), in("a.desktop")).data(Qt::ForegroundRole).isValid();
+    };
+    const auto image = [this] { return imageOf(shown(view(), in("a.desktop"))); };
+    const QImage before = image();
+    clickItem(in("a.desktop"));
+    const QImage selected = image();
+    XDoTool::press(QStringLiteral("ctrl+x"));
+    QTRY_VERIFY(isDimmed());
+    QVERIFY(!shown(view(), in("b.desktop")).data(Qt::ForegroundRole).isValid());
+    // The icon says so also of what is selected.
+    QVERIFY(image() != selected);
+    XDoTool::press(QStringLiteral("F5"));
+    QTRY_COMPARE(view().model()->rowCount(view().rootIndex()), 3);
+    QTRY_VERIFY(isDimmed());
+    clickItem(in("b.desktop"));
+    XDoTool::press(QStringLiteral("ctrl+c"));
+    QTRY_VERIFY(!isDimmed());
+    QTRY_COMPARE(image(), before);
+
+    clickItem(in("a.desktop"));
+    XDoTool::press(QStringLiteral("ctrl+x"));
+    QTRY_VERIFY(isDimmed());
+    clickItem(in("sub"));
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_COMPARE(rows(in("sub")), QStringLiteral("a"));
+    QTRY_COMPARE(view().selectedPath(), in("sub/a.desktop"));
+    QCoreApplication::processEvents();
+    QTRY_VERIFY(!shown(view(), in("sub/a.desktop")).data(Qt::ForegroundRole).isValid());
+    clickItem(in("b.desktop"));
+    XDoTool::press(QStringLiteral("ctrl+x"));
+    QTRY_VERIFY(shown(view(), in("b.desktop")).data(Qt::ForegroundRole).isValid());
+    dialog()->setAssistance(false);
+    QVERIFY(!shown(view(), in("b.desktop")).data(Qt::ForegroundRole).isValid());
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)
