@@ -36,6 +36,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , deletion(view, menu, selection, find, voice, history)
     , reloading(view, menu, selection, [this] { showAnew(); })
     , cutMark(view, menu)
+    , dragOpening(view)
     , m_rootWatch(menu.directory())
 {
 }
@@ -206,6 +207,7 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
 {
     menu.setAssisted(assisted);
     cutMark.setOn(assisted);
+    dragOpening.setOn(assisted);
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);

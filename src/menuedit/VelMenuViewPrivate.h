@@ -4,6 +4,7 @@
 #pragma once
 
 #include "CutMark.h"
+#include "DragOpening.h"
 #include "MenuActions.h"
 #include "MenuDeletion.h"
 #include "MenuEditing.h"
@@ -58,6 +59,7 @@ public:
     MenuDeletion deletion;
     MenuReload reloading;
     CutMark cutMark;
+    DragOpening dragOpening;
     /// Null where the view is only to be looked at.
     std::unique_ptr<MenuActions> actions;
     /// The line under the commands of the history in the menu of the actions.

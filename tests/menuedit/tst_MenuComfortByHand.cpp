@@ -20,6 +20,8 @@ private Q_SLOTS:
     void leavesTheKeysAloneWithoutAssistance();
     void readsTheMenuAnew();
     void dimsWhatWasCut();
+    void opensTheFolderUnderADrag_data();
+    void opensTheFolderUnderADrag();
 
 private:
     void openAssisted(int count);
@@ -153,6 +155,45 @@ void tst_MenuComfortByHand::dimsWhatWasCut()
     QTRY_VERIFY(shown(view(), in("b.desktop")).data(Qt::ForegroundRole).isValid());
     dialog()->setAssistance(false);
     QVERIFY(!shown(view(), in("b.desktop")).data(Qt::ForegroundRole).isValid());
+}
+
+void tst_MenuComfortByHand::opensTheFolderUnderADrag_data()
+{
+    QTest::addColumn<bool>("assistance");
+    QTest::addColumn<bool>("isOpen");
+    QTest::addColumn<QString>("expected");
+    QTest::newRow("closed folder") << true << false << "opened";
+    QTest::newRow("open folder") << true << true << "";
+    QTest::newRow("without assistance") << false << false << "";
+}
+
+void tst_MenuComfortByHand::opensTheFolderUnderADrag()
+{
+    QFETCH(bool, assistance);
+    QFETCH(bool, isOpen);
+    QFETCH(QString, expected);
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("a"));
+    writeEntry(QStringLiteral("sub/x.desktop"), QStringLiteral("x"));
+    openAssisted(2);
+    dialog()->setAssistance(assistance);
+    dialog()->layout()->activate();
+    QVERIFY(open(view(), in("sub"), 1));
+    view().setExpanded(shown(view(), in("sub")), isOpen);
+    QTest::qWait(300);
+    QString log;
+    connect(&view(), &QTreeView::expanded, this, [&] { log += QLatin1String("opened"); });
+    connect(&view(), &QTreeView::collapsed, this, [&] { log += QLatin1String("closed"); });
+    const auto at = [this](const QPoint &place) {
+        return QStringLiteral(" mousemove %1 sleep 0.2").arg(XDoTool::at(view().viewport(), place));
+    };
+    const QPoint from = placeOf(in("a.desktop"));
+    const QPoint to = placeOf(in("sub"));
+    XDoTool::run(at(from).trimmed() + QStringLiteral(" mousedown 1 sleep 0.2") + at((from + to) / 2) + at(to)
+                 + at(to + QPoint(3, 0)) + QStringLiteral(" sleep 1") + at(to + QPoint(6, 0))
+                 + QStringLiteral(" sleep 1 key Escape sleep 0.2 mouseup 1"));
+    QCOMPARE(log, expected);
+    QVERIFY(QFile::exists(in("a.desktop")));
+    disconnect(&view(), nullptr, this, nullptr);
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)
