@@ -6,6 +6,7 @@
 #include "MenuFilterBar.h"
 #include "MessageLine.h"
 #include "OnDisk.h"
+#include "ToolBarFocus.h"
 #include "VelMenuView.h"
 
 #include <QAction>
@@ -14,6 +15,7 @@
 #include <QEvent>
 #include <QFileInfo>
 #include <QShortcut>
+#include <QToolBar>
 #include <QVBoxLayout>
 
 namespace {
@@ -23,10 +25,11 @@ constexpr int Warning = 1;
 } // namespace
 
 MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout, VelMenuView *view,
-                                           bool isEditable)
+                                           QToolBar *toolBar)
     : m_dialog(dialog)
     , m_view(view)
-    , m_isEditable(isEditable)
+    , m_isEditable(toolBar)
+    , m_toolBarFocus(toolBar ? std::make_unique<ToolBarFocus>(toolBar, view) : nullptr)
     , m_filterBar(std::make_unique<MenuFilterBar>(view, dialog))
     , m_message(std::make_unique<MessageLine>(dialog))
 {

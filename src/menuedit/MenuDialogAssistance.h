@@ -9,8 +9,10 @@
 
 class MenuFilterBar;
 class MessageLine;
+class ToolBarFocus;
 class QAction;
 class QDialog;
+class QToolBar;
 class QVBoxLayout;
 class VelMenuView;
 
@@ -26,8 +28,9 @@ class MenuDialogAssistance : public QObject
     Q_OBJECT
 
 public:
-    /// Completes \a dialog, whose \a view lies in \a layout.
-    MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout, VelMenuView *view, bool isEditable);
+    /// Completes \a dialog, whose \a view lies in \a layout; there is a \a toolBar where the menu can be
+    /// edited, else null.
+    MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout, VelMenuView *view, QToolBar *toolBar);
     ~MenuDialogAssistance() override;
 
     bool eventFilter(QObject *watched, QEvent *event) override;
@@ -42,6 +45,7 @@ private:
     QDialog *const m_dialog;
     VelMenuView *const m_view;
     const bool m_isEditable;
+    std::unique_ptr<ToolBarFocus> m_toolBarFocus;
     std::unique_ptr<MenuFilterBar> m_filterBar;
     std::unique_ptr<MessageLine> m_message;
 };

@@ -9,6 +9,7 @@
 #include <QAction>
 #include <QImage>
 #include <QLayout>
+#include <QToolBar>
 
 /// What makes the work with a menu easier while there is assistance, by hand.
 class tst_MenuComfortByHand : public HandsOnTestCase
@@ -22,6 +23,7 @@ private Q_SLOTS:
     void dimsWhatWasCut();
     void opensTheFolderUnderADrag_data();
     void opensTheFolderUnderADrag();
+    void reachesTheToolBarByTheTabKey();
 
 private:
     void openAssisted(int count);
@@ -194,6 +196,32 @@ void tst_MenuComfortByHand::opensTheFolderUnderADrag()
     QCOMPARE(log, expected);
     QVERIFY(QFile::exists(in("a.desktop")));
     disconnect(&view(), nullptr, this, nullptr);
+}
+
+void tst_MenuComfortByHand::reachesTheToolBarByTheTabKey()
+{
+    for (const char *name : {"a", "b", "c"})
+        writeEntry(QStringLiteral("%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    openAssisted(3);
+    const auto *bar = dialog()->findChild<QToolBar *>();
+    clickItem(in("a.desktop"));
+    for (int i = 0; i < 3; ++i) {
+        QTest::qWait(50);
+        XDoTool::press(QStringLiteral("shift+Tab"));
+    }
+    const QWidget *down = bar->widgetForAction(action(view(), QStringLiteral("downAction")));
+    QTRY_VERIFY(down->hasFocus());
+    XDoTool::press(QStringLiteral("Return"));
+    QTRY_COMPARE(rows(menu()), QStringLiteral("b a c"));
+    XDoTool::press(QStringLiteral("space"));
+    QTRY_COMPARE(rows(menu()), QStringLiteral("b c a"));
+    QVERIFY(dialog()->isVisible());
+    clickItem(in("b.desktop"));
+    clickAction("downAction");
+    QTRY_COMPARE(rows(menu()), QStringLiteral("c b a"));
+    QVERIFY(view().hasFocus());
+    dialog()->setAssistance(false);
+    QCOMPARE(down->focusPolicy(), Qt::NoFocus);
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)
