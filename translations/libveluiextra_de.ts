@@ -1418,6 +1418,18 @@ gehen verloren. Sind Sie sicher?</translation>
         <source>Copying files...</source>
         <translation>Dateien werden kopiert...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Dateien werden gelöscht...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>Das Löschen von %1 wurde abgebrochen. Was noch nicht gelöscht war, ist noch da.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Neu laden</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -1418,6 +1418,18 @@ anteriores. ¿Está seguro?</translation>
         <source>Copying files...</source>
         <translation>Copiando archivos...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Borrando archivos...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>Se ha cancelado el borrado de %1. Lo que aún no se había borrado sigue ahí.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Recargar</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

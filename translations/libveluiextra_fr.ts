@@ -1418,6 +1418,18 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
         <source>Copying files...</source>
         <translation>Copie des fichiers...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Suppression des fichiers...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>La suppression de %1 a été interrompue. Ce qui n&apos;était pas encore supprimé est toujours là.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Recharger</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -1418,6 +1418,18 @@ andranno persi. Sei sicuro?</translation>
         <source>Copying files...</source>
         <translation>Copia dei file...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Eliminazione dei file...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>L&apos;eliminazione di %1 è stata interrotta. Ciò che non era ancora eliminato c&apos;è ancora.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Ricarica</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

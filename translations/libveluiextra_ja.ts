@@ -1405,6 +1405,18 @@ will be lost. Are you sure?</source>
         <source>Copying files...</source>
         <translation>ファイルをコピーしています...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>ファイルを削除しています...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>%1 の削除はキャンセルされました。まだ削除されていないものは残っています。</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>再読み込み</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -1431,6 +1431,18 @@ zostaną utracone. Czy na pewno?</translation>
         <source>Copying files...</source>
         <translation>Kopiowanie plików...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Usuwanie plików...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>Usuwanie %1 zostało anulowane. Co nie zostało jeszcze usunięte, nadal istnieje.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Wczytaj ponownie</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

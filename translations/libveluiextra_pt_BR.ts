@@ -1418,6 +1418,18 @@ serão perdidos. Tem certeza?</translation>
         <source>Copying files...</source>
         <translation>Copiando arquivos...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Excluindo arquivos...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>A exclusão de %1 foi cancelada. O que ainda não havia sido excluído continua lá.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Recarregar</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

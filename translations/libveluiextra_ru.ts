@@ -1431,6 +1431,18 @@ will be lost. Are you sure?</source>
         <source>Copying files...</source>
         <translation>Копирование файлов...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Удаление файлов...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>Удаление %1 прервано. То, что ещё не удалено, осталось на месте.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Обновить</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

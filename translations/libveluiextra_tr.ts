@@ -1405,6 +1405,18 @@ kaybolacak. Emin misiniz?</translation>
         <source>Copying files...</source>
         <translation>Dosyalar kopyalanıyor...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Dosyalar siliniyor...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>%1 silme işlemi iptal edildi. Henüz silinmemiş olanlar hâlâ duruyor.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Yeniden yükle</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -1431,6 +1431,18 @@ will be lost. Are you sure?</source>
         <source>Copying files...</source>
         <translation>Копіювання файлів...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>Вилучення файлів...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>Вилучення %1 перервано. Те, що ще не вилучено, лишилося на місці.</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>Перезавантажити</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

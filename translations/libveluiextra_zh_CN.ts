@@ -1405,6 +1405,18 @@ will be lost. Are you sure?</source>
         <source>Copying files...</source>
         <translation>正在复制文件...</translation>
     </message>
+    <message>
+        <source>Deleting files...</source>
+        <translation>正在删除文件...</translation>
+    </message>
+    <message>
+        <source>The deletion of %1 was canceled. What was not yet deleted is still there.</source>
+        <translation>已取消删除 %1。尚未删除的内容仍然存在。</translation>
+    </message>
+    <message>
+        <source>Reload</source>
+        <translation>重新载入</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>
