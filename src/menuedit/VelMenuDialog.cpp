@@ -18,6 +18,7 @@
 #include <QAbstractProxyModel>
 #include <QAction>
 #include <QDialogButtonBox>
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QFileSystemModel>
@@ -60,7 +61,8 @@ public:
     void addAction(const char *name);
     void connectButtons();
     void pick(const QModelIndex &shown) const;
-    QString title(const QString &dir) const;
+    QString title() const;
+    QString plainTitle() const;
     QPushButton *button(QDialogButtonBox::StandardButton which) const { return buttonBox->button(which); }
     QString pathOf(const QModelIndex &shown) const;
 };
@@ -121,13 +123,26 @@ void VelMenuDialogPrivate::pick(const QModelIndex &shown) const
         ok->click();
 }
 
-QString VelMenuDialogPrivate::title(const QString &dir) const
+QString VelMenuDialogPrivate::title() const
 {
     QString text;
+    const QString dir = view->menuDir();
     const QString recordFile = EntryPath::recordFileOf(dir);
     if (QFile::exists(recordFile))
         text += QLatin1String(" \"") + VelUIDesktopEntry(recordFile).getLocalName() + QLatin1Char('"');
     return text + QLatin1Char(' ') + dir;
+}
+
+// With assistance: what the menu is called, not where it lies.
+QString VelMenuDialogPrivate::plainTitle() const
+{
+    const QString dir = view->menuDir();
+    if (dir == StartMenu::directory())
+        return VelMenuDialog::tr("Start menu");
+    const VelUIDesktopEntry record(EntryPath::recordFileOf(dir));
+    const QString name = record.getLocalName().isEmpty() ? record.getName() : record.getLocalName();
+    const QString folder = QDir(QDir(dir).absolutePath()).dirName();
+    return !name.isEmpty() ? name : !folder.isEmpty() ? folder : dir;
 }
 
 QString VelMenuDialogPrivate::pathOf(const QModelIndex &shown) const
@@ -164,7 +179,7 @@ VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bo
         connect(d->view, &QAbstractItemView::doubleClicked, this,
                 [this](const QModelIndex &shown) { d->pick(shown); });
     d->connectButtons();
-    setWindowTitle(d->title(shownDir));
+    setWindowTitle(d->title());
     setWindowIcon(QIcon::fromTheme(QStringLiteral("velmenuedit")));
     DialogSize::restore(*this, sizeGroup(), QSize(400, 480));
 }
@@ -191,6 +206,9 @@ void VelMenuDialog::setAssistance(bool assistance)
         return;
     d->view->setAssistance(assistance);
     d->helper.reset();
+    // A host may have given it a title of its own.
+    if (windowTitle() == (assistance ? d->title() : d->plainTitle()))
+        setWindowTitle(assistance ? d->plainTitle() : d->title());
     if (assistance) {
         auto *layout = qobject_cast<QVBoxLayout *>(this->layout());
         d->helper = std::make_unique<MenuDialogAssistance>(this, layout, d->view, d->toolBar);

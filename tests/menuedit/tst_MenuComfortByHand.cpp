@@ -7,6 +7,7 @@
 #include "XDoTool.h"
 
 #include <QAction>
+#include <QDir>
 #include <QImage>
 #include <QLayout>
 #include <QToolBar>
@@ -24,6 +25,8 @@ private Q_SLOTS:
     void opensTheFolderUnderADrag_data();
     void opensTheFolderUnderADrag();
     void reachesTheToolBarByTheTabKey();
+    void isNamedPlainly_data();
+    void isNamedPlainly();
 
 private:
     void openAssisted(int count);
@@ -222,6 +225,43 @@ void tst_MenuComfortByHand::reachesTheToolBarByTheTabKey()
     QVERIFY(view().hasFocus());
     dialog()->setAssistance(false);
     QCOMPARE(down->focusPolicy(), Qt::NoFocus);
+}
+
+void tst_MenuComfortByHand::isNamedPlainly_data()
+{
+    QTest::addColumn<QString>("directory");
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QString>("expected");
+    QTest::newRow("folder") << "games/my menu" << QString() << "my menu";
+    QTest::newRow("slash") << "games/my menu/" << QString() << "my menu";
+    QTest::newRow("named folder") << "games"
+                                  << "Fun"
+                                  << "Fun";
+}
+
+void tst_MenuComfortByHand::isNamedPlainly()
+{
+    QFETCH(QString, directory);
+    QFETCH(QString, name);
+    QFETCH(QString, expected);
+    directory.prepend(menu() + QLatin1Char('/'));
+    QVERIFY(QDir().mkpath(directory));
+    QFile record(directory + QLatin1String("/.directory"));
+    if (!name.isEmpty()) {
+        QVERIFY(record.open(QFile::WriteOnly));
+        record.write("[Desktop Entry]\nType=Directory\nName=" + name.toUtf8() + '\n');
+        record.close();
+    }
+    VelMenuDialog picker(directory, -1, false, false, nullptr, Qt::Window);
+    const QString former = picker.windowTitle();
+    QVERIFY(former.endsWith(QLatin1Char(' ') + directory));
+    picker.setAssistance(true);
+    QCOMPARE(picker.windowTitle(), expected);
+    picker.setAssistance(false);
+    QCOMPARE(picker.windowTitle(), former);
+    picker.setWindowTitle(QStringLiteral("Own title"));
+    picker.setAssistance(true);
+    QCOMPARE(picker.windowTitle(), QStringLiteral("Own title"));
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)
