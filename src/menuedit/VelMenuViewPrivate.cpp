@@ -208,6 +208,7 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
     menu.setAssisted(assisted);
     cutMark.setOn(assisted);
     dragOpening.setOn(assisted);
+    emptyLabel = assisted && actions ? std::make_unique<EmptyMenuLabel>(q, menu) : nullptr;
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);

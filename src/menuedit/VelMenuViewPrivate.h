@@ -5,6 +5,7 @@
 
 #include "CutMark.h"
 #include "DragOpening.h"
+#include "EmptyMenuLabel.h"
 #include "MenuActions.h"
 #include "MenuDeletion.h"
 #include "MenuEditing.h"
@@ -60,6 +61,8 @@ public:
     MenuReload reloading;
     CutMark cutMark;
     DragOpening dragOpening;
+    /// Null where there is no assistance, or nothing to begin.
+    std::unique_ptr<EmptyMenuLabel> emptyLabel;
     /// Null where the view is only to be looked at.
     std::unique_ptr<MenuActions> actions;
     /// The line under the commands of the history in the menu of the actions.

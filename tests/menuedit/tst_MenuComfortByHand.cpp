@@ -9,6 +9,7 @@
 #include <QAction>
 #include <QDir>
 #include <QImage>
+#include <QLabel>
 #include <QLayout>
 #include <QToolBar>
 
@@ -27,6 +28,7 @@ private Q_SLOTS:
     void reachesTheToolBarByTheTabKey();
     void isNamedPlainly_data();
     void isNamedPlainly();
+    void tellsHowToBeginAnEmptyMenu();
 
 private:
     void openAssisted(int count);
@@ -262,6 +264,29 @@ void tst_MenuComfortByHand::isNamedPlainly()
     picker.setWindowTitle(QStringLiteral("Own title"));
     picker.setAssistance(true);
     QCOMPARE(picker.windowTitle(), QStringLiteral("Own title"));
+}
+
+void tst_MenuComfortByHand::tellsHowToBeginAnEmptyMenu()
+{
+    openAssisted(0);
+    const auto label = [this] { return view().findChild<QLabel *>(QStringLiteral("emptyMenuLabel")); };
+    QTRY_VERIFY(label() && label()->isVisible());
+    QCOMPARE(label()->text(),
+             QStringLiteral("This menu is empty. Press Ctrl+N for a new entry, or right-click here for what "
+                            "else can be added."));
+    QCOMPARE(label()->geometry(), view().viewport()->rect());
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("a"));
+    QTRY_VERIFY(!label()->isVisible());
+    view().setFilter(QStringLiteral("nothing"));
+    QTRY_COMPARE(rows(menu()), QString());
+    QTest::qWait(500);
+    QVERIFY(!label()->isVisible());
+    view().setFilter(QString());
+    clickItem(a);
+    XDoTool::press(QStringLiteral("Delete"));
+    QTRY_VERIFY(label()->isVisible());
+    dialog()->setAssistance(false);
+    QVERIFY(!label());
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)
