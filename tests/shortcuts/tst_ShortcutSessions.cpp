@@ -557,6 +557,9 @@ void tst_ShortcutSessions::keepsWhatAPlainModelKeeps()
     for (int i = 0; i < rounds && !QTest::currentTestFailed(); ++i)
         runSession(seed + quint32(i));
     qunsetenv("VEL_CONFIG_HOME");
+    // The clear button of the filter fades; the animation goes a moment after the button.
+    constexpr int LongerThanAFade = 300;
+    QTest::qWait(LongerThanAFade);
 }
 
 VEL_TEST_MAIN(tst_ShortcutSessions)
