@@ -1202,6 +1202,10 @@ Fortfahren?</translation>
         <source>Error</source>
         <translation>Fehler</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Startmenü</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1429,6 +1433,10 @@ gehen verloren. Sind Sie sicher?</translation>
     <message>
         <source>Reload</source>
         <translation>Neu laden</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Dieses Menü ist leer. Drücken Sie %1 für einen neuen Eintrag oder klicken Sie hier mit der rechten Maustaste, um anderes hinzuzufügen.</translation>
     </message>
 </context>
 <context>

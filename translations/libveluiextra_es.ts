@@ -1202,6 +1202,10 @@ Se pueden perder los valores de algunos campos...
         <source>Error</source>
         <translation>Error</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Menú de inicio</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1429,6 +1433,10 @@ anteriores. ¿Está seguro?</translation>
     <message>
         <source>Reload</source>
         <translation>Recargar</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Este menú está vacío. Pulse %1 para una entrada nueva, o haga clic aquí con el botón derecho para ver qué más se puede añadir.</translation>
     </message>
 </context>
 <context>

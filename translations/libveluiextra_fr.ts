@@ -1202,6 +1202,10 @@ Continuer&#xa0;?</translation>
         <source>Error</source>
         <translation>Erreur</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Menu de démarrage</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1429,6 +1433,10 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <message>
         <source>Reload</source>
         <translation>Recharger</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Ce menu est vide. Appuyez sur %1 pour une nouvelle entrée, ou faites ici un clic droit pour voir ce qui peut encore être ajouté.</translation>
     </message>
 </context>
 <context>

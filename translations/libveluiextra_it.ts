@@ -1202,6 +1202,10 @@ Continuare?</translation>
         <source>Error</source>
         <translation>Errore</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Menu di avvio</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1429,6 +1433,10 @@ andranno persi. Sei sicuro?</translation>
     <message>
         <source>Reload</source>
         <translation>Ricarica</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Questo menu è vuoto. Premi %1 per una nuova voce, o fai clic qui con il tasto destro per vedere che altro si può aggiungere.</translation>
     </message>
 </context>
 <context>

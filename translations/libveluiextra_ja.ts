@@ -1189,6 +1189,10 @@ Continue?</source>
         <source>Error</source>
         <translation>エラー</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>スタートメニュー</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1416,6 +1420,10 @@ will be lost. Are you sure?</source>
     <message>
         <source>Reload</source>
         <translation>再読み込み</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>このメニューは空です。%1 を押すと新しいエントリを作成できます。ここを右クリックすると、ほかに追加できるものが表示されます。</translation>
     </message>
 </context>
 <context>

@@ -1215,6 +1215,10 @@ Kontynuować?</translation>
         <source>Error</source>
         <translation>Błąd</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Menu startowe</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1442,6 +1446,10 @@ zostaną utracone. Czy na pewno?</translation>
     <message>
         <source>Reload</source>
         <translation>Wczytaj ponownie</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>To menu jest puste. Naciśnij %1, aby dodać nowy wpis, lub kliknij tu prawym przyciskiem, aby zobaczyć, co jeszcze można dodać.</translation>
     </message>
 </context>
 <context>

@@ -1202,6 +1202,10 @@ Continuar?</translation>
         <source>Error</source>
         <translation>Erro</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Menu Iniciar</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1429,6 +1433,10 @@ serão perdidos. Tem certeza?</translation>
     <message>
         <source>Reload</source>
         <translation>Recarregar</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Este menu está vazio. Pressione %1 para uma nova entrada ou clique aqui com o botão direito para ver o que mais pode ser adicionado.</translation>
     </message>
 </context>
 <context>

@@ -1215,6 +1215,10 @@ Continue?</source>
         <source>Error</source>
         <translation>Ошибка</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Меню запуска</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1442,6 +1446,10 @@ will be lost. Are you sure?</source>
     <message>
         <source>Reload</source>
         <translation>Обновить</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Это меню пусто. Нажмите %1, чтобы создать запись, или щёлкните здесь правой кнопкой, чтобы увидеть, что ещё можно добавить.</translation>
     </message>
 </context>
 <context>

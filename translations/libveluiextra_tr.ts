@@ -1189,6 +1189,10 @@ Devam edilsin mi?</translation>
         <source>Error</source>
         <translation>Hata</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Başlat menüsü</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1416,6 +1420,10 @@ kaybolacak. Emin misiniz?</translation>
     <message>
         <source>Reload</source>
         <translation>Yeniden yükle</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Bu menü boş. Yeni girdi için %1 tuşuna basın veya başka neler eklenebileceğini görmek için burada sağ tıklayın.</translation>
     </message>
 </context>
 <context>

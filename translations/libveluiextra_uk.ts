@@ -1215,6 +1215,10 @@ Continue?</source>
         <source>Error</source>
         <translation>Помилка</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>Меню запуску</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1442,6 +1446,10 @@ will be lost. Are you sure?</source>
     <message>
         <source>Reload</source>
         <translation>Перезавантажити</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>Це меню порожнє. Натисніть %1, щоб створити запис, або клацніть тут правою кнопкою, щоб побачити, що ще можна додати.</translation>
     </message>
 </context>
 <context>

@@ -1189,6 +1189,10 @@ Continue?</source>
         <source>Error</source>
         <translation>错误</translation>
     </message>
+    <message>
+        <source>Start menu</source>
+        <translation>开始菜单</translation>
+    </message>
 </context>
 <context>
     <name>VelMenuView</name>
@@ -1416,6 +1420,10 @@ will be lost. Are you sure?</source>
     <message>
         <source>Reload</source>
         <translation>重新载入</translation>
+    </message>
+    <message>
+        <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
+        <translation>此菜单为空。按 %1 新建条目，或在此处单击右键查看还可以添加什么。</translation>
     </message>
 </context>
 <context>
