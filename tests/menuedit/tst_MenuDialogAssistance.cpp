@@ -332,7 +332,11 @@ void tst_MenuDialogAssistance::leavesNothingBehind()
     // The key asks for a text again.
     clickItem(menu() + QLatin1String("/a.desktop"));
     ModalDriver modal;
-    modal.handle([](QWidget *) { XDoTool::press(QStringLiteral("Escape")); });
+    modal.handle([](QWidget *window) {
+        // Before, the key would go to the dialog behind it.
+        QVERIFY(QTest::qWaitForWindowActive(window));
+        XDoTool::press(QStringLiteral("Escape"));
+    });
     XDoTool::press(QStringLiteral("ctrl+f"));
     QTRY_VERIFY(modal.finished());
 }

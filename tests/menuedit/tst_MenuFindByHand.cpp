@@ -76,6 +76,7 @@ void tst_MenuFindByHand::search(const std::function<void()> &meanwhile)
     ModalDriver modal;
     modal.handle([](QWidget *window) {
         window->findChild<QLineEdit *>()->setText(QStringLiteral("needle"));
+        QVERIFY(QTest::qWaitForWindowActive(window));
         XDoTool::press(QStringLiteral("Return"));
     });
     QElapsedTimer timer;
@@ -133,7 +134,9 @@ void tst_MenuFindByHand::endsByTheButton()
 
 void tst_MenuFindByHand::endsWhenTheEditorIsClosed()
 {
-    search([this] { XDoTool::run(QStringLiteral("windowactivate --sync %1 key alt+F4").arg(m_dialog->winId())); });
+    search([this] {
+        XDoTool::run(QStringLiteral("windowactivate --sync %1 key alt+F4").arg(m_dialog->winId()));
+    });
     QVERIFY2(m_elapsed < 5000, qPrintable(QString::number(m_elapsed)));
 }
 

@@ -223,7 +223,10 @@ void tst_MenuHistoryByHand::takesEverythingBack_data()
         "default menu",
         [this] {
             ModalDriver modal;
-            modal.handle([](QWidget *) { XDoTool::press(QStringLiteral("Return")); });
+            modal.handle([](QWidget *window) {
+                QVERIFY(QTest::qWaitForWindowActive(window));
+                XDoTool::press(QStringLiteral("Return"));
+            });
             clickAction("recreateAction");
             QTRY_VERIFY(modal.finished());
         },
