@@ -47,6 +47,9 @@ void tst_EditShortcutsDialogKeys::init()
 // Makes the action current and its key editor ready.
 void tst_EditShortcutsDialogKeys::record(const char *name)
 {
+    // A message that was shown for a moment may have taken the keys along.
+    m_dialog->activateWindow();
+    QVERIFY(QTest::qWaitForWindowActive(m_dialog.get()));
     select(name);
     customButton()->setChecked(true);
     keyWidget()->setFocus();
