@@ -116,7 +116,12 @@ QByteArray encoded(const QString &path)
 }
 
 ItemData::ItemData(const QString &path, Qt::DropAction action)
-    : m_path(path)
+    : ItemData(QStringList{path}, action)
+{
+}
+
+ItemData::ItemData(const QStringList &paths, Qt::DropAction action)
+    : m_paths(paths)
     , m_isCut(action == Qt::MoveAction)
 {
 }
@@ -140,17 +145,23 @@ QByteArray ItemData::bytesOf(const QString &mimeType) const
 {
     if (!hasFormat(mimeType))
         return QByteArray();
-    if (mimeType == copiedFilesFormat()) {
-        const QByteArray url = QUrl::fromLocalFile(m_path).toEncoded(QUrl::FullyEncoded);
-        return (m_isCut ? "cut\n" : "copy\n") + url;
-    }
-    return mimeType == cutMarkFormat() ? QByteArrayLiteral("1") : encoded(m_path);
+    if (mimeType == cutMarkFormat())
+        return QByteArrayLiteral("1");
+    const bool isOurs = mimeType != copiedFilesFormat();
+    QByteArray bytes = isOurs ? "" : m_isCut ? "cut" : "copy";
+    for (const QString &path : m_paths)
+        bytes += isOurs ? encoded(path) : '\n' + QUrl::fromLocalFile(path).toEncoded(QUrl::FullyEncoded);
+    return bytes;
 }
 
 QVariant ItemData::retrieveData(const QString &mimeType, QVariant::Type type) const
 {
-    if (mimeType == copyFormat() && type == QVariant::List)
-        return QVariantList{QUrl::fromLocalFile(m_path)};
+    if (mimeType == copyFormat() && type == QVariant::List) {
+        QVariantList urls;
+        for (const QString &path : m_paths)
+            urls.append(QUrl::fromLocalFile(path));
+        return urls;
+    }
     const QByteArray bytes = bytesOf(mimeType);
     return bytes.isNull() ? QVariant() : QVariant(bytes);
 }
@@ -198,8 +209,11 @@ QList<QUrl> urls(const QMimeData *data, const QString &format)
 
 QStringList localPaths(const QMimeData *data)
 {
-    if (const auto *item = qobject_cast<const ItemData *>(data))
-        return QStringList{cleaned(item->path())};
+    if (const auto *items = qobject_cast<const ItemData *>(data)) {
+        QStringList paths = items->paths();
+        std::transform(paths.begin(), paths.end(), paths.begin(), cleaned);
+        return paths;
+    }
     if (data->hasFormat(copiedFilesFormat())) {
         QStringList paths = pathsOfCopiedFiles(data);
         if (!paths.isEmpty())

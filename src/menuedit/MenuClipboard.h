@@ -28,8 +28,8 @@ QString moveFormat();
 QByteArray encoded(const QString &path);
 
 /**
- * One menu item on the clipboard. Keeps its bytes exactly, which a plain QMimeData does not:
- * that one stores parsed URLs and writes them anew. urls() gives the exact path all the same.
+ * Menu items on the clipboard, a line for each. Keeps their bytes exactly, which a plain QMimeData
+ * does not: that one stores parsed URLs and writes them anew. urls() gives the exact paths all the same.
  */
 class ItemData : public QMimeData
 {
@@ -38,8 +38,10 @@ class ItemData : public QMimeData
 public:
     /// The item at the absolute \a path, cut when \a action is Qt::MoveAction, else copied.
     ItemData(const QString &path, Qt::DropAction action);
+    /// The same for several.
+    ItemData(const QStringList &paths, Qt::DropAction action);
 
-    QString path() const { return m_path; }
+    QStringList paths() const { return m_paths; }
 
     QStringList formats() const override;
     bool hasFormat(const QString &mimeType) const override;
@@ -50,7 +52,7 @@ protected:
 private:
     QByteArray bytesOf(const QString &mimeType) const;
 
-    QString m_path;
+    QStringList m_paths;
     bool m_isCut;
 };
 

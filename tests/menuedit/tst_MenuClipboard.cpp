@@ -21,6 +21,7 @@ private Q_SLOTS:
     void keepsTheBytesOfACopy();
     void keepsTheBytesOfACut();
     void offersTheFormatsOfOtherPrograms();
+    void holdsSeveralItemsInTheirOrder();
     void tellsTheFormat();
     void givesTheExactPath_data() { oddNames(); }
     void givesTheExactPath();
@@ -128,6 +129,31 @@ void tst_MenuClipboard::offersTheFormatsOfOtherPrograms()
     QCOMPARE(copied.data(list), QByteArray("copy\nfile:///tmp/a%20b%25"));
     QCOMPARE(cut.data(mark), QByteArray("1"));
     QVERIFY(!copied.hasFormat(mark));
+}
+
+void tst_MenuClipboard::holdsSeveralItemsInTheirOrder()
+{
+    const QStringList paths{write(QStringLiteral("z a%"), "x"), write(QStringLiteral("b\u0416"), "x"),
+                            write(QStringLiteral("a"), "x")};
+    const ItemData cut(paths, Qt::MoveAction);
+    QByteArray lines;
+    QByteArray urls;
+    for (const QString &path : paths) {
+        lines += "file:/" + path.toLocal8Bit() + '\n';
+        urls += '\n' + QUrl::fromLocalFile(path).toEncoded(QUrl::FullyEncoded);
+    }
+
+    QCOMPARE(cut.data(QStringLiteral("text/uri-list")), lines);
+    QCOMPARE(cut.data(QStringLiteral("text/uri-move-list")), lines);
+    QCOMPARE(cut.data(QStringLiteral("x-special/gnome-copied-files")), "cut" + urls);
+    QCOMPARE(cut.data(QStringLiteral("application/x-kde-cutselection")), QByteArray("1"));
+    QCOMPARE(cut.urls().size(), 3);
+    QCOMPARE(localPaths(&cut), paths);
+    QCOMPARE(localPaths(std::make_unique<ForeignData>(cut).get()), paths);
+    // And where a program knows our own lines alone.
+    ForeignData plain(ItemData(paths, Qt::CopyAction));
+    plain.drop(QStringLiteral("x-special/gnome-copied-files"));
+    QCOMPARE(localPaths(&plain), paths);
 }
 
 void tst_MenuClipboard::tellsTheFormat()
