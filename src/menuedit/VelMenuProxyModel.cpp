@@ -3,6 +3,7 @@
 
 #include "VelMenuProxyModel.h"
 
+#include "TreeOrder.h"
 #include "VelMenuModel.h"
 
 #include <frame/DesktopEntryRecord.h>
@@ -175,6 +176,11 @@ QVector<QModelIndex> VelMenuProxyModel::allInOrder(const QModelIndex &folder) co
         children.begin(), children.end(),
         [this](const QModelIndex &left, const QModelIndex &right) { return lessThan(right, left); });
     return children;
+}
+
+QMimeData *VelMenuProxyModel::mimeData(const QModelIndexList &indexes) const
+{
+    return QSortFilterProxyModel::mimeData(TreeOrder::outermost(indexes));
 }
 
 // The menu directory itself and what lies around it always are.

@@ -60,6 +60,10 @@ public:
     /// if there were no filter.
     QVector<QModelIndex> allInOrder(const QModelIndex &folder) const;
 
+    /// The files of \a indexes from the top to the bottom; what lies in a folder among them goes along with
+    /// it.
+    QMimeData *mimeData(const QModelIndexList &indexes) const override;
+
     bool filterAcceptsRow(int sourceRow, const QModelIndex &sourceParent) const override;
     /// Whether \a left is shown below \a right.
     bool lessThan(const QModelIndex &left, const QModelIndex &right) const override;
