@@ -19,3 +19,12 @@ bool FolderOrder::write(const QString &folder, const QStringList &list)
     record.setSortOrder(list);
     return record.save();
 }
+
+// The order is there for the user to see only when it is there for the menu, too.
+QString FolderOrder::notSaved(const QString &folder)
+{
+    return QCoreApplication::translate("VelMenuView",
+                                       "The order of the folder %1 could not be saved. Make sure that the "
+                                       "folder may be written and that the disk is not full, then try again.")
+        .arg(folder);
+}

@@ -19,4 +19,7 @@ namespace FolderOrder {
  */
 bool write(const QString &folder, const QStringList &list);
 
+/// What the user is to hear when it was not.
+QString notSaved(const QString &folder);
+
 } // namespace FolderOrder

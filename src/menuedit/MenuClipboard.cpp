@@ -231,4 +231,19 @@ QStringList localPaths(const QMimeData *data)
     return paths;
 }
 
+QList<QUrl> foreignUrls(const QMimeData *data)
+{
+    QList<QUrl> foreign;
+    if (!localPaths(data).contains(QString()))
+        return foreign;
+    const QList<QUrl> urls = data->urls();
+    const QList<QByteArray> lines = linesOf(data->data(copyFormat()));
+    for (int i = 0; i < urls.size(); ++i) {
+        const QByteArray line = lines.size() == urls.size() ? lines.at(i) : QByteArray();
+        if (!line.startsWith('#') && pathOf(urls.at(i), line).isEmpty())
+            foreign.append(urls.at(i));
+    }
+    return foreign;
+}
+
 } // namespace MenuClipboard

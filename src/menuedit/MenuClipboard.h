@@ -73,4 +73,7 @@ QList<QUrl> urls(const QMimeData *data, const QString &format);
  */
 QStringList localPaths(const QMimeData *data);
 
+/// The URLs among them that are no local files, in their order.
+QList<QUrl> foreignUrls(const QMimeData *data);
+
 } // namespace MenuClipboard

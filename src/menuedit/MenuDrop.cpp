@@ -9,11 +9,10 @@
 #include "OnDisk.h"
 
 #include <QDir>
+#include <QFile>
 #include <QFileInfo>
 #include <QFileSystemModel>
-#include <QMimeData>
 #include <QPointer>
-#include <QUrl>
 
 #include <algorithm>
 
@@ -34,8 +33,9 @@ QString failureText(const FileTransfer::Result &result, Qt::DropAction action)
     case FileTransfer::Failure::NotWritable:
         return QFileSystemModel::tr("%1 cannot be written.").arg(result.path);
     case FileTransfer::Failure::Failed:
-        return (action == Qt::MoveAction ? QFileSystemModel::tr("Can't move %1: %2")
-                                         : QFileSystemModel::tr("Can't copy %1: %2"))
+        return (action == Qt::MoveAction       ? QFileSystemModel::tr("Can't move %1: %2")
+                    : action == Qt::LinkAction ? QFileSystemModel::tr("Can't link %1: %2")
+                                               : QFileSystemModel::tr("Can't copy %1: %2"))
             .arg(result.path, result.reason);
     }
     return QString();
@@ -84,10 +84,11 @@ DropResult MenuDrop::reorder()
     if (!OnDisk::exists(m_request.sources.constFirst()))
         return refused({FileTransfer::Failure::SourceGone, m_targets.constFirst(), QString()});
     m_host.begins(m_request.sources, m_targets, m_request.action, m_folder);
+    std::optional<QStringList> order;
     if (m_request.action == Qt::MoveAction)
-        write(
-            m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder));
-    return done(true);
+        order =
+            m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder);
+    return done(true, write(order));
 }
 
 DropResult MenuDrop::bringIn()
@@ -102,19 +103,13 @@ DropResult MenuDrop::bringIn()
         order =
             m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder);
     m_host.begins(m_request.sources, m_targets, m_request.action, m_folder);
-    if (m_request.action == Qt::LinkAction) {
-        if (!link())
-            return {};
-    } else {
-        const QPointer<QFileSystemModel> model(&m_model);
-        const FileTransfer::Result result = transfer();
-        if (!model)
-            return {};
-        if (!result.succeeded())
-            return refused(result);
-    }
-    write(order);
-    return done(isListed);
+    const QPointer<QFileSystemModel> model(&m_model);
+    const FileTransfer::Result result = m_request.action == Qt::LinkAction ? link() : transfer();
+    if (!model)
+        return {};
+    if (!result.succeeded())
+        return refused(result);
+    return done(isListed, write(order));
 }
 
 // Asks before a file that exists, and keeps the place that was meant when rows come and go.
@@ -147,30 +142,36 @@ FileTransfer::Result MenuDrop::transfer()
     return result;
 }
 
-bool MenuDrop::link()
+// All or nothing, as with copies.
+FileTransfer::Result MenuDrop::link()
 {
-    QList<QUrl> urls;
-    for (const QString &source : qAsConst(m_request.sources)) {
-        if (!isHere(source))
-            urls.append(QUrl::fromLocalFile(source));
+    QStringList made;
+    for (int i = 0; i < m_targets.size(); ++i) {
+        QFile source(m_request.sources.at(i));
+        if (isHere(source.fileName()))
+            continue;
+        if (source.link(m_targets.at(i))) {
+            made.append(m_targets.at(i));
+            continue;
+        }
+        for (const QString &link : qAsConst(made))
+            QFile::remove(link);
+        return {FileTransfer::Failure::Failed, source.fileName(), source.errorString()};
     }
-    QMimeData data;
-    data.setUrls(urls);
-    return m_model.QFileSystemModel::dropMimeData(&data, m_request.action, m_request.row, 0,
-                                                  m_request.folder);
+    return {};
 }
 
-// A list that cannot be saved leaves the drop done.
-void MenuDrop::write(const std::optional<QStringList> &order) const
+// A list that cannot be saved leaves the drop done; what the user is to hear of it.
+QString MenuDrop::write(const std::optional<QStringList> &order) const
 {
-    if (order)
-        FolderOrder::write(m_folder, *order);
+    return !order || FolderOrder::write(m_folder, *order) ? QString() : FolderOrder::notSaved(m_folder);
 }
 
-DropResult MenuDrop::done(bool sortAnew) const
+DropResult MenuDrop::done(bool sortAnew, const QString &complaint) const
 {
     DropResult result;
     result.isDone = true;
+    result.complaint = complaint;
     result.folder = m_request.folder;
     result.targets = m_targets;
     if (m_request.action == Qt::MoveAction)

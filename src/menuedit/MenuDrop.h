@@ -41,9 +41,9 @@ private:
     DropResult bringIn();
     bool confirm();
     FileTransfer::Result transfer();
-    bool link();
-    void write(const std::optional<QStringList> &order) const;
-    DropResult done(bool sortAnew) const;
+    FileTransfer::Result link();
+    QString write(const std::optional<QStringList> &order) const;
+    DropResult done(bool sortAnew, const QString &complaint) const;
     DropResult refused(const FileTransfer::Result &result) const;
 
     QFileSystemModel &m_model;

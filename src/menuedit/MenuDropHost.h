@@ -21,9 +21,10 @@ class VelMenuView;
 struct DropResult
 {
     bool isDone = false; ///< whether everything is where it was dropped
-    QString complaint; ///< what the user is to hear of a drop that was not done; may be empty
+    QString complaint; ///< what the user is to hear of what was not done; may be empty
     QPersistentModelIndex folder; ///< in the file model
-    QStringList targets; ///< the paths of all files in the folder; the first is the one dropped first
+    QStringList targets; ///< the paths of all files in the folder; the first is the one dropped first.
+                         ///< None where nothing was a file
     QStringList moved; ///< the paths at which files were before
     bool sortAnew = false; ///< whether the order of the folder may have changed
 };

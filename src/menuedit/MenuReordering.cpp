@@ -10,8 +10,6 @@
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 
-#include <QCoreApplication>
-
 #include <algorithm>
 
 namespace {
@@ -25,17 +23,6 @@ int rowBelow(const ShownMenu &menu, const QModelIndex &shown, const QModelIndex 
                                                      : menu.files().rowCount(sourceFolder);
 }
 
-// The order is there for the user to see only when it is there for the menu, too.
-void tellNotSaved(MenuVoice &voice, const QString &folder)
-{
-    voice.tell(
-        QCoreApplication::translate("VelMenuView",
-                                    "The order of the folder %1 could not be saved. Make sure that the "
-                                    "folder may be written and that the disk is not full, then try again.")
-            .arg(folder),
-        MenuVoice::Failure);
-}
-
 } // namespace
 
 bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row,
@@ -47,7 +34,7 @@ bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString
     const bool isSaved = FolderOrder::write(path, ShownOrder::with(menu.proxy(), name, row, folder));
     menu.files().noteRecordFile(path);
     if (!isSaved)
-        tellNotSaved(voice, path);
+        voice.tell(FolderOrder::notSaved(path), MenuVoice::Failure);
     return true;
 }
 

@@ -45,6 +45,18 @@ QColor grayText()
                             mixed(text.blueF(), base.blueF()));
 }
 
+// Data may stand in a URL as a whole.
+QString noFile(const QUrl &url)
+{
+    constexpr int LongestShown = 200;
+    QString address = url.toDisplayString();
+    if (address.size() > LongestShown)
+        address = address.left(LongestShown) + QStringLiteral("...");
+    return QCoreApplication::translate("VelMenuView",
+                                       "%1 is no file on this computer. Nothing was moved or copied.")
+        .arg(address);
+}
+
 RowCache::Display readDisplay(const QString &file)
 {
     const VelUIDesktopEntry entry(file);
@@ -130,9 +142,16 @@ bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, in
         || action == Qt::IgnoreAction)
         return false;
     const QStringList sources = MenuClipboard::localPaths(data);
-    if (sources.isEmpty() || sources.constFirst().isEmpty())
+    if (sources.isEmpty())
         return false;
     const QPointer<VelMenuModel> self(this);
+    const QList<QUrl> foreign = MenuClipboard::foreignUrls(data);
+    if (!foreign.isEmpty()) {
+        DropResult refusal;
+        refusal.complaint = noFile(foreign.constFirst());
+        m_dropHost->finished(refusal);
+        return false;
+    }
     const DropResult result =
         MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent}).carryOut();
     if (!self)

@@ -89,7 +89,7 @@ public:
         if (m_recorder)
             remember(result);
         if (!result.complaint.isEmpty())
-            tellAt(result.targets.constFirst(), result.complaint);
+            tellAt(result.targets.value(0), result.complaint);
     }
 
 private:
@@ -155,7 +155,7 @@ private:
     void tellAt(const QString &path, const QString &text) const
     {
         QModelIndex shown;
-        if (files() && QFileInfo::exists(path))
+        if (files() && !path.isEmpty() && QFileInfo::exists(path))
             shown = proxy()->mapFromSource(files()->index(path));
         VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown);
     }

@@ -35,6 +35,12 @@ public:
 
     std::unique_ptr<FileProgress> follow(Qt::DropAction) override { return std::make_unique<Follower>(this); }
 
+    void begins(const QStringList &, const QStringList &, Qt::DropAction, const QString &) override
+    {
+        if (begin)
+            begin();
+    }
+
     void finished(const DropResult &) override { QFAIL("is told by the model"); }
 
     class Follower : public FileProgress
@@ -52,6 +58,7 @@ public:
 
     std::function<bool()> answer;
     std::function<bool()> goOn;
+    std::function<void()> begin;
     bool hasOrder = true;
     QStringList questions;
     QStringList places;
@@ -86,6 +93,9 @@ private Q_SLOTS:
     void takesBackWhenTheModelGoesWhileItCopies_data();
     void takesBackWhenTheModelGoesWhileItCopies();
     void tellsWhatFailed();
+    void tellsThatTheOrderWasNotSaved_data();
+    void tellsThatTheOrderWasNotSaved();
+    void linksAllOrNothing();
 
 private:
     DropResult drop(const QStringList &files, Qt::DropAction action, int row);
@@ -370,6 +380,45 @@ void tst_MenuDrop::tellsWhatFailed()
     result = drop({QStringLiteral("to/missing")}, Qt::MoveAction, 0);
     QCOMPARE(result.complaint, QStringLiteral("%1 does not exist.").arg(path(QStringLiteral("to/missing"))));
     QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::tellsThatTheOrderWasNotSaved_data()
+{
+    QTest::addColumn<QString>("file");
+    QTest::newRow("from elsewhere") << "from/x";
+    QTest::newRow("own folder") << "to/a";
+}
+
+// The files are where they were dropped all the same.
+void tst_MenuDrop::tellsThatTheOrderWasNotSaved()
+{
+    QFETCH(QString, file);
+    QVERIFY(QFile::remove(path(QStringLiteral("to/.directory"))));
+    QVERIFY(QDir().mkdir(path(QStringLiteral("to/.directory"))));
+
+    const DropResult result = drop({file}, Qt::MoveAction, 0);
+
+    QVERIFY(result.isDone);
+    QVERIFY(QFile::exists(result.targets.constFirst()));
+    QCOMPARE(result.complaint,
+             QStringLiteral("The order of the folder %1 could not be saved. Make sure that the folder may be "
+                            "written and that the disk is not full, then try again.")
+                 .arg(path(QStringLiteral("to"))));
+}
+
+void tst_MenuDrop::linksAllOrNothing()
+{
+    m_host.begin = [this] { write(QStringLiteral("to/y"), "came meanwhile"); };
+
+    const DropResult result = drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::LinkAction, -1);
+
+    QVERIFY(!result.isDone);
+    QVERIFY2(
+        result.complaint.startsWith(QStringLiteral("Can't link %1: ").arg(path(QStringLiteral("from/y")))),
+        qPrintable(result.complaint));
+    QCOMPARE(QDir(path(QStringLiteral("to"))).entryList(QDir::Files | QDir::System),
+             QStringList({QStringLiteral("a"), QStringLiteral("y")}));
+    QCOMPARE(read(path(QStringLiteral("to/y"))), QByteArray("came meanwhile"));
 }
 
 VEL_TEST_MAIN(tst_MenuDrop)
