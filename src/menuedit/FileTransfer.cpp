@@ -26,20 +26,25 @@ namespace FileTransfer {
 
 namespace {
 
-struct Pair
-{
-    QString source;
-    QString target;
-};
-
 TreeCopy::Path native(const QString &path)
 {
     return TreeCopy::Path(QFile::encodeName(path).toStdString());
 }
 
-QString targetOf(const QString &source, const QString &directory)
+QString folderOf(const QString &path)
 {
-    return QDir(directory).filePath(QFileInfo(source).fileName());
+    return QFileInfo(path).path();
+}
+
+bool isInPlace(const Item &item)
+{
+    return QFileInfo(item.source).fileName() == QFileInfo(item.target).fileName()
+        && liesIn(item.source, folderOf(item.target));
+}
+
+bool isWritable(const QString &directory)
+{
+    return QFileInfo(directory).isDir() && access(QFile::encodeName(directory).constData(), W_OK | X_OK) == 0;
 }
 
 bool isBelow(const QString &path, const QString &folder)
@@ -61,13 +66,13 @@ std::error_code count(const QString &source, Action action, FileProgress &progre
     return {};
 }
 
-Result failed(const Pair &pair, const std::error_code &error)
+Result failed(const Item &item, const std::error_code &error)
 {
     if (error == std::errc::file_exists)
-        return {Failure::TargetExists, pair.target, QString()};
+        return {Failure::TargetExists, item.target, QString()};
     if (error == std::errc::operation_canceled)
-        return {Failure::Canceled, pair.source, QString()};
-    return {Failure::Failed, pair.source, QString::fromLocal8Bit(error.message().c_str())};
+        return {Failure::Canceled, item.source, QString()};
+    return {Failure::Failed, item.source, QString::fromLocal8Bit(error.message().c_str())};
 }
 
 // One transfer: what can be moved in one step is at once, all else appears together in the end.
@@ -81,48 +86,48 @@ public:
     {
     }
 
-    Result carryOut(const QVector<Pair> &pairs)
+    Result carryOut(const QVector<Item> &items)
     {
-        for (const Pair &pair : pairs) {
-            if (const std::error_code error = transfer(pair))
-                return takeBack(pair, error);
+        for (const Item &item : items) {
+            if (const std::error_code error = transfer(item))
+                return takeBack(item, error);
         }
         const std::error_code error = m_copies.reveal();
         if (!error)
             return {};
-        const auto isFailed = [this](const Pair &pair) { return native(pair.source) == m_copies.failed(); };
-        return takeBack(*std::find_if(pairs.begin(), pairs.end(), isFailed), error);
+        const auto isFailed = [this](const Item &item) { return native(item.source) == m_copies.failed(); };
+        return takeBack(*std::find_if(items.begin(), items.end(), isFailed), error);
     }
 
 private:
-    std::error_code transfer(const Pair &pair)
+    std::error_code transfer(const Item &item)
     {
         if (!m_progress.goOn())
             return std::make_error_code(std::errc::operation_canceled);
         if (m_action == Action::Move) {
             const std::error_code error =
-                TreeCopy::moveAtOnce(native(pair.source), native(pair.target), m_progress);
+                TreeCopy::moveAtOnce(native(item.source), native(item.target), m_progress);
             if (!error)
-                m_moved.append(pair);
+                m_moved.append(item);
             if (error != std::errc::cross_device_link)
                 return error;
         }
-        return m_copies.add(native(pair.source), native(pair.target));
+        return m_copies.add(native(item.source), native(item.target));
     }
 
     // The last first. What cannot be moved back stays whole where it is.
-    Result takeBack(const Pair &pair, const std::error_code &error)
+    Result takeBack(const Item &item, const std::error_code &error)
     {
         UnstoppableProgress toTheEnd(m_progress);
         for (auto it = m_moved.crbegin(); it != m_moved.crend(); ++it)
             TreeCopy::move(native(it->target), native(it->source), toTheEnd);
-        return failed(pair, error);
+        return failed(item, error);
     }
 
     const Action m_action;
     FileProgress &m_progress;
     StagedCopies m_copies;
-    QVector<Pair> m_moved;
+    QVector<Item> m_moved;
 };
 
 } // namespace
@@ -136,47 +141,70 @@ bool liesIn(const QString &source, const QString &directory)
     return !canonical.isEmpty() && canonical == QFileInfo(directory).canonicalFilePath();
 }
 
-Result check(const QStringList &sources, const QString &targetDirectory)
+QVector<Item> itemsFor(const QStringList &sources, const QString &targetDirectory)
 {
-    const QString canonical = QFileInfo(targetDirectory).canonicalFilePath();
-    if (canonical.isEmpty() || !QFileInfo(targetDirectory).isDir()
-        || access(QFile::encodeName(targetDirectory).constData(), W_OK | X_OK) != 0)
-        return {Failure::NotWritable, targetDirectory, QString()};
+    QVector<Item> items;
+    for (const QString &source : sources)
+        items.append({source, QDir(targetDirectory).filePath(QFileInfo(source).fileName())});
+    return items;
+}
 
+Result check(const QVector<Item> &items)
+{
     QSet<QString> targets;
-    for (const QString &source : sources) {
-        const QFileInfo info(source);
-        if (source.isEmpty() || !OnDisk::exists(source) || info.fileName().isEmpty())
-            return {Failure::SourceGone, source, QString()};
-        if (wouldContainItself(info, canonical))
-            return {Failure::IntoItself, source, QString()};
-        if (liesIn(source, targetDirectory))
+    for (const Item &item : items) {
+        const QString folder = folderOf(item.target);
+        const QFileInfo info(item.source);
+        if (!isWritable(folder))
+            return {Failure::NotWritable, folder, QString()};
+        if (item.source.isEmpty() || !OnDisk::exists(item.source) || info.fileName().isEmpty())
+            return {Failure::SourceGone, item.source, QString()};
+        if (wouldContainItself(info, QFileInfo(folder).canonicalFilePath()))
+            return {Failure::IntoItself, item.source, QString()};
+        if (isInPlace(item))
             continue;
-        const QString target = targetOf(source, targetDirectory);
-        if (OnDisk::exists(target) || targets.contains(target))
-            return {Failure::TargetExists, target, QString()};
-        targets.insert(target);
+        if (OnDisk::exists(item.target) || targets.contains(item.target))
+            return {Failure::TargetExists, item.target, QString()};
+        targets.insert(item.target);
     }
     return {};
+}
+
+Result check(const QStringList &sources, const QString &targetDirectory)
+{
+    if (!isWritable(targetDirectory))
+        return {Failure::NotWritable, targetDirectory, QString()};
+    return check(itemsFor(sources, targetDirectory));
+}
+
+Result transfer(const QVector<Item> &items, Action action, FileProgress &progress)
+{
+    Result possible = check(items);
+    if (!possible.succeeded())
+        return possible;
+    QVector<Item> wanted;
+    QSet<QString> folders;
+    for (const Item &item : items) {
+        if (isInPlace(item))
+            continue;
+        wanted.append(item);
+        folders.insert(folderOf(item.target));
+    }
+    for (const Item &item : qAsConst(wanted)) {
+        if (const std::error_code error = count(item.source, action, progress))
+            return failed(item, error);
+    }
+    for (const QString &folder : qAsConst(folders))
+        StagingFolder::removeLeftovers(native(folder));
+    return Transfer(action, progress).carryOut(wanted);
 }
 
 Result transfer(const QStringList &sources, const QString &targetDirectory, Action action,
                 FileProgress &progress)
 {
-    Result possible = check(sources, targetDirectory);
-    if (!possible.succeeded())
-        return possible;
-    QVector<Pair> pairs;
-    for (const QString &source : sources) {
-        if (!liesIn(source, targetDirectory))
-            pairs.append({source, targetOf(source, targetDirectory)});
-    }
-    for (const Pair &pair : qAsConst(pairs)) {
-        if (const std::error_code error = count(pair.source, action, progress))
-            return failed(pair, error);
-    }
-    StagingFolder::removeLeftovers(native(targetDirectory));
-    return Transfer(action, progress).carryOut(pairs);
+    if (!isWritable(targetDirectory))
+        return {Failure::NotWritable, targetDirectory, QString()};
+    return transfer(itemsFor(sources, targetDirectory), action, progress);
 }
 
 Result transfer(const QStringList &sources, const QString &targetDirectory, Action action)

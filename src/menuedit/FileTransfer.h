@@ -5,6 +5,7 @@
 
 #include <QString>
 #include <QStringList>
+#include <QVector>
 
 class FileProgress;
 
@@ -39,19 +40,31 @@ struct Result
     bool succeeded() const { return failure == Failure::None; }
 };
 
+/// What goes where.
+struct Item
+{
+    QString source; ///< an absolute path
+    QString target; ///< the path that it is to have; where that is its own, it is left alone
+};
+
 /// Whether \a source lies directly in \a directory, by whatever path.
 bool liesIn(const QString &source, const QString &directory);
 
+/// The \a sources under their own names in \a targetDirectory.
+QVector<Item> itemsFor(const QStringList &sources, const QString &targetDirectory);
+
 /// Whether transfer() could begin; touches nothing.
+Result check(const QVector<Item> &items);
 Result check(const QStringList &sources, const QString &targetDirectory);
 
 /**
- * Copies or moves the \a sources, absolute paths, into \a targetDirectory, folders with
- * everything in them, across file systems too. An item that lies there already is left alone.
+ * Copies or moves the \a items, folders with everything in them, across file systems too.
  *
  * Links are remade, not followed, in a folder that is copied. A link given itself is moved so
  * that it still points to the same thing; a copy of a link to a file is a copy of that file.
  */
+Result transfer(const QVector<Item> &items, Action action, FileProgress &progress);
+/// The same with the \a sources under their own names in \a targetDirectory.
 Result transfer(const QStringList &sources, const QString &targetDirectory, Action action,
                 FileProgress &progress);
 /// The same with nobody following.

@@ -7,7 +7,23 @@
 
 #include <frame/EntryPath.h>
 
+#include <QFile>
+
 namespace FreeName {
+
+namespace {
+
+constexpr int LongestName = 255; // bytes
+
+// As much of the \a stem as there is room for, and the \a end.
+QString shortened(QString stem, const QString &end)
+{
+    while (stem.size() > 1 && QFile::encodeName(stem + end).size() > LongestName)
+        stem.chop(stem.at(stem.size() - 1).isLowSurrogate() ? 2 : 1);
+    return stem + end;
+}
+
+} // namespace
 
 Name first(Kind kind, const std::function<bool(const QString &)> &taken)
 {
@@ -18,6 +34,18 @@ Name first(Kind kind, const std::function<bool(const QString &)> &taken)
             : EntryPath::entryNamed(QLatin1String("shortcut") + number);
         if (!taken(fileName))
             return {fileName, number};
+    }
+}
+
+QString like(const QString &fileName, Kind kind, const std::function<bool(const QString &)> &taken)
+{
+    const int dot = kind == Kind::Folder ? -1 : fileName.lastIndexOf(QLatin1Char('.'));
+    const QString stem = dot > 0 ? fileName.left(dot) : fileName;
+    const QString suffix = fileName.mid(stem.size());
+    for (quint64 n = 2;; ++n) {
+        const QString name = shortened(stem, QLatin1Char('-') + QString::number(n) + suffix);
+        if (!taken(name))
+            return name;
     }
 }
 

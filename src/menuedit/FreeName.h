@@ -8,8 +8,8 @@
 #include <functional>
 
 /**
- * The name of a new folder or entry: "group" or "shortcut", a number (none for the first)
- * and for an entry ".desktop".
+ * The file name of something new. That of a new folder or entry is "group" or "shortcut", a number
+ * (none for the first) and for an entry ".desktop".
  */
 namespace FreeName {
 
@@ -25,6 +25,11 @@ struct Name
 
 /// The first name of \a kind that is not \a taken.
 Name first(Kind kind, const std::function<bool(const QString &fileName)> &taken);
+
+/// The first name that is not \a taken for something of \a kind that is like the one called
+/// \a fileName: that name with "-2" or the next number before its suffix. Never longer than a file
+/// system allows.
+QString like(const QString &fileName, Kind kind, const std::function<bool(const QString &fileName)> &taken);
 
 /// The first name of \a kind that nothing in the directory \a folder has, not even a link
 /// that leads nowhere: a new file would be written to where it points.

@@ -30,6 +30,12 @@ QVector<QModelIndex> childrenOf(const QSortFilterProxyModel &proxy, const QModel
 QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QString &name, int row,
                              const QModelIndex &folder)
 {
+    return with(proxy, QStringList(name), row, folder);
+}
+
+QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QStringList &names, int row,
+                             const QModelIndex &folder)
+{
     // The row of a file that went stands for a moment longer.
     const std::optional<QSet<QString>> present =
         OnDisk::namesIn(folder.data(QFileSystemModel::FilePathRole).toString());
@@ -44,5 +50,5 @@ QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QString &
     }
     if (row == proxy.sourceModel()->rowCount(folder))
         place = children.size();
-    return SortOrder::rewritten(children, name, place);
+    return SortOrder::rewritten(children, names, place);
 }

@@ -26,5 +26,8 @@ namespace ShownOrder {
  * @param folder the folder, in the file model
  */
 QStringList with(const QSortFilterProxyModel &proxy, const QString &name, int row, const QModelIndex &folder);
+/// The same with several \a names, each once, which stand there in their order.
+QStringList with(const QSortFilterProxyModel &proxy, const QStringList &names, int row,
+                 const QModelIndex &folder);
 
 } // namespace ShownOrder

@@ -93,16 +93,22 @@ Places places(const QStringList &list, const QString &left, const QString &right
 
 QStringList rewritten(const QStringList &children, const QString &name, int place)
 {
+    return rewritten(children, QStringList(name), place);
+}
+
+QStringList rewritten(const QStringList &children, const QStringList &names, int place)
+{
+    const QSet<QString> moved(names.begin(), names.end());
     QStringList list{QStringLiteral("*")};
-    list.reserve(children.size() + 2);
+    list.reserve(children.size() + names.size() + 1);
     for (int i = 0; i < children.size(); ++i) {
         if (i == place)
-            list.append(name);
-        if (children.at(i) != name)
+            list.append(names);
+        if (!moved.contains(children.at(i)))
             list.append(children.at(i));
     }
     if (place == children.size())
-        list.append(name);
+        list.append(names);
     return list;
 }
 

@@ -87,5 +87,7 @@ Places places(const QStringList &list, const QString &left, const QString &right
  * The list begins with "*", so that children that come later are shown above all others.
  */
 QStringList rewritten(const QStringList &children, const QString &name, int place);
+/// The same with several \a names, each once, which stand there in their order.
+QStringList rewritten(const QStringList &children, const QStringList &names, int place);
 
 } // namespace SortOrder

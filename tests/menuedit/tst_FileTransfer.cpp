@@ -5,6 +5,7 @@
 #include "OtherFileSystem.h"
 #include "TestCase.h"
 
+#include <menuedit/FileProgress.h>
 #include <menuedit/FileTransfer.h>
 #include <menuedit/TreeLimits.h>
 
@@ -37,6 +38,8 @@ private Q_SLOTS:
     void movesAcrossFileSystems();
     void takesSeveralItems();
     void leavesAloneWhatIsThereAlready();
+    void givesOtherNames_data();
+    void givesOtherNames();
     void carriesNamesThatAreNoText();
     void keepsPermissionsAndForAMoveTheTimes();
 
@@ -229,6 +232,35 @@ void tst_FileTransfer::leavesAloneWhatIsThereAlready()
 
     QCOMPARE(read(here), QByteArray("a"));
     QCOMPARE(read(path(QStringLiteral("to/b"))), QByteArray("b"));
+}
+
+void tst_FileTransfer::givesOtherNames_data()
+{
+    QTest::addColumn<Action>("action");
+    QTest::newRow("copy") << Action::Copy;
+    QTest::newRow("move") << Action::Move;
+}
+
+// Each into a folder of its own, also the one that it lies in.
+void tst_FileTransfer::givesOtherNames()
+{
+    QFETCH(Action, action);
+    const QVector<Item> items{
+        {write(QStringLiteral("one/a"), "a"), path(QStringLiteral("one/b"))},
+        {path(QStringLiteral("from")), path(QStringLiteral("other/taken-2"))},
+        {write(QStringLiteral("one/stays"), "stays"), path(QStringLiteral("one/stays"))},
+    };
+    write(QStringLiteral("from/inner/x"), "x");
+    write(QStringLiteral("other/taken"), "taken");
+    FileProgress nobody;
+    const Result result = transfer(items, action, nobody);
+    QVERIFY2(result.succeeded(), qPrintable(result.path));
+    QCOMPARE(read(path(QStringLiteral("one/b"))), QByteArray("a"));
+    QCOMPARE(read(path(QStringLiteral("other/taken-2/inner/x"))), QByteArray("x"));
+    QCOMPARE(read(path(QStringLiteral("other/taken"))), QByteArray("taken"));
+    QCOMPARE(read(path(QStringLiteral("one/stays"))), QByteArray("stays"));
+    QCOMPARE(QFile::exists(path(QStringLiteral("one/a"))), action == Action::Copy);
+    QCOMPARE(QFile::exists(path(QStringLiteral("from/inner/x"))), action == Action::Copy);
 }
 
 void tst_FileTransfer::carriesNamesThatAreNoText()

@@ -8,6 +8,8 @@
 #include <QDir>
 #include <QFile>
 
+Q_DECLARE_METATYPE(FreeName::Kind)
+
 class tst_FreeName : public TestCase
 {
     Q_OBJECT
@@ -17,6 +19,10 @@ private Q_SLOTS:
     void takesTheFirstThatIsFree();
     void looksAtWhatTheFolderHas();
     void passesOverALinkThatLeadsNowhere();
+    void numbersWhatIsLikeAnother_data();
+    void numbersWhatIsLikeAnother();
+    void shortensWhatWouldBeTooLong_data();
+    void shortensWhatWouldBeTooLong();
 };
 
 void tst_FreeName::countsFromNoNumberOn()
@@ -60,6 +66,66 @@ void tst_FreeName::passesOverALinkThatLeadsNowhere()
 
     QCOMPARE(FreeName::firstIn(folder(), FreeName::Kind::Entry).fileName,
              QStringLiteral("shortcut1.desktop"));
+}
+
+void tst_FreeName::numbersWhatIsLikeAnother_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<FreeName::Kind>("kind");
+    QTest::addColumn<QStringList>("taken");
+    QTest::addColumn<QString>("expected");
+    using Kind = FreeName::Kind;
+    QTest::newRow("entry") << QStringLiteral("a.desktop") << Kind::Entry << QStringList()
+                           << QStringLiteral("a-2.desktop");
+    QTest::newRow("taken") << QStringLiteral("a.desktop") << Kind::Entry
+                           << QStringList{QStringLiteral("a-2.desktop"), QStringLiteral("a-3.desktop")}
+                           << QStringLiteral("a-4.desktop");
+    QTest::newRow("numbered") << QStringLiteral("a-2.desktop") << Kind::Entry << QStringList()
+                              << QStringLiteral("a-2-2.desktop");
+    QTest::newRow("domain") << QStringLiteral("org.x.y.desktop") << Kind::Entry << QStringList()
+                            << QStringLiteral("org.x.y-2.desktop");
+    QTest::newRow("no suffix") << QStringLiteral("a") << Kind::Entry << QStringList()
+                               << QStringLiteral("a-2");
+    QTest::newRow("hidden") << QStringLiteral(".a") << Kind::Entry << QStringList() << QStringLiteral(".a-2");
+    QTest::newRow("folder") << QStringLiteral("a") << Kind::Folder << QStringList{QStringLiteral("a-2")}
+                            << QStringLiteral("a-3");
+    QTest::newRow("folder with a dot")
+        << QStringLiteral("v1.5") << Kind::Folder << QStringList() << QStringLiteral("v1.5-2");
+}
+
+void tst_FreeName::numbersWhatIsLikeAnother()
+{
+    QFETCH(QString, name);
+    QFETCH(FreeName::Kind, kind);
+    QFETCH(QStringList, taken);
+    QFETCH(QString, expected);
+    QCOMPARE(FreeName::like(name, kind, [&taken](const QString &other) { return taken.contains(other); }),
+             expected);
+}
+
+void tst_FreeName::shortensWhatWouldBeTooLong_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::addColumn<QString>("expected");
+    QTest::newRow("letters") << QString(247, QLatin1Char('a')) + QStringLiteral(".desktop")
+                             << QString(245, QLatin1Char('a')) + QStringLiteral("-2.desktop");
+    QTest::newRow("umlauts") << QString(123, QChar(0xe4)) + QStringLiteral(".desktop")
+                             << QString(122, QChar(0xe4)) + QStringLiteral("-2.desktop");
+    const QString smile = QString::fromUtf8("\xf0\x9f\x98\x80");
+    QTest::newRow("smiles") << smile.repeated(61) + QStringLiteral(".desktopss")
+                            << smile.repeated(60) + QStringLiteral("-2.desktopss");
+    QTest::newRow("more smiles") << smile.repeated(61) + QStringLiteral("aaa.desktop")
+                                 << smile.repeated(61) + QStringLiteral("a-2.desktop");
+}
+
+void tst_FreeName::shortensWhatWouldBeTooLong()
+{
+    QFETCH(QString, name);
+    QFETCH(QString, expected);
+    const QString found = FreeName::like(name, FreeName::Kind::Entry, [](const QString &) { return false; });
+    QCOMPARE(found, expected);
+    QVERIFY(QFile::encodeName(found).size() <= 255);
+    write(found, "can be written");
 }
 
 VEL_TEST_GUILESS_MAIN(tst_FreeName)

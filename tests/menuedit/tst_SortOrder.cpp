@@ -27,6 +27,8 @@ private Q_SLOTS:
     void answersSoonForADearPattern();
     void rewritesTheList_data();
     void rewritesTheList();
+    void listsSeveralTogether_data();
+    void listsSeveralTogether();
 };
 
 namespace {
@@ -225,6 +227,30 @@ void tst_SortOrder::rewritesTheList()
     QFETCH(QStringList, expected);
 
     QCOMPARE(SortOrder::rewritten(children, name, place), expected);
+}
+
+void tst_SortOrder::listsSeveralTogether_data()
+{
+    QTest::addColumn<QString>("names");
+    QTest::addColumn<int>("place");
+    QTest::addColumn<QString>("expected");
+    QTest::newRow("new ones") << "y x" << 1 << "* a y x b c d";
+    QTest::newRow("at the end") << "y x" << 4 << "* a b c d y x";
+    QTest::newRow("nowhere") << "y b" << -1 << "* a c d";
+    QTest::newRow("children") << "d a" << 2 << "* b d a c";
+    QTest::newRow("before one of them") << "b d x" << 1 << "* a b d x c";
+    QTest::newRow("none") << "" << 1 << "* a b c d";
+}
+
+void tst_SortOrder::listsSeveralTogether()
+{
+    QFETCH(QString, names);
+    QFETCH(int, place);
+    QFETCH(QString, expected);
+    const QStringList children = QStringLiteral("a b c d").split(QLatin1Char(' '));
+    QCOMPARE(SortOrder::rewritten(children, names.split(QLatin1Char(' '), Qt::SkipEmptyParts), place)
+                 .join(QLatin1Char(' ')),
+             expected);
 }
 
 VEL_TEST_GUILESS_MAIN(tst_SortOrder)
