@@ -15,6 +15,7 @@
 #include <QLocale>
 
 #include <algorithm>
+#include <cerrno>
 #include <fstream>
 #include <map>
 
@@ -96,8 +97,10 @@ bool writeDirectoryEntry(const fs::path &folder, const MenuCategory &category, c
 bool writeCategory(const fs::path &folder, const MenuCategory &category, const MenuItems &items)
 {
     std::error_code error;
-    if (!fs::create_directory(folder, error))
+    if (!fs::create_directory(folder, error)) {
+        errno = error ? error.value() : EEXIST;
         return false;
+    }
     QStringList sortOrder;
     for (const MenuItem &item : items) {
         if (!copyFile(item.source, folder / item.fileName))
@@ -112,8 +115,10 @@ bool writeCategory(const fs::path &folder, const MenuCategory &category, const M
 bool buildApplicationsMenu(const fs::path &folder)
 {
     std::map<int, MenuItems> itemsOfCategories = collectItems();
-    if (itemsOfCategories.empty())
+    if (itemsOfCategories.empty()) {
+        errno = ENODATA;
         return false;
+    }
     QStringList sortOrder;
     for (auto &[place, items] : itemsOfCategories) {
         const MenuCategory &category = menuCategories().at(place);

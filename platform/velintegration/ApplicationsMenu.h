@@ -10,6 +10,7 @@
  * category that has any, with copies of their entries.
  *
  * @param folder an existing, empty folder
- * @return false when there is no application, or something could not be copied or written
+ * @return false when there is no application (errno is ENODATA then), or something could not be copied or
+ *         written (errno tells why)
  */
 bool buildApplicationsMenu(const std::filesystem::path &folder);

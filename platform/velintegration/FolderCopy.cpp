@@ -142,8 +142,12 @@ bool copyFile(const fs::path &from, const fs::path &to)
     // Without O_NONBLOCK a named pipe would wait for a writer.
     const Descriptor source(::open(from.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
     struct stat status = {};
-    if (source.get() < 0 || ::fstat(source.get(), &status) != 0 || !S_ISREG(status.st_mode))
+    if (source.get() < 0 || ::fstat(source.get(), &status) != 0)
         return false;
+    if (!S_ISREG(status.st_mode)) {
+        errno = EINVAL;
+        return false;
+    }
     const mode_t mode = (status.st_mode & PlainBits) | S_IRUSR | S_IWUSR;
     Descriptor target(::open(to.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode));
     return target.get() >= 0 && copyBytes(source.get(), target.get()) && target.close();

@@ -6,7 +6,7 @@
 #include <filesystem>
 
 /// Copies a regular file, following links. The copy has its permissions as far as the umask lets it,
-/// never set-id bits, and can be written by its owner.
+/// never set-id bits, and can be written by its owner. When it fails, errno tells why.
 bool copyFile(const std::filesystem::path &from, const std::filesystem::path &to);
 
 /**

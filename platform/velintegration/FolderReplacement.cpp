@@ -97,15 +97,26 @@ FolderReplacement::FolderReplacement(const fs::path &target, Exchange exchange)
     : m_target(resolved(target))
     , m_exchange(exchange)
 {
+    if (!isReplaceable())
+        return;
+    PreviousFolder(m_target, m_exchange).recover();
+    removeLeftovers();
+    if (makeParents() && makeFolder())
+        return;
+    m_error = errno;
+    m_folder.clear();
+}
+
+bool FolderReplacement::isReplaceable()
+{
     std::error_code error;
-    const bool isReplaceable = m_target.has_filename()
-        && (!pathExists(m_target) || fs::is_directory(fs::symlink_status(m_target, error)));
-    if (isReplaceable) {
-        PreviousFolder(m_target, m_exchange).recover();
-        removeLeftovers();
-    }
-    if (!isReplaceable || !makeParents() || !makeFolder())
-        m_folder.clear();
+    if (m_target.empty())
+        m_error = EPERM;
+    else if (!m_target.has_filename())
+        m_error = EBUSY;
+    else if (pathExists(m_target) && !fs::is_directory(fs::symlink_status(m_target, error)))
+        m_error = ENOTDIR;
+    return m_error == 0;
 }
 
 FolderReplacement::~FolderReplacement()
@@ -178,8 +189,10 @@ bool FolderReplacement::makeFolder()
 bool FolderReplacement::commit()
 {
     const bool done = pathExists(m_target) ? replaceOld() : rename(m_folder.c_str(), m_target.c_str()) == 0;
-    if (!done)
+    if (!done) {
+        m_error = errno;
         return false;
+    }
     m_folder.clear();
     m_madeParents.clear();
     return true;

@@ -30,6 +30,9 @@ public:
     /// Whether there is a new folder to fill; without one nothing else may be called.
     bool isOpen() const { return !m_folder.empty(); }
 
+    /// Why there is none, or why commit() failed: the number of a system error.
+    int error() const { return m_error; }
+
     /// The new folder, empty at first; its name begins with a dot.
     const std::filesystem::path &folder() const { return m_folder; }
 
@@ -41,6 +44,7 @@ public:
     static int exchangePaths(const char *first, const char *second);
 
 private:
+    bool isReplaceable();
     bool makeParents();
     bool makeFolder();
     bool replaceOld();
@@ -53,4 +57,5 @@ private:
     std::vector<std::filesystem::path> m_madeParents;
     Exchange m_exchange;
     int m_lock = -1;
+    int m_error = 0;
 };

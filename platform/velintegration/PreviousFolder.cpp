@@ -67,8 +67,10 @@ bool PreviousFolder::replaceTarget(const fs::path &folder) const
 {
     const Vel::FolderLock turn(m_target.parent_path().string());
     const fs::path kept = m_target.parent_path() / (keptName() + std::to_string(inodeOf(folder)));
-    if (pathExists(kept))
+    if (pathExists(kept)) {
+        errno = EEXIST;
         return false;
+    }
     if (!replaceAtOnce(folder, kept)) {
         const bool isUnknown = errno == EINVAL || errno == ENOSYS || errno == EOPNOTSUPP;
         if (!isUnknown || !replaceInSteps(folder, kept))
@@ -107,10 +109,12 @@ bool PreviousFolder::replaceInSteps(const fs::path &folder, const fs::path &kept
     const bool isAway = move(m_target, m_path);
     if (isAway && move(folder, m_target))
         return true;
+    const int reason = errno;
     if (isAway)
         move(m_path, m_target);
     if (hasCopy)
         move(kept, m_path);
+    errno = reason;
     return false;
 }
 

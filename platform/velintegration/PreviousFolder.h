@@ -26,7 +26,7 @@ public:
     const std::filesystem::path &path() const { return m_path; }
 
     /// Puts \a folder, which lies beside the target, in the place of the target, and that in the place
-    /// of the copy. When that fails, all is as it was.
+    /// of the copy. When that fails, all is as it was, and errno tells why.
     bool replaceTarget(const std::filesystem::path &folder) const;
 
     /// Ends what killed programs began, and brings the copy back that they put away for it.

@@ -14,6 +14,31 @@
 #include <QFile>
 #include <QPointer>
 
+#include <cerrno>
+
+namespace {
+
+QString failureText(int error)
+{
+    const QString directory = StartMenu::directory();
+    if (error == ENODATA)
+        return QCoreApplication::translate(
+                   "VelMenuView",
+                   "The default menu could not be built in %1, because no application is installed. The menu "
+                   "was left as it is.")
+            .arg(directory);
+    if (error == 0)
+        return QCoreApplication::translate("VelMenuView",
+                                           "The default menu could not be built in %1. The menu was left as "
+                                           "it is.")
+            .arg(directory);
+    return QCoreApplication::translate(
+               "VelMenuView", "The default menu could not be built in %1: %2. The menu was left as it is.")
+        .arg(directory, qt_error_string(error));
+}
+
+} // namespace
+
 QString StartMenu::directory()
 {
     return QString::fromStdString(GetVelDir(VelDir::StartMenu));
@@ -28,20 +53,16 @@ bool StartMenu::recreate(QWidget *asker, MenuVoice &voice, const std::function<v
         QMessageBox::Ok | QMessageBox::Cancel, QMessageBox::Ok);
     if (!self || answer == QMessageBox::Cancel)
         return false;
-    bool isBuilt = false;
+    int error = 0;
     {
         const WaitCursor waiting;
         begins();
-        isBuilt = CreateStartMenu(QFile::encodeName(directory()).constData(), nullptr);
+        if (CreateStartMenu(QFile::encodeName(directory()).constData(), nullptr))
+            return true;
+        error = errno;
     }
-    if (isBuilt)
-        return true;
     qWarning("VelMenuView: can't create the start menu");
     if (self)
-        voice.tell(QCoreApplication::translate("VelMenuView",
-                                               "The default menu could not be built in %1. The menu was left "
-                                               "as it is.")
-                       .arg(directory()),
-                   MenuVoice::Failure);
+        voice.tell(failureText(error), MenuVoice::Failure);
     return true;
 }

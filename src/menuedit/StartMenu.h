@@ -20,7 +20,7 @@ QString directory();
 
 /**
  * Builds the default menu anew after asking over \a asker, which may go away meanwhile. When the
- * menu cannot be built, the old one stays, a warning is logged, and the user is told.
+ * menu cannot be built, the old one stays, a warning is logged, and the user is told why.
  *
  * @param voice goes with \a asker
  * @param begins called when the user wants it, before anything is touched

@@ -3,12 +3,15 @@
 
 #include "MenuTestCase.h"
 #include "ModalDriver.h"
+#include "OrdinaryUser.h"
 #include "VelMenuView.h"
 
 #include <QAction>
 #include <QFileSystemModel>
 #include <QPushButton>
 #include <QSignalSpy>
+
+#include <memory>
 
 /// Building the start menu anew.
 class tst_VelMenuViewRecreate : public MenuTestCase
@@ -19,6 +22,8 @@ private Q_SLOTS:
     void leavesTheStartMenuWhenToldSo();
     void rebuildsTheStartMenuAfterAsking();
     void leavesTheStartMenuWhenItCannotBeRebuilt();
+    void tellsWhyTheStartMenuCannotBeRebuilt_data();
+    void tellsWhyTheStartMenuCannotBeRebuilt();
     void goesAwayWhileItAsksToRebuild();
 };
 
@@ -102,6 +107,62 @@ void tst_VelMenuViewRecreate::leavesTheStartMenuWhenItCannotBeRebuilt()
     QCOMPARE(read(startMenu()), QByteArray("in the way"));
     QVERIFY(!view.selectedItem().isValid());
     QVERIFY(!view.rootIndex().isValid() || view.model()->rowCount(view.rootIndex()) == 0);
+}
+
+void tst_VelMenuViewRecreate::tellsWhyTheStartMenuCannotBeRebuilt_data()
+{
+    QTest::addColumn<QString>("obstacle");
+    QTest::addColumn<bool>("assistance");
+    QTest::addColumn<QString>("text");
+    for (const bool assistance : {false, true}) {
+        const auto row = [assistance](const char *obstacle, const char *text) {
+            QTest::addRow("%s, %s", obstacle, assistance ? "assistance" : "plain")
+                << QString::fromLatin1(obstacle) << assistance << QString::fromLatin1(text);
+        };
+        row("no application",
+            "The default menu could not be built in %1, because no application is installed. The menu was "
+            "left as it is.");
+        row("a file",
+            "The default menu could not be built in %1: Not a directory. The menu was left as it is.");
+        row("no permission",
+            "The default menu could not be built in %1: Permission denied. The menu was left as it is.");
+    }
+}
+
+void tst_VelMenuViewRecreate::tellsWhyTheStartMenuCannotBeRebuilt()
+{
+    QFETCH(QString, obstacle);
+    QFETCH(bool, assistance);
+    QFETCH(QString, text);
+    if (obstacle != QLatin1String("no application"))
+        write(QStringLiteral("data/applications/x.desktop"), entryText(QStringLiteral("Xylophone")));
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("data"))));
+    if (obstacle == QLatin1String("a file"))
+        write(QStringLiteral("config/startmenu"), "in the way");
+    else
+        write(QStringLiteral("config/startmenu/old.desktop"), entryText(QStringLiteral("Old")));
+    VelMenuView view(QString(), -1, true);
+    view.setAssistance(assistance);
+    QSignalSpy told(&view, &VelMenuView::told);
+    ModalDriver modal;
+    modal.handle(
+        [](QWidget *window) { qobject_cast<QMessageBox *>(window)->button(QMessageBox::Ok)->click(); });
+    expectWarning(QStringLiteral("VelMenuView: can't create the start menu"));
+    {
+        const bool isClosed = obstacle == QLatin1String("no permission");
+        if (isClosed)
+            QVERIFY(
+                QFile::setPermissions(path(QStringLiteral("config")), QFile::ReadOwner | QFile::ExeOwner));
+        const std::unique_ptr<OrdinaryUser> user(isClosed ? new OrdinaryUser(folder()) : nullptr);
+        view.slotRecreate();
+    }
+    QVERIFY(QFile::setPermissions(path(QStringLiteral("config")),
+                                  QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+    QVERIFY(modal.finished());
+    QCOMPARE(told.size(), 1);
+    QCOMPARE(told.at(0).at(0).toString(), text.arg(startMenu()));
+    QCOMPARE(told.at(0).at(1).toInt(), 2);
+    qputenv("XDG_DATA_DIRS", "/usr/local/share:/usr/share");
 }
 
 void tst_VelMenuViewRecreate::goesAwayWhileItAsksToRebuild()

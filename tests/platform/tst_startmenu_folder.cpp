@@ -9,6 +9,7 @@
 #include <QDir>
 #include <QFileInfo>
 
+#include <cerrno>
 #include <csignal>
 
 #include <sys/resource.h>
@@ -235,6 +236,7 @@ void tst_startmenu_folder::aCircleOfLinksIsRefused()
     QDir().mkpath(path(QStringLiteral("config/vel")));
     QVERIFY(QFile::link(QStringLiteral("startmenu"), menu()));
     QVERIFY(!create());
+    QCOMPARE(errno, EPERM);
     QVERIFY(QFileInfo(menu()).isSymLink());
     QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
 }
@@ -288,9 +290,11 @@ void tst_startmenu_folder::aFullDiskLeavesTheOldMenuWhole()
     const auto previous = std::signal(SIGXFSZ, SIG_IGN);
     setrlimit(RLIMIT_FSIZE, &small);
     const bool created = create();
+    const int error = errno;
     setrlimit(RLIMIT_FSIZE, &limit);
     std::signal(SIGXFSZ, previous);
     QVERIFY(!created);
+    QCOMPARE(error, EFBIG);
     QCOMPARE(tree(path(QStringLiteral("config"))), before);
 }
 
@@ -298,6 +302,7 @@ void tst_startmenu_folder::aFileInTheWayStays()
 {
     write(QStringLiteral("config/vel/startmenu"), "a file");
     QVERIFY(!create());
+    QCOMPARE(errno, ENOTDIR);
     QCOMPARE(read(menu()), QByteArray("a file"));
     QCOMPARE(names(path(QStringLiteral("config/vel"))), QStringList(QStringLiteral("startmenu")));
 }

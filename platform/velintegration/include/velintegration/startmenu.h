@@ -25,6 +25,8 @@
  * @param menuDir the folder of the menu. Missing parents are made, a link is followed, unless
  *        another user may have planted it (see Vel::leadsThroughPlantedLink)
  * @param templateDir a folder that is copied instead of all that; may be null or empty
- * @return whether the new menu stands
+ * @return whether the new menu stands; when it does not, errno tells why: ENODATA when no application is
+ *         installed, ENOTDIR when something else than a folder is in the place of the menu, EPERM where a
+ *         link was not followed, 0 where no reason is known, else what the system said
  */
 VELINTEGRATION_EXPORT bool CreateStartMenu(const char *menuDir, const char *templateDir);
