@@ -268,7 +268,8 @@ public Q_SLOTS:
     void slotDel();
     /**
      * Runs the selected entry with the desktop's program "vel-open", which lives on when the
-     * view goes away. A message box tells when that cannot be started within two seconds.
+     * view goes away. A message box tells when that cannot be started within two seconds; with
+     * assistance() told() does, and gives the reason when "vel-open" could not start the entry.
      */
     void slotExe();
     /// Puts the selected item on the clipboard, to be moved where it is pasted.

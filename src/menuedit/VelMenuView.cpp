@@ -277,7 +277,11 @@ void VelMenuView::dropEvent(QDropEvent *event)
 void VelMenuView::slotExe()
 {
     const QString path = selectedPath();
-    if (!path.isEmpty())
+    if (path.isEmpty())
+        return;
+    if (d->isAssisted)
+        d->execute(path);
+    else
         EntryExecution::start(this, path);
 }
 

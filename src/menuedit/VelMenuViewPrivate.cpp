@@ -3,6 +3,7 @@
 
 #include "VelMenuViewPrivate.h"
 
+#include "EntryExecution.h"
 #include "ItemKey.h"
 #include "MenuReordering.h"
 #include "RebuildRecord.h"
@@ -144,6 +145,17 @@ void VelMenuViewPrivate::removeSelected()
     for (const QModelIndex &index : selected)
         paths.append(menu.files().filePath(menu.proxy().mapToSource(index)));
     deletion.remove(paths);
+}
+
+// By then, the view may show another menu.
+void VelMenuViewPrivate::execute(const QString &path) const
+{
+    const auto tell = [view = q, path, name = history.nameOf(path)](const QString &reason) {
+        voiceOf(*view).tell(
+            QCoreApplication::translate("VelMenuView", "%1 was not started: %2.").arg(name, reason),
+            MenuVoice::Failure, view->d->selection.shown(path));
+    };
+    EntryExecution::start(q, path, tell);
 }
 
 void VelMenuViewPrivate::recreate()

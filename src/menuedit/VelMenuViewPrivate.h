@@ -77,6 +77,8 @@ public:
     void moveSelected(bool up);
     /// Deletes the selected items.
     void removeSelected();
+    /// Runs the entry at \a path, and tells why it does not start.
+    void execute(const QString &path) const;
     /// Builds the default menu anew.
     void recreate();
     void setHiddenShown(bool isShown);
