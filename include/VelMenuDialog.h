@@ -27,7 +27,7 @@ class VelMenuDialogPrivate;
  * The dialog remembers its size in the application's default QSettings, and is cut to the screen
  * when it is shown. When it is destroyed
  * it tells the window manager to read the menu again, if its directory is the start menu, the
- * desktop folder or the tool bar; a message box appears when nobody takes the command.
+ * desktop folder or the tool bar; a message box appears when nobody takes the command, see updateWM().
  *
  * \code
  * VelMenuDialog dialog(QString(), 22, false, false, this);
@@ -98,7 +98,8 @@ public:
     /**
      * Tells the window manager to read the menu of this dialog again.
      *
-     * A message box appears when the command does not arrive.
+     * A message box appears when the command does not arrive; with assistance() not where there is no
+     * window manager that takes commands, as nobody shows the menu then.
      *
      * @return whether the command arrived; false, without a message, for a directory that the
      *         window manager does not know

@@ -7,12 +7,20 @@
 
 #include <QX11Info>
 
-// Last: the macros of Xlib's header hide names of Qt.
 #include <velintegration/wmcommand.h>
+
+// Last: the macros of Xlib's header hide names of Qt.
+#include <X11/Xlib.h>
 
 namespace {
 
 constexpr VelDir Kinds[] = {VelDir::StartMenu, VelDir::Desktop, VelDir::ToolBar};
+
+// Other platforms have a display, too: that of Wayland is no connection of Xlib's.
+Display *x11Display()
+{
+    return QX11Info::isPlatformX11() ? QX11Info::display() : nullptr;
+}
 
 } // namespace
 
@@ -39,9 +47,16 @@ QByteArray MenuUpdateCommand::forKind(int kind)
     }
 }
 
+bool MenuUpdateCommand::isHeard()
+{
+    Display *const display = x11Display();
+    if (!display)
+        return false;
+    const std::string selection = VelWmCommand::selectionName(DefaultScreen(display));
+    return XGetSelectionOwner(display, XInternAtom(display, selection.c_str(), False)) != None;
+}
+
 bool MenuUpdateCommand::send(const QByteArray &command)
 {
-    // Other platforms have a display, too: that of Wayland is no connection of Xlib's.
-    Display *const display = QX11Info::isPlatformX11() ? QX11Info::display() : nullptr;
-    return SendCommandToWM(display, command.constData());
+    return SendCommandToWM(x11Display(), command.constData());
 }

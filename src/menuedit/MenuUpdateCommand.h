@@ -20,6 +20,9 @@ int kindOf(const QString &dir);
 /// The command line for a directory of \a kind, line feed included; empty for any other kind.
 QByteArray forKind(int kind);
 
+/// Whether anybody takes commands on the application's display, which nobody does off X11.
+bool isHeard();
+
 /// Sends a command over the application's display; whether the window manager has got it, which it
 /// never has off X11.
 bool send(const QByteArray &command);

@@ -254,6 +254,9 @@ bool VelMenuDialog::updateWM()
     const QByteArray command = MenuUpdateCommand::forKind(d->menuKind);
     if (command.isEmpty())
         return false;
+    // Where nobody shows the menu, nobody has to read it anew.
+    if (assistance() && !MenuUpdateCommand::isHeard())
+        return false;
     if (MenuUpdateCommand::send(command))
         return true;
     MessageBox::show(this, QMessageBox::Warning, tr("Warning"), tr("Can't send command to vel-wm"));

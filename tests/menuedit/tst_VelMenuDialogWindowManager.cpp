@@ -31,6 +31,8 @@ private Q_SLOTS:
     void tellsTheWindowManagerWhenItGoes();
     void tellsTheWindowManagerNothingOfOtherDirectories();
     void warnsWhenThereIsNoWindowManager();
+    void closesQuietlyWithAssistance();
+    void leavesTheChannelToAWindowManagerThatComesLater();
     void tellsTheWindowManagerWhenApplied();
 };
 
@@ -124,6 +126,42 @@ void tst_VelMenuDialogWindowManager::warnsWhenThereIsNoWindowManager()
     modal.answer(noWindowManager, QMessageBox::Ok);
     dialog.reset();
     QVERIFY(modal.finished());
+}
+
+void tst_VelMenuDialogWindowManager::closesQuietlyWithAssistance()
+{
+    QDir().mkpath(startMenu());
+    QVERIFY(!MenuUpdateCommand::isHeard());
+    ModalDriver modal;
+    VelMenuDialog dialog(startMenu(), -1, true, true);
+    dialog.setAssistance(true);
+    QVERIFY(!dialog.updateWM());
+    {
+        WindowManager manager;
+        QVERIFY(MenuUpdateCommand::isHeard());
+        QVERIFY(dialog.updateWM());
+        QTRY_COMPARE(manager.lines().size(), 1);
+    }
+    QVERIFY(!dialog.updateWM());
+    dialog.setAssistance(false);
+    modal.answer(noWindowManager, QMessageBox::Ok);
+    QVERIFY(!dialog.updateWM());
+    QVERIFY(modal.finished());
+    dialog.setAssistance(true);
+}
+
+void tst_VelMenuDialogWindowManager::leavesTheChannelToAWindowManagerThatComesLater()
+{
+    QDir().mkpath(startMenu());
+    auto dialog = std::make_unique<VelMenuDialog>(startMenu(), -1, true, true);
+    dialog->setAssistance(true);
+    dialog->show();
+    QVERIFY(!dialog->updateWM());
+    // One that takes the channel from nobody.
+    WindowManager manager;
+    QVERIFY(manager.owns());
+    dialog.reset();
+    QTRY_COMPARE(manager.lines(), QList<QByteArray>{"VELWM_UPDATE_STARTMENU"});
 }
 
 void tst_VelMenuDialogWindowManager::tellsTheWindowManagerWhenApplied()

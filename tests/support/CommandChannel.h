@@ -21,14 +21,21 @@ public:
         , m_window(XCreateSimpleWindow(m_display, DefaultRootWindow(m_display), 0, 0, 1, 1, 0, 0, 0))
         , m_property(XInternAtom(m_display, "_VELWM_COMMAND", 0))
     {
-        const QByteArray selection = "_VELWM_COMMAND_S" + QByteArray::number(DefaultScreen(m_display));
         XSelectInput(m_display, m_window, PropertyChangeMask);
-        XSetSelectionOwner(m_display, XInternAtom(m_display, selection.constData(), 0), m_window,
-                           CurrentTime);
+        XSetSelectionOwner(m_display, selection(m_display), m_window, CurrentTime);
         XSync(m_display, 0);
     }
     ~CommandChannel() { XCloseDisplay(m_display); }
     Q_DISABLE_COPY_MOVE(CommandChannel)
+
+    /// Whether anybody owns the selection.
+    static bool isTaken()
+    {
+        Display *display = XOpenDisplay(nullptr);
+        const Window owner = XGetSelectionOwner(display, selection(display));
+        XCloseDisplay(display);
+        return owner != 0;
+    }
 
     QByteArray bytes()
     {
@@ -46,6 +53,12 @@ public:
     }
 
 private:
+    static Atom selection(Display *display)
+    {
+        const QByteArray name = "_VELWM_COMMAND_S" + QByteArray::number(DefaultScreen(display));
+        return XInternAtom(display, name.constData(), 0);
+    }
+
     Display *m_display;
     Window m_window;
     Atom m_property;
