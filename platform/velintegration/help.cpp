@@ -3,6 +3,7 @@
 
 #include <velintegration/help.h>
 
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QProcess>
@@ -21,7 +22,7 @@ QString pagePath(const QString &page)
 {
     QStringList folders = {QStringLiteral(VEL_INSTALLED_DATA_DIR)};
     const QString data = QFile::decodeName(qgetenv("VEL_DATA_DIR"));
-    if (!data.isEmpty())
+    if (QDir::isAbsolutePath(data))
         folders.prepend(data);
     for (const QString &folder : qAsConst(folders)) {
         const QFileInfo file(folder + QLatin1String("/doc/") + page + QLatin1String(".html"));

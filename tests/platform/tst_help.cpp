@@ -74,6 +74,17 @@ private Q_SLOTS:
         QTRY_COMPARE(opened(), QFile::encodeName(page) + '|');
     }
 
+    void ignoresADataDirectoryThatIsNotAbsolute()
+    {
+        write(QStringLiteral("data/doc/index.html"), "<p>");
+        const QString before = QDir::currentPath();
+        QVERIFY(QDir::setCurrent(folder()));
+        qputenv("VEL_DATA_DIR", "data");
+        const bool isShown = velHelpShow(std::string());
+        QVERIFY(QDir::setCurrent(before));
+        QVERIFY(!isShown);
+    }
+
     void bringsAPageAboutTheMenuEditor()
     {
         qputenv("VEL_DATA_DIR", VEL_SOURCE_DIR "/data");

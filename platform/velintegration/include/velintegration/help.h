@@ -11,7 +11,8 @@
  * Opens a page of the desktop's help in the user's browser.
  *
  * The page is "doc/<page>.html" below VEL_DATA_DIR, else below the installed data of the
- * desktop. The browser is started by xdg-open and not waited for.
+ * desktop. A VEL_DATA_DIR that holds no absolute path counts as not set. The browser is started
+ * by xdg-open and not waited for.
  *
  * @param page the page's name without suffix; empty for "index". A name that leads out of the
  *             help's folder has no page
