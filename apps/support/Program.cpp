@@ -15,6 +15,9 @@
 #include <cstdio>
 #include <memory>
 
+#include <pwd.h>
+#include <unistd.h>
+
 namespace {
 
 bool loadCatalog(const QString &name, const QString &directory)
@@ -29,10 +32,22 @@ bool loadCatalog(const QString &name, const QString &directory)
     return true;
 }
 
+// Without HOME Qt looks for the user's files in the root of the file system, and not where the
+// desktop's own libraries look.
+void provideHome()
+{
+    if (qgetenv("HOME").startsWith('/'))
+        return;
+    const passwd *const user = getpwuid(getuid());
+    if (user && user->pw_dir && *user->pw_dir == '/')
+        qputenv("HOME", user->pw_dir);
+}
+
 } // namespace
 
 void Program::describe(const QString &name)
 {
+    provideHome();
     QCoreApplication::setOrganizationName(QStringLiteral("vel"));
     QCoreApplication::setApplicationName(name);
     QCoreApplication::setApplicationVersion(QStringLiteral(VEL_VERSION));

@@ -18,7 +18,8 @@ class QCommandLineParser;
  */
 namespace Program {
 
-/// Names the organization, the program \a name and its version; goes before the application object.
+/// Names the organization, the program \a name and its version, and has HOME set to the user's home;
+/// goes before the application object.
 void describe(const QString &name);
 
 /**

@@ -3,6 +3,8 @@
 
 #include "environment.h"
 
+#include <velcore/home.h>
+
 #include <cstdlib>
 #include <vector>
 
@@ -42,7 +44,12 @@ std::string absoluteVariable(const char *name)
     return value.empty() || value.front() != '/' ? std::string() : withoutTrailingSlash(value);
 }
 
-std::string homeDirectory()
+std::string inHome(const std::string &home, const char *name)
+{
+    return (home == "/" ? home : home + '/') + name;
+}
+
+std::string Vel::homeDirectory()
 {
     std::string home = absoluteVariable("HOME");
     if (!home.empty())
@@ -51,11 +58,14 @@ std::string homeDirectory()
     return registered.empty() ? std::string("/") : withoutTrailingSlash(registered);
 }
 
+std::string Vel::dataHome()
+{
+    const std::string dataHome = absoluteVariable("XDG_DATA_HOME");
+    return dataHome.empty() ? inHome(homeDirectory(), ".local/share") : dataHome;
+}
+
 std::string xdgConfigHome()
 {
-    std::string configHome = absoluteVariable("XDG_CONFIG_HOME");
-    if (!configHome.empty())
-        return configHome;
-    const std::string home = homeDirectory();
-    return (home == "/" ? std::string() : home) + "/.config";
+    const std::string configHome = absoluteVariable("XDG_CONFIG_HOME");
+    return configHome.empty() ? inHome(Vel::homeDirectory(), ".config") : configHome;
 }

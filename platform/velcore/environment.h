@@ -11,8 +11,8 @@ std::string variable(const char *name);
 /// The path in an environment variable without trailing "/"; empty when it is not absolute.
 std::string absoluteVariable(const char *name);
 
-/// The user's home: HOME, else that of the user data base. Without trailing "/".
-std::string homeDirectory();
+/// \a name in the folder \a home, which may be "/".
+std::string inHome(const std::string &home, const char *name);
 
 /// XDG_CONFIG_HOME, else ".config" in the home.
 std::string xdgConfigHome();

@@ -6,6 +6,7 @@
 #include "environment.h"
 
 #include <velcore/files.h>
+#include <velcore/home.h>
 
 #include <sstream>
 
@@ -43,7 +44,7 @@ std::string resolved(const std::string &value)
     std::string path;
     if (value.compare(0, homePrefix.size(), homePrefix) == 0
         && (value.size() == homePrefix.size() || value[homePrefix.size()] == '/')) {
-        const std::string home = homeDirectory();
+        const std::string home = Vel::homeDirectory();
         path = (home == "/" ? std::string() : home) + value.substr(homePrefix.size());
     } else if (!value.empty() && value.front() == '/') {
         path = value;
@@ -75,6 +76,5 @@ std::string userDesktopDirectory()
     }
     if (!desktop.empty())
         return desktop;
-    const std::string home = homeDirectory();
-    return (home == "/" ? std::string() : home) + "/Desktop";
+    return inHome(Vel::homeDirectory(), "Desktop");
 }

@@ -5,6 +5,8 @@
 
 #include "FolderLimits.h"
 
+#include <velcore/home.h>
+
 #include <algorithm>
 #include <cstdlib>
 #include <filesystem>
@@ -22,24 +24,16 @@ std::string variable(const char *name, const std::string &otherwise)
     return value && *value ? std::string(value) : otherwise;
 }
 
-// The standard has paths ignored that are not absolute.
-fs::path dataHome()
-{
-    const fs::path path = variable("XDG_DATA_HOME", "");
-    return path.is_absolute() ? path : fs::path(variable("HOME", "") + "/.local/share");
-}
-
 std::vector<fs::path> dataDirectories()
 {
     std::vector<fs::path> directories;
-    const auto append = [&directories](const fs::path &path) {
-        if (path.is_absolute())
-            directories.push_back(path);
-    };
-    append(dataHome());
+    directories.emplace_back(Vel::dataHome());
+    // The standard has paths ignored that are not absolute.
     std::istringstream list(variable("XDG_DATA_DIRS", "/usr/local/share:/usr/share"));
-    for (std::string path; std::getline(list, path, ':');)
-        append(path);
+    for (std::string path; std::getline(list, path, ':');) {
+        if (fs::path(path).is_absolute())
+            directories.emplace_back(path);
+    }
     return directories;
 }
 

@@ -3,25 +3,17 @@
 
 #include <veluiaux/VelTrash.h>
 
+#include <velcore/home.h>
+
 #include <QDir>
 #include <QDirIterator>
 #include <QFile>
 #include <QString>
 
-namespace {
-
-QString dataHome()
-{
-    // A relative path is to be ignored.
-    const QString path = QFile::decodeName(qgetenv("XDG_DATA_HOME"));
-    return QDir::isAbsolutePath(path) ? path : QDir::homePath() + QStringLiteral("/.local/share");
-}
-
-} // namespace
-
 bool VelTrash::isEmpty()
 {
     // Hidden files and dangling links can be thrown away too.
     const QDir::Filters everything = QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot;
-    return !QDirIterator(dataHome() + QStringLiteral("/Trash/files"), everything).hasNext();
+    const QString data = QFile::decodeName(Vel::dataHome().c_str());
+    return !QDirIterator(data + QStringLiteral("/Trash/files"), everything).hasNext();
 }

@@ -9,6 +9,7 @@
 #include <QProcess>
 
 #include <fcntl.h>
+#include <pwd.h>
 #include <unistd.h>
 
 /// The program that opens an entry, a link, a folder or a file.
@@ -29,6 +30,10 @@ private Q_SLOTS:
     void givesTheProgramASessionOfItsOwn_data();
     void givesTheProgramASessionOfItsOwn();
     void keepsTheProgramOffTheFilesOfTheCaller();
+    void startsTheProgramWithoutStreamsOfItsOwn_data();
+    void startsTheProgramWithoutStreamsOfItsOwn();
+    void tellsWhyWithoutInputAndOutput();
+    void givesTheProgramAHome();
     void programOutlivesIt();
     void runsTerminalEntriesInATerminal_data();
     void runsTerminalEntriesInATerminal();
@@ -184,6 +189,52 @@ void tst_vel_open::keepsTheProgramOffTheFilesOfTheCaller()
     QVERIFY2(told().count("/dev/null\n") >= 3, told().constData());
     QVERIFY2(!told().contains("pipe:"), told().constData());
     QVERIFY2(!told().contains("socket:"), told().constData());
+}
+
+void tst_vel_open::startsTheProgramWithoutStreamsOfItsOwn_data()
+{
+    QTest::addColumn<QString>("streams");
+    for (const char *streams : {"<&- >&-", "<&- >&- 2>&-", "<&-", ">&-", "2>&-"})
+        QTest::newRow(streams) << QString::fromLatin1(streams);
+}
+
+void tst_vel_open::startsTheProgramWithoutStreamsOfItsOwn()
+{
+    QFETCH(QString, streams);
+    probe("probe", "/bin/readlink /proc/$$/fd/0");
+    const QString file = application("Exec=probe\n");
+    QProcess shell;
+    shell.start(
+        QStringLiteral("/bin/sh"),
+        {QStringLiteral("-c"), QStringLiteral("exec \"$0\" --exec \"$1\" ") + streams, program(), file});
+    QVERIFY(shell.waitForFinished());
+    QCOMPARE(shell.readAllStandardError(), QByteArray());
+    QCOMPARE(shell.exitCode(), 0);
+    QTRY_COMPARE(told(), QByteArray("/dev/null\n"));
+}
+
+void tst_vel_open::tellsWhyWithoutInputAndOutput()
+{
+    QProcess shell;
+    shell.start(QStringLiteral("/bin/sh"),
+                {QStringLiteral("-c"), QStringLiteral("exec \"$0\" --exec \"$1\" <&- >&-"), program(),
+                 application("Exec=there-is-none\n")});
+    QVERIFY(shell.waitForFinished());
+    QVERIFY(shell.readAllStandardError().contains("there is no program there-is-none"));
+    QCOMPARE(shell.exitCode(), 1);
+}
+
+void tst_vel_open::givesTheProgramAHome()
+{
+    const QByteArray home = qgetenv("HOME");
+    const passwd *const user = getpwuid(getuid());
+    QVERIFY(user);
+    probe("probe", "echo $HOME");
+    qunsetenv("HOME");
+    const int status = open(application("Exec=probe\n"));
+    qputenv("HOME", home);
+    QCOMPARE(status, 0);
+    QTRY_COMPARE(told(), QByteArray(user->pw_dir) + '\n');
 }
 
 void tst_vel_open::programOutlivesIt()

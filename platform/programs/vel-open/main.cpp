@@ -9,6 +9,8 @@
 
 #include "EntryRunner.h"
 
+#include <velcore/home.h>
+
 #include <QCoreApplication>
 #include <QFile>
 
@@ -16,6 +18,7 @@
 #include <chrono>
 #include <clocale>
 #include <cstdio>
+#include <cstdlib>
 #include <cstring>
 #include <cwchar>
 #include <cwctype>
@@ -83,6 +86,26 @@ int fail(const std::string &path, const std::string &reason)
 {
     std::fprintf(stderr, "vel-open: %s\n", printable(path + ": " + reason).c_str());
     return 1;
+}
+
+// A stream that the caller closed would leave its number to the next file that is opened, which
+// would be lost when the streams are replaced.
+void openClosedStreams()
+{
+    int null = 0;
+    do {
+        null = open("/dev/null", O_RDWR);
+    } while (null >= 0 && null < 3);
+    if (null >= 3)
+        close(null);
+}
+
+// Whoever looks for the home finds the same one, the program that is started among them.
+void provideHome()
+{
+    const char *const home = std::getenv("HOME");
+    if (!home || *home != '/')
+        setenv("HOME", Vel::homeDirectory().c_str(), 1);
 }
 
 // The program that is started inherits no file of the caller's.
@@ -161,6 +184,8 @@ int run(int argc, char **argv, const Options &options)
 
 int main(int argc, char **argv)
 {
+    openClosedStreams();
+    provideHome();
     std::setlocale(LC_CTYPE, "");
     if (argc == 2 && std::strcmp(argv[1], "--help") == 0) {
         std::fputs(Usage, stdout);

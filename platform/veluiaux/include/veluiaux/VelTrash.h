@@ -17,7 +17,7 @@ public:
      * Whether the trash of the home folder holds nothing.
      *
      * That is the folder Trash below $XDG_DATA_HOME, or below ~/.local/share where that is not
-     * set. It is looked at anew in every call. A trash that does not exist or cannot be read
+     * set; without $HOME the user data base knows the home. It is looked at anew in every call. A trash that does not exist or cannot be read
      * counts as empty.
      */
     static bool isEmpty();
