@@ -3,10 +3,11 @@
 
 #include "PathEdit.h"
 
+#include <frame/GuardedDialog.h>
+
 #include <QFileDialog>
 #include <QHBoxLayout>
 #include <QLineEdit>
-#include <QPointer>
 #include <QToolButton>
 
 #include <climits>
@@ -58,10 +59,14 @@ void PathEdit::setText(const QString &text)
 
 void PathEdit::selectPathButtonClicked()
 {
-    const QPointer<PathEdit> self(this);
-    const QString chosen =
-        QFileDialog::getOpenFileName(this, tr("Choose application exec path"), QStringLiteral("/usr/bin"));
-    if (self && !chosen.isNull())
+    // Qt's own function keeps the dialog on the stack, where it must not be deleted with this field.
+    GuardedDialog<QFileDialog> dialog(this, tr("Choose application exec path"), QStringLiteral("/usr/bin"));
+    dialog->setFileMode(QFileDialog::ExistingFile);
+    dialog->setSupportedSchemes({QStringLiteral("file")});
+    if (!dialog.run())
+        return;
+    const QString chosen = dialog->selectedFiles().value(0);
+    if (!chosen.isNull())
         setText(chosen);
 }
 

@@ -1,0 +1,184 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "EntryDialogTestCase.h"
+#include "EntrySamples.h"
+#include "FormDriving.h"
+#include "XDoTool.h"
+
+#include <VelDesktopEntryEditDialog.h>
+#include <VelDesktopEntryPropsWidget.h>
+#include <VelMenuDialog.h>
+
+#include <KIconButton>
+#include <KIconDialog>
+
+#include <QFileDialog>
+#include <QPointer>
+#include <QToolButton>
+
+using namespace FormDriving;
+
+/// The host takes the entry dialog or its form away while the user chooses something.
+class tst_DeletionBehindChoosers : public EntryDialogTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init();
+    void cleanup();
+
+    void survivesItBehindTheFileChooser_data();
+    void survivesItBehindTheFileChooser();
+    void survivesItBehindTheFileChooserOfAnAction_data();
+    void survivesItBehindTheFileChooserOfAnAction();
+    void survivesItBehindTheIconChooser_data();
+    void survivesItBehindTheIconChooser();
+    void survivesItBehindTheMenuPicker_data();
+    void survivesItBehindTheMenuPicker();
+
+private:
+    // Each as it is with the form alone taken away, and with the dialog around it.
+    static void addRows();
+    void takeAway(bool onlyTheForm);
+    void clickButton(QWidget *button);
+
+    QPointer<VelDesktopEntryEditDialog> m_dialog;
+};
+
+void tst_DeletionBehindChoosers::init()
+{
+    EntryDialogTestCase::init();
+    m_dialog = new VelDesktopEntryEditDialog;
+    QVERIFY(
+        m_dialog->setDesktopEntryPath(write(QStringLiteral("a.desktop"), EntrySamples::fullApplication())));
+    m_dialog->show();
+    QVERIFY(QTest::qWaitForWindowActive(m_dialog));
+}
+
+void tst_DeletionBehindChoosers::cleanup()
+{
+    delete m_dialog;
+    EntryDialogTestCase::cleanup();
+}
+
+void tst_DeletionBehindChoosers::addRows()
+{
+    QTest::addColumn<bool>("onlyTheForm");
+    QTest::newRow("the dialog") << false;
+    QTest::newRow("the form") << true;
+}
+
+void tst_DeletionBehindChoosers::takeAway(bool onlyTheForm)
+{
+    if (onlyTheForm)
+        delete m_dialog->findChild<VelDesktopEntryPropsWidget *>();
+    else
+        delete m_dialog;
+}
+
+void tst_DeletionBehindChoosers::clickButton(QWidget *button)
+{
+    button->setFocus(); // has the form show it
+    QTRY_VERIFY_WITH_TIMEOUT(!button->visibleRegion().isEmpty(), 20000);
+    XDoTool::click(button);
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheFileChooser_data()
+{
+    addRows();
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheFileChooser()
+{
+    QFETCH(bool, onlyTheForm);
+    ModalDriver modal;
+    modal.handle([this, onlyTheForm](QWidget *window) {
+        QVERIFY(qobject_cast<QFileDialog *>(window));
+        takeAway(onlyTheForm);
+    });
+    clickButton(child<QWidget>(m_dialog, "tryExecEdit")->findChild<QToolButton *>());
+    QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
+    QCOMPARE(m_dialog.isNull(), !onlyTheForm);
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheFileChooserOfAnAction_data()
+{
+    addRows();
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheFileChooserOfAnAction()
+{
+    QFETCH(bool, onlyTheForm);
+    ModalDriver modal;
+    modal.handle([this, onlyTheForm, &modal](QWidget *actions) {
+        modal.handle([this, onlyTheForm, &modal](QWidget *action) {
+            modal.handle([this, onlyTheForm](QWidget *window) {
+                QVERIFY(qobject_cast<QFileDialog *>(window));
+                takeAway(onlyTheForm);
+            });
+            QVERIFY(QTest::qWaitForWindowActive(action));
+            clickButton(child<QWidget>(action, "execEdit")->findChild<QToolButton *>());
+        });
+        QVERIFY(QTest::qWaitForWindowActive(actions));
+        XDoTool::click(child<QPushButton>(actions, "addButton"));
+    });
+    clickButton(child<QToolButton>(m_dialog, "editActionsButton"));
+    QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
+    QCOMPARE(m_dialog.isNull(), !onlyTheForm);
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheIconChooser_data()
+{
+    addRows();
+}
+
+// The chooser of icons, and that of files behind it.
+void tst_DeletionBehindChoosers::survivesItBehindTheIconChooser()
+{
+    QFETCH(bool, onlyTheForm);
+    clickButton(child<QWidget>(m_dialog, "iconEdit")->findChild<KIconButton *>());
+    KIconDialog *chooser = nullptr;
+    QTRY_VERIFY_WITH_TIMEOUT((chooser = m_dialog->findChild<KIconDialog *>()) && chooser->isVisible(), 20000);
+    QVERIFY(QTest::qWaitForWindowActive(chooser));
+    QPushButton *browse = nullptr;
+    for (auto *button : chooser->findChildren<QPushButton *>()) {
+        if (button->text().contains(QLatin1String("Browse")))
+            browse = button;
+    }
+    QVERIFY(browse);
+    XDoTool::click(browse);
+    QTRY_VERIFY_WITH_TIMEOUT(chooser->findChild<QFileDialog *>(), 20000);
+    QVERIFY(QTest::qWaitForWindowActive(chooser->findChild<QFileDialog *>()));
+    takeAway(onlyTheForm);
+    QCOMPARE(m_dialog.isNull(), !onlyTheForm);
+    QCoreApplication::processEvents();
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheMenuPicker_data()
+{
+    addRows();
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindTheMenuPicker()
+{
+    QFETCH(bool, onlyTheForm);
+    ModalDriver modal;
+    modal.handle([this, onlyTheForm, &modal](QWidget *window) {
+        QVERIFY(qobject_cast<VelMenuDialog *>(window));
+        // It tells the window manager when it goes; nobody takes the command here.
+        modal.answer(warning(QStringLiteral("Can't send command to vel-wm")), QMessageBox::Ok);
+        takeAway(onlyTheForm);
+        if (onlyTheForm) {
+            QVERIFY(QTest::qWaitForWindowActive(window));
+            XDoTool::press(QStringLiteral("Escape"));
+        }
+    });
+    clickButton(child<QPushButton>(m_dialog, "copyButton"));
+    QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
+    QCOMPARE(m_dialog.isNull(), !onlyTheForm);
+}
+
+VEL_TEST_MAIN(tst_DeletionBehindChoosers)
+
+#include "tst_DeletionBehindChoosers.moc"
