@@ -7,6 +7,7 @@
 #include "records/EntryDocument.h"
 
 #include <QHash>
+#include <QSet>
 
 #include <algorithm>
 
@@ -70,6 +71,38 @@ VelUIDesktopAction read(const EntryDocument &entry, const QString &id)
     return action;
 }
 
+QString valuesOf(const VelUIDesktopAction &action)
+{
+    const QStringList values = {action.getName(),
+                                action.getLocalName(),
+                                action.getIcon(),
+                                action.getLocalIcon(),
+                                action.getExec(),
+                                action.getOnlyShowIn().join(QChar()),
+                                action.getNotShowIn().join(QChar())};
+    return values.join(QLatin1Char('\n'));
+}
+
+// Where only the id of an action is new, the action takes along what it has beside our keys: other
+// languages, for one.
+void copyRenamed(EntryDocument &entry, const QList<VelUIDesktopAction> &wanted, const QStringList &known)
+{
+    QSet<QString> gone(known.begin(), known.end());
+    QHash<QString, QString> added; // ids by what else the actions have
+    for (const VelUIDesktopAction &action : wanted) {
+        if (!gone.remove(action.getId()))
+            added.insert(valuesOf(action), action.getId());
+    }
+    std::unordered_map<std::string, std::string> names;
+    for (const QString &id : known) {
+        const bool isCandidate = !added.isEmpty() && gone.contains(id);
+        const QString renamed = isCandidate ? added.take(valuesOf(read(entry, id))) : QString();
+        if (!renamed.isEmpty())
+            names.emplace(groupOf(id), groupOf(renamed));
+    }
+    entry.copyGroups(names);
+}
+
 void write(EntryDocument &entry, const VelUIDesktopAction &action)
 {
     const std::string group = groupOf(action.getId());
@@ -96,6 +129,9 @@ void EntryActions::set(EntryDocument &entry, const QList<VelUIDesktopAction> &ac
 {
     const QStringList known = idsOf(entry);
     const QList<VelUIDesktopAction> wanted = writable(actions, known);
+    for (const VelUIDesktopAction &action : wanted)
+        entry.restoreGroup(groupOf(action.getId()));
+    copyRenamed(entry, wanted, known);
     QStringList ids;
     std::unordered_set<std::string> gone;
     for (const QString &id : known)

@@ -30,6 +30,11 @@ private Q_SLOTS:
     void keepsAnOddIdThatTheFileHas();
     void takesTheLaterOfTwoActionsWithOneId();
     void removesAndMakesAnewInOneSave();
+    void keepsTheLanguagesOfAnActionThatIsPutBack();
+    void keepsTheLanguagesOfAnInheritedActionThatIsPutBack();
+    void keepsTheLanguagesThroughAnotherType();
+    void keepsTheLanguagesOfAnActionWithANewId();
+    void takesNoLanguagesOfAnotherAction();
     void writesLocalTextsInTheVariantFound();
 
 private:
@@ -242,6 +247,90 @@ void tst_VelUIDesktopEntryActions::removesAndMakesAnewInOneSave()
     QVERIFY(record.save());
     QCOMPARE(VelUIDesktopEntry(file).getActions(), QList<VelUIDesktopAction>{action("a", "New")});
     QCOMPARE(read(file).count("[Desktop Action a]"), 1);
+}
+
+void tst_VelUIDesktopEntryActions::keepsTheLanguagesOfAnActionThatIsPutBack()
+{
+    const QByteArray before = Header
+        + "Actions=a;b;\n\n# About a\n[Desktop Action a]\nName=A\nName[fr]=AF\nX-own=1\n\n"
+          "[Desktop Action b]\nName=B\nName[ja]=BJ\n";
+    const QString file = write(QStringLiteral("x.desktop"), before);
+    VelUIDesktopEntry record(file);
+    const QList<VelUIDesktopAction> both = record.getActions();
+    record.setActions({});
+    record.setActions({both.at(1)});
+    record.setActions(both);
+    QCOMPARE(record.getActions(), both);
+    QVERIFY(record.save());
+    QCOMPARE(read(file), before);
+
+    VelUIDesktopAction renamed = both.at(0);
+    renamed.setName(QStringLiteral("New"));
+    record.setActions({});
+    record.setActions({renamed, both.at(1)});
+    QVERIFY(record.save());
+    QCOMPARE(read(file), QByteArray(before).replace("Name=A\n", "Name=New\n"));
+}
+
+void tst_VelUIDesktopEntryActions::keepsTheLanguagesOfAnInheritedActionThatIsPutBack()
+{
+    const VelUIDesktopEntry pattern(
+        write(QStringLiteral("pattern.desktop"),
+              Header + "Actions=a;\n\n[Desktop Action a]\nName=A\nName[fr]=AF\n"));
+    const QString file = path(QStringLiteral("x.desktop"));
+    VelUIDesktopEntry record{QString()};
+    record.setFilePath(file);
+    record.inheritFrom(pattern);
+    const QList<VelUIDesktopAction> actions = record.getActions();
+    record.setActions({});
+    record.setActions(actions);
+    QVERIFY(record.save());
+    QVERIFY2(read(file).contains("Name[fr]=AF\n"), read(file).constData());
+}
+
+void tst_VelUIDesktopEntryActions::keepsTheLanguagesThroughAnotherType()
+{
+    const QByteArray before =
+        Header + "Type=Application\nActions=a;\n\n[Desktop Action a]\nName=A\nName[fr]=AF\n";
+    const QString file = write(QStringLiteral("x.desktop"), before);
+    VelUIDesktopEntry record(file);
+    const QList<VelUIDesktopAction> actions = record.getActions();
+    record.setType(QStringLiteral("Link"));
+    QVERIFY(record.getActions().isEmpty());
+    record.setType(QStringLiteral("Application"));
+    record.setActions(actions);
+    QVERIFY(record.save());
+    QCOMPARE(read(file), before);
+}
+
+void tst_VelUIDesktopEntryActions::keepsTheLanguagesOfAnActionWithANewId()
+{
+    const QString file = write(QStringLiteral("x.desktop"),
+                               Header
+                                   + "Actions=a_b;c;\n\n[Desktop Action a_b]\nName=A\nName[fr]=AF\n"
+                                     "Name[de]=AD\nX-own=1\n\n[Desktop Action c]\nName=C\n");
+    VelUIDesktopEntry record(file);
+    QList<VelUIDesktopAction> actions = record.getActions();
+    VelUIDesktopAction repaired = action("a-b", "A");
+    repaired.setLocalName(QStringLiteral("AD"));
+    actions[0] = repaired;
+    record.setActions(actions);
+    QCOMPARE(record.getActions(), actions);
+    QVERIFY(record.save());
+    QCOMPARE(read(file),
+             Header
+                 + "Actions=a-b;c;\n\n[Desktop Action c]\nName=C\n\n"
+                   "[Desktop Action a-b]\nName=A\nName[fr]=AF\nName[de]=AD\nX-own=1\n");
+}
+
+void tst_VelUIDesktopEntryActions::takesNoLanguagesOfAnotherAction()
+{
+    const QByteArray before = Header + "Actions=a;\n\n[Desktop Action a]\nName=A\nName[fr]=AF\n";
+    QVERIFY(!changed(before, {action("b", "B")}).contains("[fr]"));
+    QCOMPARE(changed(before, {action("a", "A"), action("b", "A")}).count("[fr]"), 1);
+    // Nobody's group is the new action's.
+    QCOMPARE(changed(before + "\n[Desktop Action b]\nName=B\nName[ja]=BJ\n", {action("b", "A")}),
+             Header + "Actions=b;\n\n[Desktop Action b]\nName=A\nName[ja]=BJ\n");
 }
 
 void tst_VelUIDesktopEntryActions::writesLocalTextsInTheVariantFound()

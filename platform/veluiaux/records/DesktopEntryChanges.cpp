@@ -4,6 +4,7 @@
 #include "DesktopEntryChanges.h"
 
 #include <algorithm>
+#include <iterator>
 #include <utility>
 
 std::string DesktopEntryChanges::place(std::string_view group, std::string_view key, std::string_view locale)
@@ -50,11 +51,25 @@ void DesktopEntryChanges::removeGroups(const std::unordered_set<std::string> &gr
     if (groups.empty())
         return;
     m_removedGroups.insert(groups.begin(), groups.end());
-    const auto gone = std::remove_if(m_changes.begin(), m_changes.end(), [&groups](const Change &change) {
-        return groups.count(change.group) != 0;
-    });
+    const auto gone =
+        std::stable_partition(m_changes.begin(), m_changes.end(),
+                              [&groups](const Change &change) { return groups.count(change.group) == 0; });
+    std::move(gone, m_changes.end(), std::back_inserter(m_goneWithGroups));
     m_changes.erase(gone, m_changes.end());
     reindex();
+}
+
+void DesktopEntryChanges::restoreGroup(const std::string &group)
+{
+    if (m_removedGroups.erase(group) == 0)
+        return;
+    const auto back = std::stable_partition(m_goneWithGroups.begin(), m_goneWithGroups.end(),
+                                            [&group](const Change &change) { return change.group != group; });
+    for (auto change = back; change != m_goneWithGroups.end(); ++change) {
+        if (!find(change->group, change->key, change->locale))
+            set(std::move(*change));
+    }
+    m_goneWithGroups.erase(back, m_goneWithGroups.end());
 }
 
 bool DesktopEntryChanges::isRemoved(std::string_view group) const

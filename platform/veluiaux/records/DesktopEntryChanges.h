@@ -37,6 +37,8 @@ public:
 
     /// The groups go, and with them the changes made in them.
     void removeGroups(const std::unordered_set<std::string> &groups);
+    /// A group that went comes back as it was then, under what was changed in it since.
+    void restoreGroup(const std::string &group);
     bool isRemoved(std::string_view group) const;
 
 private:
@@ -46,4 +48,5 @@ private:
     std::vector<Change> m_changes;
     std::unordered_map<std::string, std::size_t> m_index;
     std::unordered_set<std::string> m_removedGroups;
+    std::vector<Change> m_goneWithGroups;
 };

@@ -187,6 +187,26 @@ void EntryDocument::removeGroups(const std::unordered_set<std::string> &groups)
     m_changes.removeGroups(groups);
 }
 
+void EntryDocument::restoreGroup(const std::string &group)
+{
+    m_changes.restoreGroup(group);
+}
+
+void EntryDocument::copyGroups(const std::unordered_map<std::string, std::string> &names)
+{
+    if (names.empty())
+        return;
+    std::vector<KeyValue> keys = keyValues();
+    std::unordered_set<std::string> taken;
+    for (const KeyValue &key : keys)
+        taken.insert(key.group);
+    for (KeyValue &key : keys) {
+        const auto name = names.find(key.group);
+        if (name != names.end() && taken.count(name->second) == 0)
+            m_changes.set({name->second, std::move(key.key), std::move(key.locale), std::move(key.value)});
+    }
+}
+
 std::vector<EntryDocument::KeyValue> EntryDocument::keyValues() const
 {
     std::vector<KeyValue> all;

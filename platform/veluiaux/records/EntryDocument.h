@@ -68,6 +68,11 @@ public:
     /// Removes a key in all languages.
     void removeKey(std::string_view group, std::string_view key);
     void removeGroups(const std::unordered_set<std::string> &groups);
+    /// A group that was removed comes back as it was then; any other stays as it is.
+    void restoreGroup(const std::string &group);
+    /// Makes a group of all keys of another, in all languages, for each group that \a names gives a
+    /// name to that no group has yet.
+    void copyGroups(const std::unordered_map<std::string, std::string> &names);
 
     /// All keys that count, in the order of the file, then of the setting.
     std::vector<KeyValue> keyValues() const;

@@ -261,8 +261,10 @@ public:
     /**
      * Sets the additional actions and their order.
      *
-     * The groups of actions that are no longer among them go. An action whose id cannot stand
-     * in a group header is left out; of two with the same id the later one counts.
+     * The groups of actions that are no longer among them go; one that is put back before the
+     * record is saved has its other languages and foreign keys again. They also go along where an
+     * action has nothing new but its id. An action whose id cannot stand in a group header is left
+     * out; of two with the same id the later one counts.
      */
     void setActions(const QList<VelUIDesktopAction> &actions);
 
