@@ -4,10 +4,10 @@
 #include "EntryFields.h"
 
 #include "EntryDisplay.h"
-#include "SearchText.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
+#include <frame/SearchText.h>
 
 #include <algorithm>
 

@@ -6,10 +6,11 @@
 #include "LoadedFolders.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
-#include "SearchText.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
+
+#include <frame/SearchText.h>
 
 #include <QCoreApplication>
 #include <QTimer>

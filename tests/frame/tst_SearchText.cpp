@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "TestCase.h"
-#include <menuedit/SearchText.h>
+#include <frame/SearchText.h>
 
 /// What is the same to somebody who looks for words.
 class tst_SearchText : public TestCase
