@@ -43,6 +43,11 @@ bool VelUIDesktopEntry::save()
     return d->document.save();
 }
 
+QByteArray VelUIDesktopEntry::contents() const
+{
+    return d->document.contents();
+}
+
 bool VelUIDesktopEntry::isValid() const
 {
     return d->document.isValid();

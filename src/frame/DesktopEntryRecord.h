@@ -12,6 +12,7 @@
 #include <veluiaux/VelUIDesktopAction.h>
 #include <veluiaux/VelUIDesktopEntry.h>
 
+#include <QByteArray>
 #include <QList>
 #include <QString>
 #include <QStringList>
@@ -56,6 +57,7 @@ static_assert(std::is_same_v<VelUIDesktopEntry::DisplayableError, int>,
 VEL_RECORD_NEEDS(VelUIDesktopEntry, void, setFilePath(std::declval<const QString &>()));
 VEL_RECORD_NEEDS(VelUIDesktopEntry, bool, load());
 VEL_RECORD_NEEDS(VelUIDesktopEntry, bool, save());
+VEL_RECORD_NEEDS(const VelUIDesktopEntry, QByteArray, contents());
 VEL_RECORD_NEEDS(const VelUIDesktopEntry, bool, isValid());
 VEL_RECORD_NEEDS(VelUIDesktopEntry, void, inheritFrom(std::declval<const VelUIDesktopEntry &>()));
 VEL_RECORD_NEEDS(const VelUIDesktopEntry, bool, isSuitable(static_cast<int *>(nullptr)));

@@ -122,7 +122,7 @@ void tst_DesktopEntryRecord::reliesOnNothingThatItDoesNotCheck_data()
 
     QTest::newRow("entry") << QStringLiteral("VelUIDesktopEntry.h")
                            << QStringLiteral(
-                                  "setFilePath load save isValid inheritFrom isSuitable isDisplayable")
+                                  "setFilePath load save contents isValid inheritFrom isSuitable isDisplayable")
                            << QStringLiteral(
                                   "Type Name LocalName GenericName LocalGenericName Comment "
                                   "LocalComment Icon LocalIcon Exec TryExec Path URL "

@@ -265,6 +265,11 @@ void EntryDocument::inheritFrom(const EntryDocument &other)
     m_valid = m_valid || (other.m_valid && !taken.empty());
 }
 
+QByteArray EntryDocument::contents() const
+{
+    return DesktopEntryWriter::apply(*m_text, m_changes);
+}
+
 bool EntryDocument::save()
 {
     if (m_path.isEmpty())

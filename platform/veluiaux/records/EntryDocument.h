@@ -43,6 +43,8 @@ public:
     bool load();
     /// Writes the changes to the file; false if that failed, the file is as it was then.
     bool save();
+    /// What the changes make of the text that was read.
+    QByteArray contents() const;
     /// Whether a file with a main group was read, or something taken over from such a document.
     bool isValid() const { return m_valid; }
     /// Takes over the keys of \a other that this document does not have.

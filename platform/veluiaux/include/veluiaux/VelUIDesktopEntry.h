@@ -6,6 +6,7 @@
 #include <veluiaux/VelUIDesktopAction.h>
 #include <veluiaux/veluiaux_export.h>
 
+#include <QByteArray>
 #include <QList>
 #include <QSharedDataPointer>
 #include <QString>
@@ -123,6 +124,8 @@ public:
      * @return false if that failed; the file is as it was then
      */
     bool save();
+    /// The bytes that save() leaves in the file when nobody else has changed that since it was read.
+    QByteArray contents() const;
     /// Whether a file with a "Desktop Entry" group was read, or something inherited from a
     /// valid record. Setters make no record valid.
     bool isValid() const;
