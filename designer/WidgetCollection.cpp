@@ -62,7 +62,7 @@ CustomWidgetInfo entryProperties()
             QStringLiteral("Form with every key of a desktop entry"),
             QStringLiteral(
                 "Shows and edits a desktop entry record: load it with loadFrom() and write it back with "
-                "saveTo() in code."),
+                "saveTo() in code. The property \"assistance\" switches on what goes beyond the plain form."),
             sizeOf(420, 400),
             false,
             create<VelDesktopEntryPropsWidget>};

@@ -31,6 +31,7 @@ class VelDesktopEntryEditDialogPrivate;
 class VELUIEXTRA_EXPORT VelDesktopEntryEditDialog : public QDialog
 {
     Q_OBJECT
+    Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:
     /**
@@ -42,6 +43,16 @@ public:
 
     /// Remembers the size of the dialog.
     ~VelDesktopEntryEditDialog() override;
+
+    /// Whether the dialog helps its users beyond the plain one; see setAssistance().
+    bool assistance() const;
+    /**
+     * Switches on what goes beyond the plain dialog. Off, as it is at first, the dialog has nothing of
+     * that. It is passed on to the menu that "Copy from..." opens.
+     *
+     * @param assistance whether the dialog is to help
+     */
+    void setAssistance(bool assistance);
 
 public Q_SLOTS:
     /**

@@ -21,6 +21,8 @@ class VelUIDesktopEntry;
  * one; rows that do not belong to the type of the entry (Application, Link or Directory) are
  * hidden and emptied, and come back with their values when the user takes the type back. Values go into the entry exactly as they were typed.
  *
+ * With setAssistance() the form also helps its user beyond that.
+ *
  * The form keeps no record: values come in with loadFrom() and go out with saveTo(), which
  * may be given another record. It neither checks the values nor touches a file;
  * VelDesktopEntryEditDialog does.
@@ -28,6 +30,7 @@ class VelUIDesktopEntry;
 class VELUIEXTRA_EXPORT VelDesktopEntryPropsWidget : public QWidget
 {
     Q_OBJECT
+    Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:
     /**
@@ -72,6 +75,16 @@ public:
      * @param readOnly whether the user can look at the values only; false at the start
      */
     void setReadOnly(bool readOnly);
+
+    /// Whether the form helps its users beyond the plain one; see setAssistance().
+    bool assistance() const;
+    /**
+     * Switches on what goes beyond the plain form. Off, as it is at first, the form has nothing of
+     * that.
+     *
+     * @param assistance whether the form is to help
+     */
+    void setAssistance(bool assistance);
 
     /**
      * Sets the frame around the form.

@@ -78,6 +78,7 @@ int run(const Options &options)
 {
     QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
     VelDesktopEntryEditDialog dialog;
+    dialog.setAssistance(true);
     if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
         return Program::fail(QCoreApplication::translate("vel-entryedit", "cannot open %1").arg(options.file),
                              NotOpened);

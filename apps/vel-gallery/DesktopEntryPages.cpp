@@ -37,10 +37,12 @@ QWidget *createFormPage(const GalleryContext &, QWidget *parent)
     showSample(form, QStringLiteral("standards.desktop"));
     auto *readOnly = new QCheckBox(PageTexts::tr("&Read-only"), page);
     auto *urlButton = new QCheckBox(PageTexts::tr("&Button beside the address"), page);
+    auto *assistance = new QCheckBox(PageTexts::tr("&Assistance"), page);
     auto *requested = new QLabel(page);
     requested->setTextFormat(Qt::PlainText);
     QObject::connect(readOnly, &QCheckBox::toggled, form, &VelDesktopEntryPropsWidget::setReadOnly);
     QObject::connect(urlButton, &QCheckBox::toggled, form, &VelDesktopEntryPropsWidget::setShowURLInfoButton);
+    QObject::connect(assistance, &QCheckBox::toggled, form, &VelDesktopEntryPropsWidget::setAssistance);
     QObject::connect(form, &VelDesktopEntryPropsWidget::requestedURLInfo, requested,
                      [requested](const QString &url) {
                          requested->setText(PageTexts::tr("Information requested for %1").arg(url));
@@ -50,6 +52,7 @@ QWidget *createFormPage(const GalleryContext &, QWidget *parent)
     auto *layout = new QVBoxLayout(page);
     layout->addWidget(readOnly);
     layout->addWidget(urlButton);
+    layout->addWidget(assistance);
     layout->addWidget(form, 1);
     layout->addWidget(requested);
     return page;
@@ -86,6 +89,7 @@ form->loadFrom(VelUIDesktopEntry(path));
 
 form->setReadOnly(readOnly->isChecked());
 form->setShowURLInfoButton(urlButton->isChecked());
+form->setAssistance(true); // more help for its user
 connect(form, &VelDesktopEntryPropsWidget::requestedURLInfo,
         this, &Window::showInformation);
 

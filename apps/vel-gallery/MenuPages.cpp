@@ -111,6 +111,7 @@ private:
     void editEntry()
     {
         VelDesktopEntryEditDialog dialog(this);
+        dialog.setAssistance(m_assistance->isChecked());
         if (dialog.setDesktopEntryPath(m_menu.filePath(QStringLiteral("terminal.desktop")), true))
             dialog.exec();
     }
@@ -158,6 +159,7 @@ editor.exec();
 
 // Edit one entry, or create it.
 VelDesktopEntryEditDialog dialog(this);
+dialog.setAssistance(true); // more help for its user
 if (dialog.setDesktopEntryPath(path, true))
     dialog.exec();)");
     page.create = [](const GalleryContext &, QWidget *parent) { return new MenuDialogsPage(parent); };

@@ -86,30 +86,30 @@ void PropsTable::build()
     using E = VelUIDesktopEntry;
     constexpr ShownFor all = ShownFor::All, applications = ShownFor::Applications;
     // clang-format off
-    tie({m_nameLine = add<QLineEdit>(required(tr("Name")), all, "nameEdit", &E::getName, &E::setName),
-         add<QLineEdit>(localizedLabel(tr("Name")), all, "localNameEdit", &E::getLocalName, &E::setLocalName)});
-    add<IconEdit>(tr("Icon"), all, "iconEdit", &E::getIcon, &E::setIcon);
-    add<IconEdit>(localizedLabel(tr("Icon")), all, "localIconEdit", &E::getLocalIcon, &E::setLocalIcon);
-    add<PathEdit>(required(tr("Exec")), applications, "execEdit", &E::getExec, &E::setExec);
-    add<QCheckBox>(tr("Terminal"), applications, "terminalCheckBox", &E::getTerminal, &E::setTerminal);
-    add<QLineEdit>(tr("Path"), applications, "pathEdit", &E::getPath, &E::setPath);
-    add<PathEdit>(tr("Try exec"), applications, "tryExecEdit", &E::getTryExec, &E::setTryExec);
+    tie({m_nameLine = add<QLineEdit>("Name", required(tr("Name")), all, "nameEdit", &E::getName, &E::setName),
+         add<QLineEdit>("Name", localized(tr("Name")), all, "localNameEdit", &E::getLocalName, &E::setLocalName)});
+    add<IconEdit>("Icon", tr("Icon"), all, "iconEdit", &E::getIcon, &E::setIcon);
+    add<IconEdit>("Icon", localized(tr("Icon")), all, "localIconEdit", &E::getLocalIcon, &E::setLocalIcon);
+    add<PathEdit>("Exec", required(tr("Exec")), applications, "execEdit", &E::getExec, &E::setExec);
+    add<QCheckBox>("Terminal", tr("Terminal"), applications, "terminalCheckBox", &E::getTerminal, &E::setTerminal);
+    add<QLineEdit>("Path", tr("Path"), applications, "pathEdit", &E::getPath, &E::setPath);
+    add<PathEdit>("TryExec", tr("Try exec"), applications, "tryExecEdit", &E::getTryExec, &E::setTryExec);
     addUrl();
-    tie({add<QLineEdit>(tr("Generic name"), all, "genericNameEdit", &E::getGenericName, &E::setGenericName),
-         add<QLineEdit>(localizedLabel(tr("Generic name")), all, "localGenericNameEdit", &E::getLocalGenericName, &E::setLocalGenericName)});
-    tie({add<QLineEdit>(tr("Comment"), all, "commentEdit", &E::getComment, &E::setComment),
-         add<QLineEdit>(localizedLabel(tr("Comment")), all, "localCommentEdit", &E::getLocalComment, &E::setLocalComment)});
-    add<QCheckBox>(tr("No display"), all, "noDisplayCheckBox", &E::getNoDisplay, &E::setNoDisplay);
-    add<QCheckBox>(tr("Hidden"), all, "hiddenCheckBox", &E::getHidden, &E::setHidden);
+    tie({add<QLineEdit>("GenericName", tr("Generic name"), all, "genericNameEdit", &E::getGenericName, &E::setGenericName),
+         add<QLineEdit>("GenericName", localized(tr("Generic name")), all, "localGenericNameEdit", &E::getLocalGenericName, &E::setLocalGenericName)});
+    tie({add<QLineEdit>("Comment", tr("Comment"), all, "commentEdit", &E::getComment, &E::setComment),
+         add<QLineEdit>("Comment", localized(tr("Comment")), all, "localCommentEdit", &E::getLocalComment, &E::setLocalComment)});
+    add<QCheckBox>("NoDisplay", tr("No display"), all, "noDisplayCheckBox", &E::getNoDisplay, &E::setNoDisplay);
+    add<QCheckBox>("Hidden", tr("Hidden"), all, "hiddenCheckBox", &E::getHidden, &E::setHidden);
     addShowIn();
-    setMimeTypeTexts(add<StringListEdit>(tr("MIME type"), applications, "mimeTypeEdit", &E::getMimeType, &E::setMimeType));
-    setCategoryTexts(add<StringListEdit>(tr("Categories"), applications, "categoriesEdit", &E::getCategories, &E::setCategories));
-    setKeywordTexts(add<StringListEdit>(tr("Keywords"), applications, "keywordsEdit", &E::getKeywords, &E::setKeywords));
-    setKeywordTexts(add<StringListEdit>(localizedLabel(tr("Keywords")), applications, "localKeywordsEdit", &E::getLocalKeywords, &E::setLocalKeywords));
-    add<QCheckBox>(tr("Startup notify"), applications, "startupNotifyCheckBox", &E::getStartupNotify, &E::setStartupNotify);
-    add<QLineEdit>(tr("Startup WM class"), applications, "startupWMClassEdit", &E::getStartupWMClass, &E::setStartupWMClass);
-    add<ActionListEdit>(tr("Actions"), applications, "actionsEdit", &E::getActions, &E::setActions)->setTexts(tr("Actions"), tr("Add action"), tr("Edit action"));
-    add<QLineEdit>(tr("Version"), all, "versionEdit", &E::getVersion, &E::setVersion);
+    setMimeTypeTexts(add<StringListEdit>("MimeType", tr("MIME type"), applications, "mimeTypeEdit", &E::getMimeType, &E::setMimeType));
+    setCategoryTexts(add<StringListEdit>("Categories", tr("Categories"), applications, "categoriesEdit", &E::getCategories, &E::setCategories));
+    setKeywordTexts(add<StringListEdit>("Keywords", tr("Keywords"), applications, "keywordsEdit", &E::getKeywords, &E::setKeywords));
+    setKeywordTexts(add<StringListEdit>("Keywords", localized(tr("Keywords")), applications, "localKeywordsEdit", &E::getLocalKeywords, &E::setLocalKeywords));
+    add<QCheckBox>("StartupNotify", tr("Startup notify"), applications, "startupNotifyCheckBox", &E::getStartupNotify, &E::setStartupNotify);
+    add<QLineEdit>("StartupWMClass", tr("Startup WM class"), applications, "startupWMClassEdit", &E::getStartupWMClass, &E::setStartupWMClass);
+    add<ActionListEdit>("Actions", tr("Actions"), applications, "actionsEdit", &E::getActions, &E::setActions)->setTexts(tr("Actions"), tr("Add action"), tr("Edit action"));
+    add<QLineEdit>("Version", tr("Version"), all, "versionEdit", &E::getVersion, &E::setVersion);
     // clang-format on
 }
 
@@ -118,14 +118,20 @@ PropsTable::Label PropsTable::required(const QString &text)
     return {text, true};
 }
 
+PropsTable::Label PropsTable::localized(const QString &text)
+{
+    return {localizedLabel(text), false, true};
+}
+
 template <typename Field, typename Getter, typename Setter>
-Field *PropsTable::add(const Label &label, ShownFor shownFor, const char *objectName, Getter getter,
-                       Setter setter)
+Field *PropsTable::add(const char *key, const Label &label, ShownFor shownFor, const char *objectName,
+                       Getter getter, Setter setter)
 {
     auto *field = makeField<Field>(objectName, m_layout->parentWidget());
     const int number = addField(m_layout, label.text, field);
     if (label.isBold)
         m_layout->setRowLabelBold(number);
+    m_formRows.append({QString::fromLatin1(key), label.text, label.isTranslation, number, field});
     m_rows.push_back(
         std::make_unique<KeyRow<Field, Getter, Setter>>(shownFor, m_layout, number, field, getter, setter));
     return field;
@@ -135,6 +141,7 @@ void PropsTable::addUrl()
 {
     auto row = std::make_unique<UrlRow>(m_layout);
     m_urlRow = row.get();
+    m_formRows.append(row->row());
     m_rows.push_back(std::move(row));
 }
 
@@ -144,6 +151,9 @@ void PropsTable::addShowIn()
                                     tr("Edit desktop environment:")};
     auto rows = std::make_unique<ShowInRows>(m_layout, texts);
     m_showIn = rows->choice();
+    const int second = m_layout->rowCount() - 1;
+    m_formRows.append({QStringLiteral("OnlyShowIn"), texts.only, false, second - 1, m_showIn->onlyField()});
+    m_formRows.append({QStringLiteral("NotShowIn"), texts.no, false, second, m_showIn->noField()});
     m_rows.push_back(std::move(rows));
 }
 
@@ -219,6 +229,11 @@ UrlRow *PropsTable::urlRow() const
 ShowInChoice *PropsTable::showIn() const
 {
     return m_showIn;
+}
+
+const QVector<FormRow> &PropsTable::formRows() const
+{
+    return m_formRows;
 }
 
 QLineEdit *PropsTable::nameLine() const

@@ -3,9 +3,11 @@
 
 #pragma once
 
+#include "FormRow.h"
 #include "PropsRow.h"
 
 #include <QCoreApplication>
+#include <QVector>
 
 #include <memory>
 #include <vector>
@@ -41,6 +43,7 @@ public:
 
     UrlRow *urlRow() const;
     ShowInChoice *showIn() const;
+    const QVector<FormRow> &formRows() const;
     /// The line of the name, with which editing begins.
     QLineEdit *nameLine() const;
 
@@ -50,16 +53,19 @@ private:
     // The label of a row; a bold one marks a key that an entry must have.
     struct Label
     {
-        Label(const QString &labelText, bool bold = false)
+        Label(const QString &labelText, bool bold = false, bool translation = false)
             : text(labelText)
             , isBold(bold)
+            , isTranslation(translation)
         {
         }
         QString text;
         bool isBold;
+        bool isTranslation;
     };
 
     static Label required(const QString &text);
+    static Label localized(const QString &text);
     static void setCategoryTexts(StringListEdit *field);
     static void setKeywordTexts(StringListEdit *field);
     static void setMimeTypeTexts(StringListEdit *field);
@@ -69,11 +75,12 @@ private:
     void addUrl();
     void addShowIn();
     template <typename Field, typename Getter, typename Setter>
-    Field *add(const Label &label, PropsRow::ShownFor shownFor, const char *objectName, Getter getter,
-               Setter setter);
+    Field *add(const char *key, const Label &label, PropsRow::ShownFor shownFor, const char *objectName,
+               Getter getter, Setter setter);
 
     FormLayout *const m_layout;
     std::vector<std::unique_ptr<PropsRow>> m_rows;
+    QVector<FormRow> m_formRows;
     UrlRow *m_urlRow = nullptr;
     ShowInChoice *m_showIn = nullptr;
     QLineEdit *m_nameLine = nullptr;

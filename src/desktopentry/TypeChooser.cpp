@@ -105,6 +105,11 @@ void TypeChooser::setReadOnly(bool readOnly)
     m_box->setDisabled(readOnly);
 }
 
+FormRow TypeChooser::row() const
+{
+    return {QStringLiteral("Type"), tr("Type"), false, m_row, m_box};
+}
+
 bool TypeChooser::eventFilter(QObject *watched, QEvent *event)
 {
     if (watched == m_box && event->type() == QEvent::Wheel && !m_box->hasFocus()) {

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "FormRow.h"
+
 #include <QCoreApplication>
 #include <QObject>
 #include <QStringList>
@@ -40,6 +42,7 @@ public:
     void leaveOpen();
     QStringList allowedTypes() const;
     void setReadOnly(bool readOnly);
+    FormRow row() const;
 
     bool eventFilter(QObject *watched, QEvent *event) override;
 

@@ -20,6 +20,7 @@ UrlRow::UrlRow(FormLayout *layout)
 
 UrlRow::UrlRow(FormLayout *layout, const Field &field)
     : PropsRow(ShownFor::Links, layout, field.number)
+    , m_number(field.number)
     , m_line(field.line)
     , m_infoButton(field.button)
 {
@@ -61,6 +62,11 @@ void UrlRow::setInfoButtonWanted(bool wanted)
         return;
     m_isInfoButtonWanted = wanted;
     m_infoButton->setVisible(wanted && m_isVisible);
+}
+
+FormRow UrlRow::row() const
+{
+    return {QStringLiteral("URL"), tr("Url"), false, m_number, m_line};
 }
 
 void UrlRow::setVisible(bool visible)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "FormRow.h"
 #include "KeptValue.h"
 #include "PropsRow.h"
 
@@ -27,6 +28,7 @@ public:
     QToolButton *infoButton() const;
     /// Shows the button whenever the row is shown, or never.
     void setInfoButtonWanted(bool wanted);
+    FormRow row() const;
 
     void setVisible(bool visible) override;
     void load(const VelUIDesktopEntry &entry) override;
@@ -46,6 +48,7 @@ private:
     UrlRow(FormLayout *layout, const Field &field);
     static Field makeRow(FormLayout *layout);
 
+    const int m_number;
     QLineEdit *const m_line;
     QToolButton *const m_infoButton;
     bool m_isInfoButtonWanted = false;

@@ -61,6 +61,7 @@ public:
     void savePosition();
     void setNewType();
     void copy(VelUIDesktopEntry entry);
+    VelUIDesktopEntry entryToSave() const;
     void emptyListSwitchedFrom(VelUIDesktopEntry *entry) const;
     VelDesktopEntryPropsWidgetPrivate &form() const { return VelDesktopEntryPropsWidgetPrivate::of(*props); }
 
@@ -69,6 +70,7 @@ public:
     VelDesktopEntryEditDialog *const q;
     QPointer<VelDesktopEntryPropsWidget> props;
     QString path;
+    bool isAssisted = false;
     std::optional<QPoint> position; // on the desktop
     // As it was read; saving through a copy writes only what differs from it, so that what
     // another program changed meanwhile stays.
@@ -174,12 +176,22 @@ void VelDesktopEntryEditDialogPrivate::emptyListSwitchedFrom(VelUIDesktopEntry *
         entry->setOnlyShowIn({});
 }
 
+VelUIDesktopEntry VelDesktopEntryEditDialogPrivate::entryToSave() const
+{
+    VelUIDesktopEntry entry = loaded;
+    entry.setFilePath(path);
+    props->saveTo(&entry);
+    emptyListSwitchedFrom(&entry);
+    return entry;
+}
+
 VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
     : QDialog(parent)
     , d(std::make_unique<VelDesktopEntryEditDialogPrivate>(this))
 {
     d->props = new VelDesktopEntryPropsWidget(this);
     d->props->setObjectName(QStringLiteral("props"));
+    d->form().recordToSave = [this] { return d->entryToSave(); };
     // Whoever opens the dialog types the name first.
     d->props->setFocus();
     connect(d->props, &VelDesktopEntryPropsWidget::changed, this, [this] { d->markModified(); });
@@ -208,6 +220,18 @@ VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
 VelDesktopEntryEditDialog::~VelDesktopEntryEditDialog()
 {
     DialogSize::remember(*this, sizeGroup());
+}
+
+bool VelDesktopEntryEditDialog::assistance() const
+{
+    return d->isAssisted;
+}
+
+void VelDesktopEntryEditDialog::setAssistance(bool assistance)
+{
+    d->isAssisted = assistance;
+    if (d->props)
+        d->props->setAssistance(assistance);
 }
 
 bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool create, const QString &pattern)
@@ -249,10 +273,7 @@ void VelDesktopEntryEditDialog::accept()
         QDialog::accept();
         return;
     }
-    VelUIDesktopEntry entry = d->loaded;
-    entry.setFilePath(d->path);
-    d->props->saveTo(&entry);
-    d->emptyListSwitchedFrom(&entry);
+    VelUIDesktopEntry entry = d->entryToSave();
     const QPointer<VelDesktopEntryEditDialog> self(this);
     if (!d->checkSuitable(entry))
         return;
@@ -277,6 +298,7 @@ void VelDesktopEntryEditDialog::copyFrom()
     if (!d->props)
         return;
     GuardedDialog<VelMenuDialog> picker(standardDirectory(VelDir::StartMenu), -1, false, false, this);
+    picker->setAssistance(assistance());
     if (!picker.run())
         return;
     const QString source = picker->selectedItemPath();

@@ -4,6 +4,7 @@
 #include <VelDesktopEntryPropsWidget.h>
 
 #include "ActionListEdit.h"
+#include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
 #include "UrlRow.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
@@ -14,7 +15,6 @@
 #include <QCheckBox>
 #include <QLineEdit>
 #include <QRadioButton>
-#include <QScopedValueRollback>
 #include <QScrollArea>
 
 using namespace VelUI;
@@ -53,21 +53,28 @@ VelDesktopEntryPropsWidget::VelDesktopEntryPropsWidget(QWidget *parent)
 
 VelDesktopEntryPropsWidget::~VelDesktopEntryPropsWidget() = default;
 
+bool VelDesktopEntryPropsWidget::assistance() const
+{
+    return d->assistance != nullptr;
+}
+
+void VelDesktopEntryPropsWidget::setAssistance(bool assistance)
+{
+    if (assistance != this->assistance())
+        d->assistance = assistance ? std::make_unique<EntryFormAssistance>(*d) : nullptr;
+}
+
 void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList &allowedTypes)
 {
     if (d->typeChooser.setType(type, allowedTypes))
         d->rows.showFor(type);
+    d->tellRecordChange();
 }
 
 void VelDesktopEntryPropsWidget::loadFrom(const VelUIDesktopEntry &entry)
 {
-    const QScopedValueRollback<bool> loading(d->isLoading, true);
-    setType(entry.getType(), d->typeChooser.allowedTypes());
-    if (!entry.isValid())
-        return;
-    if (!EntryTypeRules::choices({}).contains(entry.getType()))
-        d->typeChooser.leaveOpen();
-    d->rows.load(entry, d->typeChooser.type());
+    d->load(entry);
+    d->tellRecordChange();
 }
 
 void VelDesktopEntryPropsWidget::saveTo(VelUIDesktopEntry *entry)

@@ -4,6 +4,7 @@
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
 #include "ActionListEdit.h"
+#include "EntryFormAssistance.h"
 #include "UrlRow.h"
 #include "fields/FormLayout.h"
 #include "fields/IconEdit.h"
@@ -16,6 +17,7 @@
 #include <QApplication>
 #include <QCheckBox>
 #include <QLineEdit>
+#include <QScopedValueRollback>
 #include <QScrollArea>
 #include <QToolButton>
 #include <QVBoxLayout>
@@ -54,11 +56,15 @@ VelDesktopEntryPropsWidgetPrivate::VelDesktopEntryPropsWidgetPrivate(VelDesktopE
     , layout(makeLayout(scrollArea))
     , typeChooser(layout, form)
     , rows(layout)
+    , recordToSave([this] { return loadedAndChanged(); })
+    , m_rows(QVector<FormRow>{typeChooser.row()} + rows.formRows())
 {
     layout->setRowStretch(layout->rowCount(), 1);
     connectChanges();
     form->setFocusProxy(rows.nameLine());
 }
+
+VelDesktopEntryPropsWidgetPrivate::~VelDesktopEntryPropsWidgetPrivate() = default;
 
 VelDesktopEntryPropsWidgetPrivate &VelDesktopEntryPropsWidgetPrivate::of(VelDesktopEntryPropsWidget &form)
 {
@@ -70,11 +76,38 @@ void VelDesktopEntryPropsWidgetPrivate::allowAllTypes()
     q->setType(EntryTypeRules::Application, {});
 }
 
+VelUIDesktopEntry VelDesktopEntryPropsWidgetPrivate::loadedAndChanged() const
+{
+    VelUIDesktopEntry entry = loaded;
+    q->saveTo(&entry);
+    return entry;
+}
+
+void VelDesktopEntryPropsWidgetPrivate::load(const VelUIDesktopEntry &entry)
+{
+    const QScopedValueRollback<bool> loading(isLoading, true);
+    q->setType(entry.getType(), typeChooser.allowedTypes());
+    if (!entry.isValid())
+        return;
+    if (!EntryTypeRules::choices({}).contains(entry.getType()))
+        typeChooser.leaveOpen();
+    loaded = entry;
+    rows.load(entry, typeChooser.type());
+}
+
 // The fields tell of every change, also of those that filling them makes.
 void VelDesktopEntryPropsWidgetPrivate::tellChange()
 {
+    if (isLoading)
+        return;
+    Q_EMIT q->changed();
+    Q_EMIT recordChanged();
+}
+
+void VelDesktopEntryPropsWidgetPrivate::tellRecordChange()
+{
     if (!isLoading)
-        Q_EMIT q->changed();
+        Q_EMIT recordChanged();
 }
 
 void VelDesktopEntryPropsWidgetPrivate::connectChanges()
@@ -87,8 +120,10 @@ void VelDesktopEntryPropsWidgetPrivate::connectChanges()
         connect(edit, &IconEdit::iconChanged, this, changed);
     for (QCheckBox *box : content->findChildren<QCheckBox *>())
         connect(box, &QCheckBox::stateChanged, this, changed);
-    for (PathEdit *edit : content->findChildren<PathEdit *>())
+    for (PathEdit *edit : content->findChildren<PathEdit *>()) {
         connect(edit, &PathEdit::changed, q, &VelDesktopEntryPropsWidget::changed);
+        connect(edit, &PathEdit::changed, this, &VelDesktopEntryPropsWidgetPrivate::tellRecordChange);
+    }
     for (StringListEdit *edit : content->findChildren<StringListEdit *>())
         connect(edit, &StringListEdit::changed, this, changed);
     for (ActionListEdit *edit : content->findChildren<ActionListEdit *>())
@@ -97,8 +132,10 @@ void VelDesktopEntryPropsWidgetPrivate::connectChanges()
     typeChooser.onChosen([this] {
         rows.changeTo(typeChooser.type());
         Q_EMIT q->changed();
+        Q_EMIT recordChanged();
     });
     connect(rows.showIn(), &ShowInChoice::switched, this, &VelDesktopEntryPropsWidgetPrivate::showInSwitched);
+    connect(rows.showIn(), &ShowInChoice::switched, this, &VelDesktopEntryPropsWidgetPrivate::recordChanged);
     connect(rows.urlRow()->infoButton(), &QToolButton::clicked, this,
             [this] { Q_EMIT q->requestedURLInfo(rows.urlRow()->url()); });
     connect(qApp, &QApplication::focusChanged, this,

@@ -3,31 +3,42 @@
 
 #pragma once
 
+#include "EntryFormHost.h"
 #include "PropsTable.h"
 #include "TypeChooser.h"
 
-#include <QObject>
+#include <functional>
+#include <memory>
 
 class QScrollArea;
 class VelDesktopEntryPropsWidget;
 
 namespace VelUI {
+class EntryFormAssistance;
 class FormLayout;
 } // namespace VelUI
 
 /// The parts of the properties form: the type of the entry, and a table of rows below it.
-class VelDesktopEntryPropsWidgetPrivate : public QObject
+class VelDesktopEntryPropsWidgetPrivate : public VelUI::EntryFormHost
 {
     Q_OBJECT
 
 public:
     explicit VelDesktopEntryPropsWidgetPrivate(VelDesktopEntryPropsWidget *form);
+    ~VelDesktopEntryPropsWidgetPrivate() override;
 
     /// The parts of \a form, for the dialog around it.
     static VelDesktopEntryPropsWidgetPrivate &of(VelDesktopEntryPropsWidget &form);
 
+    VelUI::FormLayout *formLayout() const override { return layout; }
+    const QVector<VelUI::FormRow> &formRows() const override { return m_rows; }
+    VelUIDesktopEntry record() const override { return recordToSave(); }
+
     /// Forgets which types another file had to choose from.
     void allowAllTypes();
+    void load(const VelUIDesktopEntry &entry);
+    /// Tells recordChanged(), but not while loading.
+    void tellRecordChange();
 
     VelDesktopEntryPropsWidget *const q;
     QScrollArea *const scrollArea;
@@ -36,13 +47,20 @@ public:
     VelUI::PropsTable rows;
     bool readOnly = false;
     bool isLoading = false;
+    VelUIDesktopEntry loaded{QString()};
+    /// Gives the entry as it would be saved; whoever saves it sets another one.
+    std::function<VelUIDesktopEntry()> recordToSave;
+    std::unique_ptr<VelUI::EntryFormAssistance> assistance; ///< null without
 
 Q_SIGNALS:
     /// The user chose the other list of desktop environments.
     void showInSwitched();
 
 private:
+    VelUIDesktopEntry loadedAndChanged() const;
     void tellChange();
     void connectChanges();
     void keepInView(QWidget *focused);
+
+    const QVector<VelUI::FormRow> m_rows;
 };

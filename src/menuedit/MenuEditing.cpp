@@ -175,6 +175,7 @@ bool MenuEditing::openEditor(const QString &path)
 
     const QPointer<MenuEditing> self(this);
     GuardedDialog<VelDesktopEntryEditDialog> dialog(m_view);
+    dialog->setAssistance(m_isAssisted);
     if (!dialog->setDesktopEntryPath(recordPath, !QFileInfo::exists(recordPath), QString())
         || !dialog.isAlive())
         return false;

@@ -30,6 +30,9 @@ public:
                 MenuVoice &voice, MenuHistory &history);
     ~MenuEditing() override;
 
+    /// Whether the editor that is opened helps its user beyond the plain one.
+    void setAssisted(bool isAssisted) { m_isAssisted = isAssisted; }
+
     /// Creates a folder or an entry where the selection says and opens the editor on it; whether
     /// it was made and kept. The user is told when it cannot be made.
     bool createNew(FreeName::Kind kind);
@@ -56,4 +59,5 @@ private:
     MenuFind &m_find;
     MenuVoice &m_voice;
     MenuHistory &m_history;
+    bool m_isAssisted = false;
 };

@@ -218,6 +218,7 @@ void VelMenuViewPrivate::editCurrent()
 void VelMenuViewPrivate::setAssistedTree(bool assisted)
 {
     menu.setAssisted(assisted);
+    editing.setAssisted(assisted);
     cutMark.setOn(assisted);
     dragOpening.setOn(assisted);
     emptyLabel = assisted && actions ? std::make_unique<EmptyMenuLabel>(q, menu) : nullptr;

@@ -3,9 +3,12 @@
 
 #include "FormLayout.h"
 
+#include "RowSlot.h"
+
 #include <QAbstractButton>
 #include <QLabel>
 #include <QLineEdit>
+#include <QVector>
 
 namespace VelUI {
 
@@ -103,8 +106,18 @@ int FormLayout::addRow(QWidget *field)
 
 void FormLayout::setRowVisible(int row, bool visible)
 {
-    setItemVisible(itemAtPosition(row, 0), visible);
-    setItemVisible(itemAtPosition(row, 1), visible);
+    setItemVisible(rowItem(row, 0), visible);
+    setItemVisible(rowItem(row, 1), visible);
+    for (RowSlot *slot : {m_beside.value(row), m_below.value(row)}) {
+        if (slot)
+            slot->setRowVisible(visible);
+    }
+}
+
+bool FormLayout::isRowVisible(int row) const
+{
+    QLayoutItem *const item = rowItem(row, 0);
+    return item && !item->widget()->isHidden();
 }
 
 void FormLayout::hideRow(int row)
@@ -119,13 +132,89 @@ void FormLayout::showRow(int row)
 
 void FormLayout::setRowLabelBold(int row)
 {
-    QLayoutItem *const item = itemAtPosition(row, 0);
+    QLayoutItem *const item = rowItem(row, 0);
     auto *label = item ? qobject_cast<QLabel *>(item->widget()) : nullptr;
     if (!label)
         return;
     QFont font = label->font();
     font.setWeight(QFont::Bold);
     label->setFont(font);
+}
+
+void FormLayout::spread()
+{
+    if (!isSpread())
+        moveRows(2);
+}
+
+void FormLayout::pack()
+{
+    if (!isSpread())
+        return;
+    qDeleteAll(m_beside);
+    qDeleteAll(m_below);
+    m_beside.clear();
+    m_below.clear();
+    moveRows(1);
+}
+
+RowSlot *FormLayout::besideRow(int row)
+{
+    RowSlot *&slot = m_beside[row];
+    if (!slot) {
+        slot = makeSlot(row, QBoxLayout::LeftToRight);
+        addWidget(slot, row * m_spacing, 2);
+    }
+    return slot;
+}
+
+RowSlot *FormLayout::belowRow(int row)
+{
+    RowSlot *&slot = m_below[row];
+    if (!slot) {
+        slot = makeSlot(row, QBoxLayout::TopToBottom);
+        addWidget(slot, row * m_spacing + 1, 1, 1, 2);
+    }
+    return slot;
+}
+
+RowSlot *FormLayout::makeSlot(int row, QBoxLayout::Direction direction)
+{
+    auto *slot = new RowSlot(direction, parentWidget());
+    slot->setRowVisible(isRowVisible(row));
+    return slot;
+}
+
+// The grid cannot insert a line: every item is put in anew.
+void FormLayout::moveRows(int spacing)
+{
+    struct Cell
+    {
+        QLayoutItem *item;
+        int row, column, rowSpan, columnSpan;
+    };
+    QVector<Cell> cells(count());
+    for (Cell &cell : cells) {
+        getItemPosition(0, &cell.row, &cell.column, &cell.rowSpan, &cell.columnSpan);
+        cell.item = takeAt(0);
+    }
+    QVector<int> stretches;
+    for (int line = 0; line < rowCount(); line += m_spacing) {
+        stretches.append(rowStretch(line));
+        setRowStretch(line, 0);
+    }
+    for (const Cell &cell : qAsConst(cells)) {
+        const int line = cell.row / m_spacing * spacing;
+        if (QLayout *const layout = cell.item->layout())
+            addLayout(layout, line, cell.column, cell.rowSpan, cell.columnSpan);
+        else
+            addItem(cell.item, line, cell.column, cell.rowSpan, cell.columnSpan);
+    }
+    for (int row = 0; row < stretches.size(); ++row) {
+        if (stretches[row])
+            setRowStretch(row * spacing, stretches[row]);
+    }
+    m_spacing = spacing;
 }
 
 } // namespace VelUI

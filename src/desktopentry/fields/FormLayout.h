@@ -3,14 +3,21 @@
 
 #pragma once
 
+#include <QBoxLayout>
 #include <QGridLayout>
+#include <QHash>
 
 namespace VelUI {
+
+class RowSlot;
 
 /// Two columns of labels and fields whose rows can be hidden.
 ///
 /// A label becomes the buddy of its field, and the field is announced by the label's text;
 /// in a field of several parts every part is.
+///
+/// Between spread() and pack() there is a place behind each field and one under it. Rows keep their
+/// numbers, though in the grid only every other line is a row then.
 class FormLayout : public QGridLayout
 {
     Q_OBJECT
@@ -30,6 +37,24 @@ public:
     void hideRow(int row);
     void showRow(int row);
     void setRowLabelBold(int row);
+    bool isRowVisible(int row) const;
+
+    void spread();
+    /// Takes the places out again, with what is in them.
+    void pack();
+    bool isSpread() const { return m_spacing > 1; }
+    /// The places of a row; only while the layout is spread.
+    RowSlot *besideRow(int row);
+    RowSlot *belowRow(int row);
+
+private:
+    QLayoutItem *rowItem(int row, int column) const { return itemAtPosition(row * m_spacing, column); }
+    RowSlot *makeSlot(int row, QBoxLayout::Direction direction);
+    void moveRows(int spacing);
+
+    int m_spacing = 1; ///< lines of the grid for each row
+    QHash<int, RowSlot *> m_beside;
+    QHash<int, RowSlot *> m_below;
 };
 
 } // namespace VelUI

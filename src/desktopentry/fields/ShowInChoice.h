@@ -63,6 +63,8 @@ public:
     }
 
     bool isOnlyChosen() const;
+    StringListEdit *onlyField() const { return m_only; }
+    StringListEdit *noField() const { return m_no; }
 
 Q_SIGNALS:
     /// The user chose the other list.

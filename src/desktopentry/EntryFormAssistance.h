@@ -1,0 +1,48 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "EntryFormHost.h"
+
+namespace VelUI {
+
+/**
+ * What the properties form has beyond the plain one.
+ *
+ * It puts its parts into the form when it is made and takes them out again when it is destroyed;
+ * then the form is as it was. Its parts learn from it which rows there are, have places in them, and
+ * hear of every change.
+ */
+class EntryFormAssistance : public QObject
+{
+    Q_OBJECT
+
+public:
+    explicit EntryFormAssistance(EntryFormHost &form);
+    ~EntryFormAssistance() override;
+
+    /// The rows in the order of the form, also those that the type of the entry hides.
+    const QVector<FormRow> &rows() const;
+    /// The row of \a key without a language; null when the form has none.
+    const FormRow *row(const QString &key) const;
+    bool isShown(const FormRow &row) const;
+
+    /// Puts \a widget, such as a button, behind the field; the form owns it. It may be hidden, shown
+    /// and deleted at will, and the Tab key comes to it after the field.
+    void addBeside(const FormRow &row, QWidget *widget);
+    /// The same for a widget, such as a sentence, under the field.
+    void addBelow(const FormRow &row, QWidget *widget);
+
+    /// The entry as it would be saved now; its contents() are those of the file.
+    VelUIDesktopEntry record() const;
+
+Q_SIGNALS:
+    /// record() may have changed: the user edited something, an entry was loaded, the type is another.
+    void recordChanged();
+
+private:
+    EntryFormHost &m_form;
+};
+
+} // namespace VelUI

@@ -1,0 +1,61 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FieldEdit.h"
+
+#include "fields/IconEdit.h"
+#include "fields/PathEdit.h"
+#include "fields/PlainFields.h"
+#include "fields/StringListEdit.h"
+
+#include <QCheckBox>
+#include <QLineEdit>
+
+namespace VelUI {
+
+namespace {
+
+// Unlike setText() this is an edit.
+void type(QLineEdit *line, const QString &text)
+{
+    line->selectAll();
+    line->insert(text);
+}
+
+} // namespace
+
+QVariant FieldEdit::value(const QWidget *field)
+{
+    if (const auto *line = qobject_cast<const QLineEdit *>(field))
+        return fieldValue(line);
+    if (const auto *path = qobject_cast<const PathEdit *>(field))
+        return fieldValue(path);
+    if (const auto *icon = qobject_cast<const IconEdit *>(field))
+        return fieldValue(icon);
+    if (const auto *list = qobject_cast<const StringListEdit *>(field))
+        return fieldValue(list);
+    if (const auto *box = qobject_cast<const QCheckBox *>(field))
+        return fieldValue(box);
+    return {};
+}
+
+void FieldEdit::setValue(QWidget *field, const QVariant &value)
+{
+    if (FieldEdit::value(field) == value)
+        return;
+    if (auto *line = qobject_cast<QLineEdit *>(field))
+        type(line, value.toString());
+    else if (const auto *path = qobject_cast<PathEdit *>(field))
+        type(path->findChild<QLineEdit *>(), value.toString());
+    else if (auto *icon = qobject_cast<IconEdit *>(field)) {
+        icon->setIcon(value.toString());
+        Q_EMIT icon->iconChanged(value.toString());
+    } else if (auto *list = qobject_cast<StringListEdit *>(field)) {
+        list->setStrings(value.toStringList());
+        Q_EMIT list->changed();
+    } else if (auto *box = qobject_cast<QCheckBox *>(field)) {
+        box->setChecked(value.toBool());
+    }
+}
+
+} // namespace VelUI

@@ -1,0 +1,23 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QVariant>
+
+class QWidget;
+
+namespace VelUI {
+
+/// Changes of a field that count as the user's: whoever listens to the user hears of them.
+namespace FieldEdit {
+
+/// The value of a field of the form: a text, a list of texts, or a bool; invalid for other fields.
+QVariant value(const QWidget *field);
+
+/// Gives the field another value, as if the user had typed or chosen it.
+void setValue(QWidget *field, const QVariant &value);
+
+} // namespace FieldEdit
+
+} // namespace VelUI

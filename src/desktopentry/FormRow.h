@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+class QWidget;
+
+namespace VelUI {
+
+/// A row of the properties form, as those see it who add something to the form.
+struct FormRow
+{
+    QString key; ///< of the entry: "Name"
+    QString label; ///< as it is shown, without a colon
+    bool isTranslation = false; ///< the field shows the value of one language
+    int number = 0; ///< in the FormLayout
+    /// A QLineEdit, QCheckBox, PathEdit, IconEdit, StringListEdit, ActionListEdit, or the
+    /// QComboBox of the type.
+    QWidget *field = nullptr;
+};
+
+} // namespace VelUI
