@@ -95,17 +95,44 @@ QVariant typedValue(Text text)
     return toString(isQuoted(text) ? text.mid(1, text.size() - 2) : text);
 }
 
-template <typename Text>
-void readKey(Text key, Text value, QSettings::SettingsMap &map)
+// Fills the map. The name of the section comes last: in a sorted file it is the one key that may stand
+// before smaller ones, and each of those would have to look for its place.
+class MapFiller
 {
-    if (key.isEmpty() || value.isEmpty())
-        return;
-    // Written files are sorted: the place is at the end, and looked for only when it is not.
-    map.insert(map.constEnd(), toString(key), typedValue(value));
+public:
+    explicit MapFiller(QSettings::SettingsMap &map)
+        : m_map(map)
+    {
+    }
+
+    void add(const QString &key, const QVariant &value)
+    {
+        if (key == sectionKey())
+            m_section = value;
+        else // at the end; the place is looked for only when it is not there
+            m_map.insert(m_map.constEnd(), key, value);
+    }
+
+    void finish()
+    {
+        if (m_section.isValid())
+            m_map.insert(sectionKey(), m_section);
+    }
+
+private:
+    QSettings::SettingsMap &m_map;
+    QVariant m_section;
+};
+
+template <typename Text>
+void readKey(Text key, Text value, MapFiller &map)
+{
+    if (!key.isEmpty() && !value.isEmpty())
+        map.add(toString(key), typedValue(value));
 }
 
 template <typename Text>
-void readLine(Text line, QSettings::SettingsMap &map)
+void readLine(Text line, MapFiller &map)
 {
     if (line.startsWith(QLatin1Char('#')) || line.startsWith(QLatin1Char(';')))
         return;
@@ -115,7 +142,7 @@ void readLine(Text line, QSettings::SettingsMap &map)
     } else if (line.startsWith(QLatin1Char('[')) && line.endsWith(QLatin1Char(']'))) {
         QString name = toString(line);
         name.remove(QLatin1Char('[')).remove(QLatin1Char(']'));
-        map.insert(sectionKey(), name.trimmed());
+        map.add(sectionKey(), name.trimmed());
     }
 }
 
@@ -147,7 +174,7 @@ bool isUtf8()
 }
 
 // Reads one line, without its end. Its text ends at the first NUL byte.
-void readBytes(const char *begin, const char *end, bool asciiAsIs, QSettings::SettingsMap &map)
+void readBytes(const char *begin, const char *end, bool asciiAsIs, MapFiller &map)
 {
     while (begin != end && isSpace(*begin))
         ++begin;
@@ -209,15 +236,17 @@ bool read(QIODevice &device, QSettings::SettingsMap &map)
     if (!device.atEnd())
         return false;
 
+    MapFiller filler(map);
     const bool asciiAsIs = isUtf8();
     const char *line = bytes.constData();
     const char *const end = line + bytes.size();
     while (line != end) {
         const void *const feed = std::memchr(line, '\n', size_t(end - line));
         const char *const lineEnd = feed ? static_cast<const char *>(feed) : end;
-        readBytes(line, lineEnd, asciiAsIs, map);
+        readBytes(line, lineEnd, asciiAsIs, filler);
         line = feed ? lineEnd + 1 : end;
     }
+    filler.finish();
     return true;
 }
 
