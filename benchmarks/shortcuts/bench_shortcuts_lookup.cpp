@@ -91,7 +91,7 @@ bool compareLookUp(const QString &path)
                    [&] { sink = sink + std::size_t(VelKeyServer::checkForGlobalShortcut(absent).size()); });
     const QByteArray localPath = QFile::encodeName(path);
     comparison.add(
-        "SimpleIni load and walk", [&] { sink = sink + walkWithSimpleIni(localPath); }, 1.25);
+        "SimpleIni load and walk", [&] { sink = sink + walkWithSimpleIni(localPath); }, 0.35);
     comparison.add(
         "KConfig read", [&] { sink = sink + readWithKConfig(path); }, 1.0);
     // Short measurements, so that few are cut by another process.

@@ -12,8 +12,8 @@
 #include <QFile>
 #include <QKeySequence>
 
-#include <cstdio>
-#include <memory>
+#include <algorithm>
+#include <string_view>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -27,31 +27,66 @@
 
 namespace {
 
-struct FileCloser
+// Nothing, unless all of it can be read. Only a regular file has a size; opening a pipe must not wait for
+// its writer.
+QByteArray contents(const QString &path)
 {
-    void operator()(FILE *file) const { std::fclose(file); }
-};
-using FilePointer = std::unique_ptr<FILE, FileCloser>;
-
-// Only a regular file has a size; opening a pipe must not wait for its writer.
-FilePointer openFile(const QByteArray &name)
-{
-    const int descriptor = ::open(name.constData(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+    const int descriptor = ::open(path.toLocal8Bit().constData(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
     if (descriptor < 0)
-        return nullptr;
+        return {};
+    QByteArray bytes;
     struct stat status = {};
-    const bool isUsable = fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode)
-        && status.st_size <= GlobalShortcuts::LargestFile;
-    FilePointer file(isUsable ? fdopen(descriptor, "rb") : nullptr);
-    if (!file)
-        ::close(descriptor);
-    return file;
+    if (fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode)
+        && status.st_size <= GlobalShortcuts::LargestFile) {
+        bytes.resize(int(status.st_size));
+        QFile file;
+        if (!file.open(descriptor, QIODevice::ReadOnly | QIODevice::Unbuffered)
+            || file.read(bytes.data(), bytes.size()) != bytes.size())
+            bytes.clear();
+    }
+    ::close(descriptor);
+    return bytes;
 }
 
-bool load(CSimpleIniA &ini, const QString &path)
+bool isEndOfLine(char character)
 {
-    const FilePointer file = openFile(path.toLocal8Bit());
-    return file && ini.LoadFile(file.get()) >= 0;
+    return character == '\n' || character == '\r' || character == '\0';
+}
+
+bool isBlank(char character)
+{
+    return character == ' ' || character == '\t';
+}
+
+// The key in a line; none where the line has no "=".
+std::string_view keyOf(std::string_view line)
+{
+    std::string_view key = line.substr(0, line.find('='));
+    if (key.size() == line.size())
+        return {};
+    while (!key.empty() && isBlank(key.front()))
+        key.remove_prefix(1);
+    while (!key.empty() && isBlank(key.back()))
+        key.remove_suffix(1);
+    return key;
+}
+
+// Whether any line has a key that matches, in whatever section or comment it stands. Parsing the file
+// takes several times as long, and mostly nothing matches.
+bool mayMatch(const QByteArray &bytes, const KeyMatcher &matcher)
+{
+    const char *begin = bytes.constData();
+    const char *const end = begin + bytes.size();
+    if (bytes.startsWith("\xef\xbb\xbf"))
+        begin += 3;
+    while (begin < end) {
+        const char *const lineEnd = std::find_if(begin, end, isEndOfLine);
+        const std::string_view key = keyOf({begin, std::size_t(lineEnd - begin)});
+        if (!key.empty() && matcher.matches(key))
+            return true;
+        begin = lineEnd + 1;
+    }
+    return false;
 }
 
 } // namespace
@@ -64,13 +99,14 @@ QString GlobalShortcuts::filePath()
 
 QString GlobalShortcuts::find(const QString &path, const QKeySequence &sequence)
 {
+    const QByteArray bytes = path.isEmpty() ? QByteArray() : contents(path);
+    const KeyMatcher matcher(sequence);
     CSimpleIniA ini;
-    if (path.isEmpty() || !load(ini, path))
+    if (!mayMatch(bytes, matcher) || ini.LoadData(bytes.constData(), std::size_t(bytes.size())) < 0)
         return {};
     const CSimpleIniA::TKeyVal *bindings = ini.GetSection("ShortCutKeys");
     if (!bindings)
         return {};
-    const KeyMatcher matcher(sequence);
     for (const auto &binding : *bindings) {
         if (matcher.matches(binding.first.pItem))
             return QuotedText::withoutQuotes(QString::fromUtf8(binding.second));

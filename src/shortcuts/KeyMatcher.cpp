@@ -28,10 +28,11 @@ struct KeyMatcher::Parts
     const char *key = nullptr;
     std::size_t keyLength = 0;
 
-    explicit Parts(const char *text)
+    explicit Parts(std::string_view fileKey)
     {
-        const char *end = text + std::strlen(text);
-        if (*text == '"') {
+        const char *text = fileKey.data();
+        const char *end = text + fileKey.size();
+        if (text != end && *text == '"') {
             ++text;
             end -= end > text ? 1 : 0;
         }
@@ -67,7 +68,7 @@ KeyMatcher::KeyMatcher(const QKeySequence &wanted)
     }
 }
 
-bool KeyMatcher::matches(const char *fileKey) const
+bool KeyMatcher::matches(std::string_view fileKey) const
 {
     const Parts parts(fileKey);
     if (parts.isSimple) {
@@ -108,9 +109,9 @@ std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
     return m_wanted[0] == (*code | KeyNames::qtModifiers(parts.mask));
 }
 
-bool KeyMatcher::matchesText(const char *fileKey) const
+bool KeyMatcher::matchesText(std::string_view fileKey) const
 {
-    QString key = QuotedText::withoutQuotes(QString::fromUtf8(fileKey));
+    QString key = QuotedText::withoutQuotes(QString::fromUtf8(fileKey.data(), int(fileKey.size())));
     key.replace(QLatin1Char('|'), QLatin1Char('+'));
     key.remove(QLatin1String("None+"));
     const QString converted = KeyNames::fromKeyString(key);

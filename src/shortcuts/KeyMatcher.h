@@ -9,6 +9,7 @@
 
 #include <array>
 #include <optional>
+#include <string_view>
 
 /**
  * Compares the keys of the shortcut file with one key sequence.
@@ -23,10 +24,10 @@ public:
     explicit KeyMatcher(const QKeySequence &wanted);
 
     /// Whether \a fileKey, as it stands in the file in UTF-8, is the key sequence.
-    bool matches(const char *fileKey) const;
+    bool matches(std::string_view fileKey) const;
 
     /// The same by way of the texts: clean-up, conversion, parsing.
-    bool matchesText(const char *fileKey) const;
+    bool matchesText(std::string_view fileKey) const;
 
 private:
     struct Parts;
