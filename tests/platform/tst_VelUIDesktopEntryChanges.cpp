@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "Growth.h"
 #include "RecordTestCase.h"
 
 #include <sys/stat.h>
@@ -25,6 +26,7 @@ private Q_SLOTS:
     void writesTheLocalVariantThatTheGetterFound();
     void dropsWhatBelongsToTheOldTypeOnly();
     void keepsEverythingWhenTheTypeStays();
+    void removesAKeyOfManyLanguagesInLinearTime();
 };
 
 namespace {
@@ -404,6 +406,25 @@ void tst_VelUIDesktopEntryChanges::keepsEverythingWhenTheTypeStays()
 {
     const QByteArray bytes = Header + "Type=Link\nURL=u\nExec=e\n";
     QCOMPARE(changed(bytes, [](auto &record) { record.setType(QStringLiteral("Link")); }), bytes);
+}
+
+void tst_VelUIDesktopEntryChanges::removesAKeyOfManyLanguagesInLinearTime()
+{
+    const auto removal = [this](int languages) {
+        QByteArray lines;
+        for (int i = 0; i < languages; ++i)
+            lines += "Keywords[l" + QByteArray::number(i) + "]=a\n";
+        const QByteArray bytes = Header + "Type=Application\nName=A\nKeywords=a\n" + lines;
+        return [this, bytes] {
+            const QString file = write(QStringLiteral("x.desktop"), bytes);
+            VelUIDesktopEntry record(file);
+            record.setType(QStringLiteral("Link"));
+            if (!record.save() || read(file) != Header + "Type=Link\nName=A\n")
+                QTest::qFail("not removed", __FILE__, __LINE__);
+        };
+    };
+    const double growth = Growth::of(removal(1000), removal(1000 * Growth::Factor));
+    QVERIFY2(growth < Growth::Most, qPrintable(QString::number(growth)));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_VelUIDesktopEntryChanges)

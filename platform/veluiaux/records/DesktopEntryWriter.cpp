@@ -8,6 +8,8 @@
 
 #include <algorithm>
 #include <map>
+#include <string_view>
+#include <unordered_set>
 #include <utility>
 
 namespace {
@@ -80,7 +82,7 @@ private:
     void removeGroups();
     NewKeys &newGroup(const std::string &name);
     void place(const Change &change);
-    void removeKey(const Change &change);
+    void removeKeys();
     void insertVariant(int group, const Change &change);
     void insertNewKeys();
     void insertNewGroups();
@@ -92,6 +94,9 @@ private:
     LineScan m_lines;
     std::vector<Splice> m_splices;
     std::map<int, NewKeys> m_newKeys; // by group of the text
+    // By group and key.
+    std::map<std::pair<std::string_view, std::string_view>, std::unordered_set<std::string_view>>
+        m_goneLocales;
     std::vector<std::pair<std::string, NewKeys>> m_newGroups;
     std::unordered_map<std::string, std::size_t> m_newGroupOf;
 };
@@ -104,6 +109,7 @@ QByteArray Writer::run()
         newGroup(std::string(DesktopEntryNames::MainGroup));
     for (const Change &change : m_changes.all())
         place(change);
+    removeKeys();
     insertNewKeys();
     insertNewGroups();
     return join();
@@ -139,7 +145,7 @@ void Writer::place(const Change &change)
 {
     const int group = m_changes.isRemoved(change.group) ? Text::NoGroup : m_text.group(change.group);
     if (!change.value) {
-        removeKey(change);
+        m_goneLocales[{change.group, change.key}].insert(change.locale);
         return;
     }
     if (group == Text::NoGroup) {
@@ -154,16 +160,19 @@ void Writer::place(const Change &change)
         m_newKeys[group].add(change);
 }
 
-void Writer::removeKey(const Change &change)
+// A key goes from all groups of that name, with all languages that go in one walk over its lines.
+void Writer::removeKeys()
 {
     const auto &groups = m_text.groups();
-    for (std::size_t i = 0; i < groups.size(); ++i) {
-        if (m_text.groupName(groups[i]) != change.group || !survives(groups[i]))
-            continue;
-        m_text.forEachLine(int(i), change.key, [this, &change](const Text::Key &key) {
-            if (m_text.locale(key) == change.locale)
-                m_splices.push_back({key.line, key.lineEnd - key.line, Rank::Variant, false, {}});
-        });
+    for (const auto &[place, locales] : m_goneLocales) {
+        for (std::size_t i = 0; i < groups.size(); ++i) {
+            if (m_text.groupName(groups[i]) != place.first || !survives(groups[i]))
+                continue;
+            m_text.forEachLine(int(i), place.second, [this, &gone = locales](const Text::Key &key) {
+                if (gone.count(m_text.locale(key)) != 0)
+                    m_splices.push_back({key.line, key.lineEnd - key.line, Rank::Variant, false, {}});
+            });
+        }
     }
 }
 
