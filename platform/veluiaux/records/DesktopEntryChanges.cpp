@@ -3,46 +3,65 @@
 
 #include "DesktopEntryChanges.h"
 
-#include <algorithm>
+#include <functional>
 #include <iterator>
 #include <utility>
 
-std::string DesktopEntryChanges::place(std::string_view group, std::string_view key, std::string_view locale)
+namespace {
+
+constexpr std::size_t LeastSlots = 16;
+
+std::size_t hashOf(std::string_view group, std::string_view key, std::string_view locale)
 {
-    // A line feed stands in none of the three.
-    std::string place;
-    place.reserve(group.size() + key.size() + locale.size() + 2);
-    place.append(group).append(1, '\n').append(key).append(1, '\n').append(locale);
-    return place;
+    const std::hash<std::string_view> hash;
+    return (hash(group) * 31 + hash(key)) * 31 + hash(locale);
 }
+
+} // namespace
 
 const DesktopEntryChanges::Change *DesktopEntryChanges::find(std::string_view group, std::string_view key,
                                                              std::string_view locale) const
 {
     if (m_changes.empty())
         return nullptr;
-    const auto found = m_index.find(place(group, key, locale));
-    return found == m_index.end() ? nullptr : &m_changes[found->second];
+    const Slot slot = slotOf(group, key, locale);
+    return slot ? &m_changes[slot - 1] : nullptr;
 }
 
 void DesktopEntryChanges::set(Change change)
 {
-    const auto [found, isNew] =
-        m_index.emplace(place(change.group, change.key, change.locale), m_changes.size());
-    if (isNew)
-        m_changes.push_back(std::move(change));
-    else
-        m_changes[found->second].value = std::move(change.value);
+    if (m_slots.size() < 2 * (m_changes.size() + 1))
+        makeSlots(m_changes.size() + 1);
+    Slot &slot = slotOf(change.group, change.key, change.locale);
+    if (slot) {
+        m_changes[slot - 1].value = std::move(change.value);
+        return;
+    }
+    m_changes.push_back(std::move(change));
+    slot = Slot(m_changes.size());
+}
+
+void DesktopEntryChanges::reserve(std::size_t count)
+{
+    m_changes.reserve(count);
+    makeSlots(count);
+}
+
+void DesktopEntryChanges::add(DesktopEntryChanges others)
+{
+    if (isEmpty()) {
+        *this = std::move(others);
+        return;
+    }
+    for (Change &change : others.m_changes)
+        set(std::move(change));
 }
 
 void DesktopEntryChanges::drop(std::string_view group, std::string_view key, std::string_view locale)
 {
-    if (m_changes.empty())
+    if (!find(group, key, locale))
         return;
-    const auto found = m_index.find(place(group, key, locale));
-    if (found == m_index.end())
-        return;
-    m_changes.erase(m_changes.begin() + std::ptrdiff_t(found->second));
+    m_changes.erase(m_changes.begin() + (slotOf(group, key, locale) - 1));
     reindex();
 }
 
@@ -77,9 +96,37 @@ bool DesktopEntryChanges::isRemoved(std::string_view group) const
     return !m_removedGroups.empty() && m_removedGroups.count(std::string(group)) != 0;
 }
 
+// The slot that has the change, or the empty one that is to have it. There are slots, and empty ones.
+DesktopEntryChanges::Slot &DesktopEntryChanges::slotOf(std::string_view group, std::string_view key,
+                                                       std::string_view locale) const
+{
+    const std::size_t mask = m_slots.size() - 1; // their number is a power of two
+    for (std::size_t i = hashOf(group, key, locale) & mask;; i = (i + 1) & mask) {
+        Slot &slot = m_slots[i];
+        if (!slot)
+            return slot;
+        const Change &change = m_changes[slot - 1];
+        if (change.locale == locale && change.key == key && change.group == group)
+            return slot;
+    }
+}
+
+void DesktopEntryChanges::makeSlots(std::size_t count)
+{
+    std::size_t size = std::max(LeastSlots, m_slots.size());
+    while (size < 2 * count)
+        size *= 2;
+    if (size == m_slots.size())
+        return;
+    m_slots.resize(size);
+    reindex();
+}
+
 void DesktopEntryChanges::reindex()
 {
-    m_index.clear();
-    for (std::size_t i = 0; i < m_changes.size(); ++i)
-        m_index.emplace(place(m_changes[i].group, m_changes[i].key, m_changes[i].locale), i);
+    std::fill(m_slots.begin(), m_slots.end(), 0);
+    for (std::size_t i = 0; i < m_changes.size(); ++i) {
+        const Change &change = m_changes[i];
+        slotOf(change.group, change.key, change.locale) = Slot(i + 1);
+    }
 }

@@ -3,10 +3,11 @@
 
 #pragma once
 
+#include <algorithm>
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <unordered_set>
 #include <vector>
 
@@ -32,8 +33,22 @@ public:
 
     const Change *find(std::string_view group, std::string_view key, std::string_view locale) const;
     void set(Change change);
+    /// Makes room for so many changes at once.
+    void reserve(std::size_t count);
+    /// Sets all that \a others has; they have no removed groups.
+    void add(DesktopEntryChanges others);
     /// Forgets what was done to the key: it is again as it stands in the file.
     void drop(std::string_view group, std::string_view key, std::string_view locale);
+    /// The same for all changes of which \a isMeant tells so.
+    template <typename Predicate>
+    void dropIf(Predicate isMeant)
+    {
+        const auto gone = std::remove_if(m_changes.begin(), m_changes.end(), isMeant);
+        if (gone == m_changes.end())
+            return;
+        m_changes.erase(gone, m_changes.end());
+        reindex();
+    }
 
     /// The groups go, and with them the changes made in them.
     void removeGroups(const std::unordered_set<std::string> &groups);
@@ -42,11 +57,17 @@ public:
     bool isRemoved(std::string_view group) const;
 
 private:
-    static std::string place(std::string_view group, std::string_view key, std::string_view locale);
+    using Slot = std::uint32_t;
+
+    Slot &slotOf(std::string_view group, std::string_view key, std::string_view locale) const;
+    void makeSlots(std::size_t count);
     void reindex();
 
     std::vector<Change> m_changes;
-    std::unordered_map<std::string, std::size_t> m_index;
+    // A hash table whose slots hold the number of a change, counted from 1, or 0; at most half of them are
+    // taken. A record may take over hundreds of keys, and a node for each would take longer than reading
+    // them.
+    mutable std::vector<Slot> m_slots;
     std::unordered_set<std::string> m_removedGroups;
     std::vector<Change> m_goneWithGroups;
 };

@@ -7,6 +7,7 @@
 #include "DesktopEntryWriter.h"
 #include "EntryFile.h"
 #include "FileDescriptor.h"
+#include "InheritedKeys.h"
 #include "SharedTexts.h"
 
 #include <DesktopEntryValue.h>
@@ -15,6 +16,7 @@
 
 #include <fcntl.h>
 
+#include <algorithm>
 #include <mutex>
 #include <utility>
 
@@ -22,6 +24,9 @@ namespace {
 
 // So often a save starts anew because another program was faster.
 constexpr int MostAttempts = 10;
+
+constexpr std::size_t UsualLine = 40; // bytes
+constexpr std::size_t MostReserved = 1024;
 
 std::string encode(const QString &text)
 {
@@ -171,15 +176,11 @@ void EntryDocument::removeKey(std::string_view group, std::string_view key)
     std::unordered_set<std::string> inFile;
     m_text->forEachLine(this->group(group).group(), key,
                         [&](const DesktopEntryText::Key &line) { inFile.emplace(m_text->locale(line)); });
-    std::vector<std::string> onlyChanged;
-    for (const auto &change : m_changes.all()) {
-        if (change.group == group && change.key == key && inFile.count(change.locale) == 0)
-            onlyChanged.push_back(change.locale);
-    }
+    m_changes.dropIf([&](const DesktopEntryChanges::Change &change) {
+        return change.group == group && change.key == key && inFile.count(change.locale) == 0;
+    });
     for (const std::string &locale : inFile)
         m_changes.set({std::string(group), std::string(key), locale, std::nullopt});
-    for (const std::string &locale : onlyChanged)
-        m_changes.drop(group, key, locale);
 }
 
 void EntryDocument::removeGroups(const std::unordered_set<std::string> &groups)
@@ -196,30 +197,23 @@ void EntryDocument::copyGroups(const std::unordered_map<std::string, std::string
 {
     if (names.empty())
         return;
-    std::vector<KeyValue> keys = keyValues();
     std::unordered_set<std::string> taken;
-    for (const KeyValue &key : keys)
-        taken.insert(key.group);
-    for (KeyValue &key : keys) {
-        const auto name = names.find(key.group);
-        if (name != names.end() && taken.count(name->second) == 0)
-            m_changes.set({name->second, std::move(key.key), std::move(key.locale), std::move(key.value)});
+    DesktopEntryChanges copies;
+    forEachValue(
+        [&](std::string_view group, std::string_view key, std::string_view locale, std::string_view value) {
+            const auto name = names.find(*taken.emplace(group).first);
+            if (name != names.end())
+                copies.set({name->second, std::string(key), std::string(locale), std::string(value)});
+        });
+    for (const auto &copy : copies.all()) {
+        if (taken.count(copy.group) == 0)
+            m_changes.set(copy);
     }
 }
 
-std::vector<EntryDocument::KeyValue> EntryDocument::keyValues() const
+template <typename Visitor>
+void EntryDocument::forEachValue(Visitor visit) const
 {
-    std::vector<KeyValue> all;
-    std::unordered_map<std::string, std::size_t> known;
-    const auto add = [&](std::string_view group, std::string_view key, std::string_view locale,
-                         std::string_view value) {
-        const std::string place = std::string(group) + '\n' + std::string(key) + '\n' + std::string(locale);
-        const auto [found, isNew] = known.emplace(place, all.size());
-        if (isNew)
-            all.push_back({std::string(group), std::string(key), std::string(locale), std::string(value)});
-        else
-            all[found->second].value = value;
-    };
     for (std::size_t i = 0; i < m_text->groups().size(); ++i) {
         const auto &group = m_text->groups()[i];
         const std::string_view name = m_text->groupName(group);
@@ -228,41 +222,32 @@ std::vector<EntryDocument::KeyValue> EntryDocument::keyValues() const
         m_text->forEachKey(group, [&](const DesktopEntryText::Key &key) {
             const auto *change = m_changes.find(name, m_text->keyName(key), m_text->locale(key));
             if (!change)
-                add(name, m_text->keyName(key), m_text->locale(key), m_text->value(key));
+                visit(name, m_text->keyName(key), m_text->locale(key), m_text->value(key));
             else if (change->value)
-                add(name, change->key, change->locale, *change->value);
+                visit(name, m_text->keyName(key), m_text->locale(key), std::string_view(*change->value));
         });
     }
     for (const auto &change : m_changes.all()) {
         if (change.value)
-            add(change.group, change.key, change.locale, *change.value);
+            visit(std::string_view(change.group), std::string_view(change.key),
+                  std::string_view(change.locale), std::string_view(*change.value));
     }
-    return all;
 }
 
 void EntryDocument::inheritFrom(const EntryDocument &other)
 {
-    namespace Names = DesktopEntryNames;
-    std::unordered_set<std::string> actions;
-    if (!has(Names::MainGroup, Names::Actions)) {
-        for (const QString &id : other.list(Names::MainGroup, Names::Actions))
-            actions.insert(Names::actionGroup(id.toStdString()));
-    }
-    std::vector<KeyValue> taken;
-    for (KeyValue &theirs : other.keyValues()) {
-        if (Names::isActionGroup(theirs.group) && actions.count(theirs.group) == 0)
-            continue;
-        if (has(theirs.group, theirs.key))
-            continue;
-        if (!theirs.locale.empty()
-            && (!other.has(theirs.group, theirs.key) || group(theirs.group).value(theirs.key, theirs.locale)))
-            continue;
-        taken.push_back(std::move(theirs));
-    }
-    for (KeyValue &key : taken)
-        m_changes.set(
-            {std::move(key.group), std::move(key.key), std::move(key.locale), std::move(key.value)});
-    m_valid = m_valid || (other.m_valid && !taken.empty());
+    InheritedKeys inherited({*m_text, m_changes}, {*other.m_text, other.m_changes});
+    DesktopEntryChanges taken;
+    // About as many as there are lines, within reason.
+    taken.reserve(
+        std::min(other.m_text->bytes().size() / UsualLine + other.m_changes.all().size(), MostReserved));
+    other.forEachValue(
+        [&](std::string_view group, std::string_view key, std::string_view locale, std::string_view value) {
+            if (inherited.has(group, key, locale))
+                taken.set({std::string(group), std::string(key), std::string(locale), std::string(value)});
+        });
+    m_valid = m_valid || (other.m_valid && !taken.isEmpty());
+    m_changes.add(std::move(taken));
 }
 
 QByteArray EntryDocument::contents() const

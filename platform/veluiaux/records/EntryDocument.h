@@ -15,7 +15,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
-#include <vector>
+#include <unordered_set>
 
 /**
  * One desktop entry: the text of its file and what has been changed since.
@@ -26,15 +26,6 @@
 class EntryDocument
 {
 public:
-    /// A key with the value it has now, as it stands (or is to stand) in the file.
-    struct KeyValue
-    {
-        std::string group;
-        std::string key;
-        std::string locale;
-        std::string value;
-    };
-
     EntryDocument();
 
     /// Binds the document to a file without reading it.
@@ -76,10 +67,11 @@ public:
     /// name to that no group has yet.
     void copyGroups(const std::unordered_map<std::string, std::string> &names);
 
-    /// All keys that count, in the order of the file, then of the setting.
-    std::vector<KeyValue> keyValues() const;
-
 private:
+    /// Calls \a visit(group, key, locale, value) for all keys that count, in the order of the file, then of
+    /// the setting. A key that stands there twice comes twice; the last value is the one that it has.
+    template <typename Visitor>
+    void forEachValue(Visitor visit) const;
     template <typename T>
     void write(std::string_view group, std::string_view key, std::string_view locale, const T &value);
     template <typename T>
