@@ -21,6 +21,7 @@
 #include <cstdlib>
 #include <functional>
 #include <memory>
+#include <vector>
 
 // Reading and saving desktop entries: the record class beside GKeyFile and beside the least
 // that can be done.
@@ -200,6 +201,38 @@ bool compareLoading(const QString &parent, const std::string &title, const QByte
     return warm.run(Rounds) && coldKept;
 }
 
+// A record that takes over all keys of another one, beside reading such a file.
+bool compareInheriting(const QString &parent, const std::string &title, const QByteArrayList &contents)
+{
+    if (contents.isEmpty())
+        return true;
+    EntryFiles entries(parent, contents, Rounds + 2);
+    std::vector<VelUIDesktopEntry> models;
+    for (int i = 0; i < entries.count(); ++i)
+        models.emplace_back(entries.path(i));
+    Comparison comparison("desktop entry: take over all keys of another; " + title);
+    comparison.setPreparation([&entries] { entries.useNextSet(); });
+    comparison.addTimed("VelUIDesktopEntry", [&models] {
+        return microseconds(processorTime, [&models] {
+            for (const VelUIDesktopEntry &model : models) {
+                VelUIDesktopEntry heir;
+                heir.inheritFrom(model);
+                use(heir.isValid());
+            }
+        });
+    });
+    comparison.addTimed(
+        "load and read 8 values, first time",
+        [&entries] {
+            return microseconds(processorTime, [&entries] {
+                for (int i = 0; i < entries.count(); ++i)
+                    readRecord(entries.path(i));
+            });
+        },
+        3);
+    return comparison.run(Rounds);
+}
+
 // The whole of what a user does, and then each half of it.
 bool compareSaving(const QString &parent, Clock clock, const std::string &title,
                    const QByteArrayList &contents, double peerLimit, double leastLimit)
@@ -283,6 +316,11 @@ int main()
     bool kept = loading("installed entries", installed);
     kept = loading("12 languages", twelve) && kept;
     kept = loading("66 languages", EntryFiles::synthetic(66)) && kept;
+    const auto inheriting = [&memory](const char *title, const QByteArrayList &contents) {
+        return runAlone([&] { return compareInheriting(memory, title, contents); });
+    };
+    kept = inheriting("installed entries", installed) && kept;
+    kept = inheriting("66 languages", EntryFiles::synthetic(66)) && kept;
     kept = saving(memory, processorTime, "installed entries, memory disk", installed, 0.30, 0) && kept;
     kept = saving(memory, processorTime, "12 languages, memory disk", twelve, 0.30, 0) && kept;
     kept = saving(disk, wallTime, "12 languages, disk", twelve, 0, 1.1) && kept;
