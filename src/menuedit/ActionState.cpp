@@ -9,10 +9,13 @@ ActionState ActionState::of(const Selection &selection)
     if (!selection.any)
         return state;
     state.create = selection.writable;
-    state.edit = selection.writable;
+    state.edit = selection.writable && selection.items == 1;
+    state.remove = selection.writable && !selection.isAnyLocked;
     state.paste = selection.writable && selection.filesOnClipboard;
-    const bool isMovable = selection.writable && !selection.isByTime;
-    state.up = isMovable && selection.row != 0;
-    state.down = isMovable && selection.row != selection.count - 1;
+    const bool isMovable = state.remove && selection.areSiblings && !selection.isByTime;
+    const int lastRow = selection.items == 1 ? selection.row : selection.lastRow;
+    // Several move unless they stand at the end already, side by side.
+    state.up = isMovable && lastRow != selection.items - 1;
+    state.down = isMovable && selection.row != selection.count - selection.items;
     return state;
 }

@@ -18,10 +18,15 @@
 
 void ItemTransfer::put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action)
 {
+    put(item.isValid() ? QStringList{files.filePath(item)} : QStringList(), action);
+}
+
+void ItemTransfer::put(const QStringList &paths, Qt::DropAction action)
+{
     QClipboard *clipboard = QGuiApplication::clipboard();
     clipboard->clear();
-    if (item.isValid())
-        clipboard->setMimeData(new MenuClipboard::ItemData(files.filePath(item), action));
+    if (!paths.isEmpty())
+        clipboard->setMimeData(new MenuClipboard::ItemData(paths, action));
 }
 
 namespace {

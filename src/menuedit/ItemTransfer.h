@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include <Qt>
+#include <QStringList>
 
 class ClipboardContents;
 class MenuVoice;
@@ -20,6 +20,9 @@ namespace ItemTransfer {
 /// Puts \a item on the clipboard, cut when \a action is Qt::MoveAction; empties the clipboard
 /// first, and leaves it so for an invalid item.
 void put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action);
+
+/// The same for the files at the \a paths.
+void put(const QStringList &paths, Qt::DropAction action);
 
 /**
  * Moves or copies what is on the clipboard into the folder \a item or to the place of the file

@@ -11,8 +11,11 @@
 #include <QAction>
 #include <QCoreApplication>
 #include <QFileInfo>
+#include <QHash>
 #include <QIcon>
 #include <QMenu>
+
+#include <algorithm>
 
 namespace {
 
@@ -66,7 +69,34 @@ QKeySequence keyOf(MenuActions::Action action)
     }
 }
 
-ActionState stateOf(const ShownMenu &menu, const QModelIndex &item, const ClipboardContents &clipboard)
+// A folder counts as what it holds.
+QString writtenFolderOf(const ShownMenu &menu, const QModelIndex &item)
+{
+    const QString path = menu.files().filePath(item);
+    return menu.files().isDir(item) ? path : path.left(path.lastIndexOf(QLatin1Char('/')));
+}
+
+// Of several rows, which may be thousands in a few folders.
+void lookAtAll(const ShownMenu &menu, const QModelIndexList &rows, ActionState::Selection *selection)
+{
+    const QModelIndex folder = rows.constFirst().parent();
+    QHash<QString, bool> writable;
+    selection->items = rows.size();
+    selection->row = rows.constFirst().row();
+    for (const QModelIndex &row : rows) {
+        selection->row = std::min(selection->row, row.row());
+        selection->lastRow = std::max(selection->lastRow, row.row());
+        selection->areSiblings = selection->areSiblings && row.parent() == folder;
+        const QString written = writtenFolderOf(menu, menu.proxy().mapToSource(row));
+        auto known = writable.find(written);
+        if (known == writable.end())
+            known = writable.insert(written, QFileInfo(written).isWritable());
+        selection->isAnyLocked = selection->isAnyLocked || !*known;
+    }
+}
+
+ActionState stateOf(const ShownMenu &menu, const QModelIndex &item, const QModelIndexList &rows,
+                    const ClipboardContents &clipboard)
 {
     ActionState::Selection selection;
     selection.any = item.isValid();
@@ -80,6 +110,8 @@ ActionState stateOf(const ShownMenu &menu, const QModelIndex &item, const Clipbo
         const QString folder = item.parent().data(QFileSystemModel::FileNameRole).toString();
         selection.isByTime = ItemOrder::ruleOf(folder) == ItemOrder::Rule::ByTime;
     }
+    if (rows.size() > 1)
+        lookAtAll(menu, rows, &selection);
     return ActionState::of(selection);
 }
 
@@ -132,13 +164,15 @@ void MenuActions::enable(Action which, bool isEnabled)
     m_actions.at(which)->setEnabled(isEnabled);
 }
 
-void MenuActions::update(const ShownMenu &menu, const QModelIndex &item)
+void MenuActions::update(const ShownMenu &menu, const QModelIndex &item, const QModelIndexList &rows)
 {
-    const ActionState state = stateOf(menu, item, m_clipboard);
+    const ActionState state = stateOf(menu, item, rows, m_clipboard);
     enable(NewFolder, state.create);
     enable(NewEntry, state.create);
-    for (const Action action : {Edit, Delete, Execute, Cut, Copy})
+    for (const Action action : {Edit, Execute})
         enable(action, state.edit);
+    for (const Action action : {Delete, Cut, Copy})
+        enable(action, state.remove);
     enable(Paste, state.paste);
     enable(Up, state.up);
     enable(Down, state.down);

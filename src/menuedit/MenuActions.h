@@ -7,13 +7,13 @@
 
 #include "ActionState.h"
 
+#include <QModelIndexList>
 #include <QVector>
 
 #include <memory>
 
 class QAction;
 class QMenu;
-class QModelIndex;
 class QWidget;
 class ShownMenu;
 
@@ -57,8 +57,9 @@ public:
     /// What of the clipboard Paste depends on.
     ClipboardContents &clipboard() { return m_clipboard; }
 
-    /// Enables what makes sense for \a item of the file model, or without one.
-    void update(const ShownMenu &menu, const QModelIndex &item);
+    /// Enables what makes sense for \a item of the file model, or without one, where the \a rows of
+    /// the sorting model are selected.
+    void update(const ShownMenu &menu, const QModelIndex &item, const QModelIndexList &rows);
 
 private:
     void add(QWidget *view, Action which);

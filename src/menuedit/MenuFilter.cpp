@@ -24,6 +24,21 @@ namespace {
 constexpr int FoldersAtOnce = 8;
 constexpr int Pause = 15; // milliseconds
 
+QSet<QString> foldersOf(const QStringList &paths)
+{
+    QSet<QString> folders;
+    for (const QString &path : paths) {
+        QString folder = path;
+        do {
+            folder.truncate(folder.lastIndexOf(QLatin1Char('/')));
+            if (folders.contains(folder))
+                break;
+            folders.insert(folder);
+        } while (!folder.isEmpty());
+    }
+    return folders;
+}
+
 } // namespace
 
 MenuFilter::MenuFilter(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuVoice &voice)
@@ -97,11 +112,11 @@ void MenuFilter::end()
     m_index->clear();
     m_menu.proxy().setFilter(std::nullopt);
     const QString selected = m_selection.path();
+    const QSet<QString> onTheWay = foldersOf(m_selection.paths());
     const QSet<QString> folders = LoadedFolders::in(m_menu.files());
-    for (const QString &path : folders) {
-        const bool isOnTheWay = selected.startsWith(path + QLatin1Char('/'));
-        m_view->setExpanded(m_selection.shown(path), isOnTheWay || m_openedBefore.contains(path));
-    }
+    for (const QString &path : folders)
+        m_view->setExpanded(m_selection.shown(path),
+                            onTheWay.contains(path) || m_openedBefore.contains(path));
     if (!selected.isEmpty())
         m_view->scrollTo(m_selection.shown(selected));
 }
@@ -128,13 +143,13 @@ void MenuFilter::apply(const FilteredRows &rows)
 {
     if (m_menu.proxy().isFiltered() && m_menu.proxy().filteredRows() == rows)
         return;
+    m_selection.deselect([&](const QModelIndex &index) {
+        return !rows.contains(m_menu.files().filePath(m_menu.proxy().mapToSource(index)));
+    });
     const QString selected = m_selection.path();
-    const bool isKept = rows.contains(selected);
-    if (!selected.isEmpty() && !isKept)
-        m_selection.clear();
     m_menu.proxy().setFilter(rows);
     openFolders();
-    if (isKept)
+    if (!selected.isEmpty())
         m_view->scrollTo(m_selection.shown(selected));
 }
 

@@ -152,7 +152,7 @@ bool MenuFind::showNext()
 
 bool MenuFind::show(const QString &path)
 {
-    m_menu.proxy().letThrough(path);
+    m_menu.proxy().letThrough({path});
     const QModelIndex match = OnDisk::exists(path) ? m_selection.shown(path) : QModelIndex();
     if (!match.isValid())
         return false;

@@ -20,10 +20,22 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QIcon>
-#include <QItemSelectionModel>
 #include <QPointer>
 #include <QShortcut>
 #include <QTreeView>
+
+#include <algorithm>
+
+namespace {
+
+QStringList goneOf(QStringList paths)
+{
+    const auto isThere = [](const QString &path) { return QFileInfo::exists(path); };
+    paths.erase(std::remove_if(paths.begin(), paths.end(), isThere), paths.end());
+    return paths;
+}
+
+} // namespace
 
 MenuHistory::MenuHistory(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
                          MenuVoice &voice)
@@ -211,11 +223,7 @@ void MenuHistory::show(const QStringList &items)
             there.append(item);
     }
     if (!there.isEmpty())
-        m_selection.show(there.takeFirst());
+        m_selection.show(there);
     else if (!selected.isEmpty() && !QFileInfo::exists(selected))
-        m_selection.leave(selected);
-    if (m_view->selectionMode() == QAbstractItemView::SingleSelection)
-        return;
-    for (const QString &item : qAsConst(there))
-        m_view->selectionModel()->select(m_selection.shown(item), QItemSelectionModel::Select);
+        m_selection.leave(goneOf(m_selection.paths()));
 }

@@ -3,10 +3,12 @@
 
 #include "MenuReordering.h"
 
+#include "BlockMove.h"
 #include "FolderOrder.h"
 #include "MenuVoice.h"
 #include "ShownMenu.h"
 #include "ShownOrder.h"
+#include "SortOrder.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 
@@ -23,6 +25,15 @@ int rowBelow(const ShownMenu &menu, const QModelIndex &shown, const QModelIndex 
                                                      : menu.files().rowCount(sourceFolder);
 }
 
+// Puts the names of the children of \a folder, as they are to be shown, on disk.
+void write(const ShownMenu &menu, MenuVoice &voice, const QString &folder, const QStringList &list)
+{
+    const bool isSaved = FolderOrder::write(folder, list);
+    menu.files().noteRecordFile(folder);
+    if (!isSaved)
+        voice.tell(FolderOrder::notSaved(folder), MenuVoice::Failure);
+}
+
 } // namespace
 
 bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row,
@@ -31,10 +42,7 @@ bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString
     const QString path = folder.isValid() ? menu.files().filePath(folder) : QString();
     if (path.isEmpty())
         return false;
-    const bool isSaved = FolderOrder::write(path, ShownOrder::with(menu.proxy(), name, row, folder));
-    menu.files().noteRecordFile(path);
-    if (!isSaved)
-        voice.tell(FolderOrder::notSaved(path), MenuVoice::Failure);
+    write(menu, voice, path, ShownOrder::with(menu.proxy(), name, row, folder));
     return true;
 }
 
@@ -53,4 +61,28 @@ void MenuReordering::move(const ShownMenu &menu, MenuVoice &voice, const QModelI
         row = menu.proxy().mapToSource(menu.proxy().index(std::max(target, 0), 0, folder)).row();
     list(menu, voice, item.data(QFileSystemModel::FileNameRole).toString(), row, sourceFolder);
     menu.proxy().invalidateSortOrder(menu.files().filePath(sourceFolder));
+}
+
+void MenuReordering::moveAll(const ShownMenu &menu, MenuVoice &voice, const QModelIndexList &items, bool up)
+{
+    const QModelIndex folder = items.isEmpty() ? QModelIndex() : items.constFirst().parent();
+    if (!folder.isValid())
+        return;
+    const auto nameOf = [](const QModelIndex &index) {
+        return index.data(QFileSystemModel::FileNameRole).toString();
+    };
+    QSet<QString> moved;
+    for (const QModelIndex &item : items)
+        moved.insert(nameOf(item));
+    QStringList shown;
+    const QModelIndex shownFolder = menu.proxy().mapFromSource(folder);
+    for (int row = 0; row < menu.proxy().rowCount(shownFolder); ++row)
+        shown.append(nameOf(menu.proxy().index(row, 0, shownFolder)));
+    const QStringList all = ShownOrder::of(menu.proxy(), folder);
+    const QStringList order = BlockMove::byOne(all, shown, moved, up);
+    if (order == all)
+        return;
+    const QString path = menu.files().filePath(folder);
+    write(menu, voice, path, SortOrder::rewritten(order, QString(), -1));
+    menu.proxy().invalidateSortOrder(path);
 }

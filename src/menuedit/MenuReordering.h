@@ -3,8 +3,9 @@
 
 #pragma once
 
+#include <QModelIndexList>
+
 class MenuVoice;
-class QModelIndex;
 class QString;
 class ShownMenu;
 
@@ -19,5 +20,8 @@ bool list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row,
 
 /// Moves \a item by one place up or down, and shows the new order.
 void move(const ShownMenu &menu, MenuVoice &voice, const QModelIndex &item, bool up);
+
+/// The same for several \a items of one folder; see BlockMove::byOne().
+void moveAll(const ShownMenu &menu, MenuVoice &voice, const QModelIndexList &items, bool up);
 
 } // namespace MenuReordering

@@ -5,6 +5,7 @@
 
 #include "NeighborRow.h"
 #include "ShownMenu.h"
+#include "TreeOrder.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 
@@ -12,6 +13,8 @@
 #include <QItemSelectionModel>
 #include <QTimer>
 #include <QTreeView>
+
+#include <algorithm>
 
 MenuSelection::MenuSelection(QTreeView *view, const ShownMenu &menu)
     : m_view(view)
@@ -25,9 +28,33 @@ MenuSelection::~MenuSelection() = default;
 
 QModelIndex MenuSelection::item() const
 {
+    const QModelIndexList selected = all();
+    if (selected.isEmpty())
+        return {};
+    const QModelIndex current = m_view->currentIndex();
+    const bool isSelected = m_view->selectionModel()->isSelected(current);
+    return m_menu.proxy().mapToSource(isSelected                ? current
+                                          : selected.size() > 1 ? TreeOrder::fromTop(selected).constFirst()
+                                                                : selected.constFirst());
+}
+
+QModelIndexList MenuSelection::all() const
+{
     const QItemSelectionModel *selection = m_view->selectionModel();
-    const QModelIndexList selected = selection ? selection->selectedIndexes() : QModelIndexList();
-    return selected.isEmpty() ? QModelIndex() : m_menu.proxy().mapToSource(selected.constFirst());
+    return selection ? selection->selectedIndexes() : QModelIndexList();
+}
+
+bool MenuSelection::isSeveral() const
+{
+    return all().size() > 1;
+}
+
+QStringList MenuSelection::paths() const
+{
+    QStringList paths;
+    for (const QModelIndex &index : TreeOrder::outermost(all()))
+        paths.append(pathOf(index));
+    return paths;
 }
 
 QString MenuSelection::path() const
@@ -47,8 +74,15 @@ QModelIndex MenuSelection::shown(const QString &path) const
     return {};
 }
 
+QString MenuSelection::pathOf(const QModelIndex &shown) const
+{
+    return m_menu.files().filePath(m_menu.proxy().mapToSource(shown));
+}
+
 void MenuSelection::clear()
 {
+    m_awaited.clear();
+    m_came.clear();
     m_view->selectionModel()->clearSelection();
 }
 
@@ -61,7 +95,7 @@ void MenuSelection::select(const QModelIndex &index)
 void MenuSelection::show(const QString &path)
 {
     clear();
-    m_menu.proxy().letThrough(path);
+    m_menu.proxy().letThrough({path});
     const QModelIndex index = shown(path);
     if (!index.isValid())
         return;
@@ -80,47 +114,182 @@ void MenuSelection::reveal(const QString &path)
     });
 }
 
-// The row goes a moment later; were it the current one then, its neighbor would be selected.
+QModelIndex MenuSelection::shownFolder(const QString &path) const
+{
+    return path == pathOf(m_view->rootIndex()) ? m_view->rootIndex() : shown(path);
+}
+
+// With those that it lies in: what is selected has to be seen.
+void MenuSelection::openFolder(const QModelIndex &folder)
+{
+    for (QModelIndex index = folder; index.isValid() && index != m_view->rootIndex(); index = index.parent())
+        m_view->expand(index);
+}
+
+// Thousands are looked for among the rows that there are: asking for one by its path would make it.
+void MenuSelection::show(const QStringList &paths)
+{
+    m_menu.proxy().letThrough(paths);
+    show(paths.value(0));
+    if (paths.size() < 2 || m_view->selectionMode() == QAbstractItemView::SingleSelection)
+        return;
+    QSet<QString> wanted(paths.begin() + 1, paths.end());
+    QSet<QString> folders;
+    for (const QString &path : qAsConst(wanted))
+        folders.insert(path.left(path.lastIndexOf(QLatin1Char('/'))));
+    QModelIndexList rows;
+    for (const QString &path : qAsConst(folders)) {
+        const QModelIndex folder = shownFolder(path);
+        openFolder(folder);
+        for (int row = 0; folder.isValid() && row < m_menu.proxy().rowCount(folder); ++row) {
+            const QModelIndex child = m_menu.proxy().index(row, 0, folder);
+            if (wanted.remove(pathOf(child)))
+                rows.append(child);
+        }
+    }
+    add(rows);
+    m_awaited = wanted;
+}
+
+void MenuSelection::add(const QModelIndexList &rows)
+{
+    QItemSelection selection;
+    for (const QModelIndex &row : TreeOrder::fromTop(rows)) {
+        const QModelIndex above =
+            selection.isEmpty() ? QModelIndex() : QModelIndex(selection.constLast().bottomRight());
+        if (above.isValid() && above.parent() == row.parent() && above.row() + 1 == row.row())
+            selection.last() = QItemSelectionRange(selection.constLast().topLeft(), row);
+        else
+            selection.append(QItemSelectionRange(row));
+    }
+    m_isSelecting = true;
+    m_view->selectionModel()->select(selection, QItemSelectionModel::Select);
+    m_isSelecting = false;
+}
+
+void MenuSelection::deselect(const std::function<bool(const QModelIndex &)> &isToGo)
+{
+    QItemSelection going;
+    const QModelIndexList selected = all();
+    for (const QModelIndex &index : selected) {
+        if (isToGo(index))
+            going.append(QItemSelectionRange(index));
+    }
+    if (going.size() == selected.size())
+        clear();
+    else if (!going.isEmpty())
+        m_view->selectionModel()->select(going, QItemSelectionModel::Deselect);
+}
+
 void MenuSelection::leave(const QString &path)
 {
-    const QModelIndex index = shown(path);
+    leave(QStringList{path});
+}
+
+// The rows go a moment later; were one the current one then, its neighbor would be selected.
+void MenuSelection::leave(const QStringList &paths)
+{
+    m_awaited.clear();
+    m_came.clear();
+    const QSet<QString> going(paths.begin(), paths.end());
+    const QModelIndex current = m_view->currentIndex();
+    QModelIndex start = goingOne(current, going);
+    const bool isKept = !start.isValid() && current.isValid() && paths.size() > 1;
+    if (!start.isValid() && !isKept)
+        start = shown(paths.value(0));
+    deselect([&](const QModelIndex &index) { return goingOne(index, going).isValid(); });
+    if (start.isValid())
+        m_view->selectionModel()->setCurrentIndex(neighborOf(start, going), QItemSelectionModel::NoUpdate);
+}
+
+// What of the paths \a index is, or lies in; invalid for none.
+QModelIndex MenuSelection::goingOne(const QModelIndex &index, const QSet<QString> &going) const
+{
+    QModelIndex place = index;
+    while (place.isValid() && !going.contains(pathOf(place)))
+        place = place.parent();
+    return place;
+}
+
+// Where all in a folder go, the folder stays.
+QModelIndex MenuSelection::neighborOf(const QModelIndex &index, const QSet<QString> &going) const
+{
+    const auto goes = [&](int row) {
+        const QModelIndex sibling = m_menu.proxy().index(row, 0, index.parent());
+        return sibling.isValid() && going.contains(pathOf(sibling));
+    };
+    int first = index.row();
+    int last = index.row();
+    while (goes(first - 1))
+        --first;
+    while (goes(last + 1))
+        ++last;
     const QModelIndex folder = index.parent() == m_view->rootIndex() ? QModelIndex() : index.parent();
-    const QModelIndex next = index.isValid()
-        ? NeighborRow::whenGone(m_menu.proxy(), index.parent(), index.row(), index.row(), folder)
-        : QModelIndex();
-    clear();
-    m_view->selectionModel()->setCurrentIndex(next, QItemSelectionModel::NoUpdate);
+    return NeighborRow::whenGone(m_menu.proxy(), index.parent(), first, last, folder);
+}
+
+// A listing that is older than the items takes their rows away for a moment.
+void MenuSelection::awaitGoing(const QModelIndex &parent, int first, int last)
+{
+    const QItemSelection selection = m_view->selectionModel()->selection();
+    for (const QItemSelectionRange &range : selection) {
+        if (range.parent() != parent)
+            continue;
+        for (int row = std::max(first, range.top()); row <= std::min(last, range.bottom()); ++row) {
+            const QString path = pathOf(m_menu.proxy().index(row, 0, parent));
+            if (QFileInfo::exists(path))
+                m_awaited.insert(path);
+        }
+    }
 }
 
 // Keeps the view from selecting a neighbor of the row that goes.
 void MenuSelection::leaveRows(const QModelIndex &parent, int first, int last)
 {
+    awaitGoing(parent, first, last);
     const QModelIndex current = m_view->currentIndex();
     if (!current.isValid() || current.parent() != parent || current.row() < first || current.row() > last)
         return;
-    // A listing that is older than the item takes its row away for a moment.
-    const QString selected = path();
-    if (!selected.isEmpty() && QFileInfo::exists(selected))
-        m_awaited = selected;
     const QModelIndex next = NeighborRow::whenGone(m_menu.proxy(), parent, first, last, QModelIndex());
     m_view->selectionModel()->setCurrentIndex(next, QItemSelectionModel::NoUpdate);
 }
 
-// Not at once: looking for the item may bring in further rows.
-void MenuSelection::awaitRows()
+// Not at once: the view has not heard of the rows yet.
+void MenuSelection::awaitRows(const QModelIndex &parent, int first, int last)
 {
-    if (!m_awaited.isEmpty())
+    if (m_awaited.isEmpty())
+        return;
+    const bool isWaiting = !m_came.isEmpty();
+    for (int row = first; row <= last; ++row) {
+        const QModelIndex index = m_menu.proxy().index(row, 0, parent);
+        if (m_awaited.remove(pathOf(index)))
+            m_came.append(index);
+    }
+    if (!isWaiting && !m_came.isEmpty())
         QTimer::singleShot(0, this, &MenuSelection::selectAwaited);
 }
 
 void MenuSelection::selectAwaited()
 {
-    if (m_awaited.isEmpty())
-        return;
-    const QModelIndex index = QFileInfo::exists(m_awaited) ? shown(m_awaited) : QModelIndex();
-    if (index.isValid() && !m_view->selectionModel()->hasSelection()) {
-        select(index);
-        m_view->scrollTo(index);
+    QModelIndexList rows;
+    for (const QPersistentModelIndex &row : qAsConst(m_came)) {
+        if (row.isValid() && QFileInfo::exists(pathOf(row)))
+            rows.append(row);
     }
+    m_came.clear();
+    if (rows.isEmpty())
+        return;
+    if (!m_view->selectionModel()->hasSelection()) {
+        m_view->selectionModel()->setCurrentIndex(rows.constFirst(), QItemSelectionModel::NoUpdate);
+        m_view->scrollTo(rows.constFirst());
+    }
+    add(rows);
+}
+
+void MenuSelection::noteSelected(const QItemSelection &selected)
+{
+    if (m_isSelecting || selected.isEmpty())
+        return;
     m_awaited.clear();
+    m_came.clear();
 }

@@ -27,6 +27,12 @@ QVector<QModelIndex> childrenOf(const QSortFilterProxyModel &proxy, const QModel
 
 } // namespace
 
+QStringList ShownOrder::of(const QSortFilterProxyModel &proxy, const QModelIndex &folder)
+{
+    // With none in a place of its own; the first in the list stands for children that come later.
+    return with(proxy, QString(), -1, folder).mid(1);
+}
+
 QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QString &name, int row,
                              const QModelIndex &folder)
 {

@@ -14,6 +14,10 @@ class QSortFilterProxyModel;
  */
 namespace ShownOrder {
 
+/// The file names of the children of \a folder of the file model under \a proxy, in the order shown.
+/// Children that are gone are left out; those that only a filter leaves out are not.
+QStringList of(const QSortFilterProxyModel &proxy, const QModelIndex &folder);
+
 /**
  * The list that keeps the children of a folder in the order shown, with one of them, or a new
  * one, in a place of its own; see SortOrder::rewritten(). Children that are gone are left out;

@@ -31,6 +31,9 @@ constexpr Texts AllTexts[] = {
     {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo deletion of %n items"),
      QT_TRANSLATE_N_NOOP("MenuHistory", "Redo deletion of %n items"),
      QT_TRANSLATE_N_NOOP("MenuHistory", "%n items were deleted.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo deletion of %1 items (%n entries)"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo deletion of %1 items (%n entries)"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%1 items were deleted (%n entries).")},
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo moving of %1 to %2"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo moving of %1 to %2"),
      QT_TRANSLATE_NOOP("MenuHistory", "%1 was moved to %2.")},
@@ -46,18 +49,32 @@ constexpr Texts AllTexts[] = {
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo reordering of %1"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo reordering of %1"),
      QT_TRANSLATE_NOOP("MenuHistory", "%1 has another place.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo reordering of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo reordering of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%n items have other places.")},
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo default menu"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo default menu"),
      QT_TRANSLATE_NOOP("MenuHistory", "The default menu was built.")},
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo hiding of %1"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo hiding of %1"),
      QT_TRANSLATE_NOOP("MenuHistory", "%1 is hidden: the menu no longer shows it.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo hiding of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo hiding of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%n items are hidden: the menu no longer shows them.")},
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo showing %1 again"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo showing %1 again"),
      QT_TRANSLATE_NOOP("MenuHistory", "The menu shows %1 again.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo showing %n items again"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo showing %n items again"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "The menu shows %n items again.")},
 };
 
 // English has no catalog that would know the form for one.
+constexpr Texts FoldersOfOne = {
+    QT_TRANSLATE_NOOP("MenuHistory", "Undo deletion of %1 items (1 entry)"),
+    QT_TRANSLATE_NOOP("MenuHistory", "Redo deletion of %1 items (1 entry)"),
+    QT_TRANSLATE_NOOP("MenuHistory", "%1 items were deleted (1 entry)."),
+};
 constexpr Texts FolderOfOne = {
     QT_TRANSLATE_NOOP("MenuHistory", "Undo deletion of folder %1 (1 entry)"),
     QT_TRANSLATE_NOOP("MenuHistory", "Redo deletion of folder %1 (1 entry)"),
@@ -66,7 +83,10 @@ constexpr Texts FolderOfOne = {
 
 const Texts &textsOf(StepText::Kind kind, int count)
 {
-    return kind == StepText::Kind::DeleteFolder && count == 1 ? FolderOfOne : AllTexts[int(kind)];
+    const bool isOne = count == 1;
+    return isOne && kind == StepText::Kind::DeleteFolder ? FolderOfOne
+        : isOne && kind == StepText::Kind::DeleteFolders ? FoldersOfOne
+                                                         : AllTexts[int(kind)];
 }
 
 } // namespace

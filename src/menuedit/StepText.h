@@ -17,14 +17,18 @@ public:
         Delete, ///< the item
         DeleteFolder, ///< the item, with so many entries
         DeleteItems, ///< so many
+        DeleteFolders, ///< so many, which the item says as a number, with so many entries
         Move, ///< the item into the folder
         MoveItems, ///< so many into the folder
         Copy, ///< the item into the folder
         CopyItems, ///< so many into the folder
         Reorder, ///< the item
+        ReorderItems, ///< so many
         Rebuild, ///< the default menu
         Hide, ///< the item
+        HideItems, ///< so many
         ShowAgain, ///< the item
+        ShowItemsAgain, ///< so many
     };
 
     /// \a item and \a folder are shown names.

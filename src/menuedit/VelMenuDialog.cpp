@@ -224,8 +224,7 @@ QString VelMenuDialog::selectedItemPath() const
 {
     if (!d->view || !d->view->selectionModel() || !d->view->model())
         return {};
-    const QModelIndexList selected = d->view->selectionModel()->selectedIndexes();
-    return selected.isEmpty() ? QString() : d->pathOf(selected.constFirst());
+    return d->view->selectedPath();
 }
 
 QString VelMenuDialog::selectedItemExec(const QString &filePath, const QString &url,
@@ -269,7 +268,13 @@ void VelMenuDialog::selChanged(QItemSelection selected, QItemSelection)
     QPushButton *ok = d->button(QDialogButtonBox::Ok);
     if (!ok)
         return;
-    const QModelIndexList indexes = selected.indexes();
+    QModelIndexList indexes = selected.indexes();
+    // One item can be picked. Of several, the change alone does not tell which are selected now.
+    if (assistance()) {
+        indexes = d->view->selectionModel()->selectedIndexes();
+        if (indexes.size() > 1)
+            indexes.clear();
+    }
     ok->setEnabled(!indexes.isEmpty()
                    && (d->anyItemSelectable || EntryPath::isEntry(d->pathOf(indexes.constFirst()))));
 }

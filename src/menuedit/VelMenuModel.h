@@ -7,6 +7,7 @@
 
 #include <QFileSystemModel>
 #include <QPointer>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -59,7 +60,7 @@ public:
     void setAssisted(bool isAssisted) { m_isAssisted = isAssisted; }
 
     /// The items at \a paths are to be dimmed, and no others. Who says so has the rows painted anew.
-    void setCut(const QStringList &paths) { m_cut = paths; }
+    void setCut(const QStringList &paths) { m_cut = QSet<QString>(paths.begin(), paths.end()); }
 
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);
@@ -107,7 +108,7 @@ private:
     QPointer<MenuIconProvider> m_icons;
     // The paths of the rows that are about to go.
     QStringList m_going;
-    QStringList m_cut;
+    QSet<QString> m_cut;
     bool m_isAssisted = false;
     bool m_isCompleting = false;
     bool m_keepsOrder = true;

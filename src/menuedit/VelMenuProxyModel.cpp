@@ -154,12 +154,17 @@ bool VelMenuProxyModel::isLeftOut(const QModelIndex &index) const
     return !m_isHiddenShown && index.data(VelMenuModel::HiddenRole).toBool();
 }
 
-void VelMenuProxyModel::letThrough(const QString &path)
+void VelMenuProxyModel::letThrough(const QStringList &paths)
 {
-    if (!m_filter || !m_files || m_filter->contains(path))
-        return;
-    m_filter->add(m_root, path, QFileInfo(path).isDir());
-    invalidate();
+    bool isMore = false;
+    for (const QString &path : paths) {
+        if (!m_filter || !m_files || m_filter->contains(path))
+            continue;
+        m_filter->add(m_root, path, QFileInfo(path).isDir());
+        isMore = true;
+    }
+    if (isMore)
+        invalidate();
 }
 
 // In the way in which the base class sorts.

@@ -54,8 +54,8 @@ public:
     bool isFiltered() const { return m_filter.has_value(); }
     /// What a filter lets through; to be asked while there is one.
     const FilteredRows &filteredRows() const { return *m_filter; }
-    /// Shows the file at \a path, too, if a filter leaves it out.
-    void letThrough(const QString &path);
+    /// Shows the files at the \a paths, too, where a filter leaves them out.
+    void letThrough(const QStringList &paths);
     /// All children of a \a folder of the source model in the order of the menu, as they were shown
     /// if there were no filter.
     QVector<QModelIndex> allInOrder(const QModelIndex &folder) const;

@@ -93,13 +93,13 @@ void VelMenuView::showAndSelect(const QString &path)
 
 void VelMenuView::selectionChangedSlot()
 {
-    Q_EMIT selectionChanged(selectedPath());
+    d->tellSelection();
 }
 
 void VelMenuView::setActionsEnabled()
 {
     if (d->actions)
-        d->actions->update(d->menu, selectedItem());
+        d->actions->update(d->menu, selectedItem(), d->selectedRows());
 }
 
 void VelMenuView::contextMenuEvent(QContextMenuEvent *event)
@@ -168,7 +168,7 @@ void VelMenuView::slotFileNew()
 
 bool VelMenuView::slotEdit()
 {
-    return d->editing.edit(selectedPath());
+    return !d->hasSeveral() && d->editing.edit(selectedPath());
 }
 
 void VelMenuView::slotDel()
@@ -193,12 +193,12 @@ void VelMenuView::invalidateSortOrder(const QModelIndex &sourceIndex)
 
 void VelMenuView::slotUp()
 {
-    d->moveSelected(true);
+    d->moving.move(true);
 }
 
 void VelMenuView::slotDown()
 {
-    d->moveSelected(false);
+    d->moving.move(false);
 }
 
 void VelMenuView::FillClipboard(QModelIndex item, Qt::DropAction action)
@@ -208,16 +208,12 @@ void VelMenuView::FillClipboard(QModelIndex item, Qt::DropAction action)
 
 void VelMenuView::slotCut()
 {
-    if (selectedItem().isValid())
-        FillClipboard(selectedItem(), Qt::MoveAction);
-    setActionsEnabled();
+    d->putSelected(Qt::MoveAction);
 }
 
 void VelMenuView::slotCopy()
 {
-    if (selectedItem().isValid())
-        FillClipboard(selectedItem(), Qt::CopyAction);
-    setActionsEnabled();
+    d->putSelected(Qt::CopyAction);
 }
 
 void VelMenuView::slotPaste()
@@ -277,7 +273,7 @@ void VelMenuView::dropEvent(QDropEvent *event)
 void VelMenuView::slotExe()
 {
     const QString path = selectedPath();
-    if (path.isEmpty())
+    if (path.isEmpty() || d->hasSeveral())
         return;
     if (d->isAssisted)
         d->execute(path);

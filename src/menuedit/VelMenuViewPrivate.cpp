@@ -5,7 +5,7 @@
 
 #include "EntryExecution.h"
 #include "ItemKey.h"
-#include "MenuReordering.h"
+#include "ItemTransfer.h"
 #include "RebuildRecord.h"
 #include "StartMenu.h"
 #include "StepRecorder.h"
@@ -29,10 +29,12 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , voice(view, [view] { return view->isSignalConnected(QMetaMethod::fromSignal(&VelMenuView::told)); })
     , menu(directory.isEmpty() ? StartMenu::directory() : directory, isEditable, view, view)
     , selection(view, menu)
+    , severalRows(view, selection)
     , find(view, menu, selection, voice)
     , filter(view, menu, selection, voice)
     , history(view, menu, selection, find, voice)
     , hiding(menu, selection, find, voice, history)
+    , moving(menu, selection, find, voice, history)
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
     , reloading(view, menu, selection, [this] { showAnew(); })
@@ -52,6 +54,11 @@ VelMenuViewPrivate::~VelMenuViewPrivate()
 MenuVoice &VelMenuViewPrivate::voiceOf(const VelMenuView &view)
 {
     return view.d->voice;
+}
+
+MenuSelection &VelMenuViewPrivate::selectionOf(const VelMenuView &view)
+{
+    return view.d->selection;
 }
 
 MenuHistory &VelMenuViewPrivate::historyOf(const VelMenuView &view)
@@ -95,13 +102,31 @@ void VelMenuViewPrivate::show()
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::setActionsEnabled);
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::changed);
     QObject::connect(&history, &MenuHistory::replaced, q, [this] { showAnew(); });
+    QObject::connect(&moving, &MenuMoving::changed, q, &VelMenuView::setActionsEnabled);
+    QObject::connect(&moving, &MenuMoving::changed, q, &VelMenuView::changed);
     QObject::connect(&hiding, &MenuHiding::changed, q, &VelMenuView::changed);
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
     QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
-    QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
-                     &VelMenuView::setActionsEnabled);
-    QObject::connect(q->selectionModel(), &QItemSelectionModel::selectionChanged, q,
-                     &VelMenuView::selectionChangedSlot);
+    connectSelection();
+}
+
+// Of several selected items the keyboard chooses one, which no change of the selection tells.
+void VelMenuViewPrivate::connectSelection()
+{
+    const QItemSelectionModel *model = q->selectionModel();
+    QObject::connect(model, &QItemSelectionModel::selectionChanged, q, &VelMenuView::setActionsEnabled);
+    QObject::connect(model, &QItemSelectionModel::selectionChanged, q, &VelMenuView::selectionChangedSlot);
+    QObject::connect(model, &QItemSelectionModel::selectionChanged, &selection, &MenuSelection::noteSelected);
+    QObject::connect(model, &QItemSelectionModel::currentChanged, &m_refresh, [this] {
+        if (severalRows.isOn())
+            m_refresh.start(0);
+    });
+}
+
+void VelMenuViewPrivate::tellSelection()
+{
+    m_told = selection.path();
+    Q_EMIT q->selectionChanged(m_told);
 }
 
 void VelMenuViewPrivate::showAnew()
@@ -115,23 +140,13 @@ void VelMenuViewPrivate::showAnew()
     q->setActionsEnabled();
 }
 
-void VelMenuViewPrivate::moveSelected(bool up)
+void VelMenuViewPrivate::putSelected(Qt::DropAction action)
 {
-    const QModelIndex item = selection.item();
-    if (!item.isValid())
-        return;
-    const QString path = selection.path();
-    const std::unique_ptr<StepRecorder> recorder = history.record();
-    if (recorder)
-        recorder->mayWrite(EntryPath::recordFileOf(QFileInfo(path).path()));
-    MenuReordering::move(menu, voice, item, up);
-    selection.reveal(path);
-    find.clear();
+    if (hasSeveral())
+        ItemTransfer::put(selection.paths(), action);
+    else if (selection.item().isValid())
+        q->FillClipboard(selection.item(), action);
     q->setActionsEnabled();
-    const QPointer<VelMenuView> view(q);
-    Q_EMIT q->changed();
-    if (view)
-        history.add(recorder, StepText(StepText::Kind::Reorder, history.nameOf(path)), {path});
 }
 
 void VelMenuViewPrivate::removeSelected()
@@ -140,11 +155,7 @@ void VelMenuViewPrivate::removeSelected()
         editing.remove(selection.path());
         return;
     }
-    QStringList paths;
-    const QModelIndexList selected = q->selectionModel()->selectedIndexes();
-    for (const QModelIndex &index : selected)
-        paths.append(menu.files().filePath(menu.proxy().mapToSource(index)));
-    deletion.remove(paths);
+    deletion.remove(selection.paths());
 }
 
 // By then, the view may show another menu.
@@ -202,7 +213,7 @@ bool VelMenuViewPrivate::isKeyToMove(const QKeyEvent &event) const
 
 void VelMenuViewPrivate::editCurrent()
 {
-    if (!q->selectionModel()->isSelected(q->currentIndex()))
+    if (selection.isSeveral() || !q->selectionModel()->isSelected(q->currentIndex()))
         selection.select(q->currentIndex());
     if (actions->action(MenuActions::Edit)->isEnabled()) {
         q->slotEdit();
@@ -221,6 +232,7 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
     editing.setAssisted(assisted);
     cutMark.setOn(assisted);
     dragOpening.setOn(assisted);
+    severalRows.setOn(assisted && actions);
     emptyLabel = assisted && actions ? std::make_unique<EmptyMenuLabel>(q, menu) : nullptr;
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
@@ -236,9 +248,9 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
 // What is no longer shown may not stay selected.
 void VelMenuViewPrivate::setHiddenShown(bool isShown)
 {
-    const QModelIndex selected = selection.item();
-    if (!isShown && selected.data(VelMenuModel::HiddenRole).toBool())
-        selection.clear();
+    if (!isShown)
+        selection.deselect(
+            [](const QModelIndex &index) { return index.data(VelMenuModel::HiddenRole).toBool(); });
     find.clear();
     menu.proxy().setHiddenShown(isShown);
     const QPointer<VelMenuView> view(q);
@@ -283,7 +295,11 @@ void VelMenuViewPrivate::connectActions()
 void VelMenuViewPrivate::connectRows()
 {
     m_refresh.setSingleShot(true);
-    QObject::connect(&m_refresh, &QTimer::timeout, q, &VelMenuView::setActionsEnabled);
+    QObject::connect(&m_refresh, &QTimer::timeout, q, [this] {
+        q->setActionsEnabled();
+        if (severalRows.isOn() && selection.path() != m_told)
+            tellSelection();
+    });
     const auto refresh = [this] { m_refresh.start(0); };
     const VelMenuProxyModel *rows = &menu.proxy();
     QObject::connect(rows, &QAbstractItemModel::rowsInserted, &m_refresh, refresh);

@@ -13,10 +13,12 @@
 #include "MenuFind.h"
 #include "MenuHiding.h"
 #include "MenuHistory.h"
+#include "MenuMoving.h"
 #include "MenuReload.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
 #include "RootWatch.h"
+#include "SeveralRows.h"
 #include "ShownMenu.h"
 
 #include <QTimer>
@@ -43,6 +45,8 @@ public:
 
     /// How the parts of \a view tell the user.
     static MenuVoice &voiceOf(const VelMenuView &view);
+    /// What is selected in \a view.
+    static MenuSelection &selectionOf(const VelMenuView &view);
     /// What was done to the menu of \a view.
     static MenuHistory &historyOf(const VelMenuView &view);
 
@@ -52,10 +56,12 @@ public:
     MenuVoice voice;
     ShownMenu menu;
     MenuSelection selection;
+    SeveralRows severalRows;
     MenuFind find;
     MenuFilter filter;
     MenuHistory history;
     MenuHiding hiding;
+    MenuMoving moving;
     MenuEditing editing;
     MenuDeletion deletion;
     MenuReload reloading;
@@ -74,7 +80,14 @@ public:
     void show();
     /// Shows the menu directory after it was replaced.
     void showAnew();
-    void moveSelected(bool up);
+    /// Whether the user has selected several items, of which none can be edited or run.
+    bool hasSeveral() const { return severalRows.isOn() && selection.isSeveral(); }
+    /// All rows that the user has selected, where that may be several.
+    QModelIndexList selectedRows() const { return severalRows.isOn() ? selection.all() : QModelIndexList(); }
+    /// Puts the selected items on the clipboard.
+    void putSelected(Qt::DropAction action);
+    /// Tells what is selected now.
+    void tellSelection();
     /// Deletes the selected items.
     void removeSelected();
     /// Runs the entry at \a path, and tells why it does not start.
@@ -90,6 +103,7 @@ public:
 
 private:
     void setAssistedTree(bool assisted);
+    void connectSelection();
     void editCurrent();
     void makeEditable();
     void connectActions();
@@ -101,4 +115,6 @@ private:
     RootWatch m_rootWatch;
     // Rows come in many signals; the actions are looked at once afterwards.
     QTimer m_refresh;
+    // The path that was told as selected last.
+    QString m_told;
 };

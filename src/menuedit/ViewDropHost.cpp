@@ -98,7 +98,7 @@ private:
         if (result.sortAnew)
             m_view->invalidateSortOrder(result.folder);
         forgetOrders(result.targets);
-        m_view->showAndSelect(result.targets.constFirst());
+        VelMenuViewPrivate::selectionOf(*m_view).show(result.targets);
         m_view->setActionsEnabled();
     }
 
