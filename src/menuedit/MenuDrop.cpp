@@ -6,7 +6,10 @@
 #include "FileProgress.h"
 #include "FolderOrder.h"
 #include "FolderWatch.h"
+#include "KeptThing.h"
 #include "OnDisk.h"
+#include "Refusal.h"
+#include "ReplacedThings.h"
 
 #include <QDir>
 #include <QFile>
@@ -46,6 +49,28 @@ FileTransfer::Action transferAction(Qt::DropAction action)
     return action == Qt::MoveAction ? FileTransfer::Action::Move : FileTransfer::Action::Copy;
 }
 
+/// The row that is meant, whatever comes and goes.
+class MeantRow
+{
+public:
+    MeantRow(const QFileSystemModel &model, int row, const QModelIndex &folder)
+        : m_row(row)
+        , m_isLast(row == model.rowCount(folder))
+        , m_following(row >= 0 && !m_isLast ? model.index(row, 0, folder) : QModelIndex())
+    {
+    }
+
+    int in(const QFileSystemModel &model, const QModelIndex &folder) const
+    {
+        return m_row == -1 ? -1 : m_isLast ? model.rowCount(folder) : m_following.row();
+    }
+
+private:
+    const int m_row;
+    const bool m_isLast;
+    const QPersistentModelIndex m_following;
+};
+
 } // namespace
 
 MenuDrop::MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &host, const Request &request)
@@ -54,111 +79,198 @@ MenuDrop::MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &ho
     , m_host(host)
     , m_request(request)
     , m_folder(model.filePath(request.folder))
+    , m_targets(m_folder, request.sources)
+    , m_items(m_targets.plain())
 {
-    for (const QString &source : request.sources)
-        m_targets.append(QDir(m_folder).filePath(QFileInfo(source).fileName()));
 }
 
 DropResult MenuDrop::carryOut()
 {
-    const QStringList &sources = m_request.sources;
-    if (std::all_of(sources.begin(), sources.end(), [this](const QString &source) { return isHere(source); }))
+    if (areAllHere())
         return reorder();
     if (m_model.isReadOnly())
         return {};
-    if (!isHere(sources.constFirst()) && QFileInfo::exists(m_targets.constFirst()) && !confirm())
+    if (m_request.isAssisted) {
+        // Nobody is asked about what cannot be done whatever the answer.
+        m_items = m_targets.besides();
+        const FileTransfer::Result possible = check();
+        if (!possible.succeeded())
+            return refused(possible);
+    }
+    if (!settle() || m_items.isEmpty())
         return {};
-    return bringIn();
+    return areAllHere() ? reorder() : bringIn();
 }
 
-bool MenuDrop::isHere(const QString &source) const
+bool MenuDrop::areAllHere() const
 {
-    return !source.isEmpty() && FileTransfer::liesIn(source, m_folder);
+    return std::all_of(m_items.begin(), m_items.end(), [](const DropItem &item) { return item.isHere; });
+}
+
+// Has the user asked where names are taken, and keeps the place that was meant when rows come and go.
+bool MenuDrop::settle()
+{
+    const MeantRow row(m_model, m_request.row, m_request.folder);
+    if (!(m_request.isAssisted ? settleAll() : settleFirst()))
+        return false;
+    m_request.row = row.in(m_model, m_request.folder);
+    return true;
+}
+
+bool MenuDrop::settleFirst()
+{
+    const DropItem &first = m_items.constFirst();
+    if (first.isHere || !QFileInfo::exists(first.target))
+        return true;
+    const QPointer<QFileSystemModel> model(&m_model);
+    return m_host.confirmOverwrite(first.target) && model && m_request.folder.isValid();
+}
+
+bool MenuDrop::settleAll()
+{
+    const QPointer<QFileSystemModel> model(&m_model);
+    const std::optional<QVector<DropItem>> items = m_targets.settled([&](const NameClash &clash) {
+        const NameClash::Answer answer = m_host.askAbout(clash);
+        return model && m_request.folder.isValid() ? answer : NameClash::Answer();
+    });
+    m_items = items.value_or(QVector<DropItem>());
+    return items.has_value();
 }
 
 // What lies in the folder already only takes another place in its order. Where there is more that
-// does not, the first does so along with it.
+// does not, it does so along with it.
 DropResult MenuDrop::reorder()
 {
     // What is gone must not be listed.
-    if (!OnDisk::exists(m_request.sources.constFirst()))
-        return refused({FileTransfer::Failure::SourceGone, m_targets.constFirst(), QString()});
-    m_host.begins(m_request.sources, m_targets, m_request.action, m_folder);
-    std::optional<QStringList> order;
-    if (m_request.action == Qt::MoveAction)
-        order =
-            m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder);
-    return done(true, write(order));
+    for (const DropItem &item : m_request.isAssisted ? m_items : m_items.mid(0, 1)) {
+        if (!OnDisk::exists(item.source))
+            return refused({FileTransfer::Failure::SourceGone, item.target, QString()});
+    }
+    m_host.begins(m_items, m_request.action, m_folder);
+    return done(true, write(order()));
 }
 
 DropResult MenuDrop::bringIn()
 {
-    const FileTransfer::Result possible = FileTransfer::check(m_request.sources, m_folder);
+    const FileTransfer::Result possible = check();
     if (!possible.succeeded())
         return refused(possible);
-    const bool isListed =
-        isHere(m_request.sources.constFirst()) ? m_request.action == Qt::MoveAction : m_request.row != -1;
-    std::optional<QStringList> order;
-    if (isListed)
-        order =
-            m_host.orderWith(QFileInfo(m_targets.constFirst()).fileName(), m_request.row, m_request.folder);
-    m_host.begins(m_request.sources, m_targets, m_request.action, m_folder);
+    const std::optional<QStringList> list = order();
     const QPointer<QFileSystemModel> model(&m_model);
-    const FileTransfer::Result result = m_request.action == Qt::LinkAction ? link() : transfer();
+    const QPointer<FolderWatch> watch(&m_watch);
+    const QStringList released = m_watch.release(leavingPaths());
+    const std::optional<DropResult> refusal = carryOver();
+    // What could not be moved is still there.
+    if (watch)
+        watch->watchAgain(released);
     if (!model)
         return {};
-    if (!result.succeeded())
-        return refused(result);
-    return done(isListed, write(order));
+    return refusal ? *refusal : done(isListed(), write(list));
 }
 
-// Asks before a file that exists, and keeps the place that was meant when rows come and go.
-bool MenuDrop::confirm()
+// What made room is back when this does not succeed.
+std::optional<DropResult> MenuDrop::carryOver()
 {
-    const int row = m_request.row;
-    const bool isLast = row == m_model.rowCount(m_request.folder);
-    const bool isBefore = row >= 0 && row < m_model.rowCount(m_request.folder);
-    const QPersistentModelIndex following =
-        isBefore ? m_model.index(row, 0, m_request.folder) : QModelIndex();
+    ReplacedThings replaced;
+    QString occupied;
+    if (!makeRoom(replaced, &occupied))
+        return refused(Refusal::notTrashed(occupied).reason);
+    m_host.begins(m_items, m_request.action, m_folder);
     const QPointer<QFileSystemModel> model(&m_model);
-    if (!m_host.confirmOverwrite(m_targets.constFirst()) || !model || !m_request.folder.isValid())
-        return false;
-    if (row != -1)
-        m_request.row = isLast ? m_model.rowCount(m_request.folder) : following.row();
+    const FileTransfer::Result result = m_request.action == Qt::LinkAction ? link() : transfer();
+    if (!result.succeeded())
+        return refused(result);
+    std::vector<ReplacedThings::Thing> things = replaced.take();
+    for (ReplacedThings::Thing &thing : things) {
+        if (model)
+            m_host.replaced(thing.path, std::move(thing.kept));
+    }
+    return std::nullopt;
+}
+
+// What is to be replaced is still there, and looked at when it has made room.
+FileTransfer::Result MenuDrop::check() const
+{
+    QVector<FileTransfer::Item> items;
+    for (const DropItem &item : m_items) {
+        if (!item.isReplacing)
+            items.append({item.source, item.target});
+    }
+    return FileTransfer::check(items);
+}
+
+bool MenuDrop::makeRoom(ReplacedThings &replaced, QString *occupied) const
+{
+    for (const DropItem &item : m_items) {
+        *occupied = item.target;
+        if (item.isReplacing && !replaced.putAway(item.target))
+            return false;
+    }
     return true;
 }
 
 FileTransfer::Result MenuDrop::transfer()
 {
-    const QStringList released =
-        m_request.action == Qt::MoveAction ? m_watch.release(m_request.sources) : QStringList();
-    const QPointer<FolderWatch> watch(&m_watch);
+    QVector<FileTransfer::Item> items;
+    for (const DropItem &item : qAsConst(m_items))
+        items.append({item.source, item.target});
     const std::unique_ptr<FileProgress> progress = m_host.follow(m_request.action);
-    const FileTransfer::Result result =
-        FileTransfer::transfer(m_request.sources, m_folder, transferAction(m_request.action), *progress);
-    // What could not be moved is still there.
-    if (watch)
-        watch->watchAgain(released);
-    return result;
+    return FileTransfer::transfer(items, transferAction(m_request.action), *progress);
 }
 
 // All or nothing, as with copies.
 FileTransfer::Result MenuDrop::link()
 {
     QStringList made;
-    for (int i = 0; i < m_targets.size(); ++i) {
-        QFile source(m_request.sources.at(i));
-        if (isHere(source.fileName()))
+    for (const DropItem &item : qAsConst(m_items)) {
+        QFile source(item.source);
+        if (item.isHere)
             continue;
-        if (source.link(m_targets.at(i))) {
-            made.append(m_targets.at(i));
+        if (source.link(item.target)) {
+            made.append(item.target);
             continue;
         }
         for (const QString &link : qAsConst(made))
             QFile::remove(link);
-        return {FileTransfer::Failure::Failed, source.fileName(), source.errorString()};
+        return {FileTransfer::Failure::Failed, item.source, source.errorString()};
     }
     return {};
+}
+
+// The folders among them are not to be watched meanwhile.
+QStringList MenuDrop::leavingPaths() const
+{
+    QStringList paths;
+    for (const DropItem &item : m_items) {
+        if (m_request.action == Qt::MoveAction)
+            paths.append(item.source);
+        if (item.isReplacing)
+            paths.append(item.target);
+    }
+    return paths;
+}
+
+bool MenuDrop::isListed() const
+{
+    const bool isMove = m_request.action == Qt::MoveAction;
+    if (!m_request.isAssisted)
+        return m_items.constFirst().isHere ? isMove : m_request.row != -1;
+    const bool isAnyHere =
+        std::any_of(m_items.begin(), m_items.end(), [](const DropItem &item) { return item.isHere; });
+    return m_request.row != -1 ? isMove || !areAllHere() : isMove && isAnyHere;
+}
+
+std::optional<QStringList> MenuDrop::order() const
+{
+    if (!isListed())
+        return std::nullopt;
+    QStringList names;
+    for (const DropItem &item : m_request.isAssisted ? m_items : m_items.mid(0, 1)) {
+        // A copy of what is here leaves it where it is.
+        if (m_request.action == Qt::MoveAction || !item.isHere)
+            names.append(QFileInfo(item.target).fileName());
+    }
+    return m_host.orderWith(names, m_request.row, m_request.folder);
 }
 
 // A list that cannot be saved leaves the drop done; what the user is to hear of it.
@@ -167,24 +279,36 @@ QString MenuDrop::write(const std::optional<QStringList> &order) const
     return !order || FolderOrder::write(m_folder, *order) ? QString() : FolderOrder::notSaved(m_folder);
 }
 
-DropResult MenuDrop::done(bool sortAnew, const QString &complaint) const
+DropResult MenuDrop::result() const
 {
     DropResult result;
+    result.folder = m_request.folder;
+    for (const DropItem &item : m_items)
+        result.targets.append(item.target);
+    return result;
+}
+
+DropResult MenuDrop::done(bool sortAnew, const QString &complaint) const
+{
+    DropResult result = this->result();
     result.isDone = true;
     result.complaint = complaint;
-    result.folder = m_request.folder;
-    result.targets = m_targets;
-    if (m_request.action == Qt::MoveAction)
-        result.moved = m_request.sources;
+    if (m_request.action == Qt::MoveAction) {
+        for (const DropItem &item : m_items)
+            result.moved.append(item.source);
+    }
     result.sortAnew = sortAnew;
     return result;
 }
 
-DropResult MenuDrop::refused(const FileTransfer::Result &result) const
+DropResult MenuDrop::refused(const QString &complaint) const
 {
-    DropResult refusal;
-    refusal.complaint = failureText(result, m_request.action);
-    refusal.folder = m_request.folder;
-    refusal.targets = m_targets;
+    DropResult refusal = result();
+    refusal.complaint = complaint;
     return refusal;
+}
+
+DropResult MenuDrop::refused(const FileTransfer::Result &failure) const
+{
+    return refused(failureText(failure, m_request.action));
 }

@@ -3,19 +3,27 @@
 
 #pragma once
 
+#include "DropTargets.h"
 #include "FileTransfer.h"
 #include "MenuDropHost.h"
 
 #include <QPersistentModelIndex>
 #include <QString>
 #include <QStringList>
+#include <QVector>
+
+#include <optional>
 
 class FolderWatch;
 class QFileSystemModel;
+class ReplacedThings;
 
 /**
  * One drop of files into a folder of the menu: checks it, has the user asked, transfers the
  * files and writes the order of the folder when they are there. What fails is taken back.
+ *
+ * Where there is no assistance, the user is asked about the first file alone, nothing that is
+ * there makes room, and only the first file gets a place in the order of the folder.
  */
 class MenuDrop
 {
@@ -27,6 +35,7 @@ public:
         Qt::DropAction action;
         int row; ///< the source row before which the first file is to be listed, or -1
         QPersistentModelIndex folder;
+        bool isAssisted = false; ///< see VelMenuView::setAssistance()
     };
 
     MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &host, const Request &request);
@@ -36,20 +45,31 @@ public:
     DropResult carryOut();
 
 private:
-    bool isHere(const QString &source) const;
+    bool areAllHere() const;
+    bool settle();
+    bool settleFirst();
+    bool settleAll();
     DropResult reorder();
     DropResult bringIn();
-    bool confirm();
+    std::optional<DropResult> carryOver();
+    FileTransfer::Result check() const;
+    bool makeRoom(ReplacedThings &replaced, QString *occupied) const;
     FileTransfer::Result transfer();
     FileTransfer::Result link();
+    QStringList leavingPaths() const;
+    bool isListed() const;
+    std::optional<QStringList> order() const;
     QString write(const std::optional<QStringList> &order) const;
+    DropResult result() const;
     DropResult done(bool sortAnew, const QString &complaint) const;
-    DropResult refused(const FileTransfer::Result &result) const;
+    DropResult refused(const QString &complaint) const;
+    DropResult refused(const FileTransfer::Result &failure) const;
 
     QFileSystemModel &m_model;
     FolderWatch &m_watch;
     MenuDropHost &m_host;
     Request m_request;
     QString m_folder; // the path
-    QStringList m_targets;
+    DropTargets m_targets;
+    QVector<DropItem> m_items;
 };

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "DropTargets.h"
 #include "FileProgress.h"
 
 #include <QPersistentModelIndex>
@@ -12,6 +13,7 @@
 #include <memory>
 #include <optional>
 
+class KeptThing;
 class QObject;
 class VelMenuView;
 
@@ -54,20 +56,31 @@ public:
      */
     virtual bool confirmOverwrite(const QString &target) = 0;
 
-    /// The list for \a folder of the file model as it is shown, with \a name before the child at
-    /// the source row \a row; nothing where nobody shows an order.
-    virtual std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) = 0;
-
-    /// The \a sources are about to become the \a targets in \a folder, a path, whose order may be
-    /// written too. What does not lie elsewhere stays where it is.
-    virtual void begins(const QStringList &sources, const QStringList &targets, Qt::DropAction action,
-                        const QString &folder)
+    /**
+     * Asks the user what is to become of a file whose name is taken, where there is assistance. An event
+     * loop runs meanwhile, in which the model and this object may be deleted; all is canceled then.
+     */
+    virtual NameClash::Answer askAbout(const NameClash &clash)
     {
-        Q_UNUSED(sources)
-        Q_UNUSED(targets)
+        Q_UNUSED(clash)
+        return {};
+    }
+
+    /// The list for \a folder of the file model as it is shown, with the \a names, each once, before the
+    /// child at the source row \a row; nothing where nobody shows an order.
+    virtual std::optional<QStringList> orderWith(const QStringList &names, int row,
+                                                 const QModelIndex &folder) = 0;
+
+    /// The \a items are about to come to \a folder, a path, whose order may be written too.
+    virtual void begins(const QVector<DropItem> &items, Qt::DropAction action, const QString &folder)
+    {
+        Q_UNUSED(items)
         Q_UNUSED(action)
         Q_UNUSED(folder)
     }
+
+    /// What was at \a path has made room for one of the items, and is \a kept.
+    virtual void replaced(const QString &path, std::unique_ptr<KeptThing> kept);
 
     /**
      * Returns what follows the copying or moving of files. An event loop may run whenever it is

@@ -153,7 +153,7 @@ bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, in
         return false;
     }
     const DropResult result =
-        MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent}).carryOut();
+        MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent, m_isAssisted}).carryOut();
     if (!self)
         return false;
     if (result.isDone)

@@ -1,7 +1,9 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "ClashQuestion.h"
 #include "FileWork.h"
+#include "KeptThing.h"
 #include "MenuDropHost.h"
 #include "MenuHistory.h"
 #include "ShownOrder.h"
@@ -17,6 +19,8 @@
 #include <QFileSystemModel>
 #include <QMessageBox>
 #include <QSortFilterProxyModel>
+
+#include <algorithm>
 
 namespace {
 
@@ -44,10 +48,15 @@ public:
         return box.exec() != QMessageBox::No;
     }
 
-    std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) override
+    // Nor here.
+    NameClash::Answer askAbout(const NameClash &clash) override { return ClashQuestion::ask(asker(), clash); }
+
+    std::optional<QStringList> orderWith(const QStringList &names, int row,
+                                         const QModelIndex &folder) override
     {
         const QSortFilterProxyModel *shown = m_view ? proxy() : nullptr;
-        return shown ? std::optional<QStringList>(ShownOrder::with(*shown, name, row, folder)) : std::nullopt;
+        return shown ? std::optional<QStringList>(ShownOrder::with(*shown, names, row, folder))
+                     : std::nullopt;
     }
 
     std::unique_ptr<FileProgress> follow(Qt::DropAction action) override
@@ -63,21 +72,26 @@ public:
                    : QCoreApplication::translate("VelMenuView", "Copying files..."));
     }
 
-    void begins(const QStringList &sources, const QStringList &targets, Qt::DropAction action,
-                const QString &folder) override
+    void begins(const QVector<DropItem> &items, Qt::DropAction action, const QString &folder) override
     {
         m_recorder = m_view ? VelMenuViewPrivate::historyOf(*m_view).record() : nullptr;
         if (!m_recorder)
             return;
         m_isMove = action == Qt::MoveAction;
-        m_sources = sources;
+        m_items = items;
         m_recorder->mayWrite(EntryPath::recordFileOf(folder));
-        for (int i = 0; i < sources.size(); ++i) {
+        for (const DropItem &item : items) {
             if (m_isMove)
-                m_recorder->mayMove(sources.at(i), targets.at(i));
+                m_recorder->mayMove(item.source, item.target);
             else
-                m_recorder->mayMake(targets.at(i));
+                m_recorder->mayMake(item.target);
         }
+    }
+
+    void replaced(const QString &path, std::unique_ptr<KeptThing> kept) override
+    {
+        if (m_recorder)
+            m_recorder->deleted(path, std::move(kept));
     }
 
     void finished(const DropResult &result) override
@@ -86,6 +100,12 @@ public:
             return;
         if (result.isDone)
             show(result);
+        // What made room and is back is nothing that the drop made.
+        const bool isAnyBack = !result.isDone
+            && std::any_of(m_items.begin(), m_items.end(),
+                           [](const DropItem &item) { return item.isReplacing; });
+        if (isAnyBack)
+            m_recorder.reset();
         if (m_recorder)
             remember(result);
         if (!result.complaint.isEmpty())
@@ -122,23 +142,24 @@ private:
     void remember(const DropResult &result)
     {
         MenuHistory &history = VelMenuViewPrivate::historyOf(*m_view);
-        const QString first = result.targets.constFirst();
-        const bool isHere =
-            QFileInfo(m_sources.constFirst()).absoluteFilePath() == QFileInfo(first).absoluteFilePath();
-        history.add(m_recorder, textOf(history, first, isHere), result.targets + m_sources);
+        QStringList paths = result.targets;
+        for (const DropItem &item : qAsConst(m_items))
+            paths.append(item.source);
+        history.add(m_recorder, textOf(history), paths);
         m_recorder.reset();
     }
 
-    StepText textOf(const MenuHistory &history, const QString &target, bool isHere) const
+    StepText textOf(const MenuHistory &history) const
     {
-        const QString name = history.nameOf(target);
-        if (isHere && m_sources.size() == 1)
+        const DropItem &first = m_items.constFirst();
+        const QString name = history.nameOf(first.target);
+        if (first.isHere && m_items.size() == 1)
             return StepText(StepText::Kind::Reorder, name);
-        const QString folder = history.nameOf(QFileInfo(target).path());
-        if (m_sources.size() == 1)
+        const QString folder = history.nameOf(QFileInfo(first.target).path());
+        if (m_items.size() == 1)
             return StepText(m_isMove ? StepText::Kind::Move : StepText::Kind::Copy, name, 1, folder);
         return StepText(m_isMove ? StepText::Kind::MoveItems : StepText::Kind::CopyItems, QString(),
-                        m_sources.size(), folder);
+                        m_items.size(), folder);
     }
 
     const QSortFilterProxyModel *proxy() const
@@ -164,10 +185,16 @@ private:
     QObject *const m_owner;
     std::unique_ptr<StepRecorder> m_recorder; // of the drop that has begun
     bool m_isMove = false;
-    QStringList m_sources;
+    QVector<DropItem> m_items;
 };
 
 } // namespace
+
+void MenuDropHost::replaced(const QString &path, std::unique_ptr<KeptThing> kept)
+{
+    Q_UNUSED(path)
+    Q_UNUSED(kept)
+}
 
 std::unique_ptr<MenuDropHost> MenuDropHost::create(VelMenuView *view, QObject *owner)
 {

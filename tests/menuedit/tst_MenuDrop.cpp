@@ -4,6 +4,7 @@
 #include "TestCase.h"
 
 #include <menuedit/FolderWatch.h>
+#include <menuedit/KeptThing.h>
 #include <menuedit/MenuDrop.h>
 
 #include <QFileSystemModel>
@@ -25,20 +26,36 @@ public:
         return answer ? answer() : true;
     }
 
-    std::optional<QStringList> orderWith(const QString &name, int row, const QModelIndex &folder) override
+    NameClash::Answer askAbout(const NameClash &clash) override
+    {
+        questions.append(clash.target);
+        return decide ? decide(clash) : NameClash::Answer();
+    }
+
+    std::optional<QStringList> orderWith(const QStringList &names, int row,
+                                         const QModelIndex &folder) override
     {
         if (!hasOrder)
             return std::nullopt;
-        places.append(QStringLiteral("%1 before %2 in %3").arg(name).arg(row).arg(folder.data().toString()));
-        return QStringList{QStringLiteral("*"), name};
+        places.append(QStringLiteral("%1 before %2 in %3")
+                          .arg(names.join(QLatin1Char(' ')))
+                          .arg(row)
+                          .arg(folder.data().toString()));
+        return QStringList(QStringLiteral("*")) + names;
     }
 
     std::unique_ptr<FileProgress> follow(Qt::DropAction) override { return std::make_unique<Follower>(this); }
 
-    void begins(const QStringList &, const QStringList &, Qt::DropAction, const QString &) override
+    void begins(const QVector<DropItem> &, Qt::DropAction, const QString &) override
     {
         if (begin)
             begin();
+    }
+
+    void replaced(const QString &path, std::unique_ptr<KeptThing> kept) override
+    {
+        kepts.append(path);
+        wereKept = wereKept && kept && kept->isThere();
     }
 
     void finished(const DropResult &) override { QFAIL("is told by the model"); }
@@ -59,7 +76,10 @@ public:
     std::function<bool()> answer;
     std::function<bool()> goOn;
     std::function<void()> begin;
+    std::function<NameClash::Answer(const NameClash &)> decide;
     bool hasOrder = true;
+    bool wereKept = true;
+    QStringList kepts;
     QStringList questions;
     QStringList places;
 };
@@ -96,9 +116,20 @@ private Q_SLOTS:
     void tellsThatTheOrderWasNotSaved_data();
     void tellsThatTheOrderWasNotSaved();
     void linksAllOrNothing();
+    void asksAboutEachWithAssistance();
+    void putsWhatMakesRoomIntoTheTrash_data();
+    void putsWhatMakesRoomIntoTheTrash();
+    void bringsBackWhatMadeRoom_data();
+    void bringsBackWhatMadeRoom();
+    void listsAllWithAssistance_data();
+    void listsAllWithAssistance();
+    void asksNothingThatCannotBeDone();
+    void doesNothingWhenAllIsSkipped();
+    void leavesAllWhenTheModelGoesInAQuestion();
 
 private:
-    DropResult drop(const QStringList &files, Qt::DropAction action, int row);
+    DropResult drop(const QStringList &files, Qt::DropAction action, int row, bool isAssisted = false);
+    QString trashed(const QString &name) const { return path(QStringLiteral("data/Trash/files/") + name); }
     QByteArray record() const { return read(path(QStringLiteral("to/.directory"))); }
 
     std::unique_ptr<QFileSystemModel> m_model;
@@ -115,6 +146,7 @@ const QByteArray Record = "[Desktop Entry]\nType=Directory\nName=To\n";
 void tst_MenuDrop::init()
 {
     TestCase::init();
+    qputenv("XDG_DATA_HOME", QFile::encodeName(path(QStringLiteral("data"))));
     for (const char *name : {"to/a", "from/x", "from/y"})
         write(QString::fromUtf8(name), name);
     write(QStringLiteral("to/.directory"), Record);
@@ -132,13 +164,13 @@ void tst_MenuDrop::cleanup()
     TestCase::cleanup();
 }
 
-DropResult tst_MenuDrop::drop(const QStringList &files, Qt::DropAction action, int row)
+DropResult tst_MenuDrop::drop(const QStringList &files, Qt::DropAction action, int row, bool isAssisted)
 {
     QStringList sources;
     for (const QString &file : files)
         sources.append(path(file));
     const QModelIndex folder = m_model->index(path(QStringLiteral("to")));
-    return MenuDrop(*m_model, *m_watch, m_host, {sources, action, row, folder}).carryOut();
+    return MenuDrop(*m_model, *m_watch, m_host, {sources, action, row, folder, isAssisted}).carryOut();
 }
 
 void tst_MenuDrop::movesAndLists()
@@ -419,6 +451,161 @@ void tst_MenuDrop::linksAllOrNothing()
     QCOMPARE(QDir(path(QStringLiteral("to"))).entryList(QDir::Files | QDir::System),
              QStringList({QStringLiteral("a"), QStringLiteral("y")}));
     QCOMPARE(read(path(QStringLiteral("to/y"))), QByteArray("came meanwhile"));
+}
+
+void tst_MenuDrop::asksAboutEachWithAssistance()
+{
+    write(QStringLiteral("to/x"), "old x");
+    write(QStringLiteral("to/y"), "old y");
+    m_host.decide = [this](const NameClash &clash) {
+        return NameClash::Answer{clash.target.endsWith(QLatin1Char('x')) ? NameClash::Choice::KeepBoth
+                                                                         : NameClash::Choice::Skip,
+                                 false};
+    };
+
+    const DropResult result =
+        drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::MoveAction, 0, true);
+
+    QVERIFY(result.isDone);
+    QCOMPARE(result.complaint, QString());
+    QCOMPARE(result.targets, QStringList{path(QStringLiteral("to/x-2"))});
+    QCOMPARE(result.moved, QStringList{path(QStringLiteral("from/x"))});
+    QCOMPARE(read(path(QStringLiteral("to/x"))), QByteArray("old x"));
+    QCOMPARE(read(path(QStringLiteral("to/x-2"))), QByteArray("from/x"));
+    QCOMPARE(read(path(QStringLiteral("to/y"))), QByteArray("old y"));
+    QCOMPARE(read(path(QStringLiteral("from/y"))), QByteArray("from/y"));
+    QCOMPARE(m_host.questions, (QStringList{path(QStringLiteral("to/x")), path(QStringLiteral("to/y"))}));
+    QCOMPARE(record(), Record + "SortOrder=*;x-2;\n");
+}
+
+void tst_MenuDrop::putsWhatMakesRoomIntoTheTrash_data()
+{
+    QTest::addColumn<Qt::DropAction>("action");
+    QTest::newRow("move") << Qt::MoveAction;
+    QTest::newRow("copy") << Qt::CopyAction;
+    QTest::newRow("link") << Qt::LinkAction;
+}
+
+void tst_MenuDrop::putsWhatMakesRoomIntoTheTrash()
+{
+    QFETCH(Qt::DropAction, action);
+    write(QStringLiteral("to/x/inner"), "old");
+    m_host.decide = [](const NameClash &) { return NameClash::Answer{NameClash::Choice::Replace, false}; };
+
+    QVERIFY(drop({QStringLiteral("from/x")}, action, -1, true).isDone);
+
+    QCOMPARE(read(path(QStringLiteral("to/x"))), QByteArray("from/x"));
+    QCOMPARE(read(trashed(QStringLiteral("x/inner"))), QByteArray("old"));
+    QCOMPARE(m_host.kepts, QStringList{path(QStringLiteral("to/x"))});
+    QVERIFY(m_host.wereKept);
+}
+
+void tst_MenuDrop::bringsBackWhatMadeRoom_data()
+{
+    QTest::addColumn<bool>("isTrash");
+    QTest::newRow("from the trash") << true;
+    QTest::newRow("from beside") << false;
+}
+
+// Such a thing as the last cannot be copied.
+void tst_MenuDrop::bringsBackWhatMadeRoom()
+{
+    QFETCH(bool, isTrash);
+    if (!isTrash)
+        write(QStringLiteral("data"), "is no folder");
+    const QString old = write(QStringLiteral("to/x"), "old");
+    QVERIFY(mkfifo(QFile::encodeName(path(QStringLiteral("from/pipe"))).constData(), 0600) == 0);
+    m_host.decide = [](const NameClash &) { return NameClash::Answer{NameClash::Choice::Replace, true}; };
+    bool wasAway = false;
+    m_host.begin = [&] { wasAway = !QFile::exists(old); };
+
+    const DropResult result =
+        drop({QStringLiteral("from/x"), QStringLiteral("from/pipe")}, Qt::CopyAction, 0, true);
+
+    QVERIFY(!result.isDone);
+    QVERIFY(!result.complaint.isEmpty());
+    QVERIFY(wasAway);
+    QCOMPARE(read(old), QByteArray("old"));
+    QCOMPARE(QDir(path(QStringLiteral("to"))).entryList(QDir::Files | QDir::Hidden),
+             QStringList({QStringLiteral(".directory"), QStringLiteral("a"), QStringLiteral("x")}));
+    QVERIFY(!QFile::exists(trashed(QStringLiteral("x"))));
+    QCOMPARE(m_host.kepts, QStringList());
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::listsAllWithAssistance_data()
+{
+    QTest::addColumn<QStringList>("files");
+    QTest::addColumn<Qt::DropAction>("action");
+    QTest::addColumn<int>("row");
+    QTest::addColumn<QString>("places");
+    const QStringList both{QStringLiteral("from/y"), QStringLiteral("from/x")};
+    const QStringList mixed{QStringLiteral("from/y"), QStringLiteral("to/a"), QStringLiteral("from/x")};
+    const QStringList here{QStringLiteral("to/b"), QStringLiteral("to/a")};
+    QTest::newRow("move") << both << Qt::MoveAction << 0 << "y x before 0 in to";
+    QTest::newRow("copy") << both << Qt::CopyAction << 2 << "y x before 2 in to";
+    QTest::newRow("link") << both << Qt::LinkAction << 0 << "y x before 0 in to";
+    QTest::newRow("onto the folder") << both << Qt::MoveAction << -1 << "";
+    QTest::newRow("move of all") << mixed << Qt::MoveAction << 1 << "y a x before 1 in to";
+    QTest::newRow("copy of some") << mixed << Qt::CopyAction << 1 << "y x before 1 in to";
+    QTest::newRow("within the folder") << here << Qt::MoveAction << 0 << "b a before 0 in to";
+    QTest::newRow("copy within the folder") << here << Qt::CopyAction << 0 << "";
+}
+
+void tst_MenuDrop::listsAllWithAssistance()
+{
+    QFETCH(QStringList, files);
+    QFETCH(Qt::DropAction, action);
+    QFETCH(int, row);
+    QFETCH(QString, places);
+    write(QStringLiteral("to/b"), "b");
+    QTRY_COMPARE(m_model->rowCount(m_model->index(path(QStringLiteral("to")))), 2);
+
+    QVERIFY(drop(files, action, row, true).isDone);
+
+    QCOMPARE(m_host.places.join(QString()), places);
+    const QByteArray listed = places.section(QLatin1String(" before"), 0, 0).toLatin1().replace(' ', ';');
+    QCOMPARE(record(), places.isEmpty() ? Record : Record + "SortOrder=*;" + listed + ";\n");
+}
+
+void tst_MenuDrop::asksNothingThatCannotBeDone()
+{
+    write(QStringLiteral("to/x"), "old");
+
+    const DropResult result =
+        drop({QStringLiteral("from/x"), QStringLiteral("from/missing")}, Qt::MoveAction, 0, true);
+
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint,
+             QStringLiteral("%1 does not exist.").arg(path(QStringLiteral("from/missing"))));
+    QVERIFY(m_host.questions.isEmpty());
+}
+
+void tst_MenuDrop::doesNothingWhenAllIsSkipped()
+{
+    write(QStringLiteral("to/x"), "old");
+    m_host.decide = [](const NameClash &) { return NameClash::Answer{NameClash::Choice::Skip, false}; };
+    m_host.begin = [] { QFAIL("begins"); };
+
+    const DropResult result = drop({QStringLiteral("from/x")}, Qt::MoveAction, 0, true);
+
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint, QString());
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::leavesAllWhenTheModelGoesInAQuestion()
+{
+    const QString old = write(QStringLiteral("to/x"), "old");
+    m_host.decide = [this](const NameClash &) {
+        m_model.reset();
+        return NameClash::Answer{NameClash::Choice::Replace, true};
+    };
+
+    QVERIFY(!drop({QStringLiteral("from/x"), QStringLiteral("from/y")}, Qt::MoveAction, 0, true).isDone);
+
+    QCOMPARE(read(old), QByteArray("old"));
+    QVERIFY(QFile::exists(path(QStringLiteral("from/y"))));
 }
 
 VEL_TEST_MAIN(tst_MenuDrop)

@@ -1,0 +1,54 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "NameClash.h"
+
+#include <QSet>
+#include <QString>
+#include <QStringList>
+#include <QVector>
+
+#include <functional>
+#include <optional>
+
+/**
+ * One file that was dropped.
+ */
+struct DropItem
+{
+    QString source; ///< its path
+    QString target; ///< the path that it is to have
+    bool isHere = false; ///< whether it lies in the folder already; then it stays as it is
+    bool isReplacing = false; ///< whether something at the target is to make room for it
+};
+
+/**
+ * Finds the paths that dropped files are to have in a folder. Looks at the disk, and changes nothing.
+ */
+class DropTargets
+{
+public:
+    /// Decides about a name that is taken. An event loop may run in it.
+    using Ask = std::function<NameClash::Answer(const NameClash &clash)>;
+
+    DropTargets(const QString &folder, const QStringList &sources);
+
+    /// All of them under their own names, whether or not these are taken.
+    QVector<DropItem> plain() const;
+    /// All of them, those whose names are taken under others, which nothing and none of them has.
+    QVector<DropItem> besides() const;
+    /// As is decided for each whose name is taken, without those to be skipped; nullopt when all is to
+    /// stay as it is.
+    std::optional<QVector<DropItem>> settled(const Ask &ask) const;
+
+private:
+    DropItem itemOf(const QString &source) const;
+    bool isTaken(const QString &target, const QSet<QString> &promised) const;
+    QString freeTarget(const DropItem &item, const QSet<QString> &promised) const;
+    NameClash::Kind kindOf(const DropItem &item, const QSet<QString> &promised) const;
+
+    const QString m_folder;
+    const QStringList m_sources;
+};
