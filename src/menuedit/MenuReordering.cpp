@@ -25,15 +25,6 @@ int rowBelow(const ShownMenu &menu, const QModelIndex &shown, const QModelIndex 
                                                      : menu.files().rowCount(sourceFolder);
 }
 
-// Puts the names of the children of \a folder, as they are to be shown, on disk.
-void write(const ShownMenu &menu, MenuVoice &voice, const QString &folder, const QStringList &list)
-{
-    const bool isSaved = FolderOrder::write(folder, list);
-    menu.files().noteRecordFile(folder);
-    if (!isSaved)
-        voice.tell(FolderOrder::notSaved(folder), MenuVoice::Failure);
-}
-
 } // namespace
 
 bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row,
@@ -44,6 +35,15 @@ bool MenuReordering::list(const ShownMenu &menu, MenuVoice &voice, const QString
         return false;
     write(menu, voice, path, ShownOrder::with(menu.proxy(), name, row, folder));
     return true;
+}
+
+void MenuReordering::write(const ShownMenu &menu, MenuVoice &voice, const QString &folder,
+                           const QStringList &list)
+{
+    const bool isSaved = FolderOrder::write(folder, list);
+    menu.files().noteRecordFile(folder);
+    if (!isSaved)
+        voice.tell(FolderOrder::notSaved(folder), MenuVoice::Failure);
 }
 
 void MenuReordering::move(const ShownMenu &menu, MenuVoice &voice, const QModelIndex &item, bool up)

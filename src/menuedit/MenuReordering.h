@@ -4,6 +4,7 @@
 #pragma once
 
 #include <QModelIndexList>
+#include <QStringList>
 
 class MenuVoice;
 class QString;
@@ -17,6 +18,9 @@ namespace MenuReordering {
 /// Lists \a name in \a folder before the child at the source row \a row; see ShownOrder::with().
 /// False when there is no such folder; of a list that cannot be saved the \a voice tells.
 bool list(const ShownMenu &menu, MenuVoice &voice, const QString &name, int row, const QModelIndex &folder);
+
+/// Makes \a list the order of the directory \a folder; when it cannot be saved, the \a voice tells.
+void write(const ShownMenu &menu, MenuVoice &voice, const QString &folder, const QStringList &list);
 
 /// Moves \a item by one place up or down, and shows the new order.
 void move(const ShownMenu &menu, MenuVoice &voice, const QModelIndex &item, bool up);

@@ -67,6 +67,9 @@ constexpr Texts AllTexts[] = {
     {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo showing %n items again"),
      QT_TRANSLATE_N_NOOP("MenuHistory", "Redo showing %n items again"),
      QT_TRANSLATE_N_NOOP("MenuHistory", "The menu shows %n items again.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo sorting of folder %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo sorting of folder %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "The folder %1 was sorted by name.")},
 };
 
 // English has no catalog that would know the form for one.

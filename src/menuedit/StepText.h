@@ -29,6 +29,7 @@ public:
         HideItems, ///< so many
         ShowAgain, ///< the item
         ShowItemsAgain, ///< so many
+        Sort, ///< the folder
     };
 
     /// \a item and \a folder are shown names.

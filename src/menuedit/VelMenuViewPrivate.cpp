@@ -37,6 +37,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , moving(menu, selection, find, voice, history)
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
+    , sorting(menu, selection, find, voice, history)
     , reloading(view, menu, selection, [this] { showAnew(); })
     , cutMark(view, menu)
     , dragOpening(view)
@@ -105,6 +106,7 @@ void VelMenuViewPrivate::show()
     QObject::connect(&moving, &MenuMoving::changed, q, &VelMenuView::setActionsEnabled);
     QObject::connect(&moving, &MenuMoving::changed, q, &VelMenuView::changed);
     QObject::connect(&hiding, &MenuHiding::changed, q, &VelMenuView::changed);
+    QObject::connect(&sorting, &MenuSorting::changed, q, &VelMenuView::changed);
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
     QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
     connectSelection();
@@ -234,6 +236,7 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
     dragOpening.setOn(assisted);
     severalRows.setOn(assisted && actions);
     emptyLabel = assisted && actions ? std::make_unique<EmptyMenuLabel>(q, menu) : nullptr;
+    sorting.setContextMenu(assisted && actions ? actions->menu() : nullptr);
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);

@@ -16,6 +16,7 @@
 #include "MenuMoving.h"
 #include "MenuReload.h"
 #include "MenuSelection.h"
+#include "MenuSorting.h"
 #include "MenuVoice.h"
 #include "RootWatch.h"
 #include "SeveralRows.h"
@@ -64,6 +65,7 @@ public:
     MenuMoving moving;
     MenuEditing editing;
     MenuDeletion deletion;
+    MenuSorting sorting;
     MenuReload reloading;
     CutMark cutMark;
     DragOpening dragOpening;

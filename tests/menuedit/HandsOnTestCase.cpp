@@ -69,7 +69,7 @@ void HandsOnTestCase::pickInDropMenu(ModalDriver &modal, const QString &text)
         QVERIFY(menu);
         const QList<QAction *> actions = menu->actions();
         for (QAction *action : actions) {
-            if (action->text() == text)
+            if (QString(action->text()).remove(QLatin1Char('&')) == text)
                 return XDoTool::click(menu, menu->actionGeometry(action).center());
         }
         QFAIL(qPrintable(QLatin1String("no entry ") + text));

@@ -28,7 +28,8 @@ public:
     void clickItem(const QString &file);
     /// A place on the item of \a file, in the view's viewport; the item must be in sight.
     QPoint placeOf(const QString &file);
-    /// The next modal window is the menu that a drop opens: clicks the entry \a text.
+    /// The next modal window is the menu that a drop opens: clicks the entry \a text, whatever its
+    /// mnemonic is.
     static void pickInDropMenu(ModalDriver &modal, const QString &text);
 
     VelMenuDialog *dialog() const { return m_dialog.get(); }
