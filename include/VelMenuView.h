@@ -82,8 +82,9 @@ public:
     /**
      * Switches on what helps users beyond the plain tree: a filter (setFilter()), gray rows for
      * entries that the menu does not show, with the reason as their tool tips (setHiddenShown()),
-     * "Hide", "Show again" and "Sort by name" in the context menu, and the names of files for entries that
-     * have none. Off, as it is at first, the view has nothing of that. A further init() keeps it as it is.
+     * "Hide", "Show again", "Sort by name" and "Open containing folder" in the context menu, and the names of
+     * files for entries that have none. Off, as it is at first, the view has nothing of that. A further
+     * init() keeps it as it is.
      *
      * @param assistance whether the view is to help
      */

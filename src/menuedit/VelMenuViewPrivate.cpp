@@ -38,6 +38,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
     , sorting(menu, selection, find, voice, history)
+    , folderOpening(view, selection, voice)
     , reloading(view, menu, selection, [this] { showAnew(); })
     , cutMark(view, menu)
     , dragOpening(view)
@@ -236,6 +237,8 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
     dragOpening.setOn(assisted);
     severalRows.setOn(assisted && actions);
     emptyLabel = assisted && actions ? std::make_unique<EmptyMenuLabel>(q, menu) : nullptr;
+    folderOpening.setContextMenu(assisted && actions ? actions->menu() : nullptr,
+                                 actions ? actions->action(MenuActions::Find) : nullptr);
     sorting.setContextMenu(assisted && actions ? actions->menu() : nullptr);
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {

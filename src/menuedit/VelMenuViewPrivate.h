@@ -6,6 +6,7 @@
 #include "CutMark.h"
 #include "DragOpening.h"
 #include "EmptyMenuLabel.h"
+#include "FolderOpening.h"
 #include "MenuActions.h"
 #include "MenuDeletion.h"
 #include "MenuEditing.h"
@@ -66,6 +67,7 @@ public:
     MenuEditing editing;
     MenuDeletion deletion;
     MenuSorting sorting;
+    FolderOpening folderOpening;
     MenuReload reloading;
     CutMark cutMark;
     DragOpening dragOpening;

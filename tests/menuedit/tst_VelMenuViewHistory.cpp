@@ -431,6 +431,8 @@ void tst_VelMenuViewHistory::namesEveryStep_data()
         "3 items were copied to %1 B.");
     row(Kind::Reorder, "Undo reordering of 5%2 %1", "Redo reordering of 5%2 %1", "5%2 %1 has another place.");
     row(Kind::Rebuild, "Undo default menu", "Redo default menu", "The default menu was built.");
+    row(Kind::Sort, "Undo sorting of folder 5%2 %1", "Redo sorting of folder 5%2 %1",
+        "The folder 5%2 %1 was sorted by name.");
 }
 
 // Names are shown as they are, whatever they hold.
