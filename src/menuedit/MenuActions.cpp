@@ -24,23 +24,36 @@ struct Description
     const char *name;
     const char *icon; // in the theme; may be empty
     const char *text;
+    const char *textWithMnemonic; // other letters than those of the entries that come with assistance
 };
 
 // In the order of MenuActions::Action.
 constexpr Description Descriptions[] = {
-    {"dirNewAction", "folder-new", QT_TRANSLATE_NOOP("VelMenuView", "New folder")},
-    {"fileNewAction", "document-new", QT_TRANSLATE_NOOP("VelMenuView", "New entry")},
-    {"editAction", "document-properties", QT_TRANSLATE_NOOP("VelMenuView", "Edit")},
-    {"deleteAction", "edit-delete", QT_TRANSLATE_NOOP("VelMenuView", "Delete")},
-    {"executeAction", "", QT_TRANSLATE_NOOP("VelMenuView", "Execute")},
-    {"findAction", "edit-find", QT_TRANSLATE_NOOP("VelMenuView", "Find")},
-    {"findNextAction", "", QT_TRANSLATE_NOOP("VelMenuView", "Find Next")},
-    {"cutAction", "edit-cut", QT_TRANSLATE_NOOP("VelMenuView", "Cut")},
-    {"copyAction", "edit-copy", QT_TRANSLATE_NOOP("VelMenuView", "Copy")},
-    {"pasteAction", "edit-paste", QT_TRANSLATE_NOOP("VelMenuView", "Paste")},
-    {"recreateAction", "velmenuedit", QT_TRANSLATE_NOOP("VelMenuView", "Default menu...")},
-    {"upAction", "go-up", QT_TRANSLATE_NOOP("VelMenuView", "Up")},
-    {"downAction", "go-down", QT_TRANSLATE_NOOP("VelMenuView", "Down")},
+    {"dirNewAction", "folder-new", QT_TRANSLATE_NOOP("VelMenuView", "New folder"),
+     QT_TRANSLATE_NOOP("VelMenuView", "New &folder")},
+    {"fileNewAction", "document-new", QT_TRANSLATE_NOOP("VelMenuView", "New entry"),
+     QT_TRANSLATE_NOOP("VelMenuView", "New entr&y")},
+    {"editAction", "document-properties", QT_TRANSLATE_NOOP("VelMenuView", "Edit"),
+     QT_TRANSLATE_NOOP("VelMenuView", "&Edit")},
+    {"deleteAction", "edit-delete", QT_TRANSLATE_NOOP("VelMenuView", "Delete"),
+     QT_TRANSLATE_NOOP("VelMenuView", "&Delete")},
+    {"executeAction", "", QT_TRANSLATE_NOOP("VelMenuView", "Execute"),
+     QT_TRANSLATE_NOOP("VelMenuView", "E&xecute")},
+    {"findAction", "edit-find", QT_TRANSLATE_NOOP("VelMenuView", "Find"),
+     QT_TRANSLATE_NOOP("VelMenuView", "F&ind")},
+    {"findNextAction", "", QT_TRANSLATE_NOOP("VelMenuView", "Find Next"),
+     QT_TRANSLATE_NOOP("VelMenuView", "Find &Next")},
+    {"cutAction", "edit-cut", QT_TRANSLATE_NOOP("VelMenuView", "Cut"),
+     QT_TRANSLATE_NOOP("VelMenuView", "Cu&t")},
+    {"copyAction", "edit-copy", QT_TRANSLATE_NOOP("VelMenuView", "Copy"),
+     QT_TRANSLATE_NOOP("VelMenuView", "&Copy")},
+    {"pasteAction", "edit-paste", QT_TRANSLATE_NOOP("VelMenuView", "Paste"),
+     QT_TRANSLATE_NOOP("VelMenuView", "&Paste")},
+    {"recreateAction", "velmenuedit", QT_TRANSLATE_NOOP("VelMenuView", "Default menu..."),
+     QT_TRANSLATE_NOOP("VelMenuView", "Default &menu...")},
+    {"upAction", "go-up", QT_TRANSLATE_NOOP("VelMenuView", "Up"), QT_TRANSLATE_NOOP("VelMenuView", "&Up")},
+    {"downAction", "go-down", QT_TRANSLATE_NOOP("VelMenuView", "Down"),
+     QT_TRANSLATE_NOOP("VelMenuView", "D&own")},
 };
 
 QKeySequence keyOf(MenuActions::Action action)
@@ -153,10 +166,16 @@ void MenuActions::add(QWidget *view, Action which)
     m_actions[which] = action;
 }
 
-void MenuActions::setMovedByKeys(bool moved)
+void MenuActions::setAssisted(bool assisted)
 {
-    action(Up)->setShortcut(moved ? QKeySequence(QStringLiteral("Alt+Up")) : QKeySequence());
-    action(Down)->setShortcut(moved ? QKeySequence(QStringLiteral("Alt+Down")) : QKeySequence());
+    action(Up)->setShortcut(assisted ? QKeySequence(QStringLiteral("Alt+Up")) : QKeySequence());
+    action(Down)->setShortcut(assisted ? QKeySequence(QStringLiteral("Alt+Down")) : QKeySequence());
+    for (int i = 0; i < m_actions.size(); ++i) {
+        const Description &description = Descriptions[i];
+        const char *text = assisted ? description.textWithMnemonic : description.text;
+        if (m_actions.at(i))
+            m_actions.at(i)->setText(QCoreApplication::translate("VelMenuView", text));
+    }
 }
 
 void MenuActions::enable(Action which, bool isEnabled)

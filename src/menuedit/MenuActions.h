@@ -51,8 +51,8 @@ public:
     /// Null for what is not offered.
     QAction *action(Action which) const { return m_actions.at(which); }
 
-    /// Whether Up and Down have keys of their own.
-    void setMovedByKeys(bool moved);
+    /// Whether Up and Down have keys of their own, and all texts a letter to choose them by in the menu.
+    void setAssisted(bool assisted);
 
     /// What of the clipboard Paste depends on.
     ClipboardContents &clipboard() { return m_clipboard; }

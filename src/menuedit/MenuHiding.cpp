@@ -29,8 +29,8 @@ MenuHiding::MenuHiding(const ShownMenu &menu, MenuSelection &selection, MenuFind
     , m_find(find)
     , m_voice(voice)
     , m_history(history)
-    , m_hide(new QAction(QCoreApplication::translate("VelMenuView", "Hide"), this))
-    , m_showAgain(new QAction(QCoreApplication::translate("VelMenuView", "Show again"), this))
+    , m_hide(new QAction(QCoreApplication::translate("VelMenuView", "&Hide"), this))
+    , m_showAgain(new QAction(QCoreApplication::translate("VelMenuView", "Sho&w again"), this))
 {
     m_hide->setObjectName(QStringLiteral("hideAction"));
     m_showAgain->setObjectName(QStringLiteral("showAgainAction"));

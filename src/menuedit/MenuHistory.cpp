@@ -35,6 +35,12 @@ QStringList goneOf(QStringList paths)
     return paths;
 }
 
+// As the text of a command, in which a "&" would mark a letter.
+QString literal(QString text)
+{
+    return text.replace(QLatin1Char('&'), QLatin1String("&&"));
+}
+
 } // namespace
 
 MenuHistory::MenuHistory(QTreeView *view, const ShownMenu &menu, MenuSelection &selection, MenuFind &find,
@@ -85,8 +91,8 @@ void MenuHistory::updateActions()
         return;
     const StepCommand *past = commandAt(m_stack.index() - 1);
     const StepCommand *next = commandAt(m_stack.index());
-    m_undo->setText(past ? past->text().undo() : QCoreApplication::translate("MenuHistory", "Undo"));
-    m_redo->setText(next ? next->text().redo() : QCoreApplication::translate("MenuHistory", "Redo"));
+    m_undo->setText(past ? literal(past->text().undo()) : QCoreApplication::translate("MenuHistory", "Undo"));
+    m_redo->setText(next ? literal(next->text().redo()) : QCoreApplication::translate("MenuHistory", "Redo"));
     m_undo->setEnabled(past);
     m_redo->setEnabled(next);
 }

@@ -37,7 +37,7 @@ void MenuReload::setOn(bool on, QMenu *menu)
     if (!on)
         return;
     m_action = std::make_unique<QAction>(QIcon::fromTheme(QStringLiteral("view-refresh")),
-                                         QCoreApplication::translate("VelMenuView", "Reload"));
+                                         QCoreApplication::translate("VelMenuView", "&Reload"));
     m_action->setObjectName(QStringLiteral("reloadAction"));
     m_action->setShortcut(QKeySequence(Qt::Key_F5));
     m_action->setShortcutContext(Qt::WidgetShortcut);

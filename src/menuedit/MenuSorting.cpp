@@ -41,7 +41,7 @@ MenuSorting::MenuSorting(const ShownMenu &menu, MenuSelection &selection, MenuFi
     , m_find(find)
     , m_voice(voice)
     , m_history(history)
-    , m_action(new QAction(QCoreApplication::translate("VelMenuView", "Sort by &name"), this))
+    , m_action(new QAction(QCoreApplication::translate("VelMenuView", "&Sort by name"), this))
 {
     m_action->setObjectName(QStringLiteral("sortAction"));
     connect(m_action, &QAction::triggered, this, &MenuSorting::sort);

@@ -113,5 +113,5 @@ void MessageLine::updateButton()
 {
     m_button->setVisible(m_undo && m_isUndoable);
     m_button->setEnabled(m_undo && m_undo->isEnabled());
-    m_button->setToolTip(m_undo ? m_undo->text() : QString());
+    m_button->setToolTip(m_undo ? m_undo->toolTip() : QString());
 }

@@ -243,7 +243,7 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);
-        actions->setMovedByKeys(assisted);
+        actions->setAssisted(assisted);
     }
     if (assisted)
         return;

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "HandsOnTestCase.h"
+#include "ModalDriver.h"
 #include "VelMenuDialog.h"
 #include "VelMenuView.h"
 #include "XDoTool.h"
@@ -29,6 +30,7 @@ private Q_SLOTS:
     void isNamedPlainly_data();
     void isNamedPlainly();
     void tellsHowToBeginAnEmptyMenu();
+    void choosesFromTheMenuByLetters();
 
 private:
     void openAssisted(int count);
@@ -287,6 +289,43 @@ void tst_MenuComfortByHand::tellsHowToBeginAnEmptyMenu()
     QTRY_VERIFY(label()->isVisible());
     dialog()->setAssistance(false);
     QVERIFY(!label());
+}
+
+void tst_MenuComfortByHand::choosesFromTheMenuByLetters()
+{
+    writeFolder(QString(), QStringLiteral("Menu"), "b.desktop;a.desktop;c.desktop;");
+    for (const char *name : {"a", "b", "c"})
+        writeEntry(QStringLiteral("%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    openAssisted(3);
+    const auto choose = [](const char *letter) {
+        ModalDriver modal;
+        modal.handle([letter](QWidget *menu) {
+            QTRY_VERIFY_WITH_TIMEOUT(menu->isVisible(), 20000);
+            XDoTool::press(QString::fromLatin1(letter));
+        });
+        XDoTool::press(QStringLiteral("Menu"));
+        QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
+    };
+    clickItem(in("a.desktop"));
+    choose("u");
+    QTRY_COMPARE(rows(menu()), QStringLiteral("a b c"));
+    choose("o");
+    QTRY_COMPARE(rows(menu()), QStringLiteral("b a c"));
+    choose("s");
+    QTRY_COMPARE(rows(menu()), QStringLiteral("a b c"));
+    choose("d");
+    QTRY_COMPARE(rows(menu()), QStringLiteral("b c"));
+    XDoTool::press(QStringLiteral("ctrl+z"));
+    QTRY_COMPARE(rows(menu()), QStringLiteral("a b c"));
+    // The tool bar shows no letters, and takes none.
+    const auto *bar = dialog()->findChild<QToolBar *>();
+    QAction *down = action(view(), QStringLiteral("downAction"));
+    QCOMPARE(down->toolTip().left(4), QStringLiteral("Down"));
+    clickItem(in("a.desktop"));
+    XDoTool::press(QStringLiteral("alt+o"));
+    QTest::qWait(200);
+    QCOMPARE(rows(menu()), QStringLiteral("a b c"));
+    QVERIFY(bar->widgetForAction(down)->isEnabled());
 }
 
 VEL_TEST_MAIN(tst_MenuComfortByHand)

@@ -313,7 +313,13 @@ void tst_MenuDialogAssistance::takesBackWhatItTells()
     QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AB"));
     QVERIFY(!button->isEnabled());
     // It does not offer to take back what it does not tell of.
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("R&D"));
+    clickItem(menu() + QLatin1String("/b.desktop"));
+    XDoTool::press(QStringLiteral("F5"));
+    QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AR&D"));
     clickAction("upAction");
+    QCOMPARE(view().undoAction()->text(), QStringLiteral("Undo reordering of R&&D"));
+    QCOMPARE(button->toolTip(), QStringLiteral("Undo reordering of R&D"));
     filterEdit()->setText(QStringLiteral("nowhere"));
     QTRY_VERIFY(message()->text().startsWith(QLatin1String("Nothing in this menu")));
     QVERIFY(!button->isVisible());

@@ -28,6 +28,7 @@ private Q_SLOTS:
     void offersTheActionsInOrder();
     void givesEachActionItsTextIconAndKey_data();
     void givesEachActionItsTextIconAndKey();
+    void givesEachTextALetterWithAssistance();
     void hasTheActionsInTheViewToo();
     void takesKeysOnlyWhileItHasTheFocus();
     void enablesByRule_data();
@@ -115,6 +116,41 @@ void tst_VelMenuViewActions::givesEachActionItsTextIconAndKey()
     QCOMPARE(found->icon().isNull(), icon.isEmpty());
     QCOMPARE(found->shortcut(), key);
     QVERIFY(qobject_cast<QMenu *>(found->parent()));
+}
+
+// But those to take back and to do again, whose texts change.
+void tst_VelMenuViewActions::givesEachTextALetterWithAssistance()
+{
+    QDir().mkpath(startMenu());
+    VelMenuView view(QString(), -1, true);
+    auto *editMenu = view.findChild<QMenu *>(QString(), Qt::FindDirectChildrenOnly);
+    const auto texts = [editMenu] {
+        QStringList list;
+        const QList<QAction *> actions = editMenu->actions();
+        for (const QAction *action : actions) {
+            if (!action->isSeparator() && !action->objectName().startsWith(QLatin1String("undo"))
+                && !action->objectName().startsWith(QLatin1String("redo")))
+                list.append(action->text());
+        }
+        return list;
+    };
+    const QStringList plain = texts();
+    view.setAssistance(true);
+    QHash<QString, QString> taken;
+    const QStringList assisted = texts();
+    QVERIFY(assisted.size() > plain.size());
+    for (const QString &text : assisted) {
+        const QString letter = QKeySequence::mnemonic(text).toString();
+        QVERIFY2(!letter.isEmpty(), qPrintable(text));
+        QVERIFY2(!taken.contains(letter), qPrintable(text + QLatin1String(", ") + taken.value(letter)));
+        taken.insert(letter, text);
+    }
+    for (const QString &text : plain)
+        QVERIFY2(QStringList(assisted).replaceInStrings(QStringLiteral("&"), QString()).contains(text),
+                 qPrintable(text));
+    view.setAssistance(false);
+    QCOMPARE(texts(), plain);
+    QVERIFY(!plain.join(QString()).contains(QLatin1Char('&')));
 }
 
 void tst_VelMenuViewActions::hasTheActionsInTheViewToo()
