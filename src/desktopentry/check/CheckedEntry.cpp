@@ -1,0 +1,37 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "CheckedEntry.h"
+
+CheckedValue::CheckedValue(const EntryText::Group &inGroup, const EntryText::Key &ofKey,
+                           EntryFindings *findings)
+    : group(inGroup)
+    , key(ofKey)
+    , m_findings(findings)
+{
+}
+
+bool CheckedValue::isMain() const
+{
+    return group.name == "Desktop Entry";
+}
+
+void CheckedValue::add(EntryProblem problem, Severity severity, const QString &sentence) const
+{
+    m_findings->append({problem, severity, QString::fromUtf8(group.name), QString::fromUtf8(key.name),
+                        QString::fromUtf8(key.locale), sentence, std::nullopt});
+}
+
+void CheckedValue::add(EntryProblem problem, Severity severity, const QString &sentence,
+                       const QString &repair, const QVariant &value) const
+{
+    add(problem, severity, sentence);
+    if (canBeRepaired())
+        m_findings->last().repair = EntryRepair{repair, QString::fromUtf8(key.name), value};
+}
+
+// A record changes the last of several lines and leaves the others alone.
+bool CheckedValue::canBeRepaired() const
+{
+    return isMain() && group.count == 1 && key.locale.isEmpty() && EntryText::count(group, key) == 1;
+}
