@@ -1,0 +1,72 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "ProgramSource.h"
+
+#include "ChoiceModel.h"
+
+#include <QDir>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QFileInfo>
+
+namespace VelUI {
+
+namespace {
+
+constexpr qint64 MostMilliseconds = 8;
+
+} // namespace
+
+ProgramSource::ProgramSource()
+{
+    const QStringList folders =
+        QFile::decodeName(qgetenv("PATH")).split(QLatin1Char(':'), Qt::SkipEmptyParts);
+    // A relative one means another folder wherever the program is started.
+    for (const QString &folder : folders) {
+        if (QDir::isAbsolutePath(folder))
+            m_folders.append(QDir::cleanPath(folder));
+    }
+    m_folders.removeDuplicates();
+}
+
+QStringList ProgramSource::headers()
+{
+    return {tr("Program"), tr("Folder")};
+}
+
+bool ProgramSource::openNextFolder()
+{
+    if (m_folders.isEmpty())
+        return false;
+    m_files =
+        std::make_unique<QDirIterator>(m_folders.takeFirst(), QDir::Files | QDir::Executable | QDir::Hidden);
+    return true;
+}
+
+bool ProgramSource::read(ChoiceModel *model)
+{
+    QElapsedTimer timer;
+    timer.start();
+    QVector<Choice> choices;
+    bool isMore = true;
+    while (isMore && timer.elapsed() < MostMilliseconds) {
+        if (!m_files || !m_files->hasNext()) {
+            isMore = openNextFolder();
+            continue;
+        }
+        const QString file = m_files->next();
+        const QString name = m_files->fileName();
+        if (m_names.contains(name))
+            continue;
+        m_names.insert(name);
+        Choice choice;
+        choice.value = name;
+        choice.texts = QStringList{name, QFileInfo(file).path()};
+        choices.append(choice);
+    }
+    model->add(choices);
+    return isMore;
+}
+
+} // namespace VelUI
