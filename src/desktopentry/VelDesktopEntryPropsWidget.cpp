@@ -6,6 +6,7 @@
 #include "ActionListEdit.h"
 #include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
+#include "FieldChoosers.h"
 #include "UrlRow.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 #include "fields/IconEdit.h"
@@ -60,8 +61,11 @@ bool VelDesktopEntryPropsWidget::assistance() const
 
 void VelDesktopEntryPropsWidget::setAssistance(bool assistance)
 {
-    if (assistance != this->assistance())
-        d->assistance = assistance ? std::make_unique<EntryFormAssistance>(*d) : nullptr;
+    if (assistance == this->assistance())
+        return;
+    d->assistance = assistance ? std::make_unique<EntryFormAssistance>(*d) : nullptr;
+    if (d->assistance)
+        new FieldChoosers(d->assistance.get());
 }
 
 void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList &allowedTypes)
