@@ -53,6 +53,7 @@ QToolButton *FieldChoosers::addButton(const FormRow &row, const QString &text, c
     button->setObjectName(QStringLiteral("chooseButton_") + row.key);
     button->setAccessibleName(tr("Choose %1", "name of a \"Choose...\" button").arg(row.label));
     button->setToolTip(tip);
+    button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Fixed); // as wide as those above and below
     m_assistance->addBeside(row, button);
     return button;
 }

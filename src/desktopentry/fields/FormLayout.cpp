@@ -163,6 +163,7 @@ RowSlot *FormLayout::besideRow(int row)
     RowSlot *&slot = m_beside[row];
     if (!slot) {
         slot = makeSlot(row, QBoxLayout::LeftToRight);
+        makeRoomBeside(row);
         addWidget(slot, row * m_spacing, 2);
     }
     return slot;
@@ -185,30 +186,42 @@ RowSlot *FormLayout::makeSlot(int row, QBoxLayout::Direction direction)
     return slot;
 }
 
+// Only the fields that something stands behind end before it.
+void FormLayout::makeRoomBeside(int row)
+{
+    QLayoutItem *const item = rowItem(row, 1);
+    if (!item || item == rowItem(row, 0))
+        return;
+    put(takeAt(indexOf(item)), {row * m_spacing, 1, 1, 1});
+}
+
+void FormLayout::put(QLayoutItem *item, const Cell &cell)
+{
+    if (QLayout *const layout = item->layout())
+        addLayout(layout, cell.row, cell.column, cell.rowSpan, cell.columnSpan);
+    else
+        addItem(item, cell.row, cell.column, cell.rowSpan, cell.columnSpan);
+}
+
 // The grid cannot insert a line: every item is put in anew.
 void FormLayout::moveRows(int spacing)
 {
-    struct Cell
-    {
-        QLayoutItem *item;
-        int row, column, rowSpan, columnSpan;
-    };
-    QVector<Cell> cells(count());
-    for (Cell &cell : cells) {
+    QVector<QPair<QLayoutItem *, Cell>> items(count());
+    for (auto &[item, cell] : items) {
         getItemPosition(0, &cell.row, &cell.column, &cell.rowSpan, &cell.columnSpan);
-        cell.item = takeAt(0);
+        item = takeAt(0);
     }
     QVector<int> stretches;
     for (int line = 0; line < rowCount(); line += m_spacing) {
         stretches.append(rowStretch(line));
         setRowStretch(line, 0);
     }
-    for (const Cell &cell : qAsConst(cells)) {
-        const int line = cell.row / m_spacing * spacing;
-        if (QLayout *const layout = cell.item->layout())
-            addLayout(layout, line, cell.column, cell.rowSpan, cell.columnSpan);
-        else
-            addItem(cell.item, line, cell.column, cell.rowSpan, cell.columnSpan);
+    for (auto &[item, cell] : items) {
+        cell.row = cell.row / m_spacing * spacing;
+        // A field takes the place behind it, too, while nothing is there.
+        if (cell.column == 1)
+            cell.columnSpan = spacing > 1 ? 2 : 1;
+        put(item, cell);
     }
     for (int row = 0; row < stretches.size(); ++row) {
         if (stretches[row])

@@ -48,8 +48,15 @@ public:
     RowSlot *belowRow(int row);
 
 private:
+    struct Cell
+    {
+        int row, column, rowSpan, columnSpan;
+    };
+
     QLayoutItem *rowItem(int row, int column) const { return itemAtPosition(row * m_spacing, column); }
     RowSlot *makeSlot(int row, QBoxLayout::Direction direction);
+    void makeRoomBeside(int row);
+    void put(QLayoutItem *item, const Cell &cell);
     void moveRows(int spacing);
 
     int m_spacing = 1; ///< lines of the grid for each row
