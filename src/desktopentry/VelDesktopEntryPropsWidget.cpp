@@ -7,6 +7,7 @@
 #include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
 #include "FieldChoosers.h"
+#include "FieldDialogSizes.h"
 #include "UrlRow.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 #include "fields/IconEdit.h"
@@ -64,8 +65,10 @@ void VelDesktopEntryPropsWidget::setAssistance(bool assistance)
     if (assistance == this->assistance())
         return;
     d->assistance = assistance ? std::make_unique<EntryFormAssistance>(*d) : nullptr;
-    if (d->assistance)
+    if (d->assistance) {
         new FieldChoosers(d->assistance.get());
+        new FieldDialogSizes(d->assistance.get());
+    }
 }
 
 void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList &allowedTypes)

@@ -50,6 +50,13 @@ public:
     }
 };
 
+QSize kept(const QString &group, QSize fallback)
+{
+    const QSettings settings;
+    return {settings.value(widthKey(group), fallback.width()).toInt(),
+            settings.value(heightKey(group), fallback.height()).toInt()};
+}
+
 void keep(QSettings &settings, const QString &key, int number)
 {
     if (settings.value(key).toString() != QString::number(number))
@@ -60,10 +67,13 @@ void keep(QSettings &settings, const QString &key, int number)
 
 void DialogSize::restore(QWidget &dialog, const QString &group, QSize fallback)
 {
-    const QSettings settings;
-    dialog.resize(settings.value(widthKey(group), fallback.width()).toInt(),
-                  settings.value(heightKey(group), fallback.height()).toInt());
+    dialog.resize(kept(group, fallback));
     new CutWhenShown(&dialog);
+}
+
+void DialogSize::restoreShown(QWidget &dialog, const QString &group)
+{
+    dialog.resize(kept(group, dialog.size()).boundedTo(roomFor(dialog)));
 }
 
 void DialogSize::remember(const QWidget &dialog, const QString &group)

@@ -20,6 +20,13 @@ namespace DialogSize {
 void restore(QWidget &dialog, const QString &group, QSize fallback);
 
 /**
+ * The same for a dialog that is just being shown, which keeps its own size where none is kept.
+ *
+ * For those who cannot reach a dialog before it finds its size.
+ */
+void restoreShown(QWidget &dialog, const QString &group);
+
+/**
  * Keeps the size of \a dialog under \a group.
  *
  * Nothing is written when that size stands there already: QSettings waits for whoever holds the

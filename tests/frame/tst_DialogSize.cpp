@@ -22,6 +22,7 @@ private Q_SLOTS:
     void restores();
     void cutsToTheScreenWhenShown_data();
     void cutsToTheScreenWhenShown();
+    void restoresWhileItIsShown();
     void remembers();
     void writesNothingWhenTheSizeStandsThere();
     void waitsForNobodyWhenTheSizeStandsThere();
@@ -99,6 +100,19 @@ void tst_DialogSize::cutsToTheScreenWhenShown()
     dialog.hide();
     dialog.show();
     QCOMPARE(dialog.size(), kept.expandedTo(least));
+}
+
+void tst_DialogSize::restoresWhileItIsShown()
+{
+    QDialog dialog;
+    dialog.resize(310, 210);
+    DialogSize::restoreShown(dialog, QStringLiteral("Shown"));
+    QCOMPARE(dialog.size(), QSize(310, 210));
+    QSettings().setValue(QStringLiteral("Shown/Width"), 320);
+    QSettings().setValue(QStringLiteral("Shown/Height"), 90000);
+    DialogSize::restoreShown(dialog, QStringLiteral("Shown"));
+    QCOMPARE(dialog.width(), 320);
+    QVERIFY(dialog.height() > 210 && dialog.height() <= dialog.screen()->availableSize().height());
 }
 
 void tst_DialogSize::remembers()

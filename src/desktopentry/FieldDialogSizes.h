@@ -1,0 +1,31 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QObject>
+
+class QDialog;
+
+namespace VelUI {
+
+class EntryFormAssistance;
+
+/// Remembers the sizes of the dialogs that the fields of the assisted form open: those of lists, of
+/// actions, and of one action.
+class FieldDialogSizes : public QObject
+{
+    Q_OBJECT
+
+public:
+    /// Watches the fields of the form of \a assistance, which owns this.
+    explicit FieldDialogSizes(EntryFormAssistance *assistance);
+
+protected:
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    void watch(QDialog *dialog);
+};
+
+} // namespace VelUI

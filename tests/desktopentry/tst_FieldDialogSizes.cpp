@@ -1,0 +1,129 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FormDriving.h"
+#include "PropsFormTestCase.h"
+
+#include <VelDesktopEntryPropsWidget.h>
+
+#include <QListWidget>
+#include <QSettings>
+#include <QToolButton>
+
+using namespace FormDriving;
+
+namespace {
+
+const QByteArray Contents = "[Desktop Entry]\nType=Application\nName=x\nExec=x\nKeywords=a;\nActions=one;\n"
+                            "[Desktop Action one]\nName=One\nExec=one\n";
+
+// The next window: notes its size, takes another one, and does the rest.
+void resize(
+    ModalDriver &modal, QSize *found, const QSize &size,
+    const std::function<void(QWidget *)> &act = [](QWidget *window) { click(cancelButton(window)); })
+{
+    modal.handle([found, size, act](QWidget *window) {
+        *found = window->size();
+        window->resize(size);
+        QTRY_COMPARE(window->size(), size);
+        act(window);
+    });
+}
+
+void editFirstAction(QWidget *window)
+{
+    auto *list = window->findChild<QListWidget *>();
+    list->setCurrentRow(0);
+    child<QPushButton>(window, "editButton")->click();
+    click(cancelButton(window));
+}
+
+} // namespace
+
+class tst_FieldDialogSizes : public PropsFormTestCase
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void areThoseOfThePlainFormWithoutAssistance();
+    void areRememberedWithAssistance();
+    void areKeptFromOneFormToTheNext();
+    void doNotHoldTheFormThatGoes();
+
+private:
+    struct Sizes
+    {
+        QSize list;
+        QSize actions;
+        QSize action;
+    };
+    Sizes openAll(bool assistance, const Sizes &next);
+};
+
+// Opens the dialogs of a list, of the actions and of one action, and gives them other sizes.
+tst_FieldDialogSizes::Sizes tst_FieldDialogSizes::openAll(bool assistance, const Sizes &next)
+{
+    VelDesktopEntryPropsWidget form;
+    form.setAssistance(assistance);
+    form.loadFrom(entry(Contents));
+    form.show();
+    Sizes found;
+    ModalDriver modal;
+    resize(modal, &found.list, next.list);
+    child<QWidget>(&form, "keywordsEdit")->findChild<QToolButton *>()->click();
+    resize(modal, &found.actions, next.actions, editFirstAction);
+    resize(modal, &found.action, next.action);
+    child<QWidget>(&form, "actionsEdit")->findChild<QToolButton *>()->click();
+    if (!modal.finished())
+        QTest::qFail("not every dialog opened", __FILE__, __LINE__);
+    return found;
+}
+
+void tst_FieldDialogSizes::areThoseOfThePlainFormWithoutAssistance()
+{
+    const Sizes other{{500, 350}, {510, 360}, {520, 470}};
+    const Sizes first = openAll(false, other);
+    QCOMPARE(first.list, QSize(400, 300));
+    QCOMPARE(first.actions, QSize(400, 300));
+    const Sizes second = openAll(false, other);
+    QCOMPARE(second.list, first.list);
+    QCOMPARE(second.actions, first.actions);
+    QCOMPARE(second.action, first.action);
+    QVERIFY(QSettings().allKeys().isEmpty());
+}
+
+void tst_FieldDialogSizes::areRememberedWithAssistance()
+{
+    const Sizes plain = openAll(false, {{500, 350}, {510, 360}, {520, 470}});
+    const Sizes first = openAll(true, {{530, 380}, {540, 390}, {550, 500}});
+    QCOMPARE(first.list, plain.list);
+    QCOMPARE(first.actions, plain.actions);
+    QCOMPARE(first.action, plain.action);
+    const Sizes second = openAll(true, {{400, 300}, {400, 300}, {550, 500}});
+    QCOMPARE(second.list, QSize(530, 380));
+    QCOMPARE(second.actions, QSize(540, 390));
+    QCOMPARE(second.action, QSize(550, 500));
+}
+
+void tst_FieldDialogSizes::areKeptFromOneFormToTheNext()
+{
+    QSettings().setValue(QStringLiteral("EditStringsDialog/Width"), 444);
+    QSettings().setValue(QStringLiteral("EditStringsDialog/Height"), 333);
+    QCOMPARE(openAll(true, {{400, 300}, {400, 300}, {550, 500}}).list, QSize(444, 333));
+    QCOMPARE(openAll(false, {{410, 310}, {400, 300}, {550, 500}}).list, QSize(400, 300));
+    QCOMPARE(QSettings().value(QStringLiteral("EditStringsDialog/Width")).toInt(), 400);
+}
+
+void tst_FieldDialogSizes::doNotHoldTheFormThatGoes()
+{
+    auto *form = new VelDesktopEntryPropsWidget;
+    form->setAssistance(true);
+    ModalDriver modal;
+    modal.handle([form](QWidget *) { delete form; });
+    child<QWidget>(form, "keywordsEdit")->findChild<QToolButton *>()->click();
+    QVERIFY(modal.finished());
+}
+
+VEL_TEST_MAIN(tst_FieldDialogSizes)
+
+#include "tst_FieldDialogSizes.moc"
