@@ -61,7 +61,9 @@ QVector<Choice> CategoryChooser::choices(const QStringList &current)
     for (const QString &category : qAsConst(unknown)) {
         if (!RegisteredCategories::find(category))
             add(category,
-                RegisteredCategories::isExtension(category) ? tr("Extension") : tr("Not registered"),
+                RegisteredCategories::isExtension(category)
+                    ? tr("Extension", "a category of somebody's own, X-...")
+                    : tr("Not registered"),
                 Unknown);
     }
     return choices;
@@ -70,7 +72,8 @@ QVector<Choice> CategoryChooser::choices(const QStringList &current)
 std::optional<QStringList> CategoryChooser::choose(QWidget *parent, const QStringList &current)
 {
     const ChoiceDialog::Texts texts{tr("Choose categories"),
-                                    {tr("Name"), tr("Category"), tr("Remark")},
+                                    {tr("Name", "title of a column"), tr("Category", "title of a column"),
+                                     tr("Remark", "title of a column")},
                                     QStringLiteral("CategoryChooser")};
     GuardedDialog<ChoiceDialog> dialog(ChoiceModel::Kind::Several, texts, parent);
     dialog->model()->add(choices(current));

@@ -85,7 +85,7 @@ void FieldChoosers::addProgramButton(const QString &key, TakeProgram take)
 void FieldChoosers::addFieldCodes(const QString &key)
 {
     const FormRow &row = *m_assistance->row(key);
-    auto *button = new ChooserButton(tr("Insert"), row.field, false);
+    auto *button = new ChooserButton(tr("Insert", "button: a field code"), row.field, false);
     button->setObjectName(QStringLiteral("fieldCodeButton"));
     button->setAccessibleName(tr("Insert a field code"));
     button->setToolTip(tr("Inserts a code that stands for the files to open, or for a part of this entry"));

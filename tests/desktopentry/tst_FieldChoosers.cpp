@@ -87,6 +87,7 @@ class tst_FieldChoosers : public PropsFormTestCase
 
 private Q_SLOTS:
     void areThereWithAssistanceAlone();
+    void leaveTheOtherFieldsTheirRoom();
     void followTheTypeOfTheEntry();
     void followTheChosenListOfDesktops();
     void areGoneWhileTheFormIsReadOnly();
@@ -122,6 +123,19 @@ void tst_FieldChoosers::areThereWithAssistanceAlone()
     QCOMPARE(namesOfButtons(&form), QStringList());
     form.setAssistance(true);
     QCOMPARE(namesOfButtons(&form), ButtonsOfApplications);
+}
+
+void tst_FieldChoosers::leaveTheOtherFieldsTheirRoom()
+{
+    const OpenForm open;
+    QVERIFY(open.isActive);
+    const auto end = [&open](const QWidget *widget) {
+        return widget->mapTo(open.form, widget->rect().bottomRight()).x();
+    };
+    QTRY_COMPARE_WITH_TIMEOUT(end(child<QWidget>(open.form, "nameEdit")), end(open.button("TryExec")),
+                              Patience);
+    QCOMPARE(end(child<QToolButton>(open.form, "fieldCodeButton")), end(open.button("TryExec")));
+    QVERIFY(end(child<QWidget>(open.form, "tryExecEdit")) < end(open.button("TryExec")));
 }
 
 void tst_FieldChoosers::followTheTypeOfTheEntry()

@@ -42,8 +42,9 @@ QVector<Choice> choices(const QStringList &current, const QString &sessionNote, 
 std::optional<QStringList> DesktopChooser::choose(QWidget *parent, const QString &title,
                                                   const QStringList &current)
 {
-    const ChoiceDialog::Texts texts{
-        title, {tr("Desktop environment"), tr("Remark")}, QStringLiteral("DesktopChooser")};
+    const ChoiceDialog::Texts texts{title,
+                                    {tr("Desktop environment"), tr("Remark", "title of a column")},
+                                    QStringLiteral("DesktopChooser")};
     GuardedDialog<ChoiceDialog> dialog(ChoiceModel::Kind::Several, texts, parent);
     dialog->model()->add(choices(current, tr("This session"), tr("Not registered")));
     dialog->setChosen(current);

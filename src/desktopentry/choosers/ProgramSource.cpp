@@ -32,7 +32,7 @@ ProgramSource::ProgramSource()
 
 QStringList ProgramSource::headers()
 {
-    return {tr("Program"), tr("Folder")};
+    return {tr("Program", "title of a column"), tr("Folder", "title of a column")};
 }
 
 bool ProgramSource::openNextFolder()
