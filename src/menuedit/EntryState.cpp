@@ -4,20 +4,13 @@
 #include "EntryState.h"
 
 #include <frame/DesktopEntryRecord.h>
+#include <frame/DesktopNames.h>
 #include <frame/Undisplayable.h>
 
 #include <QCoreApplication>
 #include <QFileInfo>
 
 namespace {
-
-// As the records read it.
-QStringList currentDesktops()
-{
-    const QStringList desktops =
-        QString::fromLocal8Bit(qgetenv("XDG_CURRENT_DESKTOP")).split(QLatin1Char(':'), Qt::SkipEmptyParts);
-    return desktops.isEmpty() ? QStringList{QStringLiteral("VEL")} : desktops;
-}
 
 QString desktopsOf(const VelUIDesktopEntry &entry)
 {
@@ -94,7 +87,7 @@ bool EntryState::showAgain(const QString &path)
     entry.setHidden(false);
     entry.setNoDisplay(false);
     if (of(entry) == Kind::ForOtherDesktops) {
-        const QStringList desktops = currentDesktops();
+        const QStringList desktops = DesktopNames::ofSession();
         QStringList others = entry.getNotShowIn();
         for (const QString &desktop : desktops)
             others.removeAll(desktop);

@@ -4,8 +4,8 @@
 #include "DesktopChooser.h"
 
 #include "ChoiceDialog.h"
-#include "DesktopNames.h"
 
+#include <frame/DesktopNames.h>
 #include <frame/GuardedDialog.h>
 
 namespace VelUI {

@@ -3,9 +3,7 @@
 
 #include "TestCase.h"
 
-#include <desktopentry/choosers/DesktopNames.h>
-
-using namespace VelUI;
+#include <frame/DesktopNames.h>
 
 class tst_DesktopNames : public TestCase
 {

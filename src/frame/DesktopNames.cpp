@@ -3,8 +3,6 @@
 
 #include "DesktopNames.h"
 
-namespace VelUI {
-
 QStringList DesktopNames::registered()
 {
     return {
@@ -28,5 +26,3 @@ QStringList DesktopNames::ofSession()
     const QStringList names = desktops.split(QLatin1Char(':'), Qt::SkipEmptyParts);
     return names.isEmpty() ? QStringList(QStringLiteral("VEL")) : names;
 }
-
-} // namespace VelUI

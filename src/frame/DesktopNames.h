@@ -6,7 +6,7 @@
 #include <QStringList>
 
 /// The desktop environments that OnlyShowIn and NotShowIn may name.
-namespace VelUI::DesktopNames {
+namespace DesktopNames {
 
 /// Those that are registered with freedesktop.org, in alphabetical order.
 QStringList registered();
@@ -14,4 +14,4 @@ QStringList registered();
 /// Those that the session of this user says it is.
 QStringList ofSession();
 
-} // namespace VelUI::DesktopNames
+} // namespace DesktopNames
