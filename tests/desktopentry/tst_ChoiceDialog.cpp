@@ -12,10 +12,15 @@
 #include <desktopentry/choosers/ProgramChooser.h>
 
 #include <QAbstractItemView>
+#include <QAccessible>
 #include <QLabel>
 #include <QSettings>
 #include <QSignalSpy>
 #include <QTreeView>
+
+#include <private/qguiapplication_p.h>
+#include <qpa/qplatformaccessibility.h>
+#include <qpa/qplatformintegration.h>
 
 using namespace FormDriving;
 using namespace VelUI;
@@ -105,6 +110,48 @@ private:
     int *const m_steps;
 };
 
+// Hears what a screen reader hears of boxes and alerts.
+class Listener
+{
+public:
+    Listener()
+        : m_former(QAccessible::installUpdateHandler(hear))
+    {
+        platform()->setActive(true);
+        heard().clear();
+    }
+    ~Listener()
+    {
+        QAccessible::installUpdateHandler(m_former);
+        platform()->setActive(false);
+    }
+
+    static QStringList &heard()
+    {
+        static QStringList heard;
+        return heard;
+    }
+
+private:
+    static QPlatformAccessibility *platform()
+    {
+        return QGuiApplicationPrivate::platformIntegration()->accessibility();
+    }
+    static void hear(QAccessibleEvent *event)
+    {
+        QAccessibleInterface *const who = event->accessibleInterface();
+        const QString name = who->text(QAccessible::Name);
+        if (event->type() == QAccessible::Alert)
+            heard().append(name);
+        else if (event->type() == QAccessible::StateChanged
+                 && static_cast<QAccessibleStateChangeEvent *>(event)->changedStates().checked)
+            heard().append(
+                name + (who->state().checked ? QStringLiteral(" checked") : QStringLiteral(" not checked")));
+    }
+
+    const QAccessible::UpdateHandler m_former;
+};
+
 } // namespace
 
 /// Keyboard and mouse in the dialog of the choosers.
@@ -124,6 +171,7 @@ private Q_SLOTS:
     void offersNoneWhereNothingMatches();
     void readsWhileTheUserWorks();
     void speaksItsParts();
+    void speaksWhatChanges();
     void remembersItsSize();
     void choosesAMimeTypeByItsSuffix();
     void marksTheDesktopOfTheSession();
@@ -276,6 +324,20 @@ void tst_ChoiceDialog::speaksItsParts()
     QCOMPARE(view->accessibleName(), QStringLiteral("Choose animals"));
     QVERIFY(view->model()->setData(view->model()->index(0, 0), Qt::Checked, Qt::CheckStateRole));
     QCOMPARE(view->accessibleDescription(), QStringLiteral("1 chosen"));
+}
+
+void tst_ChoiceDialog::speaksWhatChanges()
+{
+    OpenDialog open(ChoiceModel::Kind::Several);
+    QVERIFY(open.isActive);
+    const Listener listener;
+    XDoTool::run(QStringLiteral("key d Down space"));
+    QTRY_COMPARE_WITH_TIMEOUT(open.rows(), QStringLiteral("Dog*"), Patience);
+    XDoTool::run(QStringLiteral("key space q"));
+    QTRY_COMPARE_WITH_TIMEOUT(open.rows(), QString(), Patience);
+    QCOMPARE(Listener::heard(),
+             (QStringList{QStringLiteral("Dog checked"), QStringLiteral("Dog not checked"),
+                          QStringLiteral("No match")}));
 }
 
 void tst_ChoiceDialog::remembersItsSize()

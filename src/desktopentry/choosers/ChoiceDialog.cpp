@@ -9,6 +9,7 @@
 
 #include <frame/DialogSize.h>
 
+#include <QAccessible>
 #include <QCoreApplication>
 #include <QDialogButtonBox>
 #include <QHBoxLayout>
@@ -146,9 +147,18 @@ void ChoiceDialog::rowsChanged()
         m_view->scrollToTop();
     }
     const bool isEmpty = m_filter->rowCount() == 0;
-    m_stateLabel->setText(m_source ? tr("Reading...") : isEmpty ? tr("No match") : QString());
+    showState(m_source ? tr("Reading...") : isEmpty ? tr("No match") : QString());
     if (!isSeveral())
         m_buttons->button(QDialogButtonBox::Ok)->setDisabled(isEmpty);
+}
+
+void ChoiceDialog::showState(const QString &state)
+{
+    if (state == m_stateLabel->text())
+        return;
+    m_stateLabel->setText(state);
+    QAccessibleEvent event(m_stateLabel, QAccessible::Alert);
+    QAccessible::updateAccessibility(&event);
 }
 
 void ChoiceDialog::showCount()

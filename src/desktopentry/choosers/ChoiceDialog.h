@@ -64,6 +64,7 @@ private:
     void enterList();
     void filterChanged();
     void rowsChanged();
+    void showState(const QString &state);
     void showCount();
     void readSome();
 

@@ -3,6 +3,7 @@
 
 #include "ChoiceView.h"
 
+#include <QAccessible>
 #include <QHeaderView>
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -79,6 +80,30 @@ void ChoiceView::beginAtFirst()
 {
     if (!currentIndex().isValid() && model()->rowCount() > 0)
         setCurrentIndex(model()->index(0, 0));
+}
+
+void ChoiceView::dataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
+                             const QVector<int> &roles)
+{
+    QTreeView::dataChanged(topLeft, bottomRight, roles);
+    if (topLeft == bottomRight && roles == QVector<int>{Qt::CheckStateRole})
+        speakBox(topLeft);
+}
+
+// Qt tells screen readers that something changed, but not what.
+void ChoiceView::speakBox(const QModelIndex &index)
+{
+    if (!QAccessible::isActive() || !isVisible())
+        return;
+    QAccessibleInterface *const view = QAccessible::queryAccessibleInterface(this);
+    QAccessibleInterface *const cell =
+        view ? view->tableInterface()->cellAt(index.row(), index.column()) : nullptr;
+    if (!cell)
+        return;
+    QAccessible::State changed;
+    changed.checked = true;
+    QAccessibleStateChangeEvent event(cell, changed);
+    QAccessible::updateAccessibility(&event);
 }
 
 bool ChoiceView::toggleCurrent()

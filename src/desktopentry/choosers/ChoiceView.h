@@ -17,6 +17,8 @@ public:
     explicit ChoiceView(QWidget *parent = nullptr);
 
     void setModel(QAbstractItemModel *model) override;
+    void dataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,
+                     const QVector<int> &roles = QVector<int>()) override;
     /// Makes the first row current unless another one is.
     void beginAtFirst();
 
@@ -31,6 +33,7 @@ protected:
 
 private:
     bool toggleCurrent();
+    void speakBox(const QModelIndex &index);
 };
 
 } // namespace VelUI
