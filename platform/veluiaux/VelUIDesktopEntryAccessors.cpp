@@ -8,7 +8,22 @@
 #include "VelUIDesktopEntryData.h"
 #include "records/DesktopEntryNames.h"
 
+#include <algorithm>
+
 namespace Names = DesktopEntryNames;
+
+namespace {
+
+// Another text would end the name of the key, or the line.
+bool canStandInKey(const QString &language)
+{
+    return !language.isEmpty() && std::all_of(language.begin(), language.end(), [](QChar character) {
+        return character > QLatin1Char(' ') && character != QLatin1Char('[') && character != QLatin1Char(']')
+            && character != QLatin1Char('=');
+    });
+}
+
+} // namespace
 
 QString VelUIDesktopEntry::getName() const
 {
@@ -248,6 +263,39 @@ QStringList VelUIDesktopEntry::getLocalKeywords() const
 void VelUIDesktopEntry::setLocalKeywords(const QStringList &value)
 {
     d->document.setLocalList(Names::MainGroup, Names::Keywords, value);
+}
+
+QStringList VelUIDesktopEntry::getLanguages(const QString &key) const
+{
+    return d->document.languages(Names::MainGroup, key.toStdString());
+}
+
+QString VelUIDesktopEntry::getLanguageInForce(const QString &key) const
+{
+    return d->document.languageInForce(Names::MainGroup, key.toStdString());
+}
+
+QString VelUIDesktopEntry::getTranslation(const QString &key, const QString &language) const
+{
+    return d->document.text(Names::MainGroup, key.toStdString(), language.toStdString());
+}
+
+void VelUIDesktopEntry::setTranslation(const QString &key, const QString &language, const QString &value)
+{
+    if (canStandInKey(language))
+        d->document.setText(Names::MainGroup, key.toStdString(), value, language.toStdString());
+}
+
+QStringList VelUIDesktopEntry::getTranslatedList(const QString &key, const QString &language) const
+{
+    return d->document.list(Names::MainGroup, key.toStdString(), language.toStdString());
+}
+
+void VelUIDesktopEntry::setTranslatedList(const QString &key, const QString &language,
+                                          const QStringList &value)
+{
+    if (canStandInKey(language))
+        d->document.setList(Names::MainGroup, key.toStdString(), value, language.toStdString());
 }
 
 QStringList VelUIDesktopEntry::getSortOrder() const

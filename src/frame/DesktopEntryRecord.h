@@ -91,6 +91,19 @@ VEL_RECORD_NEEDS_VALUE(VelUIDesktopEntry, QStringList, LocalKeywords);
 VEL_RECORD_NEEDS_VALUE(VelUIDesktopEntry, QStringList, SortOrder);
 VEL_RECORD_NEEDS_VALUE(VelUIDesktopEntry, QList<VelUIDesktopAction>, Actions);
 
+VEL_RECORD_NEEDS(const VelUIDesktopEntry, QStringList, getLanguages(std::declval<const QString &>()));
+VEL_RECORD_NEEDS(const VelUIDesktopEntry, QString, getLanguageInForce(std::declval<const QString &>()));
+VEL_RECORD_NEEDS(const VelUIDesktopEntry, QString,
+                 getTranslation(std::declval<const QString &>(), std::declval<const QString &>()));
+VEL_RECORD_NEEDS(VelUIDesktopEntry, void,
+                 setTranslation(std::declval<const QString &>(), std::declval<const QString &>(),
+                                std::declval<const QString &>()));
+VEL_RECORD_NEEDS(const VelUIDesktopEntry, QStringList,
+                 getTranslatedList(std::declval<const QString &>(), std::declval<const QString &>()));
+VEL_RECORD_NEEDS(VelUIDesktopEntry, void,
+                 setTranslatedList(std::declval<const QString &>(), std::declval<const QString &>(),
+                                   std::declval<const QStringList &>()));
+
 // The command line of an entry.
 VEL_RECORD_NEEDS_CONSTRUCTOR(VelUIDesktopEntry::ExecFormatString, const QString &);
 VEL_RECORD_NEEDS(VelUIDesktopEntry::ExecFormatString, VelUIDesktopEntry::ExecFormatString &,

@@ -120,15 +120,16 @@ void tst_DesktopEntryRecord::reliesOnNothingThatItDoesNotCheck_data()
     QTest::addColumn<QString>("operations");
     QTest::addColumn<QString>("values"); // with a getter and a setter each
 
-    QTest::newRow("entry") << QStringLiteral("VelUIDesktopEntry.h")
-                           << QStringLiteral(
-                                  "setFilePath load save contents isValid inheritFrom isSuitable isDisplayable")
-                           << QStringLiteral(
-                                  "Type Name LocalName GenericName LocalGenericName Comment "
-                                  "LocalComment Icon LocalIcon Exec TryExec Path URL "
-                                  "StartupWMClass Version Terminal NoDisplay Hidden StartupNotify "
-                                  "OnlyShowIn NotShowIn MimeType Categories Keywords LocalKeywords "
-                                  "SortOrder Actions");
+    QTest::newRow("entry")
+        << QStringLiteral("VelUIDesktopEntry.h")
+        << QStringLiteral(
+               "setFilePath load save contents isValid inheritFrom isSuitable isDisplayable getLanguages "
+               "getLanguageInForce getTranslation setTranslation getTranslatedList setTranslatedList")
+        << QStringLiteral("Type Name LocalName GenericName LocalGenericName Comment "
+                          "LocalComment Icon LocalIcon Exec TryExec Path URL "
+                          "StartupWMClass Version Terminal NoDisplay Hidden StartupNotify "
+                          "OnlyShowIn NotShowIn MimeType Categories Keywords LocalKeywords "
+                          "SortOrder Actions");
     QTest::newRow("command line") << QStringLiteral("VelUIDesktopEntry.h")
                                   << QStringLiteral(
                                          "filePath url appName icon desktopFilePath filePathList urlList")

@@ -112,9 +112,9 @@ bool EntryDocument::has(std::string_view group, std::string_view key) const
     return this->group(group).value(key).has_value();
 }
 
-QString EntryDocument::text(std::string_view group, std::string_view key) const
+QString EntryDocument::text(std::string_view group, std::string_view key, std::string_view language) const
 {
-    return this->group(group).text(key);
+    return this->group(group).text(key, language);
 }
 
 QString EntryDocument::localText(std::string_view group, std::string_view key) const
@@ -122,9 +122,9 @@ QString EntryDocument::localText(std::string_view group, std::string_view key) c
     return this->group(group).localText(key);
 }
 
-QStringList EntryDocument::list(std::string_view group, std::string_view key) const
+QStringList EntryDocument::list(std::string_view group, std::string_view key, std::string_view language) const
 {
-    return this->group(group).list(key);
+    return this->group(group).list(key, language);
 }
 
 QStringList EntryDocument::localList(std::string_view group, std::string_view key) const
@@ -137,10 +137,36 @@ bool EntryDocument::flag(std::string_view group, std::string_view key) const
     return this->group(group).flag(key);
 }
 
-void EntryDocument::setText(std::string_view group, std::string_view key, const QString &value)
+QStringList EntryDocument::languages(std::string_view group, std::string_view key) const
 {
-    if (text(group, key) != value)
-        write(group, key, {}, value);
+    QStringList found;
+    const GroupValues values = this->group(group);
+    const auto add = [&](std::string_view language) {
+        const QString name = QString::fromUtf8(language.data(), int(language.size()));
+        if (!language.empty() && values.value(key, language) && !found.contains(name))
+            found.append(name);
+    };
+    m_text->forEachVariant(values.group(), key,
+                           [&](const DesktopEntryText::Key &line) { add(m_text->locale(line)); });
+    for (const auto &change : m_changes.all()) {
+        if (change.group == group && change.key == key)
+            add(change.locale);
+    }
+    return found;
+}
+
+QString EntryDocument::languageInForce(std::string_view group, std::string_view key) const
+{
+    std::string locale;
+    this->group(group).readLocal<QString>(key, &locale);
+    return QString::fromStdString(locale);
+}
+
+void EntryDocument::setText(std::string_view group, std::string_view key, const QString &value,
+                            std::string_view language)
+{
+    if (text(group, key, language) != value)
+        write(group, key, language, value);
 }
 
 void EntryDocument::setLocalText(std::string_view group, std::string_view key, const QString &value)
@@ -148,11 +174,12 @@ void EntryDocument::setLocalText(std::string_view group, std::string_view key, c
     writeLocal(group, key, value);
 }
 
-void EntryDocument::setList(std::string_view group, std::string_view key, const QStringList &value)
+void EntryDocument::setList(std::string_view group, std::string_view key, const QStringList &value,
+                            std::string_view language)
 {
     const QStringList items = withoutEmpty(value);
-    if (list(group, key) != items)
-        write(group, key, {}, items);
+    if (list(group, key, language) != items)
+        write(group, key, language, items);
 }
 
 void EntryDocument::setLocalList(std::string_view group, std::string_view key, const QStringList &value)

@@ -46,15 +46,21 @@ public:
 
     /// Whether the key stands in the entry, if only with an empty value.
     bool has(std::string_view group, std::string_view key) const;
-    QString text(std::string_view group, std::string_view key) const;
+    QString text(std::string_view group, std::string_view key, std::string_view language = {}) const;
     QString localText(std::string_view group, std::string_view key) const;
-    QStringList list(std::string_view group, std::string_view key) const;
+    QStringList list(std::string_view group, std::string_view key, std::string_view language = {}) const;
     QStringList localList(std::string_view group, std::string_view key) const;
     bool flag(std::string_view group, std::string_view key) const;
+    /// The languages that the key has a value for, in the order of the file, then of the setting.
+    QStringList languages(std::string_view group, std::string_view key) const;
+    /// The language whose value localText() and localList() give.
+    QString languageInForce(std::string_view group, std::string_view key) const;
 
-    void setText(std::string_view group, std::string_view key, const QString &value);
+    void setText(std::string_view group, std::string_view key, const QString &value,
+                 std::string_view language = {});
     void setLocalText(std::string_view group, std::string_view key, const QString &value);
-    void setList(std::string_view group, std::string_view key, const QStringList &value);
+    void setList(std::string_view group, std::string_view key, const QStringList &value,
+                 std::string_view language = {});
     void setLocalList(std::string_view group, std::string_view key, const QStringList &value);
     void setFlag(std::string_view group, std::string_view key, bool value);
 

@@ -35,9 +35,9 @@ GroupValues::Value GroupValues::value(std::string_view key, std::string_view loc
 }
 
 template <typename T>
-std::optional<T> GroupValues::read(std::string_view key) const
+std::optional<T> GroupValues::read(std::string_view key, std::string_view language) const
 {
-    const Value bytes = value(key);
+    const Value bytes = value(key, language);
     return bytes ? DesktopEntryValue::decode<T>(*bytes) : std::nullopt;
 }
 
@@ -67,8 +67,8 @@ std::optional<T> GroupValues::readLocal(std::string_view key, std::string *local
     return std::nullopt;
 }
 
-template std::optional<QString> GroupValues::read(std::string_view key) const;
-template std::optional<QStringList> GroupValues::read(std::string_view key) const;
+template std::optional<QString> GroupValues::read(std::string_view key, std::string_view language) const;
+template std::optional<QStringList> GroupValues::read(std::string_view key, std::string_view language) const;
 template std::optional<QString> GroupValues::readLocal(std::string_view key, std::string *locale) const;
 template std::optional<QStringList> GroupValues::readLocal(std::string_view key, std::string *locale) const;
 

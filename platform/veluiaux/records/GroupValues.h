@@ -37,14 +37,20 @@ public:
 
     /// The value as QString or QStringList; none if it is missing or malformed.
     template <typename T>
-    std::optional<T> read(std::string_view key) const;
+    std::optional<T> read(std::string_view key, std::string_view language = {}) const;
     /// The value in the user's language, and of which variant it is.
     template <typename T>
     std::optional<T> readLocal(std::string_view key, std::string *locale = nullptr) const;
 
-    QString text(std::string_view key) const { return read<QString>(key).value_or(QString()); }
+    QString text(std::string_view key, std::string_view language = {}) const
+    {
+        return read<QString>(key, language).value_or(QString());
+    }
     QString localText(std::string_view key) const { return readLocal<QString>(key).value_or(QString()); }
-    QStringList list(std::string_view key) const { return read<QStringList>(key).value_or(QStringList()); }
+    QStringList list(std::string_view key, std::string_view language = {}) const
+    {
+        return read<QStringList>(key, language).value_or(QStringList());
+    }
     QStringList localList(std::string_view key) const
     {
         return readLocal<QStringList>(key).value_or(QStringList());

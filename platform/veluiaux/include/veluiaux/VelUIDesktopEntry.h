@@ -254,6 +254,20 @@ public:
     QStringList getLocalKeywords() const;
     /// Sets the search words in the user's language.
     void setLocalKeywords(const QStringList &value);
+
+    /// Returns the languages in which \a key has a value, as they stand in the file: "de", "pt_BR".
+    QStringList getLanguages(const QString &key) const;
+    /// Returns the language whose value the "Local" getter of \a key gives; empty when it gives none.
+    QString getLanguageInForce(const QString &key) const;
+    /// Returns the value of \a key, such as "Name", for exactly \a language.
+    QString getTranslation(const QString &key, const QString &language) const;
+    /// Sets the value of \a key for exactly \a language; nothing where that cannot stand in a key.
+    void setTranslation(const QString &key, const QString &language, const QString &value);
+    /// Returns the list that \a key, such as "Keywords", has for exactly \a language.
+    QStringList getTranslatedList(const QString &key, const QString &language) const;
+    /// Sets the list that \a key has for exactly \a language.
+    void setTranslatedList(const QString &key, const QString &language, const QStringList &value);
+
     /// Returns the order of a folder's items, as its ".directory" entry gives it.
     QStringList getSortOrder() const;
     /// Sets the order of a folder's items, as its ".directory" entry gives it.
