@@ -3,76 +3,42 @@
 
 #include "EntryFormAssistance.h"
 
+#include "LanguageBar.h"
+#include "LanguageRows.h"
 #include "fields/FormLayout.h"
 #include "fields/RowSlot.h"
-
-#include <QWidget>
+#include "fields/TabOrder.h"
 
 #include <algorithm>
-#include <initializer_list>
 
 namespace VelUI {
 
-namespace {
-
-// What the Tab key comes to in a widget, in its order.
-QVector<QWidget *> tabOrder(QWidget *widget)
-{
-    QVector<QWidget *> found;
-    QWidget *next = widget;
-    do {
-        if ((next->focusPolicy() & Qt::TabFocus) && !next->focusProxy()
-            && (next == widget || widget->isAncestorOf(next)))
-            found.append(next);
-        next = next->nextInFocusChain();
-    } while (next != widget);
-    return found;
-}
-
-QWidget *lastOf(std::initializer_list<QWidget *> widgets)
-{
-    QWidget *last = nullptr;
-    for (QWidget *widget : widgets) {
-        const QVector<QWidget *> order = tabOrder(widget);
-        if (!order.isEmpty())
-            last = order.constLast();
-    }
-    return last;
-}
-
-void putBehind(QWidget *last, QWidget *widget)
-{
-    const QVector<QWidget *> order = tabOrder(widget);
-    for (QWidget *next : order) {
-        if (last)
-            QWidget::setTabOrder(last, next);
-        last = next;
-    }
-}
-
-} // namespace
-
 EntryFormAssistance::EntryFormAssistance(EntryFormHost &form)
     : m_form(form)
+    , m_rows(form.formRows())
 {
     m_form.formLayout()->spread();
+    m_languageRows = std::make_unique<LanguageRows>(m_form, m_rows);
+    m_bar = std::make_unique<LanguageBar>(m_form, *m_languageRows);
     connect(&m_form, &EntryFormHost::recordChanged, this, &EntryFormAssistance::recordChanged);
 }
 
 EntryFormAssistance::~EntryFormAssistance()
 {
+    m_bar.reset();
+    m_languageRows.reset();
     m_form.formLayout()->pack();
 }
 
 const QVector<FormRow> &EntryFormAssistance::rows() const
 {
-    return m_form.formRows();
+    return m_rows;
 }
 
 const FormRow *EntryFormAssistance::row(const QString &key) const
 {
     const auto found = std::find_if(rows().begin(), rows().end(), [&key](const FormRow &row) {
-        return !row.isTranslation && row.key == key;
+        return !row.isTranslation() && row.key == key;
     });
     return found == rows().end() ? nullptr : &*found;
 }
@@ -85,17 +51,17 @@ bool EntryFormAssistance::isShown(const FormRow &row) const
 void EntryFormAssistance::addBeside(const FormRow &row, QWidget *widget)
 {
     RowSlot *const slot = m_form.formLayout()->besideRow(row.number);
-    QWidget *const last = lastOf({row.field, slot});
+    QWidget *const last = TabOrder::lastOf({row.field, slot});
     slot->add(widget);
-    putBehind(last, widget);
+    TabOrder::putBehind(last, widget);
 }
 
 void EntryFormAssistance::addBelow(const FormRow &row, QWidget *widget)
 {
     RowSlot *const slot = m_form.formLayout()->belowRow(row.number);
-    QWidget *const last = lastOf({row.field, m_form.formLayout()->besideRow(row.number), slot});
+    QWidget *const last = TabOrder::lastOf({row.field, m_form.formLayout()->besideRow(row.number), slot});
     slot->add(widget);
-    putBehind(last, widget);
+    TabOrder::putBehind(last, widget);
 }
 
 VelUIDesktopEntry EntryFormAssistance::record() const

@@ -5,7 +5,12 @@
 
 #include "EntryFormHost.h"
 
+#include <memory>
+
 namespace VelUI {
+
+class LanguageBar;
+class LanguageRows;
 
 /**
  * What the properties form has beyond the plain one.
@@ -22,7 +27,8 @@ public:
     explicit EntryFormAssistance(EntryFormHost &form);
     ~EntryFormAssistance() override;
 
-    /// The rows in the order of the form, also those that the type of the entry hides.
+    /// The rows in the order of the form, also those that the type of the entry hides. The rows of a
+    /// language have another field and label when the form turns to another language.
     const QVector<FormRow> &rows() const;
     /// The row of \a key without a language; null when the form has none.
     const FormRow *row(const QString &key) const;
@@ -43,6 +49,9 @@ Q_SIGNALS:
 
 private:
     EntryFormHost &m_form;
+    QVector<FormRow> m_rows;
+    std::unique_ptr<LanguageRows> m_languageRows;
+    std::unique_ptr<LanguageBar> m_bar;
 };
 
 } // namespace VelUI

@@ -4,11 +4,14 @@
 #pragma once
 
 #include "FormRow.h"
+#include "Translations.h"
 
 #include <frame/DesktopEntryRecord.h>
 
 #include <QObject>
 #include <QVector>
+
+class QWidget;
 
 namespace VelUI {
 
@@ -20,13 +23,24 @@ class EntryFormHost : public QObject
     Q_OBJECT
 
 public:
+    virtual QWidget *form() const = 0;
     virtual FormLayout *formLayout() const = 0;
     /// The rows in the order of the form, also those that the type of the entry hides.
     virtual const QVector<FormRow> &formRows() const = 0;
     /// The entry as it would be saved now.
     virtual VelUIDesktopEntry record() const = 0;
+    /// The same without what the fields show.
+    virtual VelUIDesktopEntry baseRecord() const = 0;
+    /// What is edited in languages that no field shows; tellEdit() after a change.
+    virtual Translations &translations() = 0;
+    /// Tells everybody of an edit by the user.
+    virtual void tellEdit() = 0;
+    /// Brings new fields into the state that the form is in.
+    virtual void applyReadOnly() = 0;
 
 Q_SIGNALS:
+    /// The form shows another entry.
+    void entryLoaded();
     /// What record() gives may have changed.
     void recordChanged();
 };

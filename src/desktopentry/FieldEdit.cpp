@@ -58,4 +58,32 @@ void FieldEdit::setValue(QWidget *field, const QVariant &value)
     }
 }
 
+void FieldEdit::show(QWidget *field, const QVariant &value)
+{
+    if (FieldEdit::value(field) == value)
+        return;
+    if (auto *line = qobject_cast<QLineEdit *>(field))
+        setFieldValue(line, value.toString());
+    else if (auto *path = qobject_cast<PathEdit *>(field))
+        setFieldValue(path, value.toString());
+    else if (auto *icon = qobject_cast<IconEdit *>(field))
+        setFieldValue(icon, value.toString());
+    else if (auto *list = qobject_cast<StringListEdit *>(field))
+        setFieldValue(list, value.toStringList());
+    else if (auto *box = qobject_cast<QCheckBox *>(field))
+        setFieldValue(box, value.toBool());
+}
+
+void FieldEdit::onEdited(QWidget *field, QObject *context, const std::function<void()> &react)
+{
+    if (const auto *line = qobject_cast<QLineEdit *>(field))
+        QObject::connect(line, &QLineEdit::textEdited, context, react);
+    for (const QLineEdit *line : field->findChildren<QLineEdit *>())
+        QObject::connect(line, &QLineEdit::textEdited, context, react);
+    if (const auto *icon = qobject_cast<IconEdit *>(field))
+        QObject::connect(icon, &IconEdit::iconChanged, context, react);
+    else if (const auto *list = qobject_cast<StringListEdit *>(field))
+        QObject::connect(list, &StringListEdit::changed, context, react);
+}
+
 } // namespace VelUI

@@ -5,6 +5,9 @@
 
 #include <QVariant>
 
+#include <functional>
+
+class QObject;
 class QWidget;
 
 namespace VelUI {
@@ -17,6 +20,12 @@ QVariant value(const QWidget *field);
 
 /// Gives the field another value, as if the user had typed or chosen it.
 void setValue(QWidget *field, const QVariant &value);
+
+/// Shows another value; those who listen to the user hear nothing.
+void show(QWidget *field, const QVariant &value);
+
+/// Calls \a react when the user edited the field, for as long as \a context lives.
+void onEdited(QWidget *field, QObject *context, const std::function<void()> &react);
 
 } // namespace FieldEdit
 

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "EntryTypeRules.h"
+
 #include <QString>
 
 class QWidget;
@@ -14,11 +16,15 @@ struct FormRow
 {
     QString key; ///< of the entry: "Name"
     QString label; ///< as it is shown, without a colon
-    bool isTranslation = false; ///< the field shows the value of one language
+    EntryTypeRules::ShownFor shownFor = EntryTypeRules::ShownFor::All;
+    /// What the label says beside the language; empty in a row without one.
+    QString translated;
     int number = 0; ///< in the FormLayout
     /// A QLineEdit, QCheckBox, PathEdit, IconEdit, StringListEdit, ActionListEdit, or the
     /// QComboBox of the type.
     QWidget *field = nullptr;
+
+    bool isTranslation() const { return !translated.isEmpty(); }
 };
 
 } // namespace VelUI

@@ -120,7 +120,7 @@ PropsTable::Label PropsTable::required(const QString &text)
 
 PropsTable::Label PropsTable::localized(const QString &text)
 {
-    return {localizedLabel(text), false, true};
+    return {localizedLabel(text), false, text};
 }
 
 template <typename Field, typename Getter, typename Setter>
@@ -131,7 +131,7 @@ Field *PropsTable::add(const char *key, const Label &label, ShownFor shownFor, c
     const int number = addField(m_layout, label.text, field);
     if (label.isBold)
         m_layout->setRowLabelBold(number);
-    m_formRows.append({QString::fromLatin1(key), label.text, label.isTranslation, number, field});
+    m_formRows.append({QString::fromLatin1(key), label.text, shownFor, label.translated, number, field});
     m_rows.push_back(
         std::make_unique<KeyRow<Field, Getter, Setter>>(shownFor, m_layout, number, field, getter, setter));
     return field;
@@ -152,8 +152,10 @@ void PropsTable::addShowIn()
     auto rows = std::make_unique<ShowInRows>(m_layout, texts);
     m_showIn = rows->choice();
     const int second = m_layout->rowCount() - 1;
-    m_formRows.append({QStringLiteral("OnlyShowIn"), texts.only, false, second - 1, m_showIn->onlyField()});
-    m_formRows.append({QStringLiteral("NotShowIn"), texts.no, false, second, m_showIn->noField()});
+    m_formRows.append(
+        {QStringLiteral("OnlyShowIn"), texts.only, ShownFor::All, {}, second - 1, m_showIn->onlyField()});
+    m_formRows.append(
+        {QStringLiteral("NotShowIn"), texts.no, ShownFor::All, {}, second, m_showIn->noField()});
     m_rows.push_back(std::move(rows));
 }
 

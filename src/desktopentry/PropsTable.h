@@ -32,6 +32,9 @@ public:
     explicit PropsTable(FormLayout *layout);
     ~PropsTable();
 
+    /// Gives the dialogs of a field their titles and labels.
+    static void setKeywordTexts(StringListEdit *field);
+
     /// Shows the rows for an entry of \a type; hides and empties the others.
     void showFor(const QString &type);
     /// The same when the user changes the type: the rows come back with what they showed when the
@@ -53,21 +56,20 @@ private:
     // The label of a row; a bold one marks a key that an entry must have.
     struct Label
     {
-        Label(const QString &labelText, bool bold = false, bool translation = false)
+        Label(const QString &labelText, bool bold = false, const QString &translatedText = QString())
             : text(labelText)
             , isBold(bold)
-            , isTranslation(translation)
+            , translated(translatedText)
         {
         }
         QString text;
         bool isBold;
-        bool isTranslation;
+        QString translated;
     };
 
     static Label required(const QString &text);
     static Label localized(const QString &text);
     static void setCategoryTexts(StringListEdit *field);
-    static void setKeywordTexts(StringListEdit *field);
     static void setMimeTypeTexts(StringListEdit *field);
 
     void build();

@@ -107,7 +107,7 @@ void TypeChooser::setReadOnly(bool readOnly)
 
 FormRow TypeChooser::row() const
 {
-    return {QStringLiteral("Type"), tr("Type"), false, m_row, m_box};
+    return {QStringLiteral("Type"), tr("Type"), EntryTypeRules::ShownFor::All, {}, m_row, m_box};
 }
 
 bool TypeChooser::eventFilter(QObject *watched, QEvent *event)

@@ -66,7 +66,7 @@ void UrlRow::setInfoButtonWanted(bool wanted)
 
 FormRow UrlRow::row() const
 {
-    return {QStringLiteral("URL"), tr("Url"), false, m_number, m_line};
+    return {QStringLiteral("URL"), tr("Url"), ShownFor::Links, {}, m_number, m_line};
 }
 
 void UrlRow::setVisible(bool visible)

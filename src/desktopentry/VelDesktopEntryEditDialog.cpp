@@ -25,6 +25,7 @@
 #include <QPoint>
 #include <QPointer>
 #include <QPushButton>
+#include <QScopedValueRollback>
 #include <QVBoxLayout>
 
 #include <optional>
@@ -61,6 +62,7 @@ public:
     void savePosition();
     void setNewType();
     void copy(VelUIDesktopEntry entry);
+    VelUIDesktopEntry entryToChange() const;
     VelUIDesktopEntry entryToSave() const;
     void emptyListSwitchedFrom(VelUIDesktopEntry *entry) const;
     VelDesktopEntryPropsWidgetPrivate &form() const { return VelDesktopEntryPropsWidgetPrivate::of(*props); }
@@ -159,7 +161,10 @@ void VelDesktopEntryEditDialogPrivate::copy(VelUIDesktopEntry entry)
     const bool wasDecided = chooser.isDecided();
     if (EntryPath::isRecordFile(path))
         entry.setType(wasDecided ? type : loaded.getType());
-    props->loadFrom(entry);
+    {
+        const QScopedValueRollback<bool> copying(form().isCopying, true);
+        props->loadFrom(entry);
+    }
     if (wasDecided && !chooser.isDecided())
         props->setType(type, chooser.allowedTypes());
 }
@@ -176,10 +181,16 @@ void VelDesktopEntryEditDialogPrivate::emptyListSwitchedFrom(VelUIDesktopEntry *
         entry->setOnlyShowIn({});
 }
 
-VelUIDesktopEntry VelDesktopEntryEditDialogPrivate::entryToSave() const
+VelUIDesktopEntry VelDesktopEntryEditDialogPrivate::entryToChange() const
 {
     VelUIDesktopEntry entry = loaded;
     entry.setFilePath(path);
+    return entry;
+}
+
+VelUIDesktopEntry VelDesktopEntryEditDialogPrivate::entryToSave() const
+{
+    VelUIDesktopEntry entry = entryToChange();
     props->saveTo(&entry);
     emptyListSwitchedFrom(&entry);
     return entry;
@@ -191,6 +202,7 @@ VelDesktopEntryEditDialog::VelDesktopEntryEditDialog(QWidget *parent)
 {
     d->props = new VelDesktopEntryPropsWidget(this);
     d->props->setObjectName(QStringLiteral("props"));
+    d->form().recordToChange = [this] { return d->entryToChange(); };
     d->form().recordToSave = [this] { return d->entryToSave(); };
     // Whoever opens the dialog types the name first.
     d->props->setFocus();

@@ -17,14 +17,38 @@
 #include <QApplication>
 #include <QCheckBox>
 #include <QLineEdit>
+#include <QRadioButton>
 #include <QScopedValueRollback>
 #include <QScrollArea>
 #include <QToolButton>
 #include <QVBoxLayout>
 
+#include <algorithm>
+
 using namespace VelUI;
 
 namespace {
+
+// A line that shows a list is never written in.
+bool showsList(const QLineEdit *line)
+{
+    return qobject_cast<const StringListEdit *>(line->parentWidget())
+        || qobject_cast<const ActionListEdit *>(line->parentWidget());
+}
+
+template <typename Edit>
+void setAllReadOnly(const QWidget *content, bool readOnly)
+{
+    for (Edit *edit : content->findChildren<Edit *>())
+        edit->setReadOnly(readOnly);
+}
+
+template <typename Button>
+void setAllDisabled(const QWidget *content, bool disabled)
+{
+    for (Button *button : content->findChildren<Button *>())
+        button->setDisabled(disabled);
+}
 
 QScrollArea *makeScrollArea(QWidget *form)
 {
@@ -57,6 +81,7 @@ VelDesktopEntryPropsWidgetPrivate::VelDesktopEntryPropsWidgetPrivate(VelDesktopE
     , typeChooser(layout, form)
     , rows(layout)
     , recordToSave([this] { return loadedAndChanged(); })
+    , recordToChange([this] { return loaded; })
     , m_rows(QVector<FormRow>{typeChooser.row()} + rows.formRows())
 {
     layout->setRowStretch(layout->rowCount(), 1);
@@ -71,6 +96,11 @@ VelDesktopEntryPropsWidgetPrivate &VelDesktopEntryPropsWidgetPrivate::of(VelDesk
     return *form.d;
 }
 
+QWidget *VelDesktopEntryPropsWidgetPrivate::form() const
+{
+    return q;
+}
+
 void VelDesktopEntryPropsWidgetPrivate::allowAllTypes()
 {
     q->setType(EntryTypeRules::Application, {});
@@ -79,8 +109,21 @@ void VelDesktopEntryPropsWidgetPrivate::allowAllTypes()
 VelUIDesktopEntry VelDesktopEntryPropsWidgetPrivate::loadedAndChanged() const
 {
     VelUIDesktopEntry entry = loaded;
-    q->saveTo(&entry);
+    save(&entry);
     return entry;
+}
+
+// What another language's row wrote counts before the user's own row, which knows of it.
+void VelDesktopEntryPropsWidgetPrivate::save(VelUIDesktopEntry *entry) const
+{
+    if (typeChooser.isDecided())
+        entry->setType(typeChooser.type());
+    m_translations.applyTo(entry, [this](const QString &key) {
+        return std::any_of(m_rows.begin(), m_rows.end(), [this, &key](const FormRow &row) {
+            return row.key == key && EntryTypeRules::isShown(row.shownFor, typeChooser.type());
+        });
+    });
+    rows.save(entry, typeChooser.type());
 }
 
 void VelDesktopEntryPropsWidgetPrivate::load(const VelUIDesktopEntry &entry)
@@ -92,16 +135,34 @@ void VelDesktopEntryPropsWidgetPrivate::load(const VelUIDesktopEntry &entry)
     if (!EntryTypeRules::choices({}).contains(entry.getType()))
         typeChooser.leaveOpen();
     loaded = entry;
+    if (!isCopying)
+        m_translations = {};
     rows.load(entry, typeChooser.type());
 }
 
 // The fields tell of every change, also of those that filling them makes.
-void VelDesktopEntryPropsWidgetPrivate::tellChange()
+void VelDesktopEntryPropsWidgetPrivate::tellEdit()
 {
     if (isLoading)
         return;
     Q_EMIT q->changed();
     Q_EMIT recordChanged();
+}
+
+void VelDesktopEntryPropsWidgetPrivate::applyReadOnly()
+{
+    typeChooser.setReadOnly(readOnly);
+    const QWidget *const content = scrollArea->widget();
+    for (QLineEdit *line : content->findChildren<QLineEdit *>()) {
+        if (!showsList(line))
+            line->setReadOnly(readOnly);
+    }
+    setAllReadOnly<IconEdit>(content, readOnly);
+    setAllReadOnly<PathEdit>(content, readOnly);
+    setAllReadOnly<StringListEdit>(content, readOnly);
+    setAllReadOnly<ActionListEdit>(content, readOnly);
+    setAllDisabled<QCheckBox>(content, readOnly);
+    setAllDisabled<QRadioButton>(content, readOnly);
 }
 
 void VelDesktopEntryPropsWidgetPrivate::tellRecordChange()
@@ -112,7 +173,7 @@ void VelDesktopEntryPropsWidgetPrivate::tellRecordChange()
 
 void VelDesktopEntryPropsWidgetPrivate::connectChanges()
 {
-    const auto changed = &VelDesktopEntryPropsWidgetPrivate::tellChange;
+    const auto changed = &VelDesktopEntryPropsWidgetPrivate::tellEdit;
     const QWidget *const content = scrollArea->widget();
     for (QLineEdit *line : content->findChildren<QLineEdit *>())
         connect(line, &QLineEdit::textEdited, this, changed);

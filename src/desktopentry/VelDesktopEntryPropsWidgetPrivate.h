@@ -30,13 +30,19 @@ public:
     /// The parts of \a form, for the dialog around it.
     static VelDesktopEntryPropsWidgetPrivate &of(VelDesktopEntryPropsWidget &form);
 
+    QWidget *form() const override;
     VelUI::FormLayout *formLayout() const override { return layout; }
     const QVector<VelUI::FormRow> &formRows() const override { return m_rows; }
     VelUIDesktopEntry record() const override { return recordToSave(); }
+    VelUIDesktopEntry baseRecord() const override { return recordToChange(); }
+    Translations &translations() override { return m_translations; }
+    void tellEdit() override;
+    void applyReadOnly() override;
 
     /// Forgets which types another file had to choose from.
     void allowAllTypes();
     void load(const VelUIDesktopEntry &entry);
+    void save(VelUIDesktopEntry *entry) const;
     /// Tells recordChanged(), but not while loading.
     void tellRecordChange();
 
@@ -47,9 +53,12 @@ public:
     VelUI::PropsTable rows;
     bool readOnly = false;
     bool isLoading = false;
+    bool isCopying = false; ///< what is loaded counts as an edit
     VelUIDesktopEntry loaded{QString()};
-    /// Gives the entry as it would be saved; whoever saves it sets another one.
+    /// Give the entry as it would be saved, and without what the form shows; whoever saves it sets
+    /// others.
     std::function<VelUIDesktopEntry()> recordToSave;
+    std::function<VelUIDesktopEntry()> recordToChange;
     std::unique_ptr<VelUI::EntryFormAssistance> assistance; ///< null without
 
 Q_SIGNALS:
@@ -58,9 +67,9 @@ Q_SIGNALS:
 
 private:
     VelUIDesktopEntry loadedAndChanged() const;
-    void tellChange();
     void connectChanges();
     void keepInView(QWidget *focused);
 
     const QVector<VelUI::FormRow> m_rows;
+    Translations m_translations;
 };

@@ -113,7 +113,7 @@ void tst_EntryFormAssistance::knowsEveryRow()
     form.setAssistance(true);
     QStringList keys;
     for (const FormRow &row : assistance(form).rows())
-        keys.append(row.isTranslation ? row.key + QLatin1Char('*') : row.key);
+        keys.append(row.isTranslation() ? row.key + QLatin1Char('*') : row.key);
     QCOMPARE(
         keys.join(QLatin1Char(' ')),
         QStringLiteral("Type Name Name* Icon Icon* Exec Terminal Path TryExec URL GenericName GenericName* "

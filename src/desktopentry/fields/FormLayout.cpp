@@ -141,6 +141,25 @@ void FormLayout::setRowLabelBold(int row)
     label->setFont(font);
 }
 
+void FormLayout::setField(int row, const QString &label, QWidget *field)
+{
+    auto *shown = qobject_cast<QLabel *>(rowItem(row, 0)->widget());
+    QWidget *const former = rowItem(row, 1)->widget();
+    const bool isVisible = isRowVisible(row);
+    if (field != former) {
+        const bool hadFocus = former->isAncestorOf(former->window()->focusWidget());
+        removeWidget(former);
+        addWidget(field, row * m_spacing, 1);
+        field->setVisible(isVisible);
+        if (hadFocus)
+            field->setFocus();
+        former->hide();
+    }
+    shown->setText(label + QLatin1Char(':'));
+    shown->setBuddy(focusTarget(field));
+    nameField(field, label);
+}
+
 void FormLayout::spread()
 {
     if (!isSpread())

@@ -38,6 +38,8 @@ public:
     void showRow(int row);
     void setRowLabelBold(int row);
     bool isRowVisible(int row) const;
+    /// Shows another widget as the field of a labeled row, under another label, and hides the one before.
+    void setField(int row, const QString &label, QWidget *field);
 
     void spread();
     /// Takes the places out again, with what is in them.

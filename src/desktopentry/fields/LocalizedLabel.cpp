@@ -9,7 +9,12 @@ namespace VelUI {
 
 QString localizedLabel(const QString &label)
 {
-    return label + QStringLiteral(" [") + QString::fromStdString(velLanguageCode()) + QLatin1Char(']');
+    return localizedLabel(label, QString::fromStdString(velLanguageCode()));
+}
+
+QString localizedLabel(const QString &label, const QString &language)
+{
+    return label + QStringLiteral(" [") + language + QLatin1Char(']');
 }
 
 } // namespace VelUI

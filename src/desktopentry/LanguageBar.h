@@ -1,0 +1,58 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include "EntryFormHost.h"
+
+#include <QStringList>
+#include <QWidget>
+
+class QAbstractButton;
+class QBoxLayout;
+class QComboBox;
+class QLabel;
+
+namespace VelUI {
+
+class LanguageRows;
+
+/// The line above the form: the language that its rows show, who sees that, and a place for buttons.
+class LanguageBar : public QWidget
+{
+    Q_OBJECT
+
+public:
+    /// Puts itself above the rows of \a form, which \a rows turns.
+    LanguageBar(EntryFormHost &form, LanguageRows &rows);
+
+    /// Puts a button at the end of the line.
+    void addButton(QAbstractButton *button);
+
+private:
+    struct Item
+    {
+        QString language; // empty for the user's own
+        QString text;
+        bool exists;
+    };
+
+    void build();
+    void refresh();
+    void showItems(const QVector<Item> &items);
+    void choose(int item);
+    void askForLanguage();
+    Item itemOf(const VelUIDesktopEntry &entry, const QString &language) const;
+    static QString textOf(const QString &language, bool exists, int count, int total);
+    QVector<Item> itemsOf(const VelUIDesktopEntry &entry) const;
+    QStringList languagesOf(const VelUIDesktopEntry &entry) const;
+    QString noteOf(const VelUIDesktopEntry &entry) const;
+
+    EntryFormHost &m_form;
+    LanguageRows &m_rows;
+    QBoxLayout *m_line;
+    QComboBox *m_box;
+    QLabel *m_note;
+};
+
+} // namespace VelUI
