@@ -3,10 +3,12 @@
 
 #include "Freeze.h"
 #include "HandsOnTestCase.h"
+#include "VelMenuDialog.h"
 #include "VelMenuView.h"
 #include "XDoTool.h"
 
 #include <QAction>
+#include <QClipboard>
 #include <QProcess>
 #include <QSignalSpy>
 #include <QTimer>
@@ -34,6 +36,8 @@ private Q_SLOTS:
     void pastesFromAnOwnerThatAnswers();
     void looksAnewWhenAnotherTakesTheClipboard();
     void asksNobodyForWhatItOwnsItself();
+    void leavesTheClipboardToItsOwnerWithoutASelection_data();
+    void leavesTheClipboardToItsOwnerWithoutASelection();
 
 private:
     void startOwner(int types, int data, const QString &text = QString());
@@ -185,6 +189,56 @@ void tst_ClipboardOwner::asksNobodyForWhatItOwnsItself()
     QVERIFY(canPaste());
     XDoTool::press(QStringLiteral("ctrl+v"));
     QTRY_VERIFY(QFile::exists(m_sub + QLatin1String("/a.desktop")));
+}
+
+void tst_ClipboardOwner::leavesTheClipboardToItsOwnerWithoutASelection_data()
+{
+    QTest::addColumn<bool>("isEditable");
+    QTest::addColumn<bool>("assistance");
+    QTest::addColumn<QString>("keys");
+    for (const bool assistance : {false, true}) {
+        for (const char *keys : {"ctrl+c", "ctrl+x"})
+            QTest::addRow("editor, %s, %s", keys, assistance ? "assistance" : "plain")
+                << true << assistance << QString::fromLatin1(keys);
+        QTest::addRow("picker, ctrl+c, %s", assistance ? "assistance" : "plain")
+            << false << assistance << QStringLiteral("ctrl+c");
+    }
+}
+
+// The owner ends when another takes the clipboard. The keyboard stays on the item that was selected.
+void tst_ClipboardOwner::leavesTheClipboardToItsOwnerWithoutASelection()
+{
+    QFETCH(bool, isEditable);
+    QFETCH(bool, assistance);
+    QFETCH(QString, keys);
+    VelMenuDialog dialog(menu(), 22, isEditable, isEditable, nullptr, Qt::Window);
+    dialog.setAssistance(assistance);
+    auto *tree = dialog.findChild<VelMenuView *>();
+    dialog.show();
+    QVERIFY(QTest::qWaitForWindowActive(&dialog));
+    QVERIFY(open(*tree, menu(), 3));
+    startOwner(Often, Often, QStringLiteral("file:///none\r\n"));
+    QPoint place = tree->visualRect(shown(*tree, m_a)).center();
+    XDoTool::click(tree->viewport(), place);
+    QTRY_COMPARE_WITH_TIMEOUT(tree->selectedPath(), m_a, 20000);
+    // Elsewhere: two clicks in one place would be a double click, which opens the entry.
+    place.rx() += 60;
+    XDoTool::run(QStringLiteral("mousemove %1 sleep 0.1 keydown ctrl click 1 keyup ctrl")
+                     .arg(XDoTool::at(tree->viewport(), place)));
+    QTRY_VERIFY_WITH_TIMEOUT(!tree->selectedItem().isValid(), 20000);
+    QVERIFY(tree->currentIndex().isValid() && tree->hasFocus());
+
+    XDoTool::press(keys);
+    // A key behind it tells that it was taken.
+    XDoTool::press(QStringLiteral("Down"));
+    QTRY_VERIFY_WITH_TIMEOUT(tree->selectedItem().isValid(), 20000);
+    QVERIFY(!QGuiApplication::clipboard()->ownsClipboard());
+    QCOMPARE(m_owner->state(), QProcess::Running);
+    // With a selection it is taken.
+    if (isEditable) {
+        XDoTool::press(keys);
+        QTRY_VERIFY_WITH_TIMEOUT(m_owner->state() == QProcess::NotRunning, 20000);
+    }
 }
 
 VEL_TEST_MAIN(tst_ClipboardOwner)
