@@ -86,4 +86,10 @@ void FieldEdit::onEdited(QWidget *field, QObject *context, const std::function<v
         QObject::connect(list, &StringListEdit::changed, context, react);
 }
 
+void FieldEdit::focus(QWidget *field)
+{
+    auto *const line = field->focusPolicy() == Qt::NoFocus ? field->findChild<QLineEdit *>() : nullptr;
+    (line ? line : field)->setFocus(Qt::OtherFocusReason);
+}
+
 } // namespace VelUI

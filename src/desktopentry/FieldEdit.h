@@ -27,6 +27,9 @@ void show(QWidget *field, const QVariant &value);
 /// Calls \a react when the user edited the field, for as long as \a context lives.
 void onEdited(QWidget *field, QObject *context, const std::function<void()> &react);
 
+/// Gives the focus to the field, to its line if it has one.
+void focus(QWidget *field);
+
 } // namespace FieldEdit
 
 } // namespace VelUI

@@ -3,7 +3,9 @@
 
 #include <VelDesktopEntryEditDialog.h>
 
+#include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
+#include "FieldEdit.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 #include "fields/ShowInChoice.h"
 
@@ -67,7 +69,10 @@ public:
     void emptyListSwitchedFrom(VelUIDesktopEntry *entry) const;
     VelDesktopEntryPropsWidgetPrivate &form() const { return VelDesktopEntryPropsWidgetPrivate::of(*props); }
 
+    void focusField(const QString &key);
+
     static QString unsuitableText(VelUIDesktopEntry::SuitableError error);
+    static QString fieldMeant(VelUIDesktopEntry::SuitableError error, const VelUIDesktopEntry &entry);
 
     VelDesktopEntryEditDialog *const q;
     QPointer<VelDesktopEntryPropsWidget> props;
@@ -98,8 +103,37 @@ bool VelDesktopEntryEditDialogPrivate::checkSuitable(const VelUIDesktopEntry &en
     VelUIDesktopEntry::SuitableError error = 0;
     if (entry.isSuitable(&error))
         return true;
+    const QPointer<VelDesktopEntryEditDialog> self(q);
     warn(unsuitableText(error));
+    if (self && isAssisted && props)
+        focusField(fieldMeant(error, entry));
     return false;
+}
+
+// The key whose value makes the entry unsuitable.
+QString VelDesktopEntryEditDialogPrivate::fieldMeant(VelUIDesktopEntry::SuitableError error,
+                                                     const VelUIDesktopEntry &entry)
+{
+    switch (error) {
+    case Unsuitable::TryExecMissing:
+    case Unsuitable::TryExecNotInPath:
+        return QStringLiteral("TryExec");
+    case Unsuitable::UrlMissing:
+        return QStringLiteral("URL");
+    default:
+        break;
+    }
+    if (!EntryTypeRules::choices({}).contains(entry.getType()))
+        return QStringLiteral("Type");
+    const bool isCommand = error > 0 || (!entry.getExec().isEmpty() && !entry.getName().isEmpty());
+    return isCommand ? QStringLiteral("Exec") : QStringLiteral("Name");
+}
+
+// The form brings what has the focus into view.
+void VelDesktopEntryEditDialogPrivate::focusField(const QString &key)
+{
+    if (const VelUI::FormRow *row = form().assistance->row(key))
+        VelUI::FieldEdit::focus(row->field);
 }
 
 QString VelDesktopEntryEditDialogPrivate::unsuitableText(VelUIDesktopEntry::SuitableError error)
@@ -261,6 +295,7 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     if (!pattern.isEmpty() && !d->inheritFrom(pattern, &entry))
         return false;
     d->form().allowAllTypes();
+    d->form().path = path;
     d->props->loadFrom(entry);
     d->path = path;
     d->loaded = own;

@@ -7,6 +7,7 @@
 #include "EntryTypeRules.h"
 #include "FieldChoosers.h"
 #include "FieldDialogSizes.h"
+#include "FormFindings.h"
 #include "UrlRow.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 
@@ -36,6 +37,8 @@ void VelDesktopEntryPropsWidget::setAssistance(bool assistance)
     if (d->assistance) {
         new FieldChoosers(d->assistance.get());
         new FieldDialogSizes(d->assistance.get());
+        new FormFindings(d->assistance.get(),
+                         {this, [this] { return d->path; }, [this] { return d->readOnly; }});
     }
 }
 
@@ -66,6 +69,7 @@ void VelDesktopEntryPropsWidget::setReadOnly(bool readOnly)
         return;
     d->readOnly = readOnly;
     d->applyReadOnly();
+    d->tellRecordChange();
 }
 
 void VelDesktopEntryPropsWidget::setFrameStyle(int style)

@@ -52,6 +52,7 @@ public:
     VelUI::TypeChooser typeChooser;
     VelUI::PropsTable rows;
     bool readOnly = false;
+    QString path; ///< of the file that the entry will be, where the host knows it
     bool isLoading = false;
     bool isCopying = false; ///< what is loaded counts as an edit
     VelUIDesktopEntry loaded{QString()};

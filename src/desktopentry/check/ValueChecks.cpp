@@ -214,6 +214,9 @@ void ValueChecks::checkPath(const CheckedEntry &entry, const CheckedValue &value
 
 void ValueChecks::checkUrl(const CheckedEntry &entry, const CheckedValue &value)
 {
+    const auto *type = EntryText::key(value.group, "Type");
+    if (type && type->value != "Link")
+        return;
     const QString url = value.text();
     if (url.trimmed().isEmpty())
         return value.add(EntryProblem::MissingTarget, EntryFinding::Error,

@@ -1,0 +1,146 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "FormFindings.h"
+
+#include "EntryFormAssistance.h"
+#include "FieldEdit.h"
+#include "check/EntryCheck.h"
+
+#include <QApplication>
+#include <QScrollArea>
+#include <QShortcut>
+#include <QWidget>
+
+#include <utility>
+
+namespace VelUI {
+
+namespace {
+
+const QLatin1String MainGroup("Desktop Entry");
+const QLatin1String ActionPrefix("Desktop Action ");
+
+} // namespace
+
+FormFindings::FormFindings(EntryFormAssistance *assistance, Form form)
+    : QObject(assistance)
+    , m_assistance(*assistance)
+    , m_form(std::move(form))
+{
+    for (int i = 0; i < m_assistance.rows().size(); ++i) {
+        const auto addLine = [this, i](FindingLine *line) {
+            m_assistance.addBelow(m_assistance.rows().at(i), line);
+        };
+        m_rows.append(new RowFindings(addLine, this));
+        connect(m_rows.last(), &RowFindings::repairRequested, this, &FormFindings::repair);
+    }
+    // Several signals may tell of one edit.
+    m_soon.setSingleShot(true);
+    connect(&m_soon, &QTimer::timeout, this, &FormFindings::check);
+    connect(assistance, &EntryFormAssistance::recordChanged, &m_soon, [this] { m_soon.start(0); });
+    connect(&m_lookups, &CachedLookups::known, this, &FormFindings::check);
+    for (const int step : {1, -1}) {
+        const QKeySequence key(step > 0 ? Qt::Key_F8 : int(Qt::SHIFT) | int(Qt::Key_F8));
+        auto *const shortcut = new QShortcut(key, m_form.widget);
+        connect(this, &QObject::destroyed, shortcut, &QObject::deleteLater);
+        connect(shortcut, &QShortcut::activated, this, [this, step] { goOn(step); });
+    }
+    m_soon.start(0);
+}
+
+FormFindings::~FormFindings() = default;
+
+void FormFindings::check()
+{
+    m_lookups.dropQuestions();
+    const VelUIDesktopEntry record = m_assistance.record();
+    const EntryFindings findings = EntryCheck::check(record, record.contents(), m_form.path(), m_lookups);
+    QVector<QVector<RowFindings::Said>> all(m_rows.size());
+    for (const EntryFinding &finding : findings) {
+        const int row = rowOf(finding);
+        all[row].append(said(finding, row));
+    }
+    for (int i = 0; i < m_rows.size(); ++i)
+        m_rows.at(i)->say(all.at(i), m_assistance.rows().at(i).field);
+}
+
+// A translation is shown in the row behind that of its key.
+int FormFindings::rowOf(const EntryFinding &finding) const
+{
+    const bool isOfAction = finding.group.startsWith(ActionPrefix);
+    const QString key = isOfAction ? QStringLiteral("Actions") : finding.key;
+    const auto &rows = m_assistance.rows();
+    if (key.isEmpty() || !(isOfAction || finding.group == MainGroup))
+        return rows.size() - 1;
+    for (int i = 0; i < rows.size(); ++i) {
+        if (rows.at(i).key != key || !m_assistance.isShown(rows.at(i)))
+            continue;
+        const bool hasTranslation = i + 1 < rows.size() && rows.at(i + 1).key == key;
+        return i + (hasTranslation && !finding.locale.isEmpty() && !isOfAction ? 1 : 0);
+    }
+    return rows.size() - 1;
+}
+
+RowFindings::Said FormFindings::said(const EntryFinding &finding, int row) const
+{
+    const FormRow &shown = m_assistance.rows().at(row);
+    const bool isOfAction = finding.group.startsWith(ActionPrefix);
+    QString about;
+    if (isOfAction && !finding.key.isEmpty())
+        about = finding.group.mid(ActionPrefix.size());
+    else if (!finding.locale.isEmpty())
+        about = QStringLiteral("%1[%2]").arg(finding.key, finding.locale);
+    else if (finding.key != shown.key)
+        about = finding.key;
+    const QString sentence = about.isEmpty()
+        ? finding.sentence
+        : tr("%1: %2", "a key or an action of an entry, and what is wrong with it")
+              .arg(about, finding.sentence);
+    const bool canRepair = finding.repair && finding.repair->key == shown.key && shown.field->isEnabled()
+        && !m_form.isReadOnly();
+    const QString key = finding.key.isEmpty() ? QStringLiteral("File") : finding.key;
+    return {finding, isOfAction ? shown.key : key, sentence, canRepair};
+}
+
+void FormFindings::goOn(int step)
+{
+    const auto &rows = m_assistance.rows();
+    int current = step > 0 ? -1 : rows.size();
+    for (int i = 0; i < rows.size(); ++i) {
+        const QWidget *focused = QApplication::focusWidget();
+        if (focused && (rows.at(i).field == focused || rows.at(i).field->isAncestorOf(focused)))
+            current = i;
+    }
+    for (int i = 1; i <= rows.size(); ++i) {
+        const int next = (current + i * step + 2 * rows.size()) % rows.size();
+        if (m_rows.at(next)->isEmpty() || !m_assistance.isShown(rows.at(next)))
+            continue;
+        FieldEdit::focus(rows.at(next).field);
+        bringIntoView(m_rows.at(next)->lastLine());
+        return;
+    }
+    QApplication::beep();
+}
+
+// The form itself brings the field into view.
+void FormFindings::bringIntoView(const QWidget *line) const
+{
+    auto *const area = m_form.widget->findChild<QScrollArea *>();
+    const QWidget *const content = area ? area->widget() : nullptr;
+    if (!line || !content || !content->isAncestorOf(line))
+        return;
+    const QRect place(line->mapTo(content, QPoint()), line->size());
+    area->ensureVisible(place.left(), place.bottom(), 0, 0);
+}
+
+void FormFindings::repair(const EntryRepair &repair)
+{
+    const FormRow *row = m_assistance.row(repair.key);
+    if (!row)
+        return;
+    FieldEdit::setValue(row->field, repair.value);
+    FieldEdit::focus(row->field);
+}
+
+} // namespace VelUI
