@@ -5,19 +5,12 @@
 
 QStringList DesktopNames::registered()
 {
-    return {
-        QStringLiteral("Budgie"),        QStringLiteral("Cinnamon"),
-        QStringLiteral("COSMIC"),        QStringLiteral("DDE"),
-        QStringLiteral("EDE"),           QStringLiteral("Endless"),
-        QStringLiteral("Enlightenment"), QStringLiteral("GNOME"),
-        QStringLiteral("GNOME-Classic"), QStringLiteral("GNOME-Flashback"),
-        QStringLiteral("KDE"),           QStringLiteral("LXDE"),
-        QStringLiteral("LXQt"),          QStringLiteral("MATE"),
-        QStringLiteral("Old"),           QStringLiteral("Pantheon"),
-        QStringLiteral("Razor"),         QStringLiteral("ROX"),
-        QStringLiteral("TDE"),           QStringLiteral("Unity"),
-        QStringLiteral("XFCE"),
-    };
+    static const QStringList names =
+        QStringLiteral(
+            "Budgie Cinnamon Deepin EDE Enlightenment GNOME GNOME-Classic GNOME-Flashback KDE LXDE "
+            "LXQt MATE Old Pantheon Razor ROX TDE Unity XFCE")
+            .split(QLatin1Char(' '));
+    return names;
 }
 
 QStringList DesktopNames::ofSession()

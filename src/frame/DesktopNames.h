@@ -8,7 +8,8 @@
 /// The desktop environments that OnlyShowIn and NotShowIn may name.
 namespace DesktopNames {
 
-/// Those that are registered with freedesktop.org, in alphabetical order.
+/// Those that are registered with freedesktop.org, as public checkers of entries know them; in
+/// alphabetical order.
 QStringList registered();
 
 /// Those that the session of this user says it is.
