@@ -38,10 +38,16 @@ bool isRemembered(const QDialog &dialog)
 FieldDialogSizes::FieldDialogSizes(EntryFormAssistance *assistance)
     : QObject(assistance)
 {
-    for (const FormRow &row : assistance->rows()) {
-        if (qobject_cast<StringListEdit *>(row.field) || qobject_cast<ActionListEdit *>(row.field))
-            row.field->installEventFilter(this);
-    }
+    for (const FormRow &row : assistance->rows())
+        watchField(row.field);
+    // Another language brings fields of its own.
+    assistance->rows().constFirst().field->parentWidget()->installEventFilter(this);
+}
+
+void FieldDialogSizes::watchField(QObject *field)
+{
+    if (qobject_cast<StringListEdit *>(field) || qobject_cast<ActionListEdit *>(field))
+        field->installEventFilter(this);
 }
 
 void FieldDialogSizes::watch(QDialog *dialog)
@@ -56,9 +62,12 @@ bool FieldDialogSizes::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::ChildPolished) {
         // Before it is shown first.
-        auto *dialog = qobject_cast<QDialog *>(static_cast<QChildEvent *>(event)->child());
+        QObject *const child = static_cast<QChildEvent *>(event)->child();
+        auto *dialog = qobject_cast<QDialog *>(child);
         if (dialog && isRemembered(*dialog))
             watch(dialog);
+        else
+            watchField(child);
     } else if (auto *dialog = qobject_cast<QDialog *>(watched)) {
         if (event->type() == QEvent::Show && !event->spontaneous())
             DialogSize::restoreShown(*dialog, sizeGroup(*dialog));

@@ -25,6 +25,7 @@ protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
+    void watchField(QObject *field);
     void watch(QDialog *dialog);
 };
 

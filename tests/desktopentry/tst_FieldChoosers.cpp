@@ -59,12 +59,15 @@ void chooseFirst(ModalDriver &modal, const QString &keys, const QString &first)
     });
 }
 
+// The names of the buttons that are shown, a "-" behind those that are disabled.
 QStringList namesOfButtons(const QWidget *form)
 {
     QStringList names;
     for (const QToolButton *button : form->findChildren<QToolButton *>()) {
-        if (button->isVisibleTo(form) && !button->objectName().startsWith(QLatin1String("edit"))
-            && !button->objectName().startsWith(QLatin1String("select")))
+        const QString object = button->objectName();
+        if (button->isVisibleTo(form)
+            && (object.startsWith(QLatin1String("chooseButton_"))
+                || object == QLatin1String("fieldCodeButton")))
             names.append(button->accessibleName() + (button->isEnabled() ? QString() : QStringLiteral("-")));
     }
     names.sort();

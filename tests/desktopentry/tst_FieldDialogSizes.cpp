@@ -6,6 +6,7 @@
 
 #include <VelDesktopEntryPropsWidget.h>
 
+#include <QComboBox>
 #include <QListWidget>
 #include <QSettings>
 #include <QToolButton>
@@ -48,6 +49,7 @@ private Q_SLOTS:
     void areThoseOfThePlainFormWithoutAssistance();
     void areRememberedWithAssistance();
     void areKeptFromOneFormToTheNext();
+    void areThoseOfTheFieldsOfAnotherLanguage();
     void doNotHoldTheFormThatGoes();
 
 private:
@@ -112,6 +114,24 @@ void tst_FieldDialogSizes::areKeptFromOneFormToTheNext()
     QCOMPARE(openAll(true, {{400, 300}, {400, 300}, {550, 500}}).list, QSize(444, 333));
     QCOMPARE(openAll(false, {{410, 310}, {400, 300}, {550, 500}}).list, QSize(400, 300));
     QCOMPARE(QSettings().value(QStringLiteral("EditStringsDialog/Width")).toInt(), 400);
+}
+
+void tst_FieldDialogSizes::areThoseOfTheFieldsOfAnotherLanguage()
+{
+    VelDesktopEntryPropsWidget form;
+    form.setAssistance(true);
+    form.loadFrom(entry("[Desktop Entry]\nType=Application\nName=x\nExec=x\nKeywords[ja]=b;\n"));
+    form.show();
+    auto *languages = child<QComboBox>(&form, "languageBox");
+    languages->setCurrentIndex(languages->findData(QStringLiteral("ja")));
+    QSize found;
+    for (const QSize &size : {QSize(600, 400), QSize(500, 400)}) {
+        ModalDriver modal;
+        resize(modal, &found, size);
+        child<QWidget>(&form, "otherKeywordsEdit")->findChild<QToolButton *>()->click();
+        QVERIFY(modal.finished());
+    }
+    QCOMPARE(found, QSize(600, 400));
 }
 
 void tst_FieldDialogSizes::doNotHoldTheFormThatGoes()

@@ -148,8 +148,7 @@ void FormLayout::setField(int row, const QString &label, QWidget *field)
     const bool isVisible = isRowVisible(row);
     if (field != former) {
         const bool hadFocus = former->isAncestorOf(former->window()->focusWidget());
-        removeWidget(former);
-        addWidget(field, row * m_spacing, 1);
+        delete replaceWidget(former, field, Qt::FindDirectChildrenOnly); // with the room that it has
         field->setVisible(isVisible);
         if (hadFocus)
             field->setFocus();
