@@ -7,6 +7,9 @@
 #include <veluiaux/VelIcon.h>
 #include <veluiaux/VelIconTheme.h>
 
+#include <QDir>
+#include <QFileInfo>
+#include <QImage>
 #include <QMimeDatabase>
 
 class tst_VelIconTheme : public TestCase
@@ -23,6 +26,9 @@ private Q_SLOTS:
     void takesAPathAsItStands();
     void knowsNoIconForAFileThatDoesNotExist();
     void leavesTheMimeTypeOutWhenNobodyAsks();
+    void findsTheFileOfAnIcon();
+    void leavesDrawingsOutForWhatCannotDraw();
+    void findsNoFileOutsideTheTheme();
 
 private:
     static VelIconTheme &theme() { return VelIconTheme::current(VelIconTheme::NoForceLoad); }
@@ -140,6 +146,50 @@ void tst_VelIconTheme::knowsNoIconForAFileThatDoesNotExist()
 void tst_VelIconTheme::leavesTheMimeTypeOutWhenNobodyAsks()
 {
     QCOMPARE(theme().getURLIconName("http://example.org", nullptr), std::string("text-html"));
+}
+
+void tst_VelIconTheme::findsTheFileOfAnIcon()
+{
+    const IconThemeFolder icons(folder(), QStringLiteral("pictures"));
+    icons.write();
+    icons.add(QStringLiteral("editor"), Qt::red);
+    icons.use();
+    const auto file = [](const char *name, int size) {
+        return QString::fromStdString(theme().getIconFile(name, size, VelIconTheme::AllIconFiles));
+    };
+    QCOMPARE(QFileInfo(file("editor", 22)).fileName(), QStringLiteral("editor.png"));
+    QCOMPARE(QImage(file("editor", 22)).size(), QSize(22, 22));
+    QCOMPARE(QImage(file("editor.svg", 8)).size(), QSize(8, 8));
+    QCOMPARE(QImage(file("editor-special", 200)).size(), QSize(32, 32));
+    QCOMPARE(file("browser", 22), QString());
+    const QString own = write(QStringLiteral("own.svgz"), "x");
+    QCOMPARE(file(own.toUtf8().constData(), 22), own);
+}
+
+void tst_VelIconTheme::leavesDrawingsOutForWhatCannotDraw()
+{
+    const IconThemeFolder icons(folder(), QStringLiteral("both"));
+    icons.write();
+    icons.add(QStringLiteral("editor"), Qt::red, 8);
+    icons.use();
+    const QString picture =
+        QString::fromStdString(theme().getIconFile("editor", 8, VelIconTheme::PictureFiles));
+    const QString drawing = QFileInfo(QFileInfo(picture).path()).path() + QStringLiteral("/32/editor.svg");
+    write(QDir(folder()).relativeFilePath(drawing), "<svg/>");
+    VelIconTheme::current(VelIconTheme::DoForceLoad);
+    QCOMPARE(QString::fromStdString(theme().getIconFile("editor", 32, VelIconTheme::PictureFiles)), picture);
+    const QString own = write(QStringLiteral("own.SVGZ"), "x");
+    QCOMPARE(theme().getIconFile(own.toStdString(), 32, VelIconTheme::PictureFiles), std::string());
+}
+
+void tst_VelIconTheme::findsNoFileOutsideTheTheme()
+{
+    const IconThemeFolder icons(folder(), QStringLiteral("narrow"));
+    icons.write();
+    icons.use();
+    write(QStringLiteral("secret.png"), "x");
+    for (const char *name : {"../secret", "", "/nowhere/at/all.png", "/"})
+        QCOMPARE(theme().getIconFile(name, 22, VelIconTheme::AllIconFiles), std::string());
 }
 
 VEL_TEST_MAIN(tst_VelIconTheme)

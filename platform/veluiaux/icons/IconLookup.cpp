@@ -117,6 +117,16 @@ IconLookup::Found IconLookup::find(const QString &name)
     return iconOfTheme(withoutImageSuffix(name));
 }
 
+QVector<ThemeFiles::File> IconLookup::filesOf(const QString &name)
+{
+    if (!QDir::isAbsolutePath(name))
+        return name.contains(QLatin1Char('/')) ? QVector<ThemeFiles::File>()
+                                               : ThemeFiles::find(withoutImageSuffix(name));
+    ThemeFolder folder;
+    folder.kind = ThemeFolder::Kind::Unsorted;
+    return QFileInfo(name).isFile() ? QVector<ThemeFiles::File>{{name, folder}} : QVector<ThemeFiles::File>();
+}
+
 QString IconLookup::identity(const QString &name)
 {
     if (!QDir::isAbsolutePath(name))

@@ -35,6 +35,9 @@ struct Found
 /// The icon \a name: a theme name, one with the suffix of an image file, or an absolute path.
 Found find(const QString &name);
 
+/// The files that there are for the icon \a name, as above, to choose one from.
+QVector<ThemeFiles::File> filesOf(const QString &name);
+
 /// A text that is another one when \a name means another icon, as long as the theme stays.
 QString identity(const QString &name);
 

@@ -3,6 +3,8 @@
 
 #include <veluiaux/VelIconTheme.h>
 
+#include "IconLookup.h"
+#include "ThemeFiles.h"
 #include "ThemeState.h"
 
 #include <LocalFile.h>
@@ -11,6 +13,8 @@
 #include <QMimeDatabase>
 #include <QString>
 #include <QUrl>
+
+#include <algorithm>
 
 namespace {
 
@@ -35,6 +39,12 @@ Kind kindOf(const QString &text)
     return {"unknown", "application/octet-stream"};
 }
 
+bool isNoPicture(const ThemeFiles::File &file)
+{
+    return !file.path.endsWith(QLatin1String(".png"), Qt::CaseInsensitive)
+        && !file.path.endsWith(QLatin1String(".xpm"), Qt::CaseInsensitive);
+}
+
 } // namespace
 
 VelIconTheme &VelIconTheme::current(ForceLoad force)
@@ -51,4 +61,13 @@ std::string VelIconTheme::getURLIconName(const char *url, std::string *mimeType)
     if (mimeType)
         *mimeType = std::move(kind.mimeType);
     return kind.icon;
+}
+
+std::string VelIconTheme::getIconFile(const std::string &name, int size, IconFileKinds kinds) const
+{
+    QVector<ThemeFiles::File> files = IconLookup::filesOf(QString::fromStdString(name));
+    if (kinds == PictureFiles)
+        files.erase(std::remove_if(files.begin(), files.end(), isNoPicture), files.end());
+    const ThemeFiles::File *const file = ThemeFiles::forSize(files, QSize(size, size));
+    return file ? file->path.toStdString() : std::string();
 }

@@ -46,6 +46,26 @@ public:
      */
     std::string getURLIconName(const char *url, std::string *mimeType);
 
+    /// Which files getIconFile() may give.
+    enum IconFileKinds {
+        AllIconFiles, ///< drawings (SVG) as well
+        PictureFiles ///< PNG and XPM pictures alone
+    };
+
+    /**
+     * The file from which an icon is painted, for programs that want files and not pixmaps.
+     *
+     * Finds what Qt would paint in the current theme. No application object is needed; then
+     * QIcon has to be told the theme and its search paths first.
+     *
+     * @param name a name in the icon theme, such a name with the suffix of an image file
+     *             ("editor.png"), or the absolute path of a file; in UTF-8
+     * @param size the edge of the icon in pixels
+     * @param kinds which files may be taken
+     * @return the absolute path in UTF-8; empty where there is no such file
+     */
+    std::string getIconFile(const std::string &name, int size, IconFileKinds kinds) const;
+
 private:
     VelIconTheme() = default;
     ~VelIconTheme() = default;
