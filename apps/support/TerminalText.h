@@ -18,4 +18,10 @@ inline QString plain(QString text)
     return text;
 }
 
+/// \a text with a blank in the place of every end of a line.
+inline QString onOneLine(QString text)
+{
+    return text.replace(QLatin1Char('\n'), QLatin1Char(' ')).replace(QLatin1Char('\r'), QLatin1Char(' '));
+}
+
 } // namespace TerminalText

@@ -4,16 +4,47 @@
 #pragma once
 
 #include <QByteArray>
+#include <QStringList>
 
 struct MenuItem;
 
 /// The forms in which a menu is printed; all of them in UTF-8 and ended by a line feed.
 namespace MenuFormat {
 
-/// A pipe menu of the Openbox window manager; an item runs through vel-open.
+/// One of them.
+struct Format
+{
+    const char *name;
+    bool isForStarting; ///< gets a ListedMenu with the files of the icons, not the menu as it is edited
+    bool hasPicturesOnly; ///< the icons have to be PNG or XPM pictures
+    bool hasLines; ///< a path with a line feed cannot be written
+    QByteArray (*print)(const MenuItem &menu);
+};
+
+/// The form \a name; null when there is none.
+const Format *find(const QString &name);
+/// The names of all, in alphabetical order.
+QStringList names();
+
+/// A pipe menu of the Openbox window manager, which labwc reads as well; an item runs through vel-open.
 QByteArray openbox(const MenuItem &menu);
 
-/// A JSON object for each item: kind, name, path, icon, exec, children.
+/// What stands between "begin" and "end" in a menu file of the Fluxbox window manager.
+QByteArray fluxbox(const MenuItem &menu);
+
+/// What a "menuprog" of the IceWM window manager prints.
+QByteArray icewm(const MenuItem &menu);
+
+/// What the "Dynamic" and "Include" tags of the JWM window manager read.
+QByteArray jwm(const MenuItem &menu);
+
+/// The MenuLines, each with its icon as rofi's dmenu mode takes it.
+QByteArray rofi(const MenuItem &menu);
+
+/// The MenuLines alone.
+QByteArray dmenu(const MenuItem &menu);
+
+/// A JSON object for each item: kind, name, path, children, and whatever else the item tells of itself.
 QByteArray json(const MenuItem &menu);
 
 /// A name on each line, a folder's children indented by four blanks below it. In a name a blank

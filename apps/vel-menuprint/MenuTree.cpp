@@ -6,6 +6,7 @@
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
 #include <menuedit/EntryDisplay.h>
+#include <menuedit/EntryState.h>
 #include <menuedit/ItemOrder.h>
 #include <menuedit/SortOrder.h>
 
@@ -58,6 +59,32 @@ MenuItem plainFile(const QFileInfo &info)
     return item;
 }
 
+QString firstOf(const QString &local, const QString &plain)
+{
+    return local.isEmpty() ? plain : local;
+}
+
+MenuItemDetails detailsOf(const VelUIDesktopEntry &record)
+{
+    MenuItemDetails details;
+    details.genericName = firstOf(record.getLocalGenericName(), record.getGenericName());
+    details.comment = firstOf(record.getLocalComment(), record.getComment());
+    details.keywords = record.getLocalKeywords().isEmpty() ? record.getKeywords() : record.getLocalKeywords();
+    details.categories = record.getCategories();
+    details.mimeTypes = record.getMimeType();
+    details.tryExec = record.getTryExec();
+    details.workingDirectory = record.getPath();
+    details.startupWMClass = record.getStartupWMClass();
+    details.url = record.getURL();
+    details.terminal = record.getTerminal();
+    details.startupNotify = record.getStartupNotify();
+    const QList<VelUIDesktopAction> actions = record.getActions();
+    for (const VelUIDesktopAction &action : actions)
+        details.actions.append({action.getId(), firstOf(action.getLocalName(), action.getName()),
+                                action.getIcon(), action.getExec()});
+    return details;
+}
+
 MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
 {
     MenuItem item;
@@ -66,6 +93,8 @@ MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
     item.icon = record.getIcon();
     item.exec = record.getExec();
     item.kind = item.exec == QLatin1String("VELWM_SEPARATOR") ? MenuItem::Separator : MenuItem::Entry;
+    item.details = detailsOf(record);
+    item.isListed = EntryState::of(record) == EntryState::Kind::Shown;
     return item;
 }
 
@@ -126,6 +155,7 @@ MenuItem readFolder(const QFileInfo &folder, Walk *walk)
         const VelUIDesktopEntry record(own);
         item.name = EntryDisplay::shownName(record);
         item.icon = record.getIcon();
+        item.isListed = !record.getNoDisplay() && !record.getHidden();
         sortOrder = record.getSortOrder();
     }
 

@@ -4,7 +4,34 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 #include <QVector>
+
+/// One of the further actions of an entry.
+struct MenuItemAction
+{
+    QString id;
+    QString name;
+    QString icon;
+    QString exec;
+};
+
+/// What else an entry tells of itself, in the user's language; what it does not tell is empty.
+struct MenuItemDetails
+{
+    QString genericName;
+    QString comment;
+    QStringList keywords;
+    QStringList categories;
+    QStringList mimeTypes;
+    QString tryExec;
+    QString workingDirectory;
+    QString startupWMClass;
+    QString url; ///< of a link
+    bool terminal = false;
+    bool startupNotify = false;
+    QVector<MenuItemAction> actions;
+};
 
 /// One item of a menu directory, as the menu shows it.
 struct MenuItem
@@ -21,6 +48,8 @@ struct MenuItem
     QString path; ///< absolute
     QString icon; ///< the name of the icon or its path; may be empty
     QString exec; ///< the command of an entry, with its field codes
+    bool isListed = true; ///< whether a menu for starting programs shows it, apart from its children
+    MenuItemDetails details; ///< of an entry
     QVector<MenuItem> children; ///< of a folder
 };
 

@@ -1,9 +1,12 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-// Prints a menu directory in its order.
+// Prints a menu directory in its order, in the forms that window managers and launchers read.
 
+#include "IconFiles.h"
+#include "ListedMenu.h"
 #include "MenuFormat.h"
+#include "MenuLines.h"
 #include "MenuTree.h"
 
 #include <support/Program.h>
@@ -11,21 +14,67 @@
 
 #include <QCommandLineParser>
 #include <QCoreApplication>
+#include <QFile>
 #include <QFileInfo>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 
+#include <unistd.h>
+
 namespace {
 
-enum ExitStatus { Done = 0, CannotWrite = 1, CannotStart = 2 };
+enum ExitStatus { Done = 0, CannotWrite = 1, CannotStart = 2, NotInMenu = 3 };
+
+constexpr int LargestIcon = 1024; // pixels
 
 struct Options
 {
     QString format;
     QString dir;
+    QString iconTheme;
+    int iconSize = 0;
+    bool isToRun = false;
     QString error; ///< what is wrong with the command line; empty when nothing is
 };
+
+/// The options that the parser knows.
+struct Switches
+{
+    QCommandLineOption format{
+        QStringLiteral("format"),
+        QCoreApplication::translate("vel-menuprint", "What to print: %1. The default is text.")
+            .arg(MenuFormat::names().join(QLatin1String(", "))),
+        QStringLiteral("FORMAT"), QStringLiteral("text")};
+    QCommandLineOption iconTheme{
+        QStringLiteral("icon-theme"),
+        QCoreApplication::translate("vel-menuprint",
+                                    "The icon theme to take the files of icons from; the user's own when "
+                                    "none is given."),
+        QStringLiteral("NAME")};
+    QCommandLineOption iconSize{
+        QStringLiteral("icon-size"),
+        QCoreApplication::translate("vel-menuprint", "The edge of the icons in pixels, 24 by default."),
+        QStringLiteral("PIXELS"), QStringLiteral("24")};
+    QCommandLineOption run{
+        QStringLiteral("run"),
+        QCoreApplication::translate("vel-menuprint",
+                                    "Reads one of the lines that rofi or dmenu was given from standard "
+                                    "input and starts its entry.")};
+};
+
+QString problemOf(const Options &options, const QStringList &arguments)
+{
+    if (!MenuFormat::find(options.format))
+        return QCoreApplication::translate("vel-menuprint", "unknown format: %1").arg(options.format);
+    if (options.iconSize < 1 || options.iconSize > LargestIcon)
+        return QCoreApplication::translate("vel-menuprint", "the size of icons is not between 1 and %1")
+            .arg(LargestIcon);
+    if (arguments.size() > 1)
+        return QCoreApplication::translate("vel-menuprint", "more than one directory");
+    return {};
+}
 
 Options parse()
 {
@@ -34,11 +83,8 @@ Options parse()
         QCoreApplication::translate("vel-menuprint", "Prints a menu directory in its order."));
     parser.addHelpOption();
     parser.addVersionOption();
-    const QCommandLineOption format(
-        QStringLiteral("format"),
-        QCoreApplication::translate("vel-menuprint", "openbox (a pipe menu), json or text (the default)."),
-        QStringLiteral("FORMAT"), QStringLiteral("text"));
-    parser.addOption(format);
+    const Switches switches;
+    parser.addOptions({switches.format, switches.iconTheme, switches.iconSize, switches.run});
     parser.addPositionalArgument(
         QStringLiteral("DIR"),
         QCoreApplication::translate("vel-menuprint",
@@ -49,14 +95,13 @@ Options parse()
     options.error = Program::parse(parser);
     if (!options.error.isEmpty())
         return options;
-    options.format = parser.value(format);
-    options.dir = parser.positionalArguments().value(0, QString::fromStdString(GetVelDir(VelDir::StartMenu)));
-    if (!QStringList({QStringLiteral("openbox"), QStringLiteral("json"), QStringLiteral("text")})
-             .contains(options.format))
-        options.error =
-            QCoreApplication::translate("vel-menuprint", "unknown format: %1").arg(options.format);
-    else if (parser.positionalArguments().size() > 1)
-        options.error = QCoreApplication::translate("vel-menuprint", "more than one directory");
+    const QStringList arguments = parser.positionalArguments();
+    options.format = parser.value(switches.format);
+    options.dir = arguments.value(0, QString::fromStdString(GetVelDir(VelDir::StartMenu)));
+    options.iconTheme = parser.value(switches.iconTheme);
+    options.iconSize = parser.value(switches.iconSize).toInt();
+    options.isToRun = parser.isSet(switches.run);
+    options.error = problemOf(options, arguments);
     return options;
 }
 
@@ -72,13 +117,89 @@ QString obstacle(const QFileInfo &directory)
     return {};
 }
 
-QByteArray printed(const QString &format, const MenuItem &menu)
+MenuItem readMenu(const QFileInfo &directory)
 {
-    if (format == QLatin1String("openbox"))
-        return MenuFormat::openbox(menu);
-    if (format == QLatin1String("json"))
-        return MenuFormat::json(menu);
-    return MenuFormat::text(menu);
+    bool isWhole = true;
+    const MenuItem menu = MenuTree::read(directory.absoluteFilePath(), &isWhole);
+    if (!isWhole)
+        Program::printError(
+            QCoreApplication::translate("vel-menuprint",
+                                        "The menu has more than %1 items or %2 levels, and the rest of it is "
+                                        "left out. Look for links that lead into the same folders again.")
+                .arg(MenuTree::MostItems)
+                .arg(MenuTree::MostLevels));
+    return menu;
+}
+
+// As the format wants it.
+MenuItem prepared(const MenuItem &menu, const MenuFormat::Format &format, const Options &options)
+{
+    if (!format.isForStarting)
+        return menu;
+    IconFiles::setTheme(options.iconTheme.isEmpty() ? IconFiles::userTheme() : options.iconTheme);
+    return ListedMenu::of(menu, [&](const QString &name) {
+        return IconFiles::find(name, options.iconSize, format.hasPicturesOnly);
+    });
+}
+
+void tellOfLongPaths(const MenuItem &menu)
+{
+    if (menu.path.contains(QLatin1Char('\n')))
+        Program::printError(
+            QCoreApplication::translate("vel-menuprint",
+                                        "%1 is left out, as the line end in its name cannot be written in "
+                                        "this format. Rename it.")
+                .arg(menu.path));
+    for (const MenuItem &child : menu.children)
+        tellOfLongPaths(child);
+}
+
+int print(const MenuItem &menu, const Options &options)
+{
+    const MenuFormat::Format &format = *MenuFormat::find(options.format);
+    const MenuItem shown = prepared(menu, format, options);
+    if (format.hasLines)
+        tellOfLongPaths(shown);
+    const QByteArray out = format.print(shown);
+    const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
+        && std::fflush(stdout) == 0;
+    return written ? Done : Program::fail(qt_error_string(errno), CannotWrite);
+}
+
+// The chosen line, without its end; empty when nothing was chosen.
+QString readLine()
+{
+    QByteArray line;
+    for (int c = std::getchar(); c != EOF && c != '\n'; c = std::getchar())
+        line += char(c);
+    return QString::fromUtf8(line);
+}
+
+// Goes on as vel-open, the one beside this program if there is one.
+int open(const QString &path)
+{
+    const QByteArray file = QFile::encodeName(path);
+    const QByteArray beside = QFile::encodeName(QCoreApplication::applicationDirPath()) + "/vel-open";
+    ::execl(beside.constData(), "vel-open", "--exec", file.constData(), nullptr);
+    ::execlp("vel-open", "vel-open", "--exec", file.constData(), nullptr);
+    return Program::fail(
+        QCoreApplication::translate("vel-menuprint", "cannot run vel-open: %1").arg(qt_error_string(errno)),
+        CannotStart);
+}
+
+int runChosen(const MenuItem &menu)
+{
+    const QString chosen = readLine();
+    if (chosen.isEmpty())
+        return Done;
+    const auto lines = MenuLines::of(ListedMenu::of(menu, nullptr));
+    const auto line = std::find_if(lines.cbegin(), lines.cend(),
+                                   [&](const MenuLines::Line &each) { return each.text == chosen; });
+    if (line != lines.cend())
+        return open(line->path);
+    return Program::fail(
+        QCoreApplication::translate("vel-menuprint", "There is no \"%1\" in the menu.").arg(chosen),
+        NotInMenu);
 }
 
 int run(const Options &options)
@@ -87,18 +208,8 @@ int run(const Options &options)
     const QString why = obstacle(directory);
     if (!why.isEmpty())
         return Program::fail(why, CannotStart);
-    bool isWhole = true;
-    const QByteArray out = printed(options.format, MenuTree::read(directory.absoluteFilePath(), &isWhole));
-    if (!isWhole)
-        Program::printError(
-            QCoreApplication::translate("vel-menuprint",
-                                        "The menu has more than %1 items or %2 levels, and the rest of it is "
-                                        "left out. Look for links that lead into the same folders again.")
-                .arg(MenuTree::MostItems)
-                .arg(MenuTree::MostLevels));
-    const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
-        && std::fflush(stdout) == 0;
-    return written ? Done : Program::fail(qt_error_string(errno), CannotWrite);
+    const MenuItem menu = readMenu(directory);
+    return options.isToRun ? runChosen(menu) : print(menu, options);
 }
 
 } // namespace

@@ -26,11 +26,13 @@ struct Result
     QByteArray err;
 };
 
-Result print(const QStringList &arguments)
+Result print(const QStringList &arguments, const QByteArray &input = QByteArray())
 {
     QProcess process;
     process.start(QStringLiteral(VEL_PROGRAM), arguments);
-    if (!process.waitForFinished())
+    process.write(input);
+    process.closeWriteChannel();
+    if (!process.waitForFinished(120000))
         QTest::qFail("the program hangs", __FILE__, __LINE__);
     return {process.exitCode(), process.readAllStandardOutput(), process.readAllStandardError()};
 }
@@ -81,6 +83,12 @@ private Q_SLOTS:
     void printsJson();
     void printsAnOpenboxPipeMenu();
     void printsNamesThatXmlCannotHold();
+    void startsTheChosenLine();
+    void startsNothingWhenNothingWasChosen();
+    void tellsThatTheChosenLineIsNotInTheMenu();
+    void tellsOfPathsThatAFormatCannotHold();
+    void refusesIconSizesThatNobodyHas_data();
+    void refusesIconSizesThatNobodyHas();
     void tellsThatItCannotWrite();
     void quotesPathsForTheShell_data();
     void quotesPathsForTheShell();
@@ -352,6 +360,68 @@ void tst_vel_menuprint::printsNamesThatXmlCannotHold()
     QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
     QVERIFY(labels.contains(QString::fromUtf8("A\xEF\xBF\xBD B")));
     QVERIFY(MenuFormat::text(menu).endsWith("        A? B\n"));
+}
+
+void tst_vel_menuprint::startsTheChosenLine()
+{
+    const QString sign = path(QStringLiteral("sign"));
+    for (const char *name : {"a", "b"})
+        write(QStringLiteral("menu/F/%1.desktop").arg(QLatin1String(name)),
+              "[Desktop Entry]\nType=Application\nName=Same\nExec=touch " + sign.toUtf8() + name + "\n");
+    const Result lines =
+        print({QStringLiteral("--format"), QStringLiteral("dmenu"), path(QStringLiteral("menu"))});
+    QCOMPARE(lines.out, QByteArray("F > Same\nF > Same (2)\n"));
+    const Result result = print({QStringLiteral("--run"), path(QStringLiteral("menu"))}, "F > Same (2)\n");
+    QCOMPARE(result.err, QByteArray());
+    QCOMPARE(result.status, 0);
+    QTRY_COMPARE_WITH_TIMEOUT(QDir(folder()).entryList({QStringLiteral("sign*")}).size(), 1, 20000);
+    const MenuItem menu = MenuTree::read(path(QStringLiteral("menu")));
+    QCOMPARE(QDir(folder()).entryList({QStringLiteral("sign*")}).constFirst(),
+             QStringLiteral("sign") + QFileInfo(menu.children.at(0).children.at(1).path).baseName());
+}
+
+void tst_vel_menuprint::startsNothingWhenNothingWasChosen()
+{
+    QVERIFY(QDir().mkpath(path(QStringLiteral("menu"))));
+    const Result result = print({QStringLiteral("--run"), path(QStringLiteral("menu"))}, "");
+    QCOMPARE(result.status, 0);
+    QCOMPARE(result.out + result.err, QByteArray());
+}
+
+void tst_vel_menuprint::tellsThatTheChosenLineIsNotInTheMenu()
+{
+    QVERIFY(QDir().mkpath(path(QStringLiteral("menu"))));
+    const Result result = print({QStringLiteral("--run"), path(QStringLiteral("menu"))}, "F > A\n");
+    QCOMPARE(result.status, 3);
+    QCOMPARE(result.err, QByteArray("vel-menuprint: There is no \"F > A\" in the menu.\n"));
+}
+
+void tst_vel_menuprint::tellsOfPathsThatAFormatCannotHold()
+{
+    write(QStringLiteral("menu/a\nb.desktop"), entry("A"));
+    const QStringList menu{path(QStringLiteral("menu"))};
+    const Result lines = print(QStringList{QStringLiteral("--format"), QStringLiteral("icewm")} + menu);
+    QCOMPARE(lines.status, 0);
+    QVERIFY2(
+        lines.err.startsWith("vel-menuprint: " + menu.constFirst().toUtf8() + "/a?b.desktop is left out"),
+        lines.err);
+    const Result xml = print(QStringList{QStringLiteral("--format"), QStringLiteral("jwm")} + menu);
+    QCOMPARE(xml.err, QByteArray());
+}
+
+void tst_vel_menuprint::refusesIconSizesThatNobodyHas_data()
+{
+    QTest::addColumn<QString>("size");
+    for (const char *size : {"0", "-1", "1025", "large", ""})
+        QTest::newRow(*size ? size : "empty") << QString::fromLatin1(size);
+}
+
+void tst_vel_menuprint::refusesIconSizesThatNobodyHas()
+{
+    QFETCH(QString, size);
+    const Result result = print({QStringLiteral("--icon-size"), size, QStringLiteral("/")});
+    QCOMPARE(result.status, 2);
+    QCOMPARE(result.err, QByteArray("vel-menuprint: the size of icons is not between 1 and 1024\n"));
 }
 
 void tst_vel_menuprint::tellsThatItCannotWrite()
