@@ -5,6 +5,12 @@
 
 #include <QSocketNotifier>
 
+namespace {
+
+constexpr char StartMenuLine[] = "VELWM_UPDATE_STARTMENU";
+
+} // namespace
+
 Bridge::Bridge(const BridgeCommands &commands, QObject *parent)
     : QObject(parent)
     , m_commands(commands)
@@ -26,6 +32,11 @@ bool Bridge::start(bool replace)
     return true;
 }
 
+void Bridge::updateStartMenu()
+{
+    obey(StartMenuLine);
+}
+
 void Bridge::stop()
 {
     m_receiver.release();
@@ -33,7 +44,7 @@ void Bridge::stop()
 
 const QString &Bridge::commandFor(const std::string &line) const
 {
-    if (line == "VELWM_UPDATE_STARTMENU")
+    if (line == StartMenuLine)
         return m_commands.startMenu;
     if (line == "VELWM_UPDATE_TOOLBAR")
         return m_commands.toolBar;

@@ -41,6 +41,9 @@ public:
      */
     bool start(bool replace);
 
+    /// Runs the command for a changed start menu, as if a line had come.
+    void updateStartMenu();
+
     /// Gives the channel up. Commands that run go on, those that still wait do not run.
     void stop();
 

@@ -5,6 +5,7 @@
 
 #include "Bridge.h"
 #include "SystemSignal.h"
+#include "WindowManagers.h"
 
 #include <support/Program.h>
 
@@ -21,8 +22,24 @@ struct Options
 {
     BridgeCommands commands;
     bool replace = false;
+    bool updatesAtStart = false;
     QString error; ///< what is wrong with the command line; empty when nothing is
 };
+
+// A command that was given counts more than the one of the window manager.
+void takeSettings(const QString &manager, Options *options)
+{
+    const WindowManagers::Settings *const settings = WindowManagers::find(manager);
+    if (!settings) {
+        options->error =
+            QCoreApplication::translate("vel-wmbridge", "unknown window manager: %1 (known are %2)")
+                .arg(manager, WindowManagers::names().join(QLatin1String(", ")));
+        return;
+    }
+    if (options->commands.startMenu.isEmpty())
+        options->commands.startMenu = QString::fromLatin1(settings->startMenu);
+    options->updatesAtStart = settings->runsAtStart;
+}
 
 Options parse()
 {
@@ -49,15 +66,26 @@ Options parse()
     const QCommandLineOption replace(
         QStringLiteral("replace"),
         QCoreApplication::translate("vel-wmbridge", "Take the channel from the program that has it."));
-    parser.addOptions({startMenu, toolBar, shortcut, other, replace});
+    const QCommandLineOption manager(
+        QStringLiteral("for"),
+        QCoreApplication::translate("vel-wmbridge",
+                                    "Do what this window manager needs to show the start menu as it is: %1.")
+            .arg(WindowManagers::names().join(QLatin1String(", "))),
+        QStringLiteral("NAME"));
+    parser.addOptions({startMenu, toolBar, shortcut, other, manager, replace});
 
     QString error = Program::parse(parser);
     if (error.isEmpty() && !parser.positionalArguments().isEmpty())
         error = QCoreApplication::translate("vel-wmbridge", "unexpected argument: %1")
                     .arg(parser.positionalArguments().constFirst());
-    return {{parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)},
-            parser.isSet(replace),
-            error};
+    Options options{
+        {parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)},
+        parser.isSet(replace),
+        false,
+        error};
+    if (parser.isSet(manager) && error.isEmpty())
+        takeSettings(parser.value(manager), &options);
+    return options;
 }
 
 // Tells of what goes wrong while the bridge runs.
@@ -83,6 +111,8 @@ int run(const Options &options)
             QCoreApplication::translate(
                 "vel-wmbridge", "cannot take the channel: there is no display, or another program has it"),
             ChannelTaken);
+    if (options.updatesAtStart)
+        bridge.updateStartMenu();
     const SystemSignal termination({SIGTERM, SIGINT});
     QObject::connect(&termination, &SystemSignal::caught, qApp, &QCoreApplication::quit);
     const int status = QCoreApplication::exec();

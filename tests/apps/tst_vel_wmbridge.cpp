@@ -58,11 +58,16 @@ private Q_SLOTS:
     void leavesItsCommandsRunningWhenItEnds();
     void keepsTheChannelWhenOthersDestroyItsWindow();
     void keepsTheChannelWhenALossIsOnlySent();
+    void doesWhatAWindowManagerNeeds();
+    void prefersTheCommandThatIsGiven();
+    void preparesTheMenuOfFluxboxAtTheStart();
     void refusesUnknownArguments_data();
     void refusesUnknownArguments();
 
 private:
     void start(const QStringList &arguments);
+    /// Puts a program \a name into the PATH of the bridge.
+    void provide(const char *name, const QString &commands);
     QString log() const { return path(QStringLiteral("log")); }
     QString logging(const char *word) const
     {
@@ -105,6 +110,7 @@ void tst_vel_wmbridge::cleanup()
     }
     m_bridge.readAll();
     m_bridge.readAllStandardError();
+    m_bridge.setProcessEnvironment(QProcessEnvironment());
     TestCase::cleanup();
 }
 
@@ -327,12 +333,58 @@ void tst_vel_wmbridge::keepsTheChannelWhenALossIsOnlySent()
     QCOMPARE(m_bridge.state(), QProcess::Running);
 }
 
+void tst_vel_wmbridge::provide(const char *name, const QString &commands)
+{
+    const QString file =
+        write(QStringLiteral("bin/") + QLatin1String(name), "#!/bin/sh\n" + commands.toUtf8() + '\n');
+    QVERIFY(QFile::setPermissions(file, QFile::ReadOwner | QFile::ExeOwner));
+    auto environment = QProcessEnvironment::systemEnvironment();
+    environment.insert(QStringLiteral("PATH"),
+                       path(QStringLiteral("bin:")) + environment.value(QStringLiteral("PATH")));
+    environment.insert(QStringLiteral("HOME"), folder());
+    m_bridge.setProcessEnvironment(environment);
+}
+
+void tst_vel_wmbridge::doesWhatAWindowManagerNeeds()
+{
+    provide("openbox", QStringLiteral("echo \"$@\" >>'%1'").arg(log()));
+    start({QStringLiteral("--for"), QStringLiteral("openbox")});
+    QVERIFY(!QFile::exists(log()));
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE_WITH_TIMEOUT(logged(), QByteArrayList{"--reconfigure"}, 20000);
+}
+
+void tst_vel_wmbridge::prefersTheCommandThatIsGiven()
+{
+    provide("openbox", QStringLiteral("echo openbox >>'%1'").arg(log()));
+    start(
+        {QStringLiteral("--for"), QStringLiteral("openbox"), QStringLiteral("--startmenu"), logging("mine")});
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE_WITH_TIMEOUT(logged(), QByteArrayList{"mine VELWM_UPDATE_STARTMENU"}, 20000);
+}
+
+void tst_vel_wmbridge::preparesTheMenuOfFluxboxAtTheStart()
+{
+    provide("vel-menuprint", QStringLiteral("cat '%1'").arg(write(QStringLiteral("menu"), "first")));
+    start({QStringLiteral("--for"), QStringLiteral("fluxbox")});
+    const QString file = path(QStringLiteral(".fluxbox/vel-menu"));
+    QTRY_VERIFY_WITH_TIMEOUT(QFile::exists(file), 20000);
+    QCOMPARE(read(file), QByteArray("first"));
+    write(QStringLiteral("menu"), "second");
+    QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
+    QTRY_COMPARE_WITH_TIMEOUT(read(file), QByteArray("second"), 20000);
+}
+
 void tst_vel_wmbridge::refusesUnknownArguments_data()
 {
     QTest::addColumn<QString>("argument");
     QTest::addColumn<QByteArray>("message");
     QTest::newRow("word") << QStringLiteral("now") << QByteArray("vel-wmbridge: unexpected argument: now\n");
     QTest::newRow("option") << QStringLiteral("--now") << QByteArray("vel-wmbridge: Unknown option 'now'.\n");
+    QTest::newRow("window manager")
+        << QStringLiteral("--for=other")
+        << QByteArray("vel-wmbridge: unknown window manager: other (known are fluxbox, icewm, jwm, labwc, "
+                      "openbox)\n");
     QTest::newRow("no command") << QStringLiteral("--other")
                                 << QByteArray("vel-wmbridge: Missing value after '--other'.\n");
 }
