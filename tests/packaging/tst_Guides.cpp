@@ -51,11 +51,15 @@ void tst_Guides::showEveryExample()
 void tst_Guides::showNothingElse()
 {
     const QDir guides(sourceDir + QStringLiteral("/docs/guides"));
-    const QStringList names = guides.entryList({QStringLiteral("*.md")});
-    QCOMPARE(names.size(),
+    int programs = 0;
+    for (const QString &name : guides.entryList({QStringLiteral("*.md")})) {
+        const int inThis = read(guides.filePath(name)).count("```cpp\n");
+        // A guide for users has none.
+        QVERIFY2(inThis <= 1, qPrintable(name));
+        programs += inThis;
+    }
+    QCOMPARE(programs,
              QDir(sourceDir + QStringLiteral("/examples")).entryList({QStringLiteral("*.cpp")}).size());
-    for (const QString &name : names)
-        QCOMPARE(read(guides.filePath(name)).count("```cpp\n"), 1);
 }
 
 VEL_TEST_GUILESS_MAIN(tst_Guides)
