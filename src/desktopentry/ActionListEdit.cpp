@@ -3,6 +3,7 @@
 
 #include "ActionListEdit.h"
 
+#include "ActionIds.h"
 #include "EditActionsDialog.h"
 
 #include <frame/GuardedDialog.h>
@@ -21,14 +22,6 @@ const ListLineForm::Names FormNames = {
     QT_TRANSLATE_NOOP("ActionListEdit", "..."),
 };
 
-QStringList idsOf(const QList<VelUIDesktopAction> &actions)
-{
-    QStringList ids;
-    for (const VelUIDesktopAction &action : actions)
-        ids.append(action.getId());
-    return ids;
-}
-
 } // namespace
 
 ActionListEdit::ActionListEdit(QWidget *parent)
@@ -41,7 +34,7 @@ ActionListEdit::ActionListEdit(QWidget *parent)
 void ActionListEdit::setActions(const QList<VelUIDesktopAction> &actions)
 {
     m_actions = actions;
-    m_ui.show(idsOf(m_actions));
+    m_ui.show(ActionIds::of(m_actions));
 }
 
 QList<VelUIDesktopAction> ActionListEdit::actions() const
