@@ -9,12 +9,16 @@
 
 #include <QDialog>
 #include <QList>
+#include <QSet>
 
 namespace VelUI {
 
 class EditActionsWidget;
 
 /// Edits a copy of an entry's actions; Ok waits for the first change.
+///
+/// The dialog tells of ids that are wrong and proposes others. Ok does not take ids that would get
+/// lost; those that are but odd it takes when the user has been told, or when they were there before.
 class EditActionsDialog : public QDialog
 {
     Q_OBJECT
@@ -25,12 +29,18 @@ public:
     QList<VelUIDesktopAction> actions() const;
     void setTexts(const QString &addTitle, const QString &editTitle);
 
+    void accept() override;
+
 public Q_SLOTS:
     void setChanged(bool changed);
 
 private:
+    void tellOfIds();
+    void repairIds();
+
     ListDialogForm m_ui;
     EditActionsWidget *m_listWidget;
+    QSet<QString> m_toldIds;
 };
 
 } // namespace VelUI

@@ -61,6 +61,11 @@ QList<VelUIDesktopAction> EditActionsWidget::actions() const
     return actions;
 }
 
+void EditActionsWidget::select(int row)
+{
+    m_ui.select(row);
+}
+
 void EditActionsWidget::setTexts(const QString &addTitle, const QString &editTitle)
 {
     m_addTitle = addTitle;
@@ -80,7 +85,7 @@ void EditActionsWidget::addAction()
     if (!dialog.run())
         return;
     appendItem(dialog->action());
-    updateButtonsAvailability();
+    m_ui.select(m_ui.listWidget->count() - 1);
     Q_EMIT changed();
 }
 

@@ -33,6 +33,8 @@ public:
 
     void setActions(const QList<VelUIDesktopAction> &actions);
     QList<VelUIDesktopAction> actions() const;
+    /// Makes the action in \a row the only selected one and shows it.
+    void select(int row);
 
     /// Sets the titles of the dialogs of a new and of an edited action.
     void setTexts(const QString &addTitle, const QString &editTitle);

@@ -253,7 +253,9 @@ void tst_EditActionsWidget::keepsTheButtonsRightWhenActionsComeAndGo()
     });
     widget.addAction();
     QVERIFY(modal.finished());
-    QVERIFY(down->isEnabled());
+    // The new one is selected.
+    QVERIFY(!down->isEnabled());
+    QVERIFY(child<QPushButton>(&widget, "upButton")->isEnabled());
 
     widget.setActions(actions({"b", "c"}));
     for (const QPushButton *button : widget.findChildren<QPushButton *>())

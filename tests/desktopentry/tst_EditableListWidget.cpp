@@ -318,6 +318,7 @@ void tst_EditableListWidget::asksWithTheFunctionGiven()
     QCOMPARE(asked.title, QStringLiteral("Add string"));
     QCOMPARE(asked.mode, QLineEdit::Normal);
     QCOMPARE(asked.text, QString());
+    child<QListWidget>(&widget, "listWidget")->setCurrentRow(0);
     widget.editAction();
     QCOMPARE(asked.title, QStringLiteral("Edit string"));
     QCOMPARE(asked.mode, QLineEdit::Normal);
@@ -412,7 +413,7 @@ void tst_EditableListWidget::keepsTheButtonsRightAfterEveryChange()
     QVERIFY(up->isEnabled() && !down->isEnabled());
     nextAnswer = QStringLiteral("c");
     widget.addAction();
-    QVERIFY(up->isEnabled() && down->isEnabled());
+    QVERIFY(up->isEnabled() && !down->isEnabled()); // the new one is selected
     list->setCurrentRow(0);
     widget.deleteActions();
     QCOMPARE(list->selectedItems().size(), 1);

@@ -30,6 +30,9 @@ public Q_SLOTS:
     void setChanged(bool changed);
 
 private:
+    void tellOfSemicolons();
+    void splitAtSemicolons();
+
     ListDialogForm m_ui;
     EditableListWidget *m_listWidget;
 };

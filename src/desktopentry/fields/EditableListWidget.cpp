@@ -54,6 +54,11 @@ QStringList EditableListWidget::strings() const
     return strings;
 }
 
+void EditableListWidget::select(int row)
+{
+    m_ui.select(row);
+}
+
 void EditableListWidget::setTexts(const QString &addTitle, const QString &addLabel, const QString &editTitle,
                                   const QString &editLabel)
 {
@@ -75,7 +80,7 @@ void EditableListWidget::addAction()
     if (!self || text.isEmpty())
         return;
     m_ui.listWidget->addItem(text);
-    updateButtonsAvailability();
+    m_ui.select(m_ui.listWidget->count() - 1);
     Q_EMIT changed();
 }
 

@@ -21,6 +21,8 @@ public:
 
     void setStrings(const QStringList &strings);
     QStringList strings() const;
+    /// Makes the string in \a row the only selected one and shows it.
+    void select(int row);
 
     void setTexts(const QString &addTitle, const QString &addLabel, const QString &editTitle,
                   const QString &editLabel);

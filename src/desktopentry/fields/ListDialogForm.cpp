@@ -3,6 +3,8 @@
 
 #include "ListDialogForm.h"
 
+#include "ListMessage.h"
+
 #include <QCoreApplication>
 #include <QDialog>
 #include <QDialogButtonBox>
@@ -43,6 +45,39 @@ void ListDialogForm::setupUi(QDialog *dialog, QWidget *listWidget, const Names &
 void ListDialogForm::setOkEnabled(bool enabled)
 {
     buttonBox->button(QDialogButtonBox::Ok)->setEnabled(enabled);
+}
+
+void ListDialogForm::makeMessage()
+{
+    QWidget *const dialog = buttonBox->parentWidget();
+    m_message = new ListMessage(dialog);
+    m_message->setObjectName(QStringLiteral("listMessage"));
+    verticalLayout->insertWidget(verticalLayout->indexOf(line), m_message);
+    // Before the buttons with Tab, too.
+    QWidget *previous = m_message->findChild<QPushButton *>();
+    for (const auto button : {QDialogButtonBox::Ok, QDialogButtonBox::Cancel}) {
+        QWidget::setTabOrder(previous, buttonBox->button(button));
+        previous = buttonBox->button(button);
+    }
+    QObject::connect(m_message, &ListMessage::repairWanted, dialog, [this] { repair(); });
+}
+
+void ListDialogForm::tell(const QString &text, const QString &repairText)
+{
+    if (text.isEmpty()) {
+        if (m_message)
+            m_message->hide();
+        return;
+    }
+    if (!m_message)
+        makeMessage();
+    m_message->tell(text, repairText);
+}
+
+void ListDialogForm::insist()
+{
+    if (m_message)
+        m_message->insist();
 }
 
 } // namespace VelUI

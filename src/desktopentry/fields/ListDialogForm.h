@@ -3,13 +3,18 @@
 
 #pragma once
 
+#include <functional>
+
 class QDialog;
 class QDialogButtonBox;
 class QFrame;
+class QString;
 class QVBoxLayout;
 class QWidget;
 
 namespace VelUI {
+
+class ListMessage;
 
 /// The form of a dialog around a list editor: the editor, a line, and Ok and Cancel.
 class ListDialogForm
@@ -25,9 +30,21 @@ public:
     void setupUi(QDialog *dialog, QWidget *listWidget, const Names &names);
     void setOkEnabled(bool enabled);
 
+    /// Says \a text below the list, with a button for repair() that \a repairText names. An empty
+    /// \a text says nothing, an empty \a repairText offers nothing.
+    void tell(const QString &text, const QString &repairText);
+    /// Leads whoever overlooked what was said to it.
+    void insist();
+    std::function<void()> repair; ///< what the button does
+
     QVBoxLayout *verticalLayout = nullptr;
     QFrame *line = nullptr;
     QDialogButtonBox *buttonBox = nullptr;
+
+private:
+    void makeMessage();
+
+    ListMessage *m_message = nullptr; ///< made when there is something to say
 };
 
 } // namespace VelUI

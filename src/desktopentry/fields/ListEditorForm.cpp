@@ -3,10 +3,13 @@
 
 #include "ListEditorForm.h"
 
+#include "ButtonKeys.h"
+
 #include <QCoreApplication>
 #include <QHBoxLayout>
 #include <QListWidget>
 #include <QPushButton>
+#include <QTimer>
 #include <QVBoxLayout>
 
 namespace VelUI {
@@ -38,7 +41,20 @@ void ListEditorForm::setupUi(QWidget *widget, const Names &names)
 
     widget->setWindowTitle(QCoreApplication::translate(names.form, names.windowTitle));
     QMetaObject::connectSlotsByName(widget);
+    connectKeys();
     updateButtons();
+}
+
+void ListEditorForm::connectKeys()
+{
+    auto *keys = new ButtonKeys(listWidget);
+    keys->add(Qt::Key_Delete, deleteButton);
+    for (const Qt::Key key : {Qt::Key_Return, Qt::Key_Enter, Qt::Key_F2})
+        keys->add(key, editButton);
+    // Not from the click itself: what opens may take the list away, which is not done with it yet.
+    QPushButton *const edit = editButton;
+    QObject::connect(listWidget, &QListWidget::itemDoubleClicked, edit,
+                     [edit] { QTimer::singleShot(0, edit, &QPushButton::click); });
 }
 
 QPushButton *ListEditorForm::addPushButton(QWidget *widget, const char *name, const char *context,
@@ -48,6 +64,13 @@ QPushButton *ListEditorForm::addPushButton(QWidget *widget, const char *name, co
     button->setObjectName(QLatin1String(name));
     verticalLayout->addWidget(button);
     return button;
+}
+
+void ListEditorForm::select(int row)
+{
+    listWidget->setCurrentRow(row, QItemSelectionModel::ClearAndSelect);
+    listWidget->scrollToItem(listWidget->currentItem());
+    updateButtons();
 }
 
 void ListEditorForm::removeSelectedItems()

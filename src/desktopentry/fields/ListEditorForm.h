@@ -29,6 +29,8 @@ public:
 
     void setupUi(QWidget *widget, const Names &names);
 
+    /// Makes the item in \a row the only selected one and shows it.
+    void select(int row);
     void removeSelectedItems();
     /// Moves the current item by \a rows and keeps it current; without one nothing happens.
     bool moveCurrentItem(int rows);
@@ -45,6 +47,7 @@ public:
     QPushButton *downButton = nullptr;
 
 private:
+    void connectKeys();
     QPushButton *addPushButton(QWidget *widget, const char *name, const char *context, const char *text);
 };
 
