@@ -1,14 +1,16 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "EntryWindow.h"
+
 #include <support/WindowProgram.h>
 
-#include <VelDesktopEntryEditDialog.h>
 #include <VelDesktopEntryPropsWidget.h>
 
 #include <QApplication>
 #include <QCommandLineParser>
 #include <QDialogButtonBox>
+#include <QFile>
 #include <QFileInfo>
 #include <QIcon>
 #include <QPushButton>
@@ -74,14 +76,43 @@ void makeReadOnly(VelDesktopEntryEditDialog *dialog)
         copyButton->setEnabled(false);
 }
 
+// Why the file will not be opened, as far as that can be seen beforehand; empty when nothing is seen.
+QString whyNotOpened(const QString &path)
+{
+    const QFileInfo info(path);
+    if (!info.exists())
+        return QCoreApplication::translate(
+                   "vel-entryedit", "cannot open %1: there is no such file, --create makes a new entry")
+            .arg(path);
+    if (!info.isFile())
+        return QCoreApplication::translate("vel-entryedit", "cannot open %1: it is no regular file")
+            .arg(path);
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly))
+        return QCoreApplication::translate("vel-entryedit", "cannot open %1: %2")
+            .arg(path, file.errorString());
+    return QString();
+}
+
+// On the terminal before the message box, which has to be closed first.
+bool open(VelDesktopEntryEditDialog *dialog, const Options &options)
+{
+    const QString whyNot = options.create ? QString() : whyNotOpened(options.file);
+    if (!whyNot.isEmpty())
+        Program::printError(whyNot);
+    const bool isOpened = dialog->setDesktopEntryPath(options.file, options.create, options.pattern);
+    if (!isOpened && whyNot.isEmpty())
+        Program::printError(QCoreApplication::translate("vel-entryedit", "cannot open %1").arg(options.file));
+    return isOpened;
+}
+
 int run(const Options &options)
 {
     QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("document-edit")));
-    VelDesktopEntryEditDialog dialog;
+    EntryWindow dialog(options.file);
     dialog.setAssistance(true);
-    if (!dialog.setDesktopEntryPath(options.file, options.create, options.pattern))
-        return Program::fail(QCoreApplication::translate("vel-entryedit", "cannot open %1").arg(options.file),
-                             NotOpened);
+    if (!open(&dialog, options))
+        return NotOpened;
     if (options.readOnly)
         makeReadOnly(&dialog);
     return dialog.exec() == QDialog::Accepted ? Saved : Canceled;

@@ -18,6 +18,11 @@ private Q_SLOTS:
     void showsHelpAndVersionWithoutADisplay_data();
     void showsHelpAndVersionWithoutADisplay();
     void saysThatItCannotOpenAMissingFile();
+    void saysWhyItCannotOpenAFile();
+    void saysThatAFileIsNoEntry();
+    void asksBeforeChangesAreLost_data();
+    void asksBeforeChangesAreLost();
+    void staysWhenWhatItWasToldToSaveCannotBeSaved();
     void endsWithOneWhenCanceled();
     void leavesTheFileWhenNothingWasChanged();
     void createsAnEntryThatRuns();
@@ -26,7 +31,11 @@ private Q_SLOTS:
     void isDescribedByAnEntryOfItsOwn();
 
 private:
+    static const QByteArray changeable;
+
     void start(QProcess &program, const QStringList &arguments);
+    // Opens the entry and types into the name in the user's language.
+    void startChanged(QProcess &program, const QString &file);
     void waitForWindow(const QString &title);
     static void pressKeys(const QStringList &keys);
     static void typeText(const QString &text);
@@ -34,6 +43,8 @@ private:
     QString findWindow(const QString &title);
     static QByteArray xdotool(const QStringList &arguments);
 };
+
+const QByteArray tst_vel_entryedit::changeable = "[Desktop Entry]\nType=Application\nName=a\nExec=true\n";
 
 QByteArray tst_vel_entryedit::xdotool(const QStringList &arguments)
 {
@@ -131,23 +142,110 @@ void tst_vel_entryedit::saysThatItCannotOpenAMissingFile()
     QProcess program;
     start(program, {missing});
     waitForWindow(QStringLiteral("Warning"));
+    // Whoever looks at the terminal need not close the box first.
+    QCOMPARE(program.readAllStandardError(),
+             "vel-entryedit: cannot open " + missing.toLocal8Bit()
+                 + ": there is no such file, --create makes a new entry\n");
     pressKeys({QStringLiteral("Return")});
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 2);
-    QCOMPARE(program.readAllStandardError(), "vel-entryedit: cannot open " + missing.toLocal8Bit() + '\n');
+    QCOMPARE(program.readAllStandardError(), QByteArray());
+}
+
+void tst_vel_entryedit::saysWhyItCannotOpenAFile()
+{
+    QProcess program;
+    start(program, {folder()});
+    waitForWindow(QStringLiteral("Warning"));
+    QCOMPARE(program.readAllStandardError(),
+             "vel-entryedit: cannot open " + folder().toLocal8Bit() + ": it is no regular file\n");
+    pressKeys({QStringLiteral("Return")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 2);
+}
+
+void tst_vel_entryedit::startChanged(QProcess &program, const QString &file)
+{
+    start(program, {file});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys({QStringLiteral("Tab"), QStringLiteral("x")});
+}
+
+void tst_vel_entryedit::asksBeforeChangesAreLost_data()
+{
+    QTest::addColumn<QString>("leave");
+    QTest::newRow("Escape") << QStringLiteral("Escape");
+    QTest::newRow("closed by the window manager") << QStringLiteral("alt+F4");
+}
+
+void tst_vel_entryedit::asksBeforeChangesAreLost()
+{
+    QFETCH(QString, leave);
+    const QString file = write(QStringLiteral("a.desktop"), changeable);
+    QProcess program;
+    startChanged(program, file);
+    // No answer is no.
+    pressKeys({leave});
+    waitForWindow(QStringLiteral("Unsaved changes"));
+    pressKeys({QStringLiteral("Escape")});
+    waitUntilGone(QStringLiteral("Unsaved changes"));
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    QCOMPARE(program.state(), QProcess::Running);
+    // Return saves.
+    pressKeys({leave});
+    waitForWindow(QStringLiteral("Unsaved changes"));
+    pressKeys({QStringLiteral("Return")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 0);
+    QVERIFY2(read(file).contains("]=x\n"), read(file).constData());
+}
+
+void tst_vel_entryedit::staysWhenWhatItWasToldToSaveCannotBeSaved()
+{
+    const QString file = write(QStringLiteral("a.desktop"), "[Desktop Entry]\nType=Application\nName=a\n");
+    QProcess program;
+    startChanged(program, file);
+    pressKeys({QStringLiteral("Escape")});
+    waitForWindow(QStringLiteral("Unsaved changes"));
+    pressKeys({QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("^Warning$")); // there is no command
+    pressKeys({QStringLiteral("Return")});
+    waitUntilGone(QStringLiteral("^Warning$"));
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    QCOMPARE(program.state(), QProcess::Running);
+    pressKeys({QStringLiteral("Escape")});
+    waitForWindow(QStringLiteral("Unsaved changes"));
+    pressKeys({QStringLiteral("Tab"), QStringLiteral("space")}); // Discard
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 1);
+}
+
+void tst_vel_entryedit::saysThatAFileIsNoEntry()
+{
+    const QByteArray bytes = "Dear diary\n";
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    QProcess program;
+    start(program, {file});
+    waitForWindow(QStringLiteral("^Warning$"));
+    pressKeys({QStringLiteral("Return")});
+    waitForWindow(QStringLiteral("Desktop Entry Editor"));
+    pressKeys({QStringLiteral("Escape")});
+    QVERIFY(program.waitForFinished(20000));
+    QCOMPARE(program.exitCode(), 1);
+    QCOMPARE(read(file), bytes);
 }
 
 void tst_vel_entryedit::endsWithOneWhenCanceled()
 {
-    const QByteArray bytes = "[Desktop Entry]\nType=Application\nName=a\nExec=true\n";
-    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    const QString file = write(QStringLiteral("a.desktop"), changeable);
     QProcess program;
-    start(program, {file});
-    waitForWindow(QStringLiteral("Desktop Entry Editor"));
-    pressKeys({QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Escape")});
+    startChanged(program, file);
+    pressKeys({QStringLiteral("Escape")});
+    waitForWindow(QStringLiteral("Unsaved changes"));
+    pressKeys({QStringLiteral("Tab"), QStringLiteral("space")}); // Discard
     QVERIFY(program.waitForFinished(20000));
     QCOMPARE(program.exitCode(), 1);
-    QCOMPARE(read(file), bytes);
+    QCOMPARE(read(file), changeable);
     QCOMPARE(program.readAllStandardError(), QByteArray());
 }
 
@@ -187,9 +285,8 @@ void tst_vel_entryedit::createsAnEntryThatRuns()
     QVERIFY(!QFile::exists(file));
     QCOMPARE(program.state(), QProcess::Running);
 
-    // From the name over its localized one and two icons with their buttons to the command.
+    // The command has the keys now, which is what was missing.
     waitForWindow(QStringLiteral("Desktop Entry Editor"));
-    pressKeys(QStringList(QVector<QString>(6, QStringLiteral("Tab")).toList()));
     typeText(script + QStringLiteral(" started"));
     pressKeys({QStringLiteral("Return")});
     QVERIFY(program.waitForFinished(20000));
@@ -229,8 +326,9 @@ void tst_vel_entryedit::changesNothingReadOnly()
     pressKeys({QStringLiteral("Tab"), QStringLiteral("x"), QStringLiteral("Return")});
     QVERIFY(!program.waitForFinished(500));
 
-    // Back over Help and Cancel: what comes before them is no button that copies but a field.
-    pressKeys(QStringList(QVector<QString>(4, QStringLiteral("shift+Tab")).toList()));
+    // Back over the language, Help and Cancel: what comes before them is no button that copies but a
+    // field.
+    pressKeys(QStringList(QVector<QString>(6, QStringLiteral("shift+Tab")).toList()));
     pressKeys(
         {QStringLiteral("space"), QStringLiteral("Tab"), QStringLiteral("Tab"), QStringLiteral("space")});
     waitForWindow(QStringLiteral("^Help$"));
