@@ -60,7 +60,8 @@ public Q_SLOTS:
      *
      * A new entry at a path that ends in "/.directory" is a Directory; one that ends in
      * ".desktop" is an Application, which the user may turn into a Link. The window title
-     * names the file.
+     * names the file. A file without a group "Desktop Entry" is no entry, which a message box says;
+     * it may become one.
      *
      * @param path the absolute path of the entry
      * @param create whether the file may be missing; without it a file that cannot be read

@@ -58,6 +58,7 @@ public:
     }
 
     void warn(const QString &text);
+    void warnOfNoEntry(const QString &file);
     void markModified();
     bool checkSuitable(const VelUIDesktopEntry &entry);
     bool inheritFrom(const QString &pattern, VelUIDesktopEntry *entry);
@@ -87,6 +88,11 @@ public:
 void VelDesktopEntryEditDialogPrivate::warn(const QString &text)
 {
     MessageBox::show(q, QMessageBox::Warning, tr("Warning"), text);
+}
+
+void VelDesktopEntryEditDialogPrivate::warnOfNoEntry(const QString &file)
+{
+    warn(tr("The file %1 is not a desktop entry: it has no group [Desktop Entry].").arg(file));
 }
 
 void VelDesktopEntryEditDialogPrivate::markModified()
@@ -160,12 +166,15 @@ bool VelDesktopEntryEditDialogPrivate::inheritFrom(const QString &pattern, VelUI
 {
     VelUIDesktopEntry source{QString()};
     source.setFilePath(pattern);
-    if (source.load()) {
-        entry->inheritFrom(source);
+    const bool isLoaded = source.load();
+    entry->inheritFrom(source);
+    if (source.isValid())
         return true;
-    }
     const QPointer<VelDesktopEntryEditDialog> self(q);
-    warn(tr("Can't load file %1").arg(pattern));
+    if (isLoaded)
+        warnOfNoEntry(pattern);
+    else
+        warn(tr("Can't load file %1").arg(pattern));
     return self;
 }
 
@@ -304,6 +313,9 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     setWindowTitle(tr("Desktop Entry Editor") + QStringLiteral(" - ") + path + QStringLiteral("[*]"));
     // Filling the form is not a change of the user's.
     setWindowModified(false);
+    // The last thing: the dialog may go away behind it.
+    if (loaded && !own.isValid())
+        d->warnOfNoEntry(path);
     return true;
 }
 

@@ -26,6 +26,9 @@ private Q_SLOTS:
     void remembersItsSize();
     void readsASizeThatIsNoNumberAsNothing();
     void refusesAMissingFile();
+    void saysThatAFileIsNoEntry_data();
+    void saysThatAFileIsNoEntry();
+    void saysThatATemplateIsNoEntry();
     void leavesTheFormWhenAFileIsRefused();
     void makesANewEntry_data();
     void makesANewEntry();
@@ -86,6 +89,49 @@ void tst_VelDesktopEntryEditDialog::refusesAMissingFile()
     ModalDriver modal;
     modal.answer(warning(QStringLiteral("Can't load file ") + missing), QMessageBox::Ok);
     QVERIFY(!dialog.setDesktopEntryPath(missing));
+    QVERIFY(modal.finished());
+}
+
+void tst_VelDesktopEntryEditDialog::saysThatAFileIsNoEntry_data()
+{
+    QTest::addColumn<QByteArray>("bytes");
+    QTest::addColumn<bool>("create");
+    for (const bool create : {false, true}) {
+        const char *const how = create ? " (create)" : "";
+        QTest::addRow("text%s", how) << QByteArray("Dear diary\n") << create;
+        QTest::addRow("nothing%s", how) << QByteArray() << create;
+        QTest::addRow("bytes%s", how) << QByteArray("\x7f\x45LF\0\1", 6) << create;
+        QTest::addRow("another group%s", how) << QByteArray("[Other Entry]\nName=a\n") << create;
+    }
+}
+
+void tst_VelDesktopEntryEditDialog::saysThatAFileIsNoEntry()
+{
+    QFETCH(QByteArray, bytes);
+    QFETCH(bool, create);
+    VelDesktopEntryEditDialog dialog;
+    const QString file = write(QStringLiteral("a.desktop"), bytes);
+    ModalDriver modal;
+    modal.answer(
+        warning(
+            QStringLiteral("The file %1 is not a desktop entry: it has no group [Desktop Entry].").arg(file)),
+        QMessageBox::Ok);
+    QVERIFY(dialog.setDesktopEntryPath(file, create));
+    QVERIFY(modal.finished());
+    QVERIFY(dialog.windowTitle().contains(file));
+    QCOMPARE(read(file), bytes);
+}
+
+void tst_VelDesktopEntryEditDialog::saysThatATemplateIsNoEntry()
+{
+    VelDesktopEntryEditDialog dialog;
+    const QString pattern = write(QStringLiteral("pattern"), "Name=a\n");
+    ModalDriver modal;
+    modal.answer(
+        warning(QStringLiteral("The file %1 is not a desktop entry: it has no group [Desktop Entry].")
+                    .arg(pattern)),
+        QMessageBox::Ok);
+    QVERIFY(dialog.setDesktopEntryPath(path(QStringLiteral("a.desktop")), true, pattern));
     QVERIFY(modal.finished());
 }
 
