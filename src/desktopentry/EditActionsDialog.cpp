@@ -18,7 +18,7 @@ const ListDialogForm::Names FormNames = {
     QT_TRANSLATE_NOOP("EditActionsDialog", "Actions"),
 };
 
-constexpr int MostSentences = 3;
+constexpr int MostSentences = 2;
 
 class Sentences
 {
@@ -40,12 +40,11 @@ QString Sentences::of(const ActionIds::Problem &problem)
     case ActionIds::Fault::Equal:
         return tr("Two actions have the id \"%1\". The second one can have \"%2\".").arg(id, proposal);
     case ActionIds::Fault::Impossible:
-        return tr("No entry can hold an action with the id \"%1\". It can have \"%2\".").arg(id, proposal);
+        return tr("No entry can hold the id \"%1\". It can be \"%2\".").arg(id, proposal);
     case ActionIds::Fault::Odd:
         break;
     }
-    return tr("The id \"%1\" has other characters in it than A to Z, a to z, 0 to 9 and \"-\", which other "
-              "programs may not take. It can be \"%2\".")
+    return tr("The id \"%1\" should have only A to Z, a to z, 0 to 9 and \"-\" in it, as \"%2\" has.")
         .arg(id, proposal);
 }
 

@@ -262,14 +262,12 @@ void tst_ListKeys::tellsOfIdsBeforeOkTakesThem_data()
     QTest::newRow("equal") << QStringLiteral(
         "a") << QStringLiteral("Two actions have the id \"a\". The second one can have \"a-2\".")
                            << QStringLiteral("a-2");
-    QTest::newRow("impossible") << QStringLiteral(
-        "b]") << QStringLiteral("No entry can hold an action with the id \"b]\". It can have \"b\".")
+    QTest::newRow("impossible") << QStringLiteral("b]")
+                                << QStringLiteral("No entry can hold the id \"b]\". It can be \"b\".")
                                 << QStringLiteral("b");
     QTest::newRow("odd") << QStringLiteral("new window")
-                         << QStringLiteral(
-                                "The id \"new window\" has other characters in it than A to Z, a to z, "
-                                "0 to 9 and \"-\", which other programs may not take. It can be "
-                                "\"new-window\".")
+                         << QStringLiteral("The id \"new window\" should have only A to Z, a to z, 0 to 9 "
+                                           "and \"-\" in it, as \"new-window\" has.")
                          << QStringLiteral("new-window");
 }
 

@@ -72,6 +72,11 @@ void ListDialogForm::tell(const QString &text, const QString &repairText)
     if (!m_message)
         makeMessage();
     m_message->tell(text, repairText);
+    // The least height that a layout asks for leaves out the lines of a text.
+    QWidget *const dialog = buttonBox->parentWidget();
+    verticalLayout->activate();
+    dialog->resize(dialog->width(),
+                   qMax(dialog->height(), verticalLayout->minimumHeightForWidth(dialog->width())));
 }
 
 void ListDialogForm::insist()

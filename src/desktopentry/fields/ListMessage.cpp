@@ -5,7 +5,7 @@
 
 #include <QAccessible>
 #include <QApplication>
-#include <QHBoxLayout>
+#include <QGridLayout>
 #include <QLabel>
 #include <QPushButton>
 #include <QStyle>
@@ -39,11 +39,12 @@ ListMessage::ListMessage(QWidget *parent)
     m_text->setWordWrap(true);
     m_repair->setObjectName(QStringLiteral("repairButton"));
 
-    auto *layout = new QHBoxLayout(this);
+    auto *layout = new QGridLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(m_icon, 0, Qt::AlignTop);
-    layout->addWidget(m_text, 1);
-    layout->addWidget(m_repair, 0, Qt::AlignTop);
+    layout->setColumnStretch(1, 1);
+    layout->addWidget(m_icon, 0, 0, Qt::AlignTop);
+    layout->addWidget(m_text, 0, 1);
+    layout->addWidget(m_repair, 1, 1, Qt::AlignTrailing);
     connect(m_repair, &QPushButton::clicked, this, &ListMessage::repairWanted);
 }
 
