@@ -67,7 +67,9 @@ Refusal FileStep::run(const Changes &changes, Way there, Way back, FileProgress 
     Refusal refusal;
     std::size_t done = 0;
     for (; done < changes.size(); ++done) {
-        refusal = changes[done]->check();
+        refusal = progress.goOn()
+            ? changes[done]->check()
+            : Refusal::failed(QString(), std::make_error_code(std::errc::operation_canceled));
         if (!refusal)
             refusal = (changes[done]->*there)(progress);
         if (refusal)

@@ -44,6 +44,14 @@ void FolderWatch::watchAgain(const QStringList &folders)
     }
 }
 
+void FolderWatch::setOn(bool on)
+{
+    m_isOn = on;
+    m_model->setOption(QFileSystemModel::DontWatchForChanges, !on);
+    if (on)
+        renew();
+}
+
 // Whether a folder was moved or deleted cannot be told when its row goes.
 void FolderWatch::noticeRemoval(const QModelIndex &parent, int first, int last)
 {
@@ -59,7 +67,7 @@ void FolderWatch::noticeRemoval(const QModelIndex &parent, int first, int last)
 void FolderWatch::renew()
 {
     // A root that is gone could be left, but not gone back to.
-    if (!QFileInfo::exists(m_model->rootPath()))
+    if (!m_isOn || !QFileInfo::exists(m_model->rootPath()))
         return;
     QStringList watched;
     collect(m_model->index(m_model->rootPath()), watched);

@@ -31,6 +31,8 @@ public:
     QStringList release(const QStringList &paths);
     /// Watches those of the \a folders again that are still there.
     void watchAgain(const QStringList &folders);
+    /// Off, the model notices nothing; on again, it reads anew what it had read.
+    void setOn(bool on);
 
 private:
     void noticeRemoval(const QModelIndex &parent, int first, int last);
@@ -40,4 +42,5 @@ private:
 
     QFileSystemModel *m_model;
     QTimer m_timer;
+    bool m_isOn = true;
 };

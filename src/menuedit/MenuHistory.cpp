@@ -28,6 +28,8 @@
 
 namespace {
 
+constexpr int FewPaths = 20;
+
 QStringList goneOf(QStringList paths)
 {
     const auto isThere = [](const QString &path) { return QFileInfo::exists(path); };
@@ -135,10 +137,16 @@ void MenuHistory::run(bool isUndo)
     // The view may go while this takes long, and the stack with it.
     FileStep step = std::move(command->step());
     m_isRunning = true;
+    // While many come and go one by one, their folders would be read anew again and again.
+    const bool areMany = paths.size() > FewPaths;
+    if (areMany)
+        m_menu.files().setWatching(false);
     const Refusal refusal = follow(step, isUndo);
     if (!self)
         return;
     m_isRunning = false;
+    if (areMany)
+        m_menu.files().setWatching(true);
     command->step() = std::move(step);
     m_menu.files().watchAgain(released);
     if (!refusal) {
@@ -195,6 +203,8 @@ void MenuHistory::takeIn(const QStringList &paths)
 {
     const QString menu = menuDirectory();
     const QString target = QFileInfo(menu).canonicalFilePath();
+    QStringList items;
+    QSet<QString> folders;
     for (const QString &path : paths) {
         if (path == menu || path == target) {
             Q_EMIT replaced();
@@ -205,14 +215,15 @@ void MenuHistory::takeIn(const QStringList &paths)
         if (folder != menu && !folder.startsWith(menu + QLatin1Char('/')))
             continue;
         m_menu.files().noteRecordFile(item);
-        m_menu.files().forgetItemInfo(path);
-        m_menu.files().forgetItemInfo(item);
-        if (QFileInfo::exists(item))
-            m_menu.files().index(item);
-        m_menu.proxy().invalidateSortOrder(folder);
+        items.append(path);
+        if (item != path)
+            items.append(item);
+        folders.insert(folder);
         if (item == path && QFileInfo(path).isDir())
-            m_menu.proxy().invalidateSortOrder(path);
+            folders.insert(path);
     }
+    m_menu.files().forgetItems(items);
+    m_menu.proxy().invalidateSortOrders(folders);
 }
 
 QString MenuHistory::menuDirectory() const

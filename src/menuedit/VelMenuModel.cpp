@@ -207,6 +207,48 @@ void VelMenuModel::forgetItemInfo(const QString &path)
     refreshRow(path);
 }
 
+// Of many, those rows are shown anew that there are: each that is made by its path takes its time.
+void VelMenuModel::forgetItems(const QStringList &paths)
+{
+    if (paths.size() <= MostAtOnce) {
+        for (const QString &path : paths) {
+            forgetItemInfo(path);
+            const QString item = EntryPath::describedBy(path);
+            if (QFileInfo::exists(item))
+                index(item);
+        }
+        return;
+    }
+    QSet<QString> items;
+    QSet<QString> folders;
+    for (const QString &path : paths) {
+        const QString item = EntryPath::describedBy(path);
+        m_cache->forgetTree(path);
+        items.insert(item);
+        folders.insert(item.left(item.lastIndexOf(QLatin1Char('/'))));
+    }
+    for (const QString &folder : qAsConst(folders))
+        refreshRows(index(folder), items);
+}
+
+void VelMenuModel::refreshRows(const QModelIndex &folder, const QSet<QString> &paths)
+{
+    int first = -1;
+    int last = -1;
+    const int count = folder.isValid() ? rowCount(folder) : 0;
+    for (int row = 0; row < count; ++row) {
+        const QString path = pathOf(index(row, 0, folder));
+        const QFileInfo info(path);
+        if (!paths.contains(path) || !info.exists())
+            continue;
+        m_cache->setEditedIcon(path, iconProvider()->icon(info));
+        first = first < 0 ? row : first;
+        last = row;
+    }
+    if (first >= 0)
+        Q_EMIT dataChanged(index(first, 0, folder), index(last, 0, folder));
+}
+
 void VelMenuModel::noteRecordFile(const QString &path)
 {
     m_cache->forgetPlain(path);
@@ -220,6 +262,11 @@ QStringList VelMenuModel::release(const QStringList &paths)
 void VelMenuModel::watchAgain(const QStringList &folders)
 {
     m_watch->watchAgain(folders);
+}
+
+void VelMenuModel::setWatching(bool on)
+{
+    m_watch->setOn(on);
 }
 
 void VelMenuModel::setItemName(const QString &path, const QString &name)

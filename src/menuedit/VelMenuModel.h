@@ -64,12 +64,16 @@ public:
 
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);
+    /// The same for the \a paths. A few that have come to be have their rows at once.
+    void forgetItems(const QStringList &paths);
     /// To be told that the folder at \a path has a record file now, if it had none.
     void noteRecordFile(const QString &path);
     /// Stops watching the folders among the \a paths, which are about to move, and those below
     /// them; returns what is to be watched again where it is still there.
     QStringList release(const QStringList &paths);
     void watchAgain(const QStringList &folders);
+    /// Off, nothing is noticed of what comes and goes, until all that was read is read anew.
+    void setWatching(bool on);
     /// Shows \a path as \a name, without reading the file.
     void setItemName(const QString &path, const QString &name);
 
@@ -94,6 +98,7 @@ private:
     bool isHidden(const QModelIndex &index) const;
 
     void refreshRow(const QString &path);
+    void refreshRows(const QModelIndex &folder, const QSet<QString> &paths);
     void beginRemoval(const QModelIndex &parent, int first, int last);
     void endRemoval();
     void completeDataChanged(const QModelIndex &topLeft, const QModelIndex &bottomRight,

@@ -122,7 +122,13 @@ void VelMenuProxyModel::watch(QAbstractItemModel *model)
 
 void VelMenuProxyModel::invalidateSortOrder(const QString &folderPath)
 {
-    sortOrders.remove(folderPath);
+    invalidateSortOrders({folderPath});
+}
+
+void VelMenuProxyModel::invalidateSortOrders(const QSet<QString> &folderPaths)
+{
+    for (const QString &path : folderPaths)
+        sortOrders.remove(path);
     dropAll();
     invalidate();
 }

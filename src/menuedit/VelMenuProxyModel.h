@@ -9,6 +9,7 @@
 
 #include <QHash>
 #include <QMap>
+#include <QSet>
 #include <QSortFilterProxyModel>
 #include <QString>
 #include <QStringList>
@@ -41,6 +42,8 @@ public:
     /// Forgets the list that was read for the folder of that path, as VelMenuModel::filePath()
     /// gives it, and filters and sorts anew.
     void invalidateSortOrder(const QString &folderPath);
+    /// The same for the folders of all those paths at once.
+    void invalidateSortOrders(const QSet<QString> &folderPaths);
 
     /// Shows only what the \a rows let through; everything for none.
     void setFilter(const std::optional<FilteredRows> &rows);
