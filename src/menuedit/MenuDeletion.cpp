@@ -3,7 +3,8 @@
 
 #include "MenuDeletion.h"
 
-#include "FileProgress.h"
+#include "FewLines.h"
+#include "FileWork.h"
 #include "KeptThing.h"
 #include "MenuFind.h"
 #include "MenuHistory.h"
@@ -12,6 +13,7 @@
 #include "OnDisk.h"
 #include "ShownMenu.h"
 #include "StepRecorder.h"
+#include "StepText.h"
 #include "TreeRemoval.h"
 #include "VelMenuModel.h"
 
@@ -20,25 +22,57 @@
 #include <QCoreApplication>
 #include <QFile>
 #include <QFileInfo>
+#include <QLocale>
 #include <QPointer>
 #include <QTreeView>
 
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
-// Without those that lie in others of them.
-QStringList outermost(const QStringList &paths)
+constexpr int MostNames = 5;
+constexpr int FewPaths = 20;
+
+// What went into the trash, in words.
+class Deleted
 {
-    QStringList result;
-    for (const QString &path : paths) {
-        const bool isInner = std::any_of(paths.begin(), paths.end(), [&path](const QString &other) {
-            return path.startsWith(other + QLatin1Char('/'));
-        });
-        if (!isInner && !path.isEmpty() && !result.contains(path))
-            result.append(path);
+public:
+    void add(const QString &name, const TreeState &state)
+    {
+        ++m_items;
+        m_name = name;
+        m_isAnyFolder = m_isAnyFolder || state.isFolder();
+        m_entries += state.isFolder() ? state.shownItems() : 1;
     }
-    return result;
+
+    StepText text() const
+    {
+        if (m_items > 1)
+            return m_isAnyFolder
+                ? StepText(StepText::Kind::DeleteFolders, QString::number(m_items), m_entries)
+                : StepText(StepText::Kind::DeleteItems, QString(), m_items);
+        return m_isAnyFolder ? StepText(StepText::Kind::DeleteFolder, m_name, m_entries)
+                             : StepText(StepText::Kind::Delete, m_name);
+    }
+
+private:
+    int m_items = 0;
+    int m_entries = 0;
+    bool m_isAnyFolder = false;
+    QString m_name;
+};
+
+QString complaint(const QString &path, const std::error_code &error)
+{
+    return QCoreApplication::translate("MenuDeletion", "%1 cannot be deleted: %2")
+        .arg(path, QString::fromLocal8Bit(error.message().c_str()));
+}
+
+FileWork deletingFiles(QWidget *view)
+{
+    return FileWork(view, QCoreApplication::translate("VelMenuView", "Delete"),
+                    QCoreApplication::translate("VelMenuView", "Deleting files..."));
 }
 
 } // namespace
@@ -58,42 +92,72 @@ MenuDeletion::~MenuDeletion() = default;
 
 void MenuDeletion::remove(const QStringList &paths)
 {
+    if (paths.isEmpty())
+        return;
     const QPointer<MenuDeletion> self(this);
-    const QStringList wanted = outermost(paths);
-    const QStringList left = putAway(wanted);
-    bool isChanged = left.size() < wanted.size();
-    if (self && !left.isEmpty() && confirmFinal(left) && self)
-        isChanged = removeForGood(left) || isChanged;
-    if (self && isChanged)
+    Outcome outcome;
+    // First: rows that go while they are selected have the selection looked at each time.
+    m_selection.leave(paths);
+    // While many go one by one, their folders would be read anew again and again.
+    const bool areMany = paths.size() > FewPaths;
+    if (areMany)
+        m_menu.files().setWatching(false);
+    putAway(paths, &outcome);
+    if (self && !outcome.isCanceled && !outcome.untrashed.isEmpty() && confirmFinal(outcome.untrashed)
+        && self)
+        removeForGood(&outcome);
+    if (self && areMany)
+        m_menu.files().setWatching(true);
+    if (self)
+        selectWhatStays(paths);
+    if (self && outcome.isChanged)
         Q_EMIT changed();
+    if (self)
+        tellWhatStays(paths, outcome);
 }
 
-// Returns what cannot be put into the trash.
-QStringList MenuDeletion::putAway(const QStringList &paths)
+// In one step, which holds what has gone when the user ends it.
+void MenuDeletion::putAway(const QStringList &paths, Outcome *outcome)
 {
+    const QPointer<MenuDeletion> self(this);
     const std::unique_ptr<StepRecorder> recorder = m_history.record();
-    QStringList left;
     QStringList gone;
-    QString name;
-    TreeState state;
-    for (const QString &path : paths) {
-        const QString shownName = m_history.nameOf(path);
-        std::unique_ptr<KeptThing> kept = recorder ? KeptThing::inTrash(path) : nullptr;
-        if (!kept) {
-            left.append(path);
-            continue;
+    Deleted deleted;
+    {
+        FileWork work = deletingFiles(m_view);
+        work.expect(paths.size());
+        for (const QString &path : paths) {
+            if (!work.goOn()) {
+                outcome->isCanceled = true;
+                break;
+            }
+            const QString name = m_history.nameOf(path);
+            if (std::unique_ptr<KeptThing> kept = recorder ? KeptThing::inTrash(path) : nullptr) {
+                deleted.add(name, kept->state());
+                gone.append(path);
+                recorder->deleted(path, std::move(kept));
+            } else {
+                outcome->refuse(path);
+            }
+            work.advance();
         }
-        gone.append(path);
-        name = shownName;
-        state = kept->state();
-        recorder->deleted(path, std::move(kept));
     }
-    const StepText text = gone.size() != 1 ? StepText(StepText::Kind::DeleteItems, QString(), gone.size())
-        : state.isFolder()                 ? StepText(StepText::Kind::DeleteFolder, name, state.shownItems())
-                                           : StepText(StepText::Kind::Delete, name);
-    leave(gone);
-    m_history.add(recorder, text, gone);
-    return left;
+    if (!self)
+        return;
+    outcome->isChanged = !gone.isEmpty();
+    forget(gone);
+    m_history.add(recorder, deleted.text(), gone);
+}
+
+// What may not be taken from its folder is not asked about, nor what has gone by itself.
+void MenuDeletion::Outcome::refuse(const QString &path)
+{
+    if (!OnDisk::exists(path))
+        return;
+    if (QFileInfo(QFileInfo(path).absolutePath()).isWritable())
+        untrashed.append(path);
+    else
+        complaints.append(complaint(path, std::make_error_code(std::errc::permission_denied)));
 }
 
 bool MenuDeletion::confirmFinal(const QStringList &paths) const
@@ -113,32 +177,71 @@ bool MenuDeletion::confirmFinal(const QStringList &paths) const
         == QMessageBox::Yes;
 }
 
-// Whether anything was removed.
-bool MenuDeletion::removeForGood(const QStringList &paths)
+void MenuDeletion::removeForGood(Outcome *outcome)
 {
-    FileProgress nobody;
-    QStringList complaints;
-    bool isAnyGone = false;
-    for (const QString &path : paths) {
-        const TreeRemoval::Result result = TreeRemoval::remove(QFile::encodeName(path).toStdString(), nobody);
-        isAnyGone = isAnyGone || !OnDisk::exists(path);
-        if (!result.succeeded())
-            complaints.append(QCoreApplication::translate("MenuDeletion", "%1 cannot be deleted: %2")
-                                  .arg(QFile::decodeName(result.path.c_str()),
-                                       QString::fromLocal8Bit(result.error.message().c_str())));
+    const QPointer<MenuDeletion> self(this);
+    const QStringList paths = outcome->untrashed;
+    {
+        FileWork work = deletingFiles(m_view);
+        for (const QString &path : paths) {
+            const TreeRemoval::Result result =
+                TreeRemoval::remove(QFile::encodeName(path).toStdString(), work);
+            // Of a folder some may have gone.
+            outcome->isChanged = outcome->isChanged || !OnDisk::exists(path) || QFileInfo(path).isDir();
+            outcome->isCanceled = result.error == std::errc::operation_canceled;
+            if (outcome->isCanceled)
+                break;
+            if (!result.succeeded())
+                outcome->complaints.append(complaint(QFile::decodeName(result.path.c_str()), result.error));
+        }
     }
-    leave(paths);
-    if (!complaints.isEmpty())
-        m_voice.tell(complaints.join(QLatin1Char('\n')), MenuVoice::Failure, m_view->currentIndex());
-    return isAnyGone;
+    if (self)
+        forget(paths);
 }
 
-void MenuDeletion::leave(const QStringList &paths)
+void MenuDeletion::forget(const QStringList &paths)
 {
-    for (const QString &path : paths) {
+    for (const QString &path : paths)
         m_menu.files().forgetItemInfo(path);
-        if (!OnDisk::exists(path))
-            m_selection.leave(path);
-    }
     m_find.clear();
+}
+
+void MenuDeletion::selectWhatStays(const QStringList &paths)
+{
+    QStringList left;
+    std::copy_if(paths.begin(), paths.end(), std::back_inserter(left), &OnDisk::exists);
+    if (!left.isEmpty())
+        m_selection.show(left);
+}
+
+void MenuDeletion::tellWhatStays(const QStringList &paths, const Outcome &outcome)
+{
+    QStringList texts;
+    if (!outcome.complaints.isEmpty())
+        texts.append(FewLines::of(outcome.complaints));
+    if (outcome.isCanceled)
+        texts.append(canceledText(paths));
+    texts.removeAll(QString());
+    if (!texts.isEmpty())
+        m_voice.tell(texts.join(QLatin1Char('\n')),
+                     outcome.complaints.isEmpty() ? MenuVoice::Warning : MenuVoice::Failure,
+                     m_view->currentIndex());
+}
+
+QString MenuDeletion::canceledText(const QStringList &paths) const
+{
+    QStringList names;
+    for (const QString &path : paths) {
+        if (OnDisk::exists(path))
+            names.append(m_history.nameOf(path));
+    }
+    if (names.isEmpty())
+        return {};
+    return names.size() > MostNames
+        ? QCoreApplication::translate(
+            "MenuDeletion", "The deletion was canceled. %n items are still there, in whole or in part.",
+            nullptr, names.size())
+        : QCoreApplication::translate("MenuDeletion",
+                                      "The deletion was canceled. Still there, in whole or in part: %1.")
+              .arg(QLocale().createSeparatedList(names));
 }

@@ -26,7 +26,8 @@ public:
                  MenuVoice &voice, MenuHistory &history);
     ~MenuDeletion() override;
 
-    /// Deletes what is at the \a paths, folders with everything in them, in one step.
+    /// Deletes what is at the \a paths, folders with everything in them, in one step. None of them lies in
+    /// another. The user can end it, which leaves what is not yet deleted, and is told of what stays.
     void remove(const QStringList &paths);
 
 Q_SIGNALS:
@@ -34,10 +35,23 @@ Q_SIGNALS:
     void changed();
 
 private:
-    QStringList putAway(const QStringList &paths);
+    struct Outcome
+    {
+        void refuse(const QString &path);
+
+        QStringList untrashed; ///< what cannot be put into the trash
+        QStringList complaints; ///< what cannot be deleted, and why
+        bool isCanceled = false;
+        bool isChanged = false;
+    };
+
+    void putAway(const QStringList &paths, Outcome *outcome);
     bool confirmFinal(const QStringList &paths) const;
-    bool removeForGood(const QStringList &paths);
-    void leave(const QStringList &paths);
+    void removeForGood(Outcome *outcome);
+    void forget(const QStringList &paths);
+    void selectWhatStays(const QStringList &paths);
+    void tellWhatStays(const QStringList &paths, const Outcome &outcome);
+    QString canceledText(const QStringList &paths) const;
 
     QTreeView *const m_view;
     const ShownMenu &m_menu;

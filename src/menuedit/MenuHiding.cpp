@@ -4,13 +4,17 @@
 #include "MenuHiding.h"
 
 #include "EntryState.h"
+#include "FewLines.h"
 #include "MenuFind.h"
 #include "MenuHistory.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
 #include "ShownMenu.h"
 #include "StepRecorder.h"
+#include "StepText.h"
+#include "TreeOrder.h"
 #include "VelMenuModel.h"
+#include "VelMenuProxyModel.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
@@ -21,6 +25,16 @@
 #include <QMenu>
 
 #include <algorithm>
+
+namespace {
+
+// Whether the entry itself says that the menu is not to show it.
+bool isMarkedBy(EntryState::Kind state)
+{
+    return EntryState::isOutsideMenu(state) && state != EntryState::Kind::NotInstalled;
+}
+
+} // namespace
 
 MenuHiding::MenuHiding(const ShownMenu &menu, MenuSelection &selection, MenuFind &find, MenuVoice &voice,
                        MenuHistory &history)
@@ -58,58 +72,101 @@ void MenuHiding::setContextMenu(QMenu *menu)
     connect(menu, &QMenu::aboutToShow, this, &MenuHiding::update);
 }
 
-// Empty where a folder or another file is selected.
-QString MenuHiding::selectedEntry() const
+// Folders and other files among what is selected stay as they are.
+QStringList MenuHiding::selectedEntries() const
 {
-    const QString path = m_selection.path();
-    return EntryPath::isEntry(path) && QFileInfo(path).isFile() ? path : QString();
+    QStringList entries;
+    const QModelIndexList rows = TreeOrder::fromTop(m_selection.all());
+    for (const QModelIndex &row : rows) {
+        const QString path = m_menu.files().filePath(m_menu.proxy().mapToSource(row));
+        if (EntryPath::isEntry(path) && QFileInfo(path).isFile())
+            entries.append(path);
+    }
+    return entries;
 }
 
+// Of several entries some may be hidden and others not.
 void MenuHiding::update()
 {
-    const QString path = selectedEntry();
-    const EntryState::Kind state =
-        path.isEmpty() ? EntryState::Kind::Shown : EntryState::of(VelUIDesktopEntry(path));
-    const bool isMarked = EntryState::isOutsideMenu(state) && state != EntryState::Kind::NotInstalled;
-    const bool isWritable = !path.isEmpty() && state != EntryState::Kind::Malformed
-        && QFileInfo(QFileInfo(path).absolutePath()).isWritable();
-    m_hide->setVisible(!isMarked);
-    m_showAgain->setVisible(isMarked);
-    m_hide->setEnabled(isWritable);
-    m_showAgain->setEnabled(isWritable);
+    const QStringList paths = selectedEntries();
+    bool isAnyShown = paths.isEmpty();
+    bool isAnyMarked = false;
+    bool canHide = false;
+    bool canShow = false;
+    for (const QString &path : paths) {
+        const EntryState::Kind state = EntryState::of(VelUIDesktopEntry(path));
+        const bool isMarked = isMarkedBy(state);
+        const bool isWritable =
+            state != EntryState::Kind::Malformed && QFileInfo(QFileInfo(path).absolutePath()).isWritable();
+        (isMarked ? isAnyMarked : isAnyShown) = true;
+        canHide = canHide || (!isMarked && isWritable);
+        canShow = canShow || (isMarked && isWritable);
+        if (canHide && canShow)
+            break;
+    }
+    m_hide->setVisible(isAnyShown);
+    m_showAgain->setVisible(isAnyMarked);
+    m_hide->setEnabled(canHide);
+    m_showAgain->setEnabled(canShow);
 }
 
 void MenuHiding::hideSelected()
 {
-    mark(&EntryState::hide, StepText::Kind::Hide);
+    mark(&EntryState::hide, false);
 }
 
 void MenuHiding::showSelectedAgain()
 {
-    mark(&EntryState::showAgain, StepText::Kind::ShowAgain);
+    mark(&EntryState::showAgain, true);
+}
+
+// Of several entries those that are not so already.
+void MenuHiding::mark(bool (*change)(const QString &path), bool isShown)
+{
+    QStringList paths = selectedEntries();
+    if (paths.size() > 1)
+        paths.erase(std::remove_if(paths.begin(), paths.end(),
+                                   [isShown](const QString &path) {
+                                       return isMarkedBy(EntryState::of(VelUIDesktopEntry(path))) != isShown;
+                                   }),
+                    paths.end());
+    const std::unique_ptr<StepRecorder> recorder = m_history.record();
+    QStringList done;
+    QStringList complaints;
+    QString name;
+    for (const QString &path : qAsConst(paths)) {
+        const QString itsName = m_history.nameOf(path);
+        if (recorder)
+            recorder->mayWrite(path);
+        if (!change(path)) {
+            complaints.append(QCoreApplication::translate(
+                                  "VelMenuView", "'%1' was not changed: the file %2 cannot be written.")
+                                  .arg(itsName, path));
+            continue;
+        }
+        name = itsName;
+        m_menu.files().forgetItemInfo(path);
+        done.append(path);
+    }
+    finish(recorder, done, name, isShown, complaints);
 }
 
 // The history tells what was done.
-void MenuHiding::mark(bool (*change)(const QString &path), StepText::Kind kind)
+void MenuHiding::finish(const std::unique_ptr<StepRecorder> &recorder, const QStringList &done,
+                        const QString &name, bool isShown, const QStringList &complaints)
 {
-    const QString path = selectedEntry();
-    if (path.isEmpty())
-        return;
-    const QString name = m_history.nameOf(path);
-    const std::unique_ptr<StepRecorder> recorder = m_history.record();
-    if (recorder)
-        recorder->mayWrite(path);
-    if (!change(path)) {
-        m_voice.tell(
-            QCoreApplication::translate("VelMenuView", "'%1' was not changed: the file %2 cannot be written.")
-                .arg(name, path),
-            MenuVoice::Failure);
-        return;
-    }
-    m_find.clear();
-    m_menu.files().forgetItemInfo(path);
+    using Kind = StepText::Kind;
     const QPointer<MenuHiding> self(this);
-    m_history.add(recorder, StepText(kind, name), {path});
-    if (self)
-        Q_EMIT changed();
+    if (!done.isEmpty()) {
+        m_find.clear();
+        m_history.add(recorder,
+                      done.size() == 1 ? StepText(isShown ? Kind::ShowAgain : Kind::Hide, name)
+                                       : StepText(isShown ? Kind::ShowItemsAgain : Kind::HideItems, QString(),
+                                                  done.size()),
+                      done);
+        if (self)
+            Q_EMIT changed();
+    }
+    if (self && !complaints.isEmpty())
+        m_voice.tell(FewLines::of(complaints), MenuVoice::Failure);
 }

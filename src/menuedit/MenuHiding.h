@@ -3,10 +3,11 @@
 
 #pragma once
 
-#include "StepText.h"
-
 #include <QObject>
 #include <QPointer>
+#include <QStringList>
+
+#include <memory>
 
 class MenuFind;
 class MenuHistory;
@@ -15,10 +16,11 @@ class MenuVoice;
 class QAction;
 class QMenu;
 class ShownMenu;
+class StepRecorder;
 
 /**
  * Taking entries out of the menu without deleting them, and back in: two entries of the context
- * menu, of which the one is shown that makes sense for what is selected.
+ * menu, of which that is shown that makes sense for what is selected; both for hidden and other entries.
  */
 class MenuHiding : public QObject
 {
@@ -32,7 +34,7 @@ public:
     /// Puts the entries into \a menu, before its first separator; null takes them out again.
     void setContextMenu(QMenu *menu);
 
-    /// Hides the selected entry, or shows it again.
+    /// Hides the selected entries, or shows them again, as one step.
     void hideSelected();
     void showSelectedAgain();
 
@@ -42,8 +44,10 @@ Q_SIGNALS:
 
 private:
     void update();
-    void mark(bool (*change)(const QString &path), StepText::Kind kind);
-    QString selectedEntry() const;
+    void mark(bool (*change)(const QString &path), bool isShown);
+    void finish(const std::unique_ptr<StepRecorder> &recorder, const QStringList &done, const QString &name,
+                bool isShown, const QStringList &complaints);
+    QStringList selectedEntries() const;
 
     const ShownMenu &m_menu;
     MenuSelection &m_selection;

@@ -15,6 +15,7 @@
 #include <QTreeView>
 
 #include <algorithm>
+#include <numeric>
 
 MenuSelection::MenuSelection(QTreeView *view, const ShownMenu &menu)
     : m_view(view)
@@ -26,16 +27,19 @@ MenuSelection::MenuSelection(QTreeView *view, const ShownMenu &menu)
 
 MenuSelection::~MenuSelection() = default;
 
+// Of thousands the ranges are few.
 QModelIndex MenuSelection::item() const
 {
-    const QModelIndexList selected = all();
-    if (selected.isEmpty())
+    const QItemSelectionModel *model = m_view->selectionModel();
+    if (!model || !model->hasSelection())
         return {};
-    const QModelIndex current = m_view->currentIndex();
-    const bool isSelected = m_view->selectionModel()->isSelected(current);
-    return m_menu.proxy().mapToSource(isSelected                ? current
-                                          : selected.size() > 1 ? TreeOrder::fromTop(selected).constFirst()
-                                                                : selected.constFirst());
+    if (model->isSelected(m_view->currentIndex()))
+        return m_menu.proxy().mapToSource(m_view->currentIndex());
+    QModelIndexList tops;
+    const QItemSelection ranges = model->selection();
+    for (const QItemSelectionRange &range : ranges)
+        tops.append(range.topLeft());
+    return m_menu.proxy().mapToSource(TreeOrder::fromTop(tops).value(0));
 }
 
 QModelIndexList MenuSelection::all() const
@@ -44,9 +48,13 @@ QModelIndexList MenuSelection::all() const
     return selection ? selection->selectedIndexes() : QModelIndexList();
 }
 
-bool MenuSelection::isSeveral() const
+int MenuSelection::count() const
 {
-    return all().size() > 1;
+    const QItemSelectionModel *model = m_view->selectionModel();
+    const QItemSelection ranges = model ? model->selection() : QItemSelection();
+    return std::accumulate(ranges.begin(), ranges.end(), 0, [](int count, const QItemSelectionRange &range) {
+        return count + range.height();
+    });
 }
 
 QStringList MenuSelection::paths() const

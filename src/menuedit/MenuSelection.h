@@ -37,7 +37,9 @@ public:
 
     /// All selected items of the sorting model, in the order in which they were selected.
     QModelIndexList all() const;
-    bool isSeveral() const;
+    /// How many there are.
+    int count() const;
+    bool isSeveral() const { return count() > 1; }
     /// The paths of all selected items from the top to the bottom, without those that lie in others of them.
     QStringList paths() const;
 

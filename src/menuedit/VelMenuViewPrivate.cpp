@@ -24,6 +24,13 @@
 #include <QMetaMethod>
 #include <QPointer>
 
+namespace {
+
+// Selected items that are looked at whenever there is one more or less.
+constexpr int MostAtOnce = 100;
+
+} // namespace
+
 VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directory, bool isEditable)
     : q(view)
     , voice(view, [view] { return view->isSignalConnected(QMetaMethod::fromSignal(&VelMenuView::told)); })
@@ -117,7 +124,13 @@ void VelMenuViewPrivate::show()
 void VelMenuViewPrivate::connectSelection()
 {
     const QItemSelectionModel *model = q->selectionModel();
-    QObject::connect(model, &QItemSelectionModel::selectionChanged, q, &VelMenuView::setActionsEnabled);
+    // Rows of thousands may go one by one.
+    QObject::connect(model, &QItemSelectionModel::selectionChanged, q, [this] {
+        if (selection.count() > MostAtOnce)
+            m_refresh.start(0);
+        else
+            q->setActionsEnabled();
+    });
     QObject::connect(model, &QItemSelectionModel::selectionChanged, q, &VelMenuView::selectionChangedSlot);
     QObject::connect(model, &QItemSelectionModel::selectionChanged, &selection, &MenuSelection::noteSelected);
     QObject::connect(model, &QItemSelectionModel::currentChanged, &m_refresh, [this] {
