@@ -162,18 +162,18 @@ QStringList MenuMirror::sortOrderOf(const QString &folder) const
         .split(QLatin1Char(';'), Qt::SkipEmptyParts);
 }
 
-void MenuMirror::list(const QString &folder, const QStringList &shown, const QString &name,
+void MenuMirror::list(const QString &folder, const QStringList &shown, const QStringList &names,
                       const QString &following)
 {
     QStringList list{QStringLiteral("*")};
     for (const QString &child : shown) {
         if (!following.isNull() && child == following)
-            list.append(name);
-        if (child != name)
+            list += names;
+        if (!names.contains(child))
             list.append(child);
     }
     if (!following.isNull() && following.isEmpty())
-        list.append(name);
+        list += names;
     const QByteArray line = "SortOrder=" + list.join(QLatin1Char(';')).toUtf8() + ';';
 
     QByteArray &record = m_items[folder].bytes;

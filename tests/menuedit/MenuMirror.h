@@ -55,7 +55,13 @@ public:
     QStringList sortOrderOf(const QString &folder) const;
     /// Lists \a shown, with \a name before \a following (at the end for an empty one; nowhere
     /// when that is null).
-    void list(const QString &folder, const QStringList &shown, const QString &name, const QString &following);
+    void list(const QString &folder, const QStringList &shown, const QString &name, const QString &following)
+    {
+        list(folder, shown, QStringList{name}, following);
+    }
+    /// The same with several names.
+    void list(const QString &folder, const QStringList &shown, const QStringList &names,
+              const QString &following);
 
     bool isHidden(const QString &path) const;
     QString shownName(const QString &path) const;

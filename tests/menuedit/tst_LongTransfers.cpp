@@ -59,6 +59,13 @@ extern "C" int fsync(int)
     return 0;
 }
 
+extern "C" int renameat2(int folder, const char *name, int newFolder, const char *newName,
+                         unsigned flags) noexcept
+{
+    usleep(SlowDisk::s_delay);
+    return int(syscall(SYS_renameat2, folder, name, newFolder, newName, flags));
+}
+
 extern "C" int unlinkat(int folder, const char *name, int flags) noexcept
 {
     usleep(SlowDisk::s_delay);
@@ -82,6 +89,8 @@ private Q_SLOTS:
     void leavesTheWindowAlive();
     void endsADeletionWhenItIsCanceled();
     void survivesItsViewWhileItDeletes();
+    void tellsWhatStaysOfSeveral();
+    void takesBackWhatWentIntoTheTrash();
 
 private:
     void put(const QString &folder, bool asFiles, bool isCut);
@@ -333,6 +342,81 @@ void tst_LongTransfers::survivesItsViewWhileItDeletes()
     QVERIFY(isGone);
     QVERIFY(!progressWindow());
     QVERIFY(!QGuiApplication::overrideCursor());
+}
+
+// Of several that no trash takes, those that are not yet deleted stay.
+void tst_LongTransfers::tellsWhatStaysOfSeveral()
+{
+    const QByteArray dataHome = qgetenv("XDG_DATA_HOME");
+    qputenv("XDG_DATA_HOME", QFile::encodeName(path(QStringLiteral("data"))));
+    write(QStringLiteral("data/Trash"), "no folder");
+    const QString big = source(false);
+    QVERIFY(QDir().rename(big, m_sub + QStringLiteral("/big")));
+    const QString z = writeEntry(QStringLiteral("z.desktop"), QStringLiteral("Z"));
+    openDialog(menu(), 3);
+    view().setAssistance(true);
+    clickItem(z);
+    view().setFocus();
+    XDoTool::press(QStringLiteral("ctrl+a"));
+    QTRY_COMPARE(view().selectionModel()->selectedIndexes().size(), 3);
+    QSignalSpy told(&view(), &VelMenuView::told);
+    const SlowDisk slow;
+    answerTheQuestion();
+    bool wasCanceled = false;
+    whenInSight(&view(), [&](QProgressDialog *window) {
+        QCOMPARE(window->labelText(), QStringLiteral("Deleting files..."));
+        wasCanceled = true;
+        XDoTool::press(QStringLiteral("Escape"));
+    });
+    XDoTool::press(QStringLiteral("Delete"));
+    QTRY_COMPARE_WITH_TIMEOUT(told.count(), 1, 30000);
+    QVERIFY(wasCanceled);
+    QCOMPARE(told.constFirst().at(0).toString(),
+             QStringLiteral("The deletion was canceled. Still there, in whole or in part: sub, A, Z."));
+    QCOMPARE(told.constFirst().at(1).toInt(), 1);
+    const int left = everythingIn(m_sub).size();
+    QVERIFY2(left > 0 && left < Files, qPrintable(QString::number(left)));
+    QVERIFY(QFile::exists(z));
+    QCOMPARE(view().selectionModel()->selectedIndexes().size(), 3);
+    qputenv("XDG_DATA_HOME", dataHome);
+}
+
+// What went is a step of its own.
+void tst_LongTransfers::takesBackWhatWentIntoTheTrash()
+{
+    const QByteArray dataHome = qgetenv("XDG_DATA_HOME");
+    qputenv("XDG_DATA_HOME", QFile::encodeName(path(QStringLiteral("data"))));
+    const QString big = source(false);
+    QVERIFY(QDir().rename(big, m_sub + QStringLiteral("/big")));
+    openDialog(menu(), 2);
+    QVERIFY(open(view(), m_sub, 1));
+    QVERIFY(open(view(), m_sub + QStringLiteral("/big"), Files));
+    view().setAssistance(true);
+    const QModelIndex folder = shown(view(), m_sub + QStringLiteral("/big"));
+    view().selectionModel()->select(
+        QItemSelection(view().model()->index(0, 0, folder), view().model()->index(Files - 1, 0, folder)),
+        QItemSelectionModel::ClearAndSelect);
+    QSignalSpy told(&view(), &VelMenuView::told);
+    bool wasCanceled = false;
+    const SlowDisk slow;
+    whenInSight(&view(), [&](QProgressDialog *window) {
+        QCOMPARE(window->maximum(), Files);
+        wasCanceled = true;
+        XDoTool::press(QStringLiteral("Escape"));
+    });
+    view().setFocus();
+    view().slotDel();
+    QVERIFY(wasCanceled);
+    QCOMPARE(told.count(), 2);
+    const int left = everythingIn(m_sub + QStringLiteral("/big")).size();
+    QVERIFY2(left > 0 && left < Files, qPrintable(QString::number(left)));
+    QCOMPARE(told.constFirst().at(0).toString(), QStringLiteral("%1 items were deleted.").arg(Files - left));
+    QCOMPARE(told.constLast().at(0).toString(),
+             QStringLiteral("The deletion was canceled. %1 items are still there, in whole or in part.")
+                 .arg(left));
+    view().undoAction()->trigger();
+    QCOMPARE(everythingIn(m_sub + QStringLiteral("/big")).size(), Files);
+    qputenv("XDG_DATA_HOME", dataHome);
 }
 
 VEL_TEST_MAIN(tst_LongTransfers)

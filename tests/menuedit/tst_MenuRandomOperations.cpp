@@ -59,6 +59,13 @@ private:
     void paste();
     void drop();
     void remove();
+    void stepWithSeveral();
+    void selectSeveral(const QStringList &paths);
+    void removeSeveral();
+    void moveBlock();
+    bool areThere(const QStringList &paths) const;
+    void listAll(const Transfer &transfer, bool isOrder);
+    bool isAnyTaken(const Transfer &transfer) const;
     bool predict(const Transfer &transfer, ModalDriver &modal);
     static bool isRefused(const MenuMirror &mirror, const Transfer &transfer);
 
@@ -101,7 +108,7 @@ void tst_MenuRandomOperations::create()
         m_view->slotDirNew();
     else
         m_view->slotFileNew();
-    QVERIFY(modal.finished());
+    QVERIFY2(modal.finished(), qPrintable(m_step));
     m_selected = isKept ? full(path) : QString::fromLatin1("");
     if (!isKept)
         return;
@@ -131,7 +138,7 @@ void tst_MenuRandomOperations::edit()
             qobject_cast<QDialog *>(dialog)->reject();
     });
     QCOMPARE(m_view->slotEdit(), isSaved);
-    QVERIFY(modal.finished());
+    QVERIFY2(modal.finished(), qPrintable(m_step));
     m_selected = full(path);
     if (!isSaved)
         return;
@@ -195,6 +202,47 @@ bool tst_MenuRandomOperations::isRefused(const MenuMirror &mirror, const Transfe
     return false;
 }
 
+bool tst_MenuRandomOperations::areThere(const QStringList &paths) const
+{
+    return std::all_of(paths.begin(), paths.end(),
+                       [this](const QString &path) { return m_mirror.contains(path); });
+}
+
+// With assistance each of the files gets its place. A copy of what is here leaves it where it is.
+void tst_MenuRandomOperations::listAll(const Transfer &transfer, bool isOrder)
+{
+    QStringList names;
+    bool isAnyHere = false;
+    for (const QString &source : transfer.sources) {
+        const bool isHere = MenuMirror::folderOf(source) == transfer.folder;
+        isAnyHere = isAnyHere || isHere;
+        if (transfer.isMove || !isHere)
+            names.append(MenuMirror::nameOf(source));
+    }
+    if (transfer.following.isNull() ? transfer.isMove && isAnyHere : transfer.isMove || !isOrder)
+        m_mirror.list(transfer.folder, m_rows.value(transfer.folder), names, transfer.following);
+}
+
+// Nobody is asked about what cannot be done whatever the answer.
+bool tst_MenuRandomOperations::isAnyTaken(const Transfer &transfer) const
+{
+    const auto isIntoItself = [&](const QString &source) {
+        return m_mirror.kindOf(source) == Kind::Folder && MenuMirror::isBelow(transfer.folder, source);
+    };
+    if (!areThere(transfer.sources)
+        || std::any_of(transfer.sources.begin(), transfer.sources.end(), isIntoItself))
+        return false;
+    QStringList names;
+    for (const QString &source : transfer.sources) {
+        const QString name = MenuMirror::nameOf(source);
+        const bool isHere = MenuMirror::folderOf(source) == transfer.folder;
+        if (!isHere && (names.contains(name) || m_mirror.contains(MenuMirror::join(transfer.folder, name))))
+            return true;
+        names.append(name);
+    }
+    return false;
+}
+
 // Carries the transfer out in the plain model, and announces the question that comes.
 bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &modal)
 {
@@ -202,7 +250,12 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
     const QString name = MenuMirror::nameOf(first);
     const QString target = MenuMirror::join(transfer.folder, name);
     const bool isOwnFolder = MenuMirror::folderOf(first) == transfer.folder;
-    if (!isOwnFolder && m_mirror.contains(target))
+    // With assistance each name that is taken is asked about; what is called off changes nothing.
+    if (m_view->assistance() && isAnyTaken(transfer)) {
+        modal.handle([](QWidget *dialog) { qobject_cast<QDialog *>(dialog)->reject(); });
+        return false;
+    }
+    if (!m_view->assistance() && !isOwnFolder && m_mirror.contains(target))
         modal.answer({QMessageBox::Question, QStringLiteral("Attention"),
                       QStringLiteral("%1 already exists. Overwrite?").arg(full(target)), QMessageBox::Yes,
                       QMessageBox::NoButton},
@@ -210,10 +263,13 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
     const bool isOrder =
         std::all_of(transfer.sources.begin(), transfer.sources.end(),
                     [&](const QString &source) { return MenuMirror::folderOf(source) == transfer.folder; });
-    if (isOrder ? !m_mirror.contains(first) : isRefused(m_mirror, transfer))
+    const bool isAnyGone = !m_mirror.contains(first) || (m_view->assistance() && !areThere(transfer.sources));
+    if (isOrder ? isAnyGone : isRefused(m_mirror, transfer))
         return false;
     const bool isListed = isOwnFolder ? transfer.isMove : !transfer.following.isNull();
-    if (isListed)
+    if (m_view->assistance())
+        listAll(transfer, isOrder);
+    else if (isListed)
         m_mirror.list(transfer.folder, m_rows.value(transfer.folder), name, transfer.following);
     // A folder that is moved is read again, within its folder too.
     if (isOwnFolder && transfer.isMove) {
@@ -231,7 +287,12 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
         else
             m_mirror.copy(source, to);
     }
-    m_selected = m_mirror.isHidden(target) ? QString::fromLatin1("") : full(target);
+    m_selected = QString::fromLatin1("");
+    for (const QString &source : m_view->assistance() ? transfer.sources : QStringList{first}) {
+        const QString to = MenuMirror::join(transfer.folder, MenuMirror::nameOf(source));
+        if (m_selected.isEmpty() && !m_mirror.isHidden(to))
+            m_selected = full(to);
+    }
     return true;
 }
 
@@ -250,7 +311,7 @@ void tst_MenuRandomOperations::paste()
         && predict({{m_remembered}, m_isCut, folder, isInto ? QString() : MenuMirror::nameOf(selected)},
                    modal);
     m_view->slotPaste();
-    QVERIFY(modal.finished());
+    QVERIFY2(modal.finished(), qPrintable(m_step));
     if (isDone && m_isCut)
         m_remembered.clear();
     const QMimeData *data = QGuiApplication::clipboard()->mimeData();
@@ -286,7 +347,7 @@ void tst_MenuRandomOperations::drop()
     QCOMPARE(m_view->model()->dropMimeData(&data, transfer.isMove ? Qt::MoveAction : Qt::CopyAction, row,
                                            std::min(row, 0), shown(*m_view, full(transfer.folder))),
              isDone);
-    QVERIFY(modal.finished());
+    QVERIFY2(modal.finished(), qPrintable(m_step));
 }
 
 void tst_MenuRandomOperations::remove()
@@ -308,10 +369,98 @@ void tst_MenuRandomOperations::remove()
                       QMessageBox::Yes},
                      isSure ? QMessageBox::Yes : QMessageBox::No);
     m_view->slotDel();
-    QVERIFY(modal.finished());
+    QVERIFY2(modal.finished(), qPrintable(m_step));
     m_selected = isSure ? QString::fromLatin1("") : full(path);
     if (isSure)
         m_mirror.remove(path);
+}
+
+// As Ctrl and clicks do, in any order.
+void tst_MenuRandomOperations::selectSeveral(const QStringList &paths)
+{
+    m_view->selectionModel()->clearSelection();
+    for (const QString &path : paths)
+        m_view->selectionModel()->setCurrentIndex(shown(*m_view, full(path)), QItemSelectionModel::Select);
+    QCOMPARE(m_view->selectionModel()->selectedIndexes().size(), paths.size());
+    QCOMPARE(m_view->selectedPath(), full(paths.constLast()));
+}
+
+void tst_MenuRandomOperations::removeSeveral()
+{
+    QStringList paths;
+    const QStringList all = shownPaths();
+    const int wanted = 2 + number(4);
+    for (int i = 0; i < 20 && paths.size() < wanted; ++i) {
+        // Sometimes with what lies in a folder among them.
+        const QString path =
+            !paths.isEmpty() && chance(30) ? any(m_mirror.childrenOf(paths.constLast())) : any(all);
+        const bool isLarge =
+            m_mirror.kindOf(path) == Kind::Folder && m_mirror.childrenOf(path).size() > 12 && chance(90);
+        if (all.contains(path) && !paths.contains(path) && !isLarge)
+            paths.append(path);
+    }
+    if (paths.size() < 2)
+        return;
+    describe(QStringLiteral("delete %1").arg(paths.join(QLatin1String(" and "))));
+    selectSeveral(paths);
+    const ModalDriver modal;
+    m_view->slotDel();
+    QVERIFY2(modal.finished(), qPrintable(m_step));
+    m_selected = QString::fromLatin1("");
+    for (const QString &path : qAsConst(paths)) {
+        if (m_mirror.contains(path))
+            m_mirror.remove(path);
+    }
+}
+
+// One after the other past what is not moved, until the end is reached.
+void tst_MenuRandomOperations::moveBlock()
+{
+    const QString folder = any(folders());
+    QStringList rows = m_rows.value(folder);
+    if (rows.size() < 3)
+        return;
+    QStringList moved;
+    for (int i = 2 + number(4); i > 0; --i) {
+        const QString name = any(rows);
+        if (!moved.contains(name))
+            moved.append(name);
+    }
+    if (moved.size() < 2)
+        return;
+    const bool isUp = chance(50);
+    QStringList paths;
+    for (const QString &name : qAsConst(moved))
+        paths.append(MenuMirror::join(folder, name));
+    describe(
+        QStringLiteral("%1 %2").arg(QLatin1String(isUp ? "up" : "down"), paths.join(QLatin1String(" and "))));
+    selectSeveral(paths);
+    if (isUp)
+        m_view->slotUp();
+    else
+        m_view->slotDown();
+    m_selected = full(paths.constLast());
+    const QStringList before = rows;
+    for (int i = 1; i < rows.size(); ++i) {
+        const int row = isUp ? i : rows.size() - 1 - i;
+        const int next = isUp ? row - 1 : row + 1;
+        if (moved.contains(rows.at(row)) && !moved.contains(rows.at(next)))
+            rows.swapItemsAt(row, next);
+    }
+    if (rows == before)
+        return;
+    m_mirror.list(folder, rows, rows.constLast(), QString::fromLatin1(""));
+    QCOMPARE(m_mirror.sortOrderOf(folder), QStringList{QStringLiteral("*")} + rows);
+}
+
+void tst_MenuRandomOperations::stepWithSeveral()
+{
+    m_step.clear();
+    m_selected.clear();
+    if (m_mirror.paths().size() > Items - 100 && chance(50))
+        removeSeveral();
+    else
+        moveBlock();
 }
 
 void tst_MenuRandomOperations::step()
@@ -428,6 +577,8 @@ void tst_MenuRandomOperations::takesBackAndDoesAgain()
         const int what = i > 0 ? number(100) : 100;
         if ((what < 20 && turn(true)) || (what >= 20 && what < 33 && turn(false)))
             ++turns;
+        else if (what >= 88 && what < 100)
+            stepWithSeveral();
         else if (i > 0)
             step();
         note();
