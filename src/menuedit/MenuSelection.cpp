@@ -138,10 +138,15 @@ void MenuSelection::openFolder(const QModelIndex &folder)
 void MenuSelection::show(const QStringList &paths)
 {
     m_menu.proxy().letThrough(paths);
-    show(paths.value(0));
-    if (paths.size() < 2 || m_view->selectionMode() == QAbstractItemView::SingleSelection)
+    const bool isOne = paths.size() < 2 || m_view->selectionMode() == QAbstractItemView::SingleSelection;
+    // The first of those that are not hidden.
+    const auto first = isOne ? paths.begin()
+                             : std::find_if(paths.begin(), paths.end() - 1,
+                                            [this](const QString &path) { return shown(path).isValid(); });
+    show(paths.isEmpty() ? QString() : *first);
+    if (isOne)
         return;
-    QSet<QString> wanted(paths.begin() + 1, paths.end());
+    QSet<QString> wanted(first + 1, paths.end());
     QSet<QString> folders;
     for (const QString &path : qAsConst(wanted))
         folders.insert(path.left(path.lastIndexOf(QLatin1Char('/'))));
