@@ -7,6 +7,8 @@
 #include "FreeName.h"
 #include "OnDisk.h"
 
+#include <frame/EntryPath.h>
+
 #include <QDir>
 #include <QFileInfo>
 
@@ -15,12 +17,6 @@
 using Choice = NameClash::Choice;
 
 namespace {
-
-QStringList withoutRepeats(QStringList list)
-{
-    list.removeDuplicates();
-    return list;
-}
 
 // Where it lies, and where it leads.
 QStringList placesOf(const QString &path)
@@ -61,13 +57,19 @@ private:
 
 } // namespace
 
-DropTargets::DropTargets(const QString &folder, const QStringList &sources)
+DropTargets::DropTargets(const QString &folder, const QStringList &sources,
+                         const QVector<WebAddress> &addresses)
     : m_folder(folder)
     , m_sources(sources)
 {
+    int next = 0;
+    for (const QString &source : sources) {
+        const bool isAddress = source.isEmpty() && next < addresses.size();
+        m_items.append(isAddress ? addressItem(addresses.at(next++)) : fileItem(source));
+    }
 }
 
-DropItem DropTargets::itemOf(const QString &source) const
+DropItem DropTargets::fileItem(const QString &source) const
 {
     DropItem item;
     item.source = source;
@@ -76,12 +78,12 @@ DropItem DropTargets::itemOf(const QString &source) const
     return item;
 }
 
-QVector<DropItem> DropTargets::plain() const
+DropItem DropTargets::addressItem(const WebAddress &address) const
 {
-    QVector<DropItem> items;
-    for (const QString &source : m_sources)
-        items.append(itemOf(source));
-    return items;
+    DropItem item;
+    item.address = address;
+    item.target = QDir(m_folder).filePath(EntryPath::entryNamed(address.fileStem()));
+    return item;
 }
 
 QVector<DropItem> DropTargets::besides() const
@@ -93,14 +95,18 @@ QVector<DropItem> DropTargets::besides() const
 std::optional<QVector<DropItem>> DropTargets::settled(const Ask &ask) const
 {
     Decision decision(ask);
-    const QStringList sources = withoutRepeats(m_sources);
     QVector<DropItem> items;
     QSet<QString> promised;
-    for (const QString &source : sources) {
-        DropItem item = itemOf(source);
+    QSet<QString> seen;
+    for (DropItem item : m_items) {
+        if (item.isFile() && seen.contains(item.source))
+            continue;
+        seen.insert(item.source);
         if (!item.isHere && isTaken(item.target, promised)) {
-            const Choice choice =
-                decision.about({source, item.target, kindOf(item, promised), sources.size() > 1});
+            // Nobody knows an address by the name of its file.
+            const Choice choice = item.isFile()
+                ? decision.about({item.source, item.target, kindOf(item, promised), m_items.size() > 1})
+                : Choice::KeepBoth;
             if (choice == Choice::Cancel)
                 return std::nullopt;
             if (choice == Choice::Skip)
@@ -124,8 +130,9 @@ bool DropTargets::isTaken(const QString &target, const QSet<QString> &promised) 
 // The own names of the others are left to them.
 QString DropTargets::freeTarget(const DropItem &item, const QSet<QString> &promised) const
 {
-    const auto kind = QFileInfo(item.source).isDir() ? FreeName::Kind::Folder : FreeName::Kind::Entry;
-    const QString own = QFileInfo(item.source).fileName();
+    const auto kind =
+        item.isFile() && QFileInfo(item.source).isDir() ? FreeName::Kind::Folder : FreeName::Kind::Entry;
+    const QString own = QFileInfo(item.target).fileName();
     const QDir folder(m_folder);
     return folder.filePath(FreeName::like(own, kind, [&](const QString &name) {
         const auto hasName = [&name](const QString &source) { return QFileInfo(source).fileName() == name; };

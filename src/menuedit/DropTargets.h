@@ -4,6 +4,7 @@
 #pragma once
 
 #include "NameClash.h"
+#include "WebAddress.h"
 
 #include <QSet>
 #include <QString>
@@ -14,14 +15,17 @@
 #include <optional>
 
 /**
- * One file that was dropped.
+ * One file or web address that was dropped.
  */
 struct DropItem
 {
-    QString source; ///< its path
+    QString source; ///< the path of the file; empty for an address
+    WebAddress address; ///< which is to become an entry; empty for a file
     QString target; ///< the path that it is to have
     bool isHere = false; ///< whether it lies in the folder already; then it stays as it is
     bool isReplacing = false; ///< whether something at the target is to make room for it
+
+    bool isFile() const { return address.url.isEmpty(); }
 };
 
 /**
@@ -33,10 +37,12 @@ public:
     /// Decides about a name that is taken. An event loop may run in it.
     using Ask = std::function<NameClash::Answer(const NameClash &clash)>;
 
-    DropTargets(const QString &folder, const QStringList &sources);
+    /// The \a sources are paths; empty ones stand for the \a addresses in turn, and for no file where
+    /// there are none left.
+    DropTargets(const QString &folder, const QStringList &sources, const QVector<WebAddress> &addresses = {});
 
     /// All of them under their own names, whether or not these are taken.
-    QVector<DropItem> plain() const;
+    const QVector<DropItem> &plain() const { return m_items; }
     /// All of them, those whose names are taken under others, which nothing and none of them has.
     QVector<DropItem> besides() const;
     /// As is decided for each whose name is taken, without those to be skipped; nullopt when all is to
@@ -44,11 +50,13 @@ public:
     std::optional<QVector<DropItem>> settled(const Ask &ask) const;
 
 private:
-    DropItem itemOf(const QString &source) const;
+    DropItem fileItem(const QString &source) const;
+    DropItem addressItem(const WebAddress &address) const;
     bool isTaken(const QString &target, const QSet<QString> &promised) const;
     QString freeTarget(const DropItem &item, const QSet<QString> &promised) const;
     NameClash::Kind kindOf(const DropItem &item, const QSet<QString> &promised) const;
 
     const QString m_folder;
     const QStringList m_sources;
+    QVector<DropItem> m_items;
 };

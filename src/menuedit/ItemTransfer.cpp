@@ -7,14 +7,20 @@
 #include "MenuClipboard.h"
 #include "MenuVoice.h"
 #include "VelMenuModel.h"
+#include "WebAddress.h"
 
 #include <QClipboard>
 #include <QCoreApplication>
+#include <QDropEvent>
 #include <QGuiApplication>
 #include <QIcon>
 #include <QMenu>
+#include <QMimeData>
 #include <QPersistentModelIndex>
 #include <QPointer>
+#include <QUrl>
+
+#include <algorithm>
 
 void ItemTransfer::put(const VelMenuModel &files, const QModelIndex &item, Qt::DropAction action)
 {
@@ -69,6 +75,17 @@ bool ItemTransfer::paste(VelMenuModel &files, const QModelIndex &selected, Clipb
         return false;
     clipboard->clear();
     return true;
+}
+
+// The source believes in what was proposed to it, unless that makes it remove something.
+Qt::DropAction ItemTransfer::actionForAddresses(const QDropEvent &drop)
+{
+    const QList<QUrl> urls = drop.mimeData()->urls();
+    if (urls.isEmpty() || !std::all_of(urls.begin(), urls.end(), &WebAddress::isOne))
+        return Qt::IgnoreAction;
+    if (drop.proposedAction() != Qt::MoveAction)
+        return drop.proposedAction();
+    return drop.possibleActions() & Qt::CopyAction ? Qt::CopyAction : Qt::LinkAction;
 }
 
 Qt::DropAction ItemTransfer::askForDropAction(QWidget *view, const QPoint &position, Qt::DropActions possible)

@@ -7,6 +7,7 @@
 
 class ClipboardContents;
 class MenuVoice;
+class QDropEvent;
 class QModelIndex;
 class QPoint;
 class QWidget;
@@ -33,6 +34,10 @@ void put(const QStringList &paths, Qt::DropAction action);
  * @return whether something was moved, which it is only once
  */
 bool paste(VelMenuModel &files, const QModelIndex &item, ClipboardContents *contents, MenuVoice &voice);
+
+/// The action for \a drop where all that is dropped are web addresses: an entry is made of each, whatever
+/// it is called. Qt::IgnoreAction for anything else.
+Qt::DropAction actionForAddresses(const QDropEvent &drop);
 
 /// Asks in a menu at the global \a position which of the \a possible actions is to be done with
 /// dropped files; Qt::IgnoreAction for nothing. The \a view may go away meanwhile.

@@ -231,6 +231,12 @@ QStringList localPaths(const QMimeData *data)
     return paths;
 }
 
+// Qt gives the first one away under another name on X11; the other one says the same.
+QList<QByteArray> titleTexts(const QMimeData *data)
+{
+    return {data->data(QStringLiteral("text/x-moz-url")), data->data(QStringLiteral("_NETSCAPE_URL"))};
+}
+
 QList<QUrl> foreignUrls(const QMimeData *data)
 {
     QList<QUrl> foreign;

@@ -76,4 +76,7 @@ QStringList localPaths(const QMimeData *data);
 /// The URLs among them that are no local files, in their order.
 QList<QUrl> foreignUrls(const QMimeData *data);
 
+/// The texts of \a data in which browsers give titles for URLs; see WebAddress::parsed().
+QList<QByteArray> titleTexts(const QMimeData *data);
+
 } // namespace MenuClipboard

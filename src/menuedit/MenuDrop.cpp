@@ -11,7 +11,7 @@
 #include "Refusal.h"
 #include "ReplacedThings.h"
 
-#include <QDir>
+#include <QCoreApplication>
 #include <QFile>
 #include <QFileInfo>
 #include <QFileSystemModel>
@@ -49,6 +49,20 @@ FileTransfer::Action transferAction(Qt::DropAction action)
     return action == Qt::MoveAction ? FileTransfer::Action::Move : FileTransfer::Action::Copy;
 }
 
+QString notSaved(const QString &path, const QString &folder)
+{
+    return QCoreApplication::translate("VelMenuView",
+                                       "%1 could not be saved. Make sure that the folder %2 may be written "
+                                       "and that the disk is not full, then try again.")
+        .arg(path, folder);
+}
+
+void removeAll(const QStringList &files)
+{
+    for (const QString &file : files)
+        QFile::remove(file);
+}
+
 /// The row that is meant, whatever comes and goes.
 class MeantRow
 {
@@ -79,7 +93,7 @@ MenuDrop::MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &ho
     , m_host(host)
     , m_request(request)
     , m_folder(model.filePath(request.folder))
-    , m_targets(m_folder, request.sources)
+    , m_targets(m_folder, request.sources, request.addresses)
     , m_items(m_targets.plain())
 {
 }
@@ -176,10 +190,17 @@ std::optional<DropResult> MenuDrop::carryOver()
     if (!makeRoom(replaced, &occupied))
         return refused(Refusal::notTrashed(occupied).reason);
     m_host.begins(m_items, m_request.action, m_folder);
+    QStringList written;
+    if (const QString failed = writeEntries(&written); !failed.isEmpty()) {
+        removeAll(written);
+        return refused(notSaved(failed, m_folder));
+    }
     const QPointer<QFileSystemModel> model(&m_model);
     const FileTransfer::Result result = m_request.action == Qt::LinkAction ? link() : transfer();
-    if (!result.succeeded())
+    if (!result.succeeded()) {
+        removeAll(written);
         return refused(result);
+    }
     std::vector<ReplacedThings::Thing> things = replaced.take();
     for (ReplacedThings::Thing &thing : things) {
         if (model)
@@ -193,10 +214,11 @@ FileTransfer::Result MenuDrop::check() const
 {
     QVector<FileTransfer::Item> items;
     for (const DropItem &item : m_items) {
-        if (!item.isReplacing)
+        if (item.isFile() && !item.isReplacing)
             items.append({item.source, item.target});
     }
-    return FileTransfer::check(items);
+    const FileTransfer::Result folder = FileTransfer::check(QStringList(), m_folder);
+    return folder.succeeded() ? FileTransfer::check(items) : folder;
 }
 
 bool MenuDrop::makeRoom(ReplacedThings &replaced, QString *occupied) const
@@ -209,11 +231,26 @@ bool MenuDrop::makeRoom(ReplacedThings &replaced, QString *occupied) const
     return true;
 }
 
+// The path that could not be written, if there is one.
+QString MenuDrop::writeEntries(QStringList *made) const
+{
+    for (const DropItem &item : m_items) {
+        if (item.isFile())
+            continue;
+        if (!item.address.save(item.target))
+            return item.target;
+        made->append(item.target);
+    }
+    return QString();
+}
+
 FileTransfer::Result MenuDrop::transfer()
 {
     QVector<FileTransfer::Item> items;
-    for (const DropItem &item : qAsConst(m_items))
-        items.append({item.source, item.target});
+    for (const DropItem &item : qAsConst(m_items)) {
+        if (item.isFile())
+            items.append({item.source, item.target});
+    }
     const std::unique_ptr<FileProgress> progress = m_host.follow(m_request.action);
     return FileTransfer::transfer(items, transferAction(m_request.action), *progress);
 }
@@ -224,14 +261,13 @@ FileTransfer::Result MenuDrop::link()
     QStringList made;
     for (const DropItem &item : qAsConst(m_items)) {
         QFile source(item.source);
-        if (item.isHere)
+        if (item.isHere || !item.isFile())
             continue;
         if (source.link(item.target)) {
             made.append(item.target);
             continue;
         }
-        for (const QString &link : qAsConst(made))
-            QFile::remove(link);
+        removeAll(made);
         return {FileTransfer::Failure::Failed, item.source, source.errorString()};
     }
     return {};
@@ -242,7 +278,7 @@ QStringList MenuDrop::leavingPaths() const
 {
     QStringList paths;
     for (const DropItem &item : m_items) {
-        if (m_request.action == Qt::MoveAction)
+        if (m_request.action == Qt::MoveAction && item.isFile())
             paths.append(item.source);
         if (item.isReplacing)
             paths.append(item.target);
@@ -294,8 +330,10 @@ DropResult MenuDrop::done(bool sortAnew, const QString &complaint) const
     result.isDone = true;
     result.complaint = complaint;
     if (m_request.action == Qt::MoveAction) {
-        for (const DropItem &item : m_items)
-            result.moved.append(item.source);
+        for (const DropItem &item : m_items) {
+            if (item.isFile())
+                result.moved.append(item.source);
+        }
     }
     result.sortAnew = sortAnew;
     return result;

@@ -19,8 +19,9 @@ class QFileSystemModel;
 class ReplacedThings;
 
 /**
- * One drop of files into a folder of the menu: checks it, has the user asked, transfers the
- * files and writes the order of the folder when they are there. What fails is taken back.
+ * One drop of files and web addresses into a folder of the menu: checks it, has the user asked,
+ * transfers the files, writes entries for the addresses, and then the order of the folder. What fails
+ * is taken back.
  *
  * Where there is no assistance, the user is asked about the first file alone, nothing that is
  * there makes room, and only the first file gets a place in the order of the folder.
@@ -31,11 +32,12 @@ public:
     /// What is to be done; the data that it was read from may be gone while the user is asked.
     struct Request
     {
-        QStringList sources; ///< absolute paths, at least one
+        QStringList sources; ///< absolute paths, at least one; see DropTargets
         Qt::DropAction action;
         int row; ///< the source row before which the first file is to be listed, or -1
         QPersistentModelIndex folder;
         bool isAssisted = false; ///< see VelMenuView::setAssistance()
+        QVector<WebAddress> addresses = {}; ///< only where there is assistance
     };
 
     MenuDrop(QFileSystemModel &model, FolderWatch &watch, MenuDropHost &host, const Request &request);
@@ -54,6 +56,7 @@ private:
     std::optional<DropResult> carryOver();
     FileTransfer::Result check() const;
     bool makeRoom(ReplacedThings &replaced, QString *occupied) const;
+    QString writeEntries(QStringList *made) const;
     FileTransfer::Result transfer();
     FileTransfer::Result link();
     QStringList leavingPaths() const;

@@ -146,14 +146,18 @@ bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, in
         return false;
     const QPointer<VelMenuModel> self(this);
     const QList<QUrl> foreign = MenuClipboard::foreignUrls(data);
-    if (!foreign.isEmpty()) {
+    for (const QUrl &url : foreign) {
+        if (m_isAssisted && WebAddress::isOne(url))
+            continue;
         DropResult refusal;
-        refusal.complaint = noFile(foreign.constFirst());
+        refusal.complaint = noFile(url);
         m_dropHost->finished(refusal);
         return false;
     }
+    const QVector<WebAddress> addresses = WebAddress::withTitles(foreign, MenuClipboard::titleTexts(data));
     const DropResult result =
-        MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent, m_isAssisted}).carryOut();
+        MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent, m_isAssisted, addresses})
+            .carryOut();
     if (!self)
         return false;
     if (result.isDone)

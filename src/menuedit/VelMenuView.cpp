@@ -256,8 +256,10 @@ void VelMenuView::keyPressEvent(QKeyEvent *event)
 void VelMenuView::dropEvent(QDropEvent *event)
 {
     const QPointer<VelMenuView> self(this);
-    const Qt::DropAction action = ItemTransfer::askForDropAction(
-        this, viewport()->mapToGlobal(event->posF().toPoint()), event->possibleActions());
+    Qt::DropAction action = d->isAssisted ? ItemTransfer::actionForAddresses(*event) : Qt::IgnoreAction;
+    if (action == Qt::IgnoreAction)
+        action = ItemTransfer::askForDropAction(this, viewport()->mapToGlobal(event->posF().toPoint()),
+                                                event->possibleActions());
     if (!self)
         return;
     event->setDropAction(action);

@@ -81,7 +81,7 @@ public:
         m_items = items;
         m_recorder->mayWrite(EntryPath::recordFileOf(folder));
         for (const DropItem &item : items) {
-            if (m_isMove)
+            if (m_isMove && item.isFile())
                 m_recorder->mayMove(item.source, item.target);
             else
                 m_recorder->mayMake(item.target);
@@ -143,8 +143,10 @@ private:
     {
         MenuHistory &history = VelMenuViewPrivate::historyOf(*m_view);
         QStringList paths = result.targets;
-        for (const DropItem &item : qAsConst(m_items))
-            paths.append(item.source);
+        for (const DropItem &item : qAsConst(m_items)) {
+            if (item.isFile())
+                paths.append(item.source);
+        }
         history.add(m_recorder, textOf(history), paths);
         m_recorder.reset();
     }
@@ -155,6 +157,8 @@ private:
         const QString name = history.nameOf(first.target);
         if (first.isHere && m_items.size() == 1)
             return StepText(StepText::Kind::Reorder, name);
+        if (!first.isFile() && m_items.size() == 1)
+            return StepText(StepText::Kind::Create, name);
         const QString folder = history.nameOf(QFileInfo(first.target).path());
         if (m_items.size() == 1)
             return StepText(m_isMove ? StepText::Kind::Move : StepText::Kind::Copy, name, 1, folder);

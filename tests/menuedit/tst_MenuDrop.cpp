@@ -126,9 +126,13 @@ private Q_SLOTS:
     void asksNothingThatCannotBeDone();
     void doesNothingWhenAllIsSkipped();
     void leavesAllWhenTheModelGoesInAQuestion();
+    void makesEntriesOfAddresses();
+    void takesEntriesBackWhenAFileFails();
+    void tellsThatAnEntryWasNotSaved();
 
 private:
     DropResult drop(const QStringList &files, Qt::DropAction action, int row, bool isAssisted = false);
+    DropResult dropWithAddresses(const QStringList &files);
     QString trashed(const QString &name) const { return path(QStringLiteral("data/Trash/files/") + name); }
     QByteArray record() const { return read(path(QStringLiteral("to/.directory"))); }
 
@@ -606,6 +610,65 @@ void tst_MenuDrop::leavesAllWhenTheModelGoesInAQuestion()
 
     QCOMPARE(read(old), QByteArray("old"));
     QVERIFY(QFile::exists(path(QStringLiteral("from/y"))));
+}
+
+// Empty names stand for addresses.
+DropResult tst_MenuDrop::dropWithAddresses(const QStringList &files)
+{
+    QStringList sources;
+    for (const QString &file : files)
+        sources.append(file.isEmpty() ? QString() : path(file));
+    const QVector<WebAddress> addresses{{QUrl(QStringLiteral("http://a.org/")), QStringLiteral("A")},
+                                        {QUrl(QStringLiteral("http://b.org/")), QString()}};
+    const QModelIndex folder = m_model->index(path(QStringLiteral("to")));
+    return MenuDrop(*m_model, *m_watch, m_host, {sources, Qt::MoveAction, 0, folder, true, addresses})
+        .carryOut();
+}
+
+void tst_MenuDrop::makesEntriesOfAddresses()
+{
+    const QByteArray mine = "mine";
+    write(QStringLiteral("to/b.org.desktop"), mine);
+
+    const DropResult result = dropWithAddresses({QString(), QStringLiteral("from/x"), QString()});
+
+    QVERIFY(result.isDone);
+    QCOMPARE(m_host.questions, QStringList());
+    QCOMPARE(m_host.places, QStringList{QStringLiteral("a.org.desktop x b.org-2.desktop before 0 in to")});
+    QCOMPARE(result.moved, QStringList{path(QStringLiteral("from/x"))});
+    QVERIFY(read(path(QStringLiteral("to/a.org.desktop"))).contains("URL=http://a.org/\n"));
+    QVERIFY(read(path(QStringLiteral("to/b.org-2.desktop"))).contains("Name=b.org\n"));
+    QCOMPARE(read(path(QStringLiteral("to/b.org.desktop"))), mine);
+}
+
+void tst_MenuDrop::takesEntriesBackWhenAFileFails()
+{
+    m_host.begin = [this] { write(QStringLiteral("to/x"), "came meanwhile"); };
+
+    const DropResult result = dropWithAddresses({QString(), QStringLiteral("from/x")});
+
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint,
+             QStringLiteral("%1 exists and was left as it is.").arg(path(QStringLiteral("to/x"))));
+    QVERIFY(!QFile::exists(path(QStringLiteral("to/a.org.desktop"))));
+    QCOMPARE(record(), Record);
+}
+
+void tst_MenuDrop::tellsThatAnEntryWasNotSaved()
+{
+    const QString second = path(QStringLiteral("to/b.org.desktop"));
+    m_host.begin = [this] { write(QStringLiteral("to/b.org.desktop"), "came meanwhile"); };
+
+    const DropResult result = dropWithAddresses({QString(), QString(), QStringLiteral("from/x")});
+
+    QVERIFY(!result.isDone);
+    QCOMPARE(result.complaint,
+             QStringLiteral("%1 could not be saved. Make sure that the folder %2 may be written and that the "
+                            "disk is not full, then try again.")
+                 .arg(second, path(QStringLiteral("to"))));
+    QCOMPARE(read(second), QByteArray("came meanwhile"));
+    QVERIFY(!QFile::exists(path(QStringLiteral("to/a.org.desktop"))));
+    QVERIFY(QFile::exists(path(QStringLiteral("from/x"))));
 }
 
 VEL_TEST_MAIN(tst_MenuDrop)
