@@ -10,6 +10,7 @@
 #include "OnDisk.h"
 #include "Refusal.h"
 #include "ReplacedThings.h"
+#include "TransferText.h"
 
 #include <QCoreApplication>
 #include <QFile>
@@ -20,29 +21,6 @@
 #include <algorithm>
 
 namespace {
-
-QString failureText(const FileTransfer::Result &result, Qt::DropAction action)
-{
-    switch (result.failure) {
-    case FileTransfer::Failure::None:
-    case FileTransfer::Failure::Canceled: // which the user knows
-        break;
-    case FileTransfer::Failure::SourceGone:
-        return QFileSystemModel::tr("%1 does not exist.").arg(result.path);
-    case FileTransfer::Failure::TargetExists:
-        return QFileSystemModel::tr("%1 exists and was left as it is.").arg(result.path);
-    case FileTransfer::Failure::IntoItself:
-        return QFileSystemModel::tr("%1 cannot be put into itself.").arg(result.path);
-    case FileTransfer::Failure::NotWritable:
-        return QFileSystemModel::tr("%1 cannot be written.").arg(result.path);
-    case FileTransfer::Failure::Failed:
-        return (action == Qt::MoveAction       ? QFileSystemModel::tr("Can't move %1: %2")
-                    : action == Qt::LinkAction ? QFileSystemModel::tr("Can't link %1: %2")
-                                               : QFileSystemModel::tr("Can't copy %1: %2"))
-            .arg(result.path, result.reason);
-    }
-    return QString();
-}
 
 FileTransfer::Action transferAction(Qt::DropAction action)
 {
@@ -348,5 +326,5 @@ DropResult MenuDrop::refused(const QString &complaint) const
 
 DropResult MenuDrop::refused(const FileTransfer::Result &failure) const
 {
-    return refused(failureText(failure, m_request.action));
+    return refused(TransferText::of(failure, m_request.action));
 }

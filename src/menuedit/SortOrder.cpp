@@ -112,4 +112,16 @@ QStringList rewritten(const QStringList &children, const QStringList &names, int
     return list;
 }
 
+QStringList withCopies(const QStringList &children, const QHash<QString, QString> &copies)
+{
+    QStringList list{QStringLiteral("*")};
+    for (const QString &child : children) {
+        list.append(child);
+        const QString copy = copies.value(child);
+        if (!copy.isEmpty())
+            list.append(copy);
+    }
+    return list;
+}
+
 } // namespace SortOrder

@@ -90,4 +90,8 @@ QStringList rewritten(const QStringList &children, const QString &name, int plac
 /// The same with several \a names, each once, which stand there in their order.
 QStringList rewritten(const QStringList &children, const QStringList &names, int place);
 
+/// The list for the same folder with \a copies of some of its children, each right after the one that is
+/// its key.
+QStringList withCopies(const QStringList &children, const QHash<QString, QString> &copies);
+
 } // namespace SortOrder

@@ -70,6 +70,12 @@ constexpr Texts AllTexts[] = {
     {QT_TRANSLATE_NOOP("MenuHistory", "Undo sorting of folder %1"),
      QT_TRANSLATE_NOOP("MenuHistory", "Redo sorting of folder %1"),
      QT_TRANSLATE_NOOP("MenuHistory", "The folder %1 was sorted by name.")},
+    {QT_TRANSLATE_NOOP("MenuHistory", "Undo duplication of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "Redo duplication of %1"),
+     QT_TRANSLATE_NOOP("MenuHistory", "%1 was duplicated. The copy is selected.")},
+    {QT_TRANSLATE_N_NOOP("MenuHistory", "Undo duplication of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "Redo duplication of %n items"),
+     QT_TRANSLATE_N_NOOP("MenuHistory", "%n items were duplicated. The copies are selected.")},
 };
 
 // English has no catalog that would know the form for one.

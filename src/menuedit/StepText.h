@@ -30,6 +30,8 @@ public:
         ShowAgain, ///< the item
         ShowItemsAgain, ///< so many
         Sort, ///< the folder
+        Duplicate, ///< the item
+        DuplicateItems, ///< so many
     };
 
     /// \a item and \a folder are shown names.

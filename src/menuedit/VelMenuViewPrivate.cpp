@@ -44,6 +44,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , moving(menu, selection, find, voice, history)
     , editing(view, menu, selection, find, voice, history)
     , deletion(view, menu, selection, find, voice, history)
+    , duplication(view, menu, selection, find, voice, history)
     , sorting(menu, selection, find, voice, history)
     , folderOpening(view, selection, voice)
     , reloading(view, menu, selection, [this] { showAnew(); })
@@ -108,6 +109,7 @@ void VelMenuViewPrivate::show()
         makeEditable();
     QObject::connect(&editing, &MenuEditing::changed, q, &VelMenuView::changed);
     QObject::connect(&deletion, &MenuDeletion::changed, q, &VelMenuView::changed);
+    QObject::connect(&duplication, &MenuDuplication::changed, q, &VelMenuView::changed);
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::setActionsEnabled);
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::changed);
     QObject::connect(&history, &MenuHistory::replaced, q, [this] { showAnew(); });
@@ -256,6 +258,7 @@ void VelMenuViewPrivate::setAssistedTree(bool assisted)
     reloading.setOn(assisted, actions ? actions->menu() : nullptr);
     if (actions) {
         hiding.setContextMenu(assisted ? actions->menu() : nullptr);
+        duplication.setContextMenu(assisted ? actions->menu() : nullptr, actions->action(MenuActions::Paste));
         actions->setAssisted(assisted);
     }
     if (assisted)

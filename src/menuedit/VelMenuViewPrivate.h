@@ -9,6 +9,7 @@
 #include "FolderOpening.h"
 #include "MenuActions.h"
 #include "MenuDeletion.h"
+#include "MenuDuplication.h"
 #include "MenuEditing.h"
 #include "MenuFilter.h"
 #include "MenuFind.h"
@@ -66,6 +67,7 @@ public:
     MenuMoving moving;
     MenuEditing editing;
     MenuDeletion deletion;
+    MenuDuplication duplication;
     MenuSorting sorting;
     FolderOpening folderOpening;
     MenuReload reloading;

@@ -29,6 +29,7 @@ private Q_SLOTS:
     void rewritesTheList();
     void listsSeveralTogether_data();
     void listsSeveralTogether();
+    void listsCopiesAfterTheirOriginals();
 };
 
 namespace {
@@ -251,6 +252,17 @@ void tst_SortOrder::listsSeveralTogether()
     QCOMPARE(SortOrder::rewritten(children, names.split(QLatin1Char(' '), Qt::SkipEmptyParts), place)
                  .join(QLatin1Char(' ')),
              expected);
+}
+
+void tst_SortOrder::listsCopiesAfterTheirOriginals()
+{
+    const QStringList children = QStringLiteral("a b c").split(QLatin1Char(' '));
+    const QString c = QStringLiteral("c");
+    QCOMPARE(SortOrder::withCopies(children,
+                                   {{QStringLiteral("a"), QStringLiteral("a-2")}, {c, QStringLiteral("c-2")}})
+                 .join(QLatin1Char(' ')),
+             QStringLiteral("* a a-2 b c c-2"));
+    QCOMPARE(SortOrder::withCopies({}, {{c, QStringLiteral("c-2")}}), QStringList{QStringLiteral("*")});
 }
 
 VEL_TEST_GUILESS_MAIN(tst_SortOrder)
