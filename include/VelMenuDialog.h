@@ -62,7 +62,7 @@ public:
      */
     explicit VelMenuDialog(QWidget *parent = nullptr);
 
-    /// Remembers the size and tells the window manager; see updateWM().
+    /// Remembers the size and, with assistance(), which folders are open, and tells the window manager; see updateWM().
     ~VelMenuDialog() override;
 
     /// The menu directory shown.
@@ -73,7 +73,10 @@ public:
 
     /**
      * Switches on what helps users beyond the plain dialog, in its view too
-     * (VelMenuView::setAssistance()). Off, as it is at first, the dialog has nothing of that.
+     * (VelMenuView::setAssistance()). The folders that were open in the menu directory when a dialog with
+     * assistance was destroyed last are opened again, a few at a time; not those behind links that lead
+     * out of it, and no more than 200 with 5,000 items. Off, as it is at first, the dialog has nothing of
+     * that.
      *
      * @param assistance whether the dialog is to help
      */

@@ -6,8 +6,10 @@
 #include "MenuFilterBar.h"
 #include "MessageLine.h"
 #include "OnDisk.h"
+#include "OpenedMenus.h"
 #include "ToolBarFocus.h"
 #include "VelMenuView.h"
+#include "VelMenuViewPrivate.h"
 
 #include <QAction>
 #include <QCoreApplication>
@@ -46,11 +48,19 @@ MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout,
     takeKeys();
     dialog->installEventFilter(this);
     tellIfReadOnly();
+    VelMenuViewPrivate::openedFoldersOf(*view).open(OpenedMenus::foldersOf(view->menuDir()));
 }
 
 MenuDialogAssistance::~MenuDialogAssistance()
 {
     giveKeysBack();
+}
+
+// A filter opens folders of its own.
+void MenuDialogAssistance::remember() const
+{
+    m_view->setFilter(QString());
+    OpenedMenus::keep(m_view->menuDir(), VelMenuViewPrivate::openedFoldersOf(*m_view).opened());
 }
 
 QAction *MenuDialogAssistance::action(const char *name) const

@@ -33,6 +33,9 @@ public:
     MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout, VelMenuView *view, QToolBar *toolBar);
     ~MenuDialogAssistance() override;
 
+    /// Remembers what was opened in the tree, which it opened again when it was made.
+    void remember() const;
+
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:

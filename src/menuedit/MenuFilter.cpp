@@ -6,6 +6,7 @@
 #include "LoadedFolders.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
+#include "OpenedFolders.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
@@ -101,7 +102,7 @@ void MenuFilter::setHiddenFound(bool isFound)
 
 void MenuFilter::begin()
 {
-    m_openedBefore = openedFolders();
+    m_openedBefore = OpenedFolders::in(*m_view, m_menu, m_selection);
     m_isBeginning = true;
     m_index->read();
     m_isBeginning = false;
@@ -191,17 +192,6 @@ void MenuFilter::openFoldersSoon()
         m_isOpening = false;
         openFolders();
     });
-}
-
-QSet<QString> MenuFilter::openedFolders() const
-{
-    QSet<QString> opened;
-    const QSet<QString> loaded = LoadedFolders::in(m_menu.files());
-    for (const QString &path : loaded) {
-        if (m_view->isExpanded(m_selection.shown(path)))
-            opened.insert(path);
-    }
-    return opened;
 }
 
 bool MenuFilter::selectNext()

@@ -52,7 +52,6 @@ private:
     void apply(const FilteredRows &rows);
     void openFolders();
     void openFoldersSoon();
-    QSet<QString> openedFolders() const;
     void tellIfNothing();
 
     QTreeView *const m_view;

@@ -3,8 +3,8 @@
 
 #include "MenuReload.h"
 
-#include "LoadedFolders.h"
 #include "MenuSelection.h"
+#include "OpenedFolders.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
@@ -50,17 +50,6 @@ void MenuReload::setOn(bool on, QMenu *menu)
     menu->addActions({m_separator.get(), m_action.get()});
 }
 
-QStringList MenuReload::openedFolders() const
-{
-    QStringList opened;
-    const QSet<QString> loaded = LoadedFolders::in(m_menu.files());
-    for (const QString &path : loaded) {
-        if (m_view->isExpanded(m_selection.shown(path)))
-            opened.append(path);
-    }
-    return opened;
-}
-
 // The current item first.
 QStringList MenuReload::selectedItems() const
 {
@@ -78,7 +67,7 @@ QStringList MenuReload::selectedItems() const
 
 void MenuReload::reload()
 {
-    const QStringList opened = openedFolders();
+    const QSet<QString> opened = OpenedFolders::in(*m_view, m_menu, m_selection);
     const QStringList selected = selectedItems();
     m_showAnew();
     for (const QString &path : opened)

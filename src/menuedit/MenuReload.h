@@ -36,7 +36,6 @@ public:
     void reload();
 
 private:
-    QStringList openedFolders() const;
     QStringList selectedItems() const;
     void selectAgain(const QStringList &paths);
 

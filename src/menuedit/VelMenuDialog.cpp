@@ -192,6 +192,8 @@ VelMenuDialog::VelMenuDialog(QWidget *parent)
 VelMenuDialog::~VelMenuDialog()
 {
     DialogSize::remember(*this, sizeGroup());
+    if (d->helper)
+        d->helper->remember();
     updateWM();
 }
 

@@ -48,6 +48,7 @@ VelMenuViewPrivate::VelMenuViewPrivate(VelMenuView *view, const QString &directo
     , sorting(menu, selection, find, voice, history)
     , folderOpening(view, selection, voice)
     , reloading(view, menu, selection, [this] { showAnew(); })
+    , openedFolders(view, menu, selection)
     , cutMark(view, menu)
     , dragOpening(view)
     , m_rootWatch(menu.directory())
@@ -69,6 +70,11 @@ MenuVoice &VelMenuViewPrivate::voiceOf(const VelMenuView &view)
 MenuSelection &VelMenuViewPrivate::selectionOf(const VelMenuView &view)
 {
     return view.d->selection;
+}
+
+OpenedFolders &VelMenuViewPrivate::openedFoldersOf(const VelMenuView &view)
+{
+    return view.d->openedFolders;
 }
 
 MenuHistory &VelMenuViewPrivate::historyOf(const VelMenuView &view)

@@ -20,6 +20,7 @@
 #include "MenuSelection.h"
 #include "MenuSorting.h"
 #include "MenuVoice.h"
+#include "OpenedFolders.h"
 #include "RootWatch.h"
 #include "SeveralRows.h"
 #include "ShownMenu.h"
@@ -53,6 +54,9 @@ public:
     /// What was done to the menu of \a view.
     static MenuHistory &historyOf(const VelMenuView &view);
 
+    /// Which folders are opened in \a view.
+    static OpenedFolders &openedFoldersOf(const VelMenuView &view);
+
     VelMenuView *const q;
     /// See VelMenuView::setAssistance().
     bool isAssisted = false;
@@ -71,6 +75,7 @@ public:
     MenuSorting sorting;
     FolderOpening folderOpening;
     MenuReload reloading;
+    OpenedFolders openedFolders;
     CutMark cutMark;
     DragOpening dragOpening;
     /// Null where there is no assistance, or nothing to begin.
