@@ -108,6 +108,21 @@ void lookAtAll(const ShownMenu &menu, const QModelIndexList &rows, ActionState::
     }
 }
 
+// A letter that is put behind the text, as in Japanese, would stay in what a tool button derives from it.
+void mark(QAction &action, const Description &description, bool isMarked)
+{
+    action.setText(QCoreApplication::translate("VelMenuView", description.text));
+    action.setIconText(QString());
+    action.setToolTip(QString());
+    if (!isMarked)
+        return;
+    const QString iconText = action.iconText();
+    const QString toolTip = action.toolTip();
+    action.setText(QCoreApplication::translate("VelMenuView", description.textWithMnemonic));
+    action.setIconText(iconText);
+    action.setToolTip(toolTip);
+}
+
 ActionState stateOf(const ShownMenu &menu, const QModelIndex &item, const QModelIndexList &rows,
                     const ClipboardContents &clipboard)
 {
@@ -171,10 +186,8 @@ void MenuActions::setAssisted(bool assisted)
     action(Up)->setShortcut(assisted ? QKeySequence(QStringLiteral("Alt+Up")) : QKeySequence());
     action(Down)->setShortcut(assisted ? QKeySequence(QStringLiteral("Alt+Down")) : QKeySequence());
     for (int i = 0; i < m_actions.size(); ++i) {
-        const Description &description = Descriptions[i];
-        const char *text = assisted ? description.textWithMnemonic : description.text;
         if (m_actions.at(i))
-            m_actions.at(i)->setText(QCoreApplication::translate("VelMenuView", text));
+            mark(*m_actions.at(i), Descriptions[i], assisted);
     }
 }
 

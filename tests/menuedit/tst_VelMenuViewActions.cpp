@@ -12,6 +12,7 @@
 #include <QMenu>
 #include <QMimeData>
 #include <QTemporaryDir>
+#include <QTranslator>
 
 #include <sys/stat.h>
 
@@ -29,6 +30,7 @@ private Q_SLOTS:
     void givesEachActionItsTextIconAndKey_data();
     void givesEachActionItsTextIconAndKey();
     void givesEachTextALetterWithAssistance();
+    void showsNoLetterOutsideTheMenu();
     void hasTheActionsInTheViewToo();
     void takesKeysOnlyWhileItHasTheFocus();
     void enablesByRule_data();
@@ -151,6 +153,50 @@ void tst_VelMenuViewActions::givesEachTextALetterWithAssistance()
     view.setAssistance(false);
     QCOMPARE(texts(), plain);
     QVERIFY(!plain.join(QString()).contains(QLatin1Char('&')));
+}
+
+namespace {
+
+/// Puts the letters behind the texts, as languages without letters do.
+class LettersBehind : public QTranslator
+{
+public:
+    using QTranslator::QTranslator;
+    bool isEmpty() const override { return false; }
+    QString translate(const char *context, const char *source, const char *, int) const override
+    {
+        const QString text = QString::fromUtf8(source);
+        const int letter = text.indexOf(QLatin1Char('&'));
+        if (letter < 0 || qstrcmp(context, "VelMenuView") != 0)
+            return {};
+        return QString(text).remove(letter, 1) + QStringLiteral("(&%1)").arg(text.at(letter + 1).toUpper());
+    }
+};
+
+} // namespace
+
+void tst_VelMenuViewActions::showsNoLetterOutsideTheMenu()
+{
+    LettersBehind translator;
+    QVERIFY(QCoreApplication::installTranslator(&translator));
+    VelMenuView view(menu(), -1, true);
+    const auto texts = [&view](QString (QAction::*text)() const) {
+        QStringList list;
+        const QList<QAction *> actions = view.actions();
+        for (const QAction *action : actions.mid(0, 12))
+            list.append((action->*text)());
+        return list;
+    };
+    const QStringList toolTips = texts(&QAction::toolTip);
+    const QStringList iconTexts = texts(&QAction::iconText);
+    view.setAssistance(true);
+    QVERIFY(texts(&QAction::text).contains(QStringLiteral("New folder(&F)")));
+    QCOMPARE(texts(&QAction::toolTip), toolTips);
+    QCOMPARE(texts(&QAction::iconText), iconTexts);
+    view.setAssistance(false);
+    QCOMPARE(texts(&QAction::toolTip), toolTips);
+    QCOMPARE(texts(&QAction::iconText), iconTexts);
+    QCoreApplication::removeTranslator(&translator);
 }
 
 void tst_VelMenuViewActions::hasTheActionsInTheViewToo()
