@@ -3,23 +3,30 @@
 
 #pragma once
 
-#include "EntryExecution.h"
+#include <QStringList>
+
+#include <functional>
+
+class QWidget;
 
 /**
  * Showing of files where they lie, in the desktop's file manager.
  */
 namespace ContainingFolder {
 
+/// Hears why a folder was not opened: half a sentence.
+using Failed = std::function<void(const QString &folder, const QString &reason)>;
+
 /**
- * Has the file manager that is on the session bus, or is started by it, show the file at \a path in its
- * folder. Where there is none, the desktop's program for entries opens the folder.
+ * Has the file manager that is on the session bus, or is started by it, show the files at \a paths in
+ * their folders. Where there is none, the desktop's program for entries opens each folder.
  *
  * Nothing is waited for.
  *
  * @param owner for as long as it lives the outcome is followed
- * @param path absolute
- * @param failed is told when neither way works
+ * @param paths absolute
+ * @param failed is told of each folder that neither way opens
  */
-void show(QWidget *owner, const QString &path, const EntryExecution::Failed &failed);
+void show(QWidget *owner, const QStringList &paths, const Failed &failed);
 
 } // namespace ContainingFolder

@@ -9,7 +9,6 @@
 
 #include <QAction>
 #include <QCoreApplication>
-#include <QFileInfo>
 #include <QMenu>
 
 FolderOpening::FolderOpening(QWidget *view, const MenuSelection &selection, MenuVoice &voice)
@@ -44,16 +43,15 @@ void FolderOpening::update()
 
 void FolderOpening::open()
 {
-    const QString path = m_selection.path();
-    if (path.isEmpty())
+    const QStringList paths = m_selection.paths();
+    if (paths.isEmpty())
         return;
     // The view may show another menu by then.
     const QPointer<FolderOpening> self(this);
-    ContainingFolder::show(m_view, path, [self, path](const QString &reason) {
-        if (!self)
-            return;
-        const QString text = QCoreApplication::translate("VelMenuView", "The folder %1 was not opened: %2.")
-                                 .arg(QFileInfo(path).path(), reason);
-        self->m_voice.tell(text, MenuVoice::Failure, self->m_selection.shown(path));
+    ContainingFolder::show(m_view, paths, [self](const QString &folder, const QString &reason) {
+        if (self)
+            self->m_voice.tell(QCoreApplication::translate("VelMenuView", "The folder %1 was not opened: %2.")
+                                   .arg(folder, reason),
+                               MenuVoice::Failure, self->m_selection.shown(folder));
     });
 }

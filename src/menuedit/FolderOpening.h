@@ -27,7 +27,7 @@ public:
     /// Puts the entry into \a menu, above its action \a next; a null menu takes it out again.
     void setContextMenu(QMenu *menu, QAction *next);
 
-    /// Shows the selected item; the user is told when that fails, which may be later.
+    /// Shows the selected items; the user is told when that fails, which may be later.
     void open();
 
 private:

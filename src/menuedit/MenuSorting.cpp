@@ -117,10 +117,9 @@ void MenuSorting::sort()
         return;
     m_menu.proxy().invalidateSortOrder(folder);
     m_find.clear();
-    const QString selected = m_selection.path();
-    if (!selected.isEmpty())
-        m_selection.reveal(selected);
-    m_history.add(recorder, StepText(StepText::Kind::Sort, name), {selected});
+    if (!m_selection.path().isEmpty())
+        m_selection.reveal(m_selection.path());
+    m_history.add(recorder, StepText(StepText::Kind::Sort, name), m_selection.paths());
     if (self)
         Q_EMIT changed();
 }

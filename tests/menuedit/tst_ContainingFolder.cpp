@@ -69,12 +69,14 @@ private Q_SLOTS:
     void opensTheFolderWhereThereIsNone();
     void tellsWhyItCouldNot_data();
     void tellsWhyItCouldNot();
+    void showsSeveralItemsAtOnce_data();
+    void showsSeveralItemsAtOnce();
     void needsAnItem();
     void isThereWithAssistanceOnly();
 
 private:
     void installOpener(const QByteArray &script);
-    void openAssisted();
+    void openAssisted(int count = 1);
     void choose();
     QAction *openAction() const;
     QString log() const { return path(QStringLiteral("log")); }
@@ -117,10 +119,10 @@ void tst_ContainingFolder::installOpener(const QByteArray &script)
     qputenv("PATH", QFile::encodeName(path(QStringLiteral("bin"))) + ":/usr/bin:/bin");
 }
 
-void tst_ContainingFolder::openAssisted()
+void tst_ContainingFolder::openAssisted(int count)
 {
     writeEntry(QString::fromUtf8("my folder/\xc3\xa4 %41#.desktop"), QStringLiteral("A"));
-    openDialog(menu(), 1);
+    openDialog(menu(), count);
     dialog()->setAssistance(true);
     dialog()->layout()->activate();
     QCoreApplication::processEvents();
@@ -224,6 +226,37 @@ void tst_ContainingFolder::tellsWhyItCouldNot()
     auto *message = dialog()->findChild<QLabel *>(QStringLiteral("messageLabel"));
     QTRY_COMPARE_WITH_TIMEOUT(message->text(),
                               QStringLiteral("The folder %1 was not opened: %2.").arg(menu(), reason), 20000);
+}
+
+void tst_ContainingFolder::showsSeveralItemsAtOnce_data()
+{
+    QTest::addColumn<bool>("hasService");
+    QTest::newRow("file manager") << true;
+    QTest::newRow("none") << false;
+}
+
+void tst_ContainingFolder::showsSeveralItemsAtOnce()
+{
+    QFETCH(bool, hasService);
+    installOpener("echo \"$2\" >>'" + QFile::encodeName(log()) + "'\n");
+    const std::unique_ptr<FileManagerService> service(hasService ? new FileManagerService(m_address, false)
+                                                                 : nullptr);
+    for (const char *name : {"b", "c", "d"})
+        writeEntry(QStringLiteral("%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
+    openAssisted(4);
+    clickItem(menu() + QString::fromUtf8("/my folder/\xc3\xa4 %41#.desktop"));
+    XDoTool::press(QStringLiteral("shift+Down"));
+    XDoTool::press(QStringLiteral("shift+Down"));
+    QTRY_COMPARE_WITH_TIMEOUT(view().selectionModel()->selectedIndexes().size(), 3, 20000);
+    choose();
+    if (service) {
+        QTRY_COMPARE_WITH_TIMEOUT(service->shown().size(), 3, 20000);
+        QVERIFY(service->shown().constLast().endsWith(QLatin1String("/menu/c.desktop")));
+        return;
+    }
+    const QByteArray both = QFile::encodeName(menu()) + "/my folder\n" + QFile::encodeName(menu()) + '\n';
+    QTRY_COMPARE_WITH_TIMEOUT(QFileInfo(log()).size(), qint64(both.size()), 20000);
+    QVERIFY(read(log()).contains(QFile::encodeName(menu()) + '\n'));
 }
 
 void tst_ContainingFolder::needsAnItem()
