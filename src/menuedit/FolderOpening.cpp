@@ -9,13 +9,15 @@
 
 #include <QAction>
 #include <QCoreApplication>
+#include <QIcon>
 #include <QMenu>
 
 FolderOpening::FolderOpening(QWidget *view, const MenuSelection &selection, MenuVoice &voice)
     : m_view(view)
     , m_selection(selection)
     , m_voice(voice)
-    , m_action(new QAction(QCoreApplication::translate("VelMenuView", "Open containin&g folder"), this))
+    , m_action(new QAction(QIcon::fromTheme(QStringLiteral("document-open-folder")),
+                           QCoreApplication::translate("VelMenuView", "Open containin&g folder"), this))
 {
     m_action->setObjectName(QStringLiteral("openFolderAction"));
     connect(m_action, &QAction::triggered, this, &FolderOpening::open);

@@ -22,6 +22,7 @@
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
+#include <QIcon>
 #include <QMenu>
 
 namespace {
@@ -41,7 +42,8 @@ MenuSorting::MenuSorting(const ShownMenu &menu, MenuSelection &selection, MenuFi
     , m_find(find)
     , m_voice(voice)
     , m_history(history)
-    , m_action(new QAction(QCoreApplication::translate("VelMenuView", "&Sort by name"), this))
+    , m_action(new QAction(QIcon::fromTheme(QStringLiteral("view-sort-ascending")),
+                           QCoreApplication::translate("VelMenuView", "&Sort by name"), this))
 {
     m_action->setObjectName(QStringLiteral("sortAction"));
     connect(m_action, &QAction::triggered, this, &MenuSorting::sort);
