@@ -8,7 +8,9 @@
 #include "check/EntryCheck.h"
 
 #include <QApplication>
+#include <QCoreApplication>
 #include <QScrollArea>
+#include <QScrollBar>
 #include <QShortcut>
 #include <QWidget>
 
@@ -20,6 +22,38 @@ namespace {
 
 const QLatin1String MainGroup("Desktop Entry");
 const QLatin1String ActionPrefix("Desktop Action ");
+
+// Where the focus is in the view of a form: what the user types in must not move away under his hands.
+class FocusPlace
+{
+public:
+    explicit FocusPlace(const QWidget *form)
+        : m_area(form->findChild<QScrollArea *>())
+        , m_focused(QApplication::focusWidget())
+    {
+        if (!m_area || !m_focused || !m_area->widget()->isAncestorOf(m_focused))
+            m_focused = nullptr;
+        else
+            m_top = top();
+    }
+
+    /// Lays out what changed and scrolls by as much as that moved the place.
+    void restore() const
+    {
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::LayoutRequest);
+        if (!m_focused)
+            return;
+        QScrollBar *const bar = m_area->verticalScrollBar();
+        bar->setValue(bar->value() + top() - m_top);
+    }
+
+private:
+    int top() const { return m_focused->mapTo(m_area->viewport(), QPoint()).y(); }
+
+    QScrollArea *m_area;
+    QWidget *m_focused;
+    int m_top = 0;
+};
 
 } // namespace
 
@@ -61,8 +95,10 @@ void FormFindings::check()
         const int row = rowOf(finding);
         all[row].append(said(finding, row));
     }
+    const FocusPlace place(m_form.widget);
     for (int i = 0; i < m_rows.size(); ++i)
         m_rows.at(i)->say(all.at(i), m_assistance.rows().at(i).field);
+    place.restore();
 }
 
 // A translation is shown in the row behind that of its key.
@@ -117,21 +153,22 @@ void FormFindings::goOn(int step)
         if (m_rows.at(next)->isEmpty() || !m_assistance.isShown(rows.at(next)))
             continue;
         FieldEdit::focus(rows.at(next).field);
-        bringIntoView(m_rows.at(next)->lastLine());
+        bringIntoView(next);
         return;
     }
     QApplication::beep();
 }
 
-// The form itself brings the field into view.
-void FormFindings::bringIntoView(const QWidget *line) const
+// The field and what is said about it.
+void FormFindings::bringIntoView(int row) const
 {
     auto *const area = m_form.widget->findChild<QScrollArea *>();
-    const QWidget *const content = area ? area->widget() : nullptr;
-    if (!line || !content || !content->isAncestorOf(line))
+    const QWidget *const line = m_rows.at(row)->lastLine();
+    if (!area || !line)
         return;
-    const QRect place(line->mapTo(content, QPoint()), line->size());
+    const QRect place(line->mapTo(area->widget(), QPoint()), line->size());
     area->ensureVisible(place.left(), place.bottom(), 0, 0);
+    area->ensureWidgetVisible(m_assistance.rows().at(row).field);
 }
 
 void FormFindings::repair(const EntryRepair &repair)

@@ -47,7 +47,7 @@ private:
     int rowOf(const EntryFinding &finding) const;
     RowFindings::Said said(const EntryFinding &finding, int row) const;
     void goOn(int step);
-    void bringIntoView(const QWidget *line) const;
+    void bringIntoView(int row) const;
     void repair(const EntryRepair &repair);
 
     EntryFormAssistance &m_assistance;

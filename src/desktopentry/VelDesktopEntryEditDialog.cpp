@@ -27,6 +27,7 @@
 #include <QPoint>
 #include <QPointer>
 #include <QPushButton>
+#include <QScrollArea>
 #include <QScopedValueRollback>
 #include <QVBoxLayout>
 
@@ -135,11 +136,13 @@ QString VelDesktopEntryEditDialogPrivate::fieldMeant(VelUIDesktopEntry::Suitable
     return isCommand ? QStringLiteral("Exec") : QStringLiteral("Name");
 }
 
-// The form brings what has the focus into view.
 void VelDesktopEntryEditDialogPrivate::focusField(const QString &key)
 {
-    if (const VelUI::FormRow *row = form().assistance->row(key))
-        VelUI::FieldEdit::focus(row->field);
+    const VelUI::FormRow *row = form().assistance->row(key);
+    if (!row)
+        return;
+    VelUI::FieldEdit::focus(row->field);
+    form().scrollArea->ensureWidgetVisible(row->field);
 }
 
 QString VelDesktopEntryEditDialogPrivate::unsuitableText(VelUIDesktopEntry::SuitableError error)

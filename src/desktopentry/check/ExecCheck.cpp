@@ -47,7 +47,9 @@ void addQuoting(const Fault &fault, const CheckedValue &value)
         : EntryFinding::Error;
     const QString sentence = quotingSentence(fault);
     if (!ExecRewriting::needsShell(exec))
-        value.add(fault.problem, severity, sentence, Text::tr("Put it in quotes"),
+        value.add(fault.problem, severity, sentence,
+                  fault.problem == EntryProblem::OpenQuote ? Text::tr("Close the quote")
+                                                           : Text::tr("Put it in quotes"),
                   ExecRewriting::requoted(exec, QDir::homePath()));
     else if (!ExecRewriting::throughShell(exec).isEmpty())
         value.add(fault.problem, severity, sentence, Text::tr("Have a shell run it"),

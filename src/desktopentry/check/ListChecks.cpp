@@ -5,6 +5,8 @@
 
 #include "ItemRepair.h"
 
+#include <frame/DesktopNames.h>
+
 #include <QCoreApplication>
 
 #include <algorithm>
@@ -122,23 +124,14 @@ void checkAction(const QByteArray &item, const CheckedEntry &entry, const Checke
 
 } // namespace
 
-const QStringList &ListChecks::registeredDesktops()
-{
-    static const QStringList desktops =
-        QStringLiteral(
-            "Budgie Cinnamon Deepin EDE Enlightenment GNOME GNOME-Classic GNOME-Flashback KDE LXDE "
-            "LXQt MATE Old Pantheon Razor ROX TDE Unity XFCE")
-            .split(QLatin1Char(' '));
-    return desktops;
-}
-
 void ListChecks::checkDesktops(const CheckedValue &value)
 {
     forEachItem(value, [&value](const QByteArray &item) {
         const QString name = EntryText::text(item);
-        if (registeredDesktops().contains(name) || name.startsWith(QLatin1String("X-")))
+        const QStringList registered = DesktopNames::registered();
+        if (registered.contains(name) || name.startsWith(QLatin1String("X-")))
             return;
-        const QString meant = ItemRepair::meant(item, registeredDesktops());
+        const QString meant = ItemRepair::meant(item, registered);
         const QString sentence =
             Text::tr("There is no registered desktop '%1'; others have to begin with 'X-'.").arg(name);
         if (meant.isEmpty())

@@ -12,7 +12,4 @@ void checkDesktops(const CheckedValue &value);
 void checkMimeTypes(const CheckedEntry &entry, const CheckedValue &value);
 void checkActions(const CheckedEntry &entry, const CheckedValue &value);
 
-/// The desktop environments that are registered for OnlyShowIn and NotShowIn.
-const QStringList &registeredDesktops();
-
 } // namespace ListChecks
