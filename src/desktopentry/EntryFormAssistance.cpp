@@ -59,7 +59,9 @@ void EntryFormAssistance::addBeside(const FormRow &row, QWidget *widget)
 void EntryFormAssistance::addBelow(const FormRow &row, QWidget *widget)
 {
     RowSlot *const slot = m_form.formLayout()->belowRow(row.number);
-    QWidget *const last = TabOrder::lastOf({row.field, m_form.formLayout()->besideRow(row.number), slot});
+    RowSlot *const beside = m_form.formLayout()->usedBesideRow(row.number);
+    QWidget *const last =
+        beside ? TabOrder::lastOf({row.field, beside, slot}) : TabOrder::lastOf({row.field, slot});
     slot->add(widget);
     TabOrder::putBehind(last, widget);
 }

@@ -127,7 +127,7 @@ RowFindings::Said FormFindings::said(const EntryFinding &finding, int row) const
         about = finding.group.mid(ActionPrefix.size());
     else if (!finding.locale.isEmpty())
         about = QStringLiteral("%1[%2]").arg(finding.key, finding.locale);
-    else if (finding.key != shown.key)
+    else if (finding.key != shown.key && !finding.sentence.contains(finding.key))
         about = finding.key;
     const QString sentence = about.isEmpty()
         ? finding.sentence

@@ -99,8 +99,8 @@ void tst_ExecRewriting::quotesWordsOfACommand_data()
                                    << "a  \"b c\" %f";
     QTest::newRow("single quotes") << "sh -c 'echo \"$x\"'"
                                    << "sh -c \"echo \\\"\\$x\\\"\"";
-    QTest::newRow("open quote") << "a \"b"
-                                << "a \"b\"";
+    QTest::newRow("open quote") << "a \"b c" << "a \"b c\"";
+    QTest::newRow("needless quote") << "a \"b" << "a b";
     QTest::newRow("backslash") << "/opt/My\\ App/run %f"
                                << "\"/opt/My App/run\" %f";
     QTest::newRow("address") << "a http://x?a=b&c"

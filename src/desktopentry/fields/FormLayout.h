@@ -48,6 +48,8 @@ public:
     /// The places of a row; only while the layout is spread.
     RowSlot *besideRow(int row);
     RowSlot *belowRow(int row);
+    /// The same behind the field; null where nothing was put there yet.
+    RowSlot *usedBesideRow(int row) const { return m_beside.value(row); }
 
 private:
     struct Cell
