@@ -3,7 +3,7 @@
 
 #include "TestCase.h"
 
-#include <desktopentry/choosers/ExecProgram.h>
+#include <desktopentry/ExecProgram.h>
 #include <frame/DesktopEntryRecord.h>
 
 #include <QProcess>
@@ -48,7 +48,7 @@ void tst_ExecProgram::quotesWhatIsReserved()
 {
     QFETCH(QString, word);
     QFETCH(QString, quoted);
-    QCOMPARE(ExecProgram::quoted(word), quoted);
+    QCOMPARE(ExecProgram::replaced(QStringLiteral("x -y"), word), quoted + QStringLiteral(" -y"));
 }
 
 void tst_ExecProgram::isRunAsTheProgramThatItIs_data()
