@@ -181,8 +181,8 @@ RowSlot *FormLayout::besideRow(int row)
     RowSlot *&slot = m_beside[row];
     if (!slot) {
         slot = makeSlot(row, QBoxLayout::LeftToRight);
-        makeRoomBeside(row);
         addWidget(slot, row * m_spacing, 2);
+        connect(slot, &RowSlot::filled, this, [this, row](bool isFilled) { makeRoomBeside(row, isFilled); });
     }
     return slot;
 }
@@ -205,12 +205,12 @@ RowSlot *FormLayout::makeSlot(int row, QBoxLayout::Direction direction)
 }
 
 // Only the fields that something stands behind end before it.
-void FormLayout::makeRoomBeside(int row)
+void FormLayout::makeRoomBeside(int row, bool isNeeded)
 {
     QLayoutItem *const item = rowItem(row, 1);
     if (!item || item == rowItem(row, 0))
         return;
-    put(takeAt(indexOf(item)), {row * m_spacing, 1, 1, 1});
+    put(takeAt(indexOf(item)), {row * m_spacing, 1, 1, isNeeded ? 1 : 2});
 }
 
 void FormLayout::put(QLayoutItem *item, const Cell &cell)

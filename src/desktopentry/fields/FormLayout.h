@@ -59,7 +59,7 @@ private:
 
     QLayoutItem *rowItem(int row, int column) const { return itemAtPosition(row * m_spacing, column); }
     RowSlot *makeSlot(int row, QBoxLayout::Direction direction);
-    void makeRoomBeside(int row);
+    void makeRoomBeside(int row, bool isNeeded);
     void put(QLayoutItem *item, const Cell &cell);
     void moveRows(int spacing);
 

@@ -52,6 +52,10 @@ void RowSlot::update()
     const bool hasShown = std::any_of(widgets.begin(), widgets.end(),
                                       [](const QWidget *widget) { return !widget->isHidden(); });
     setVisible(m_isRowVisible && hasShown);
+    if (hasShown == m_isFilled)
+        return;
+    m_isFilled = hasShown;
+    Q_EMIT filled(hasShown);
 }
 
 } // namespace VelUI

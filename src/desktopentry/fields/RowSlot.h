@@ -24,6 +24,10 @@ public:
 
     bool eventFilter(QObject *watched, QEvent *event) override;
 
+Q_SIGNALS:
+    /// There is a widget to be shown here, or none any more.
+    void filled(bool isFilled);
+
 protected:
     void childEvent(QChildEvent *event) override;
 
@@ -32,6 +36,7 @@ private:
 
     QBoxLayout *const m_layout;
     bool m_isRowVisible = true;
+    bool m_isFilled = false;
 };
 
 } // namespace VelUI
