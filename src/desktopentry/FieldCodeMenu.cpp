@@ -24,8 +24,9 @@ void FieldCodeMenu::insert(const QString &code)
     // The Tab key selects all that it comes to: nobody means to replace that.
     if (m_line->selectedText() == m_line->text())
         m_line->deselect();
-    const bool isReplacing = m_line->hasSelectedText();
-    const int place = isReplacing ? m_line->selectionStart() : m_line->cursorPosition();
+    if (!m_line->hasSelectedText())
+        m_line->setCursorPosition(FieldCodes::place(m_line->text(), m_line->cursorPosition()));
+    const int place = m_line->hasSelectedText() ? m_line->selectionStart() : m_line->cursorPosition();
     const QString kept = m_line->text().remove(place, m_line->selectedText().size());
     m_line->insert(FieldCodes::insertion(kept, place, code));
     m_line->setFocus(Qt::OtherFocusReason);

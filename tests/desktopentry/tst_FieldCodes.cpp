@@ -13,6 +13,8 @@ class tst_FieldCodes : public TestCase
 
 private Q_SLOTS:
     void offersThoseInForceAndExplainsEach();
+    void putsNoCodeBeforeTheProgram_data();
+    void putsNoCodeBeforeTheProgram();
     void keepsACodeApartFromTheWordBeforeIt_data();
     void keepsACodeApartFromTheWordBeforeIt();
 };
@@ -26,6 +28,26 @@ void tst_FieldCodes::offersThoseInForceAndExplainsEach()
         QVERIFY(code.explanation.size() > 12);
     }
     QCOMPARE(codes.join(QLatin1Char(' ')), QStringLiteral("%f %F %u %U %i %c %k %%"));
+}
+
+void tst_FieldCodes::putsNoCodeBeforeTheProgram_data()
+{
+    QTest::addColumn<QString>("command");
+    QTest::addColumn<int>("position");
+    QTest::addColumn<int>("place");
+    QTest::newRow("nothing there") << "" << 0 << 0;
+    QTest::newRow("in front") << "gimp -n" << 0 << 7;
+    QTest::newRow("among blanks in front") << "  gimp" << 1 << 6;
+    QTest::newRow("in the program") << "gimp" << 1 << 1;
+    QTest::newRow("behind the program") << "gimp -n" << 5 << 5;
+}
+
+void tst_FieldCodes::putsNoCodeBeforeTheProgram()
+{
+    QFETCH(QString, command);
+    QFETCH(int, position);
+    QFETCH(int, place);
+    QCOMPARE(FieldCodes::place(command, position), place);
 }
 
 void tst_FieldCodes::keepsACodeApartFromTheWordBeforeIt_data()

@@ -36,6 +36,11 @@ QVector<FieldCodes::Code> FieldCodes::all()
     };
 }
 
+int FieldCodes::place(const QString &command, int position)
+{
+    return command.left(position).trimmed().isEmpty() ? command.size() : position;
+}
+
 QString FieldCodes::insertion(const QString &command, int position, const QString &code)
 {
     const bool isAtEndOfWord = position > 0 && position == command.size() && endsWord(command.back());

@@ -24,6 +24,10 @@ public:
     /// Those that the Desktop Entry Standard has; not the deprecated ones.
     static QVector<Code> all();
 
+    /// Where a code goes that is to be written at \a position of \a command: to the end, if that is before
+    /// the program, which is no place for one.
+    static int place(const QString &command, int position);
+
     /// What has to be written at \a position of \a command for \a code to be there, apart from a word
     /// that ends the command there.
     static QString insertion(const QString &command, int position, const QString &code);
