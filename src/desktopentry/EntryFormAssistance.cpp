@@ -50,10 +50,7 @@ bool EntryFormAssistance::isShown(const FormRow &row) const
 
 void EntryFormAssistance::addBeside(const FormRow &row, QWidget *widget)
 {
-    RowSlot *const slot = m_form.formLayout()->besideRow(row.number);
-    QWidget *const last = TabOrder::lastOf({row.field, slot});
-    slot->add(widget);
-    TabOrder::putBehind(last, widget);
+    m_form.formLayout()->addBeside(row.number, row.field, widget);
 }
 
 void EntryFormAssistance::addBelow(const FormRow &row, QWidget *widget)

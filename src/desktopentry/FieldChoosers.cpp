@@ -5,10 +5,10 @@
 
 #include "CategoryChooser.h"
 #include "ChooserButton.h"
-#include "EntryFormAssistance.h"
 #include "ExecProgram.h"
 #include "FieldCodeMenu.h"
 #include "FieldEdit.h"
+#include "FormRow.h"
 #include "choosers/DesktopChooser.h"
 #include "choosers/MimeTypeChooser.h"
 #include "choosers/ProgramChooser.h"
@@ -30,18 +30,29 @@ QString programAlone(const QString &, const QString &program)
 
 } // namespace
 
-FieldChoosers::FieldChoosers(EntryFormAssistance *assistance)
-    : QObject(assistance)
-    , m_assistance(assistance)
+FieldChoosers::FieldChoosers(const QVector<FormRow> &rows, Place place, QObject *parent)
+    : QObject(parent)
+    , m_place(std::move(place))
 {
-    addProgramButton(QStringLiteral("Exec"), ExecProgram::replaced);
-    addFieldCodes(QStringLiteral("Exec"));
-    addProgramButton(QStringLiteral("TryExec"), programAlone);
-    addListButton(QStringLiteral("MimeType"), MimeTypeChooser::choose);
-    addListButton(QStringLiteral("Categories"), CategoryChooser::choose);
-    for (const QString &key : {QStringLiteral("OnlyShowIn"), QStringLiteral("NotShowIn")}) {
-        const QString title = m_assistance->row(key)->label;
-        addListButton(key, [title](QWidget *parent, const QStringList &current) {
+    for (const FormRow &row : rows) {
+        if (!row.isTranslation())
+            addTo(row);
+    }
+}
+
+void FieldChoosers::addTo(const FormRow &row)
+{
+    if (row.key == QLatin1String("Exec")) {
+        addProgramButton(row, ExecProgram::replaced);
+        addFieldCodes(row);
+    } else if (row.key == QLatin1String("TryExec")) {
+        addProgramButton(row, programAlone);
+    } else if (row.key == QLatin1String("MimeType")) {
+        addListButton(row, MimeTypeChooser::choose);
+    } else if (row.key == QLatin1String("Categories")) {
+        addListButton(row, CategoryChooser::choose);
+    } else if (row.key == QLatin1String("OnlyShowIn") || row.key == QLatin1String("NotShowIn")) {
+        addListButton(row, [title = row.label](QWidget *parent, const QStringList &current) {
             return DesktopChooser::choose(parent, title, current);
         });
     }
@@ -54,13 +65,12 @@ QToolButton *FieldChoosers::addButton(const FormRow &row, const QString &text, c
     button->setAccessibleName(tr("Choose %1", "name of a \"Choose...\" button").arg(row.label));
     button->setToolTip(tip);
     button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Fixed); // as wide as those above and below
-    m_assistance->addBeside(row, button);
+    m_place(row, button);
     return button;
 }
 
-void FieldChoosers::addListButton(const QString &key, const ChooseList &choose)
+void FieldChoosers::addListButton(const FormRow &row, const ChooseList &choose)
 {
-    const FormRow &row = *m_assistance->row(key);
     const QPointer<StringListEdit> field = qobject_cast<StringListEdit *>(row.field);
     const auto *button = addButton(row, tr("Choose..."), tr("Chooses from all that are known (Alt+Down)"));
     connect(button, &QToolButton::clicked, this, [field, choose] {
@@ -70,9 +80,8 @@ void FieldChoosers::addListButton(const QString &key, const ChooseList &choose)
     });
 }
 
-void FieldChoosers::addProgramButton(const QString &key, TakeProgram take)
+void FieldChoosers::addProgramButton(const FormRow &row, TakeProgram take)
 {
-    const FormRow &row = *m_assistance->row(key);
     const QPointer<PathEdit> field = qobject_cast<PathEdit *>(row.field);
     const auto *button = addButton(row, tr("Choose..."), tr("Chooses an installed program (Alt+Down)"));
     connect(button, &QToolButton::clicked, this, [field, take] {
@@ -82,16 +91,15 @@ void FieldChoosers::addProgramButton(const QString &key, TakeProgram take)
     });
 }
 
-void FieldChoosers::addFieldCodes(const QString &key)
+void FieldChoosers::addFieldCodes(const FormRow &row)
 {
-    const FormRow &row = *m_assistance->row(key);
     auto *button = new ChooserButton(tr("Insert", "button: a field code"), row.field, false);
     button->setObjectName(QStringLiteral("fieldCodeButton"));
     button->setAccessibleName(tr("Insert a field code"));
     button->setToolTip(tr("Inserts a code that stands for the files to open, or for a part of this entry"));
     button->setPopupMode(QToolButton::InstantPopup);
     button->setMenu(new FieldCodeMenu(row.field->findChild<QLineEdit *>(), button));
-    m_assistance->addBeside(row, button);
+    m_place(row, button);
 }
 
 } // namespace VelUI

@@ -5,6 +5,7 @@
 
 #include <QObject>
 #include <QStringList>
+#include <QVector>
 
 #include <functional>
 #include <optional>
@@ -14,32 +15,35 @@ class QWidget;
 
 namespace VelUI {
 
-class EntryFormAssistance;
 class PathEdit;
 class StringListEdit;
 struct FormRow;
 
-/// The buttons of the assisted form behind those fields whose values can be chosen: MIME types,
-/// categories, desktops, programs and field codes. What is chosen is an edit of the user.
+/// The buttons of a form behind those fields whose values can be chosen: MIME types, categories,
+/// desktops, programs and field codes. What is chosen is an edit of the user.
 class FieldChoosers : public QObject
 {
     Q_OBJECT
 
 public:
-    /// Adds the buttons to the form of \a assistance, which owns this.
-    explicit FieldChoosers(EntryFormAssistance *assistance);
+    /// Puts a button behind the field of a row.
+    using Place = std::function<void(const FormRow &row, QWidget *button)>;
+
+    /// Gives buttons to those of \a rows that have a chooser.
+    FieldChoosers(const QVector<FormRow> &rows, Place place, QObject *parent);
 
 private:
     using ChooseList = std::function<std::optional<QStringList>(QWidget *, const QStringList &)>;
     // The text of a field with a program that was chosen for it.
     using TakeProgram = QString (*)(const QString &text, const QString &program);
 
-    void addListButton(const QString &key, const ChooseList &choose);
-    void addProgramButton(const QString &key, TakeProgram take);
-    void addFieldCodes(const QString &key);
+    void addTo(const FormRow &row);
+    void addListButton(const FormRow &row, const ChooseList &choose);
+    void addProgramButton(const FormRow &row, TakeProgram take);
+    void addFieldCodes(const FormRow &row);
     QToolButton *addButton(const FormRow &row, const QString &text, const QString &tip);
 
-    EntryFormAssistance *const m_assistance;
+    const Place m_place;
 };
 
 } // namespace VelUI

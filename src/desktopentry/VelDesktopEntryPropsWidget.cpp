@@ -6,7 +6,7 @@
 #include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
 #include "FieldChoosers.h"
-#include "FieldDialogSizes.h"
+#include "FieldDialogs.h"
 #include "FormFindings.h"
 #include "UrlRow.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
@@ -35,8 +35,11 @@ void VelDesktopEntryPropsWidget::setAssistance(bool assistance)
         return;
     d->assistance = assistance ? std::make_unique<EntryFormAssistance>(*d) : nullptr;
     if (d->assistance) {
-        new FieldChoosers(d->assistance.get());
-        new FieldDialogSizes(d->assistance.get());
+        const auto place = [assistance = d->assistance.get()](const FormRow &row, QWidget *button) {
+            assistance->addBeside(row, button);
+        };
+        new FieldChoosers(d->assistance->rows(), place, d->assistance.get());
+        new FieldDialogs(d->assistance.get());
         new FormFindings(d->assistance.get(),
                          {this, [this] { return d->path; }, [this] { return d->readOnly; }});
     }

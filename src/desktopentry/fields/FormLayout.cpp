@@ -4,6 +4,7 @@
 #include "FormLayout.h"
 
 #include "RowSlot.h"
+#include "TabOrder.h"
 
 #include <QAbstractButton>
 #include <QLabel>
@@ -174,6 +175,24 @@ void FormLayout::pack()
     m_beside.clear();
     m_below.clear();
     moveRows(1);
+}
+
+int FormLayout::rowOf(QWidget *field) const
+{
+    const int index = indexOf(field);
+    if (index < 0)
+        return -1;
+    Cell cell{};
+    getItemPosition(index, &cell.row, &cell.column, &cell.rowSpan, &cell.columnSpan);
+    return cell.row / m_spacing;
+}
+
+void FormLayout::addBeside(int row, QWidget *field, QWidget *widget)
+{
+    RowSlot *const slot = besideRow(row);
+    QWidget *const last = TabOrder::lastOf({field, slot});
+    slot->add(widget);
+    TabOrder::putBehind(last, widget);
 }
 
 RowSlot *FormLayout::besideRow(int row)

@@ -38,6 +38,8 @@ public:
     void showRow(int row);
     void setRowLabelBold(int row);
     bool isRowVisible(int row) const;
+    /// The number of the row that has \a field in it; -1 where none has.
+    int rowOf(QWidget *field) const;
     /// Shows another widget as the field of a labeled row, under another label, and hides the one before.
     void setField(int row, const QString &label, QWidget *field);
 
@@ -45,6 +47,9 @@ public:
     /// Takes the places out again, with what is in them.
     void pack();
     bool isSpread() const { return m_spacing > 1; }
+    /// Puts \a widget behind \a field in its row, where the Tab key comes to it after the field. Only while
+    /// the layout is spread.
+    void addBeside(int row, QWidget *field, QWidget *widget);
     /// The places of a row; only while the layout is spread.
     RowSlot *besideRow(int row);
     RowSlot *belowRow(int row);

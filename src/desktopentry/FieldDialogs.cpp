@@ -1,8 +1,9 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
-#include "FieldDialogSizes.h"
+#include "FieldDialogs.h"
 
+#include "ActionChoosers.h"
 #include "ActionListEdit.h"
 #include "ActionPropsDialog.h"
 #include "EditActionsDialog.h"
@@ -35,7 +36,7 @@ bool isRemembered(const QDialog &dialog)
 
 } // namespace
 
-FieldDialogSizes::FieldDialogSizes(EntryFormAssistance *assistance)
+FieldDialogs::FieldDialogs(EntryFormAssistance *assistance)
     : QObject(assistance)
 {
     for (const FormRow &row : assistance->rows())
@@ -44,21 +45,23 @@ FieldDialogSizes::FieldDialogSizes(EntryFormAssistance *assistance)
     assistance->rows().constFirst().field->parentWidget()->installEventFilter(this);
 }
 
-void FieldDialogSizes::watchField(QObject *field)
+void FieldDialogs::watchField(QObject *field)
 {
     if (qobject_cast<StringListEdit *>(field) || qobject_cast<ActionListEdit *>(field))
         field->installEventFilter(this);
 }
 
-void FieldDialogSizes::watch(QDialog *dialog)
+void FieldDialogs::watch(QDialog *dialog)
 {
     dialog->installEventFilter(this);
+    if (auto *action = qobject_cast<ActionPropsDialog *>(dialog))
+        ActionChoosers::addTo(action);
     // It opens the dialog of one action.
     if (auto *list = dialog->findChild<EditActionsWidget *>())
         list->installEventFilter(this);
 }
 
-bool FieldDialogSizes::eventFilter(QObject *watched, QEvent *event)
+bool FieldDialogs::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::ChildPolished) {
         // Before it is shown first.

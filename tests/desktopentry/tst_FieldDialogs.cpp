@@ -8,6 +8,7 @@
 
 #include <QComboBox>
 #include <QListWidget>
+#include <QMenu>
 #include <QSettings>
 #include <QToolButton>
 
@@ -41,15 +42,18 @@ void editFirstAction(QWidget *window)
 
 } // namespace
 
-class tst_FieldDialogSizes : public PropsFormTestCase
+/// The dialogs of the assisted form's fields: the sizes that they remember, and their choosers.
+class tst_FieldDialogs : public PropsFormTestCase
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void areThoseOfThePlainFormWithoutAssistance();
-    void areRememberedWithAssistance();
-    void areKeptFromOneFormToTheNext();
-    void areThoseOfTheFieldsOfAnotherLanguage();
+    void haveThePlainSizesWithoutAssistance();
+    void rememberTheirSizesWithAssistance();
+    void keepTheirSizesFromOneFormToTheNext();
+    void rememberTheirSizesInAnotherLanguage();
+    void giveChoosersToTheFieldsOfAnAction_data();
+    void giveChoosersToTheFieldsOfAnAction();
     void doNotHoldTheFormThatGoes();
 
 private:
@@ -63,7 +67,7 @@ private:
 };
 
 // Opens the dialogs of a list, of the actions and of one action, and gives them other sizes.
-tst_FieldDialogSizes::Sizes tst_FieldDialogSizes::openAll(bool assistance, const Sizes &next)
+tst_FieldDialogs::Sizes tst_FieldDialogs::openAll(bool assistance, const Sizes &next)
 {
     VelDesktopEntryPropsWidget form;
     form.setAssistance(assistance);
@@ -81,7 +85,7 @@ tst_FieldDialogSizes::Sizes tst_FieldDialogSizes::openAll(bool assistance, const
     return found;
 }
 
-void tst_FieldDialogSizes::areThoseOfThePlainFormWithoutAssistance()
+void tst_FieldDialogs::haveThePlainSizesWithoutAssistance()
 {
     const Sizes other{{500, 350}, {510, 360}, {520, 470}};
     const Sizes first = openAll(false, other);
@@ -94,20 +98,21 @@ void tst_FieldDialogSizes::areThoseOfThePlainFormWithoutAssistance()
     QVERIFY(QSettings().allKeys().isEmpty());
 }
 
-void tst_FieldDialogSizes::areRememberedWithAssistance()
+void tst_FieldDialogs::rememberTheirSizesWithAssistance()
 {
     const Sizes plain = openAll(false, {{500, 350}, {510, 360}, {520, 470}});
     const Sizes first = openAll(true, {{530, 380}, {540, 390}, {550, 500}});
     QCOMPARE(first.list, plain.list);
     QCOMPARE(first.actions, plain.actions);
-    QCOMPARE(first.action, plain.action);
+    QVERIFY(first.action.width() > plain.action.width()); // of the buttons
+    QCOMPARE(first.action.height(), plain.action.height());
     const Sizes second = openAll(true, {{400, 300}, {400, 300}, {550, 500}});
     QCOMPARE(second.list, QSize(530, 380));
     QCOMPARE(second.actions, QSize(540, 390));
     QCOMPARE(second.action, QSize(550, 500));
 }
 
-void tst_FieldDialogSizes::areKeptFromOneFormToTheNext()
+void tst_FieldDialogs::keepTheirSizesFromOneFormToTheNext()
 {
     QSettings().setValue(QStringLiteral("EditStringsDialog/Width"), 444);
     QSettings().setValue(QStringLiteral("EditStringsDialog/Height"), 333);
@@ -116,7 +121,7 @@ void tst_FieldDialogSizes::areKeptFromOneFormToTheNext()
     QCOMPARE(QSettings().value(QStringLiteral("EditStringsDialog/Width")).toInt(), 400);
 }
 
-void tst_FieldDialogSizes::areThoseOfTheFieldsOfAnotherLanguage()
+void tst_FieldDialogs::rememberTheirSizesInAnotherLanguage()
 {
     VelDesktopEntryPropsWidget form;
     form.setAssistance(true);
@@ -134,7 +139,57 @@ void tst_FieldDialogSizes::areThoseOfTheFieldsOfAnotherLanguage()
     QCOMPARE(found, QSize(600, 400));
 }
 
-void tst_FieldDialogSizes::doNotHoldTheFormThatGoes()
+void tst_FieldDialogs::giveChoosersToTheFieldsOfAnAction_data()
+{
+    QTest::addColumn<bool>("assistance");
+    QTest::addColumn<QString>("tabs");
+    QTest::newRow("plain") << false << "lineEdit selectPathButton buttonBox";
+    QTest::newRow("assisted") << true
+                              << "lineEdit selectPathButton chooseButton_Exec fieldCodeButton buttonBox";
+}
+
+void tst_FieldDialogs::giveChoosersToTheFieldsOfAnAction()
+{
+    QFETCH(bool, assistance);
+    QFETCH(QString, tabs);
+    VelDesktopEntryPropsWidget form;
+    form.setAssistance(assistance);
+    form.loadFrom(entry(Contents));
+    form.show();
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        auto *list = window->findChild<QListWidget *>();
+        list->setCurrentRow(0);
+        child<QPushButton>(window, "editButton")->click();
+        click(okButton(window)->isEnabled() ? okButton(window) : cancelButton(window));
+    });
+    QStringList reached;
+    modal.handle([&reached, assistance](QWidget *window) {
+        QVERIFY(QTest::qWaitForWindowActive(window));
+        child<QWidget>(window, "execEdit")->setFocus();
+        do {
+            reached.append(window->focusWidget()->objectName());
+            QTest::keyClick(window->focusWidget(), Qt::Key_Tab);
+        } while (!qobject_cast<QPushButton *>(window->focusWidget()) && reached.size() < 9);
+        reached.append(window->focusWidget()->parentWidget()->objectName());
+        QCOMPARE(window->findChild<QWidget *>(QStringLiteral("chooseButton_OnlyShowIn")) != nullptr,
+                 assistance);
+        QCOMPARE(window->findChild<QWidget *>(QStringLiteral("chooseButton_NotShowIn")) != nullptr,
+                 assistance);
+        if (assistance)
+            child<QToolButton>(window, "fieldCodeButton")->menu()->actions().first()->trigger();
+        click(assistance ? okButton(window) : cancelButton(window));
+    });
+    child<QWidget>(&form, "actionsEdit")->findChild<QToolButton *>()->click();
+    QVERIFY(modal.finished());
+    QCOMPARE(reached.join(QLatin1Char(' ')), tabs);
+    VelUIDesktopEntry record = entry(Contents);
+    form.saveTo(&record);
+    QCOMPARE(record.getActions().first().getExec(),
+             assistance ? QStringLiteral("one %f") : QStringLiteral("one"));
+}
+
+void tst_FieldDialogs::doNotHoldTheFormThatGoes()
 {
     auto *form = new VelDesktopEntryPropsWidget;
     form->setAssistance(true);
@@ -144,6 +199,6 @@ void tst_FieldDialogSizes::doNotHoldTheFormThatGoes()
     QVERIFY(modal.finished());
 }
 
-VEL_TEST_MAIN(tst_FieldDialogSizes)
+VEL_TEST_MAIN(tst_FieldDialogs)
 
-#include "tst_FieldDialogSizes.moc"
+#include "tst_FieldDialogs.moc"

@@ -11,15 +11,15 @@ namespace VelUI {
 
 class EntryFormAssistance;
 
-/// Remembers the sizes of the dialogs that the fields of the assisted form open: those of lists, of
-/// actions, and of one action.
-class FieldDialogSizes : public QObject
+/// Completes the dialogs that the fields of the assisted form open, those of lists, of actions and of
+/// one action: their sizes are remembered, and the fields of an action have choosers.
+class FieldDialogs : public QObject
 {
     Q_OBJECT
 
 public:
     /// Watches the fields of the form of \a assistance, which owns this.
-    explicit FieldDialogSizes(EntryFormAssistance *assistance);
+    explicit FieldDialogs(EntryFormAssistance *assistance);
 
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
