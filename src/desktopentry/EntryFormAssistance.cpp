@@ -3,11 +3,16 @@
 
 #include "EntryFormAssistance.h"
 
+#include "FieldEdit.h"
+#include "FormHistory.h"
 #include "LanguageBar.h"
 #include "LanguageRows.h"
 #include "fields/FormLayout.h"
 #include "fields/RowSlot.h"
 #include "fields/TabOrder.h"
+
+#include <QAction>
+#include <QToolButton>
 
 #include <algorithm>
 
@@ -20,11 +25,15 @@ EntryFormAssistance::EntryFormAssistance(EntryFormHost &form)
     m_form.formLayout()->spread();
     m_languageRows = std::make_unique<LanguageRows>(m_form, m_rows);
     m_bar = std::make_unique<LanguageBar>(m_form, *m_languageRows);
+    m_history = std::make_unique<FormHistory>(m_form, *m_languageRows);
+    addAction("undoButton", m_history->undoAction());
+    addAction("redoButton", m_history->redoAction());
     connect(&m_form, &EntryFormHost::recordChanged, this, &EntryFormAssistance::recordChanged);
 }
 
 EntryFormAssistance::~EntryFormAssistance()
 {
+    m_history.reset();
     m_bar.reset();
     m_languageRows.reset();
     m_form.formLayout()->pack();
@@ -61,6 +70,22 @@ void EntryFormAssistance::addBelow(const FormRow &row, QWidget *widget)
         beside ? TabOrder::lastOf({row.field, beside, slot}) : TabOrder::lastOf({row.field, slot});
     slot->add(widget);
     TabOrder::putBehind(last, widget);
+}
+
+void EntryFormAssistance::addAction(const char *name, QAction *action)
+{
+    auto *button = new QToolButton;
+    button->setObjectName(QLatin1String(name));
+    button->setDefaultAction(action);
+    button->setFocusPolicy(Qt::StrongFocus);
+    m_bar->addButton(button);
+}
+
+void EntryFormAssistance::edit(const FormRow &row, const QVariant &value)
+{
+    m_history->beginStep();
+    FieldEdit::setValue(row.field, value);
+    m_history->beginStep();
 }
 
 VelUIDesktopEntry EntryFormAssistance::record() const

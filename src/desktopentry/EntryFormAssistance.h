@@ -7,8 +7,11 @@
 
 #include <memory>
 
+class QAction;
+
 namespace VelUI {
 
+class FormHistory;
 class LanguageBar;
 class LanguageRows;
 
@@ -40,6 +43,11 @@ public:
     /// The same for a widget, such as a sentence, under the field.
     void addBelow(const FormRow &row, QWidget *widget);
 
+    /// Gives a field another value as the user would, in a step of its own that can be taken back.
+    void edit(const FormRow &row, const QVariant &value);
+    /// Takes back what the user did in the form, and does it again.
+    FormHistory &history() const { return *m_history; }
+
     /// The entry as it would be saved now; its contents() are those of the file.
     VelUIDesktopEntry record() const;
 
@@ -48,10 +56,13 @@ Q_SIGNALS:
     void recordChanged();
 
 private:
+    void addAction(const char *name, QAction *action);
+
     EntryFormHost &m_form;
     QVector<FormRow> m_rows;
     std::unique_ptr<LanguageRows> m_languageRows;
     std::unique_ptr<LanguageBar> m_bar;
+    std::unique_ptr<FormHistory> m_history;
 };
 
 } // namespace VelUI

@@ -11,11 +11,14 @@
 #include <QObject>
 #include <QVector>
 
+#include <functional>
+
 class QWidget;
 
 namespace VelUI {
 
 class FormLayout;
+class ShowInChoice;
 
 /// The properties form as those see it who complete it.
 class EntryFormHost : public QObject
@@ -33,8 +36,15 @@ public:
     virtual VelUIDesktopEntry baseRecord() const = 0;
     /// What is edited in languages that no field shows; tellEdit() after a change.
     virtual Translations &translations() = 0;
+    virtual QString type() const = 0;
+    virtual bool isTypeDecided() const = 0;
+    /// Shows the rows of another type; nobody is asked.
+    virtual void showType(const QString &type, bool isDecided) = 0;
+    virtual ShowInChoice *showInChoice() const = 0;
     /// Tells everybody of an edit by the user.
     virtual void tellEdit() = 0;
+    /// Does something to the fields of which tellEdit() then tells.
+    virtual void quietly(const std::function<void()> &act) = 0;
     /// Brings new fields into the state that the form is in.
     virtual void applyReadOnly() = 0;
 

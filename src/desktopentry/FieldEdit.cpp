@@ -3,6 +3,8 @@
 
 #include "FieldEdit.h"
 
+#include "ActionListEdit.h"
+#include "EditActionsWidget.h"
 #include "fields/IconEdit.h"
 #include "fields/PathEdit.h"
 #include "fields/PlainFields.h"
@@ -34,14 +36,25 @@ QVariant FieldEdit::value(const QWidget *field)
         return fieldValue(icon);
     if (const auto *list = qobject_cast<const StringListEdit *>(field))
         return fieldValue(list);
+    if (const auto *actions = qobject_cast<const ActionListEdit *>(field))
+        return QVariant::fromValue(fieldValue(actions));
     if (const auto *box = qobject_cast<const QCheckBox *>(field))
         return fieldValue(box);
     return {};
 }
 
+// A QVariant knows not how to compare actions.
+bool FieldEdit::areEqual(const QVariant &left, const QVariant &right)
+{
+    const int type = qMetaTypeId<QList<VelUIDesktopAction>>();
+    if (left.userType() == type && right.userType() == type)
+        return left.value<QList<VelUIDesktopAction>>() == right.value<QList<VelUIDesktopAction>>();
+    return left == right;
+}
+
 void FieldEdit::setValue(QWidget *field, const QVariant &value)
 {
-    if (FieldEdit::value(field) == value)
+    if (areEqual(FieldEdit::value(field), value))
         return;
     if (auto *line = qobject_cast<QLineEdit *>(field))
         type(line, value.toString());
@@ -53,6 +66,9 @@ void FieldEdit::setValue(QWidget *field, const QVariant &value)
     } else if (auto *list = qobject_cast<StringListEdit *>(field)) {
         list->setStrings(value.toStringList());
         Q_EMIT list->changed();
+    } else if (auto *actions = qobject_cast<ActionListEdit *>(field)) {
+        actions->setActions(value.value<QList<VelUIDesktopAction>>());
+        Q_EMIT actions->changed();
     } else if (auto *box = qobject_cast<QCheckBox *>(field)) {
         box->setChecked(value.toBool());
     }
@@ -60,7 +76,7 @@ void FieldEdit::setValue(QWidget *field, const QVariant &value)
 
 void FieldEdit::show(QWidget *field, const QVariant &value)
 {
-    if (FieldEdit::value(field) == value)
+    if (areEqual(FieldEdit::value(field), value))
         return;
     if (auto *line = qobject_cast<QLineEdit *>(field))
         setFieldValue(line, value.toString());
@@ -70,6 +86,8 @@ void FieldEdit::show(QWidget *field, const QVariant &value)
         setFieldValue(icon, value.toString());
     else if (auto *list = qobject_cast<StringListEdit *>(field))
         setFieldValue(list, value.toStringList());
+    else if (auto *actions = qobject_cast<ActionListEdit *>(field))
+        setFieldValue(actions, value.value<QList<VelUIDesktopAction>>());
     else if (auto *box = qobject_cast<QCheckBox *>(field))
         setFieldValue(box, value.toBool());
 }

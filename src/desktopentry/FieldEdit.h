@@ -15,8 +15,10 @@ namespace VelUI {
 /// Changes of a field that count as the user's: whoever listens to the user hears of them.
 namespace FieldEdit {
 
-/// The value of a field of the form: a text, a list of texts, or a bool; invalid for other fields.
+/// The value of a field of the form: a text, a list of texts or of actions, or a bool; invalid for
+/// other fields.
 QVariant value(const QWidget *field);
+bool areEqual(const QVariant &left, const QVariant &right);
 
 /// Gives the field another value, as if the user had typed or chosen it.
 void setValue(QWidget *field, const QVariant &value);

@@ -176,7 +176,7 @@ void FormFindings::repair(const EntryRepair &repair)
     const FormRow *row = m_assistance.row(repair.key);
     if (!row)
         return;
-    FieldEdit::setValue(row->field, repair.value);
+    m_assistance.edit(*row, repair.value);
     FieldEdit::focus(row->field);
 }
 

@@ -36,7 +36,8 @@ QString ownCode()
 
 bool isEmpty(const QVariant &value)
 {
-    return value.type() == QVariant::StringList ? value.toStringList().isEmpty() : value.toString().isEmpty();
+    return value.userType() == QMetaType::QStringList ? value.toStringList().isEmpty()
+                                                      : value.toString().isEmpty();
 }
 
 } // namespace

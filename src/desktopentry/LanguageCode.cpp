@@ -8,6 +8,7 @@
 #include <QRegularExpression>
 
 #include <algorithm>
+#include <utility>
 
 namespace {
 
@@ -82,7 +83,7 @@ QStringList LanguageCode::known()
     for (const QLocale &locale : locales)
         codes.append(locale.name().section(QLatin1Char('_'), 0, 0));
     codes.removeDuplicates();
-    for (const QString &code : qAsConst(codes)) {
+    for (const QString &code : std::as_const(codes)) {
         const QString name = isValid(code) ? nativeName(code) : QString();
         if (!name.isEmpty())
             names.append({name, code});
@@ -92,7 +93,7 @@ QStringList LanguageCode::known()
         return collator.compare(left.first, right.first) < 0;
     });
     codes.clear();
-    for (const auto &name : qAsConst(names))
+    for (const auto &name : std::as_const(names))
         codes.append(name.second);
     return codes;
 }

@@ -12,6 +12,8 @@
 #include "fields/StringListEdit.h"
 #include "fields/TabOrder.h"
 
+#include <utility>
+
 namespace VelUI {
 
 LanguageRows::LanguageRows(EntryFormHost &form, QVector<FormRow> &rows)
@@ -25,7 +27,7 @@ LanguageRows::LanguageRows(EntryFormHost &form, QVector<FormRow> &rows)
 LanguageRows::~LanguageRows()
 {
     turnTo(QString());
-    for (const Pair &pair : qAsConst(m_pairs))
+    for (const Pair &pair : std::as_const(m_pairs))
         delete pair.other;
 }
 
@@ -37,7 +39,7 @@ QString LanguageRows::language() const
 QStringList LanguageRows::keys() const
 {
     QStringList keys;
-    for (const FormRow &row : qAsConst(m_rows)) {
+    for (const FormRow &row : std::as_const(m_rows)) {
         if (row.isTranslation())
             keys.append(row.key);
     }
@@ -87,7 +89,7 @@ void LanguageRows::makeFields()
 
 void LanguageRows::showFields(bool isOwn)
 {
-    for (const Pair &pair : qAsConst(m_pairs)) {
+    for (const Pair &pair : std::as_const(m_pairs)) {
         FormRow &row = m_rows[pair.row];
         row.field = isOwn ? pair.own : pair.other;
         row.label = isOwn ? localizedLabel(row.translated) : localizedLabel(row.translated, m_language);
@@ -100,7 +102,7 @@ void LanguageRows::showValues()
     if (m_language.isEmpty())
         return;
     const VelUIDesktopEntry entry = m_form.record();
-    for (const Pair &pair : qAsConst(m_pairs))
+    for (const Pair &pair : std::as_const(m_pairs))
         FieldEdit::show(pair.other, Translations::value(entry, m_rows.at(pair.row).key, m_language));
 }
 

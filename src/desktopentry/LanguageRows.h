@@ -31,6 +31,8 @@ public:
     QString language() const;
     void turnTo(const QString &language);
 
+    /// All rows of the form with the fields that are in their places.
+    const QVector<FormRow> &rows() const { return m_rows; }
     /// The keys that have languages.
     QStringList keys() const;
 

@@ -6,6 +6,7 @@
 #include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
 #include "FieldEdit.h"
+#include "FormHistory.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 #include "fields/ShowInChoice.h"
 
@@ -66,6 +67,7 @@ public:
     void savePosition();
     void setNewType();
     void copy(VelUIDesktopEntry entry);
+    void addHistory();
     VelUIDesktopEntry entryToChange() const;
     VelUIDesktopEntry entryToSave() const;
     void emptyListSwitchedFrom(VelUIDesktopEntry *entry) const;
@@ -207,10 +209,8 @@ void VelDesktopEntryEditDialogPrivate::copy(VelUIDesktopEntry entry)
     const bool wasDecided = chooser.isDecided();
     if (EntryPath::isRecordFile(path))
         entry.setType(wasDecided ? type : loaded.getType());
-    {
-        const QScopedValueRollback<bool> copying(form().isCopying, true);
-        props->loadFrom(entry);
-    }
+    const QScopedValueRollback<bool> copying(form().isCopying, true);
+    props->loadFrom(entry);
     if (wasDecided && !chooser.isDecided())
         props->setType(type, chooser.allowedTypes());
 }
@@ -225,6 +225,14 @@ void VelDesktopEntryEditDialogPrivate::emptyListSwitchedFrom(VelUIDesktopEntry *
         entry->setNotShowIn({});
     else
         entry->setOnlyShowIn({});
+}
+
+// Good in the whole dialog.
+void VelDesktopEntryEditDialogPrivate::addHistory()
+{
+    const VelUI::FormHistory &history = form().assistance->history();
+    q->addActions({history.undoAction(), history.redoAction()});
+    QObject::connect(&history, &VelUI::FormHistory::unchanged, q, [this] { q->setWindowModified(false); });
 }
 
 VelUIDesktopEntry VelDesktopEntryEditDialogPrivate::entryToChange() const
@@ -287,9 +295,14 @@ bool VelDesktopEntryEditDialog::assistance() const
 
 void VelDesktopEntryEditDialog::setAssistance(bool assistance)
 {
+    if (assistance == d->isAssisted)
+        return;
     d->isAssisted = assistance;
-    if (d->props)
-        d->props->setAssistance(assistance);
+    if (!d->props)
+        return;
+    d->props->setAssistance(assistance);
+    if (assistance)
+        d->addHistory();
 }
 
 bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool create, const QString &pattern)

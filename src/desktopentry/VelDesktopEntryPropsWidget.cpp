@@ -49,7 +49,11 @@ void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList 
 {
     if (d->typeChooser.setType(type, allowedTypes))
         d->rows.showFor(type);
-    d->tellRecordChange();
+    if (d->isLoading)
+        return;
+    if (!d->isCopying)
+        Q_EMIT d->entryLoaded();
+    Q_EMIT d->recordChanged();
 }
 
 void VelDesktopEntryPropsWidget::loadFrom(const VelUIDesktopEntry &entry)

@@ -146,7 +146,21 @@ void VelDesktopEntryPropsWidgetPrivate::tellEdit()
     if (isLoading)
         return;
     Q_EMIT q->changed();
-    Q_EMIT recordChanged();
+    tellRecordChange();
+}
+
+void VelDesktopEntryPropsWidgetPrivate::showType(const QString &type, bool isDecided)
+{
+    typeChooser.setType(type, typeChooser.allowedTypes());
+    if (!isDecided)
+        typeChooser.leaveOpen();
+    rows.changeTo(type);
+}
+
+void VelDesktopEntryPropsWidgetPrivate::quietly(const std::function<void()> &act)
+{
+    const QScopedValueRollback<bool> quiet(isLoading, true);
+    act();
 }
 
 void VelDesktopEntryPropsWidgetPrivate::applyReadOnly()
@@ -167,7 +181,7 @@ void VelDesktopEntryPropsWidgetPrivate::applyReadOnly()
 
 void VelDesktopEntryPropsWidgetPrivate::tellRecordChange()
 {
-    if (!isLoading)
+    if (!isLoading && !isRetyping)
         Q_EMIT recordChanged();
 }
 
@@ -191,7 +205,11 @@ void VelDesktopEntryPropsWidgetPrivate::connectChanges()
         connect(edit, &ActionListEdit::changed, this, changed);
 
     typeChooser.onChosen([this] {
-        rows.changeTo(typeChooser.type());
+        {
+            // One change, of however many fields.
+            const QScopedValueRollback<bool> retyping(isRetyping, true);
+            rows.changeTo(typeChooser.type());
+        }
         Q_EMIT q->changed();
         Q_EMIT recordChanged();
     });

@@ -36,7 +36,12 @@ public:
     VelUIDesktopEntry record() const override { return recordToSave(); }
     VelUIDesktopEntry baseRecord() const override { return recordToChange(); }
     Translations &translations() override { return m_translations; }
+    QString type() const override { return typeChooser.type(); }
+    bool isTypeDecided() const override { return typeChooser.isDecided(); }
+    void showType(const QString &type, bool isDecided) override;
+    VelUI::ShowInChoice *showInChoice() const override { return rows.showIn(); }
     void tellEdit() override;
+    void quietly(const std::function<void()> &act) override;
     void applyReadOnly() override;
 
     /// Forgets which types another file had to choose from.
@@ -54,6 +59,7 @@ public:
     bool readOnly = false;
     QString path; ///< of the file that the entry will be, where the host knows it
     bool isLoading = false;
+    bool isRetyping = false; ///< the fields of the old type are being emptied
     bool isCopying = false; ///< what is loaded counts as an edit
     VelUIDesktopEntry loaded{QString()};
     /// Give the entry as it would be saved, and without what the form shows; whoever saves it sets

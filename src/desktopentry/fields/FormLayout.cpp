@@ -11,6 +11,8 @@
 #include <QLineEdit>
 #include <QVector>
 
+#include <utility>
+
 namespace VelUI {
 
 namespace {

@@ -78,6 +78,13 @@ void ShowInChoice::load(const QStringList &only, const QStringList &no)
     m_isLoading = false;
 }
 
+void ShowInChoice::choose(bool only)
+{
+    m_isLoading = true;
+    (only ? m_onlyButton : m_noButton)->setChecked(true);
+    m_isLoading = false;
+}
+
 bool ShowInChoice::isOnlyChosen() const
 {
     return m_onlyButton->isChecked();

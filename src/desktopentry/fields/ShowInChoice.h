@@ -63,6 +63,8 @@ public:
     }
 
     bool isOnlyChosen() const;
+    /// Chooses "Only show in" or the other list; nobody is told.
+    void choose(bool only);
     StringListEdit *onlyField() const { return m_only; }
     StringListEdit *noField() const { return m_no; }
 
