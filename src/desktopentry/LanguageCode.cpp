@@ -4,6 +4,7 @@
 #include "LanguageCode.h"
 
 #include <QCollator>
+#include <QHash>
 #include <QLocale>
 #include <QRegularExpression>
 
@@ -28,6 +29,32 @@ Parts partsOf(const QString &code)
     const int country = rest.indexOf(QLatin1Char('_'));
     return {rest.left(country), country < 0 ? QString() : rest.mid(country),
             modifier < 0 ? QString() : code.mid(modifier)};
+}
+
+// The language alone is called by the shortest of its names: the others speak of a country, too.
+QString shortestName(const QLocale &locale)
+{
+    QString shortest = locale.nativeLanguageName();
+    const auto all = QLocale::matchingLocales(locale.language(), locale.script(), QLocale::AnyCountry);
+    for (const QLocale &other : all) {
+        const QString name = other.nativeLanguageName();
+        if (!name.isEmpty() && name.size() < shortest.size())
+            shortest = name;
+    }
+    return shortest;
+}
+
+QString findName(const QString &code)
+{
+    const Parts parts = partsOf(code);
+    const QLocale locale(parts.language + parts.country);
+    // An unknown language is given as "C", and an unknown country without a word.
+    if (locale.name().section(QLatin1Char('_'), 0, 0) != parts.language)
+        return {};
+    QString name = parts.country.isEmpty() ? shortestName(locale) : locale.nativeLanguageName();
+    if (!name.isEmpty())
+        name[0] = name[0].toUpper();
+    return name;
 }
 
 } // namespace
@@ -63,15 +90,10 @@ QString LanguageCode::inForce(const QString &code, const QStringList &existing)
 
 QString LanguageCode::nativeName(const QString &code)
 {
-    const Parts parts = partsOf(code);
-    const QLocale locale(parts.language + parts.country);
-    // An unknown language is given as "C", and an unknown country without a word.
-    if (locale.name().section(QLatin1Char('_'), 0, 0) != parts.language)
-        return {};
-    QString name = locale.nativeLanguageName();
-    if (!name.isEmpty())
-        name[0] = name[0].toUpper();
-    return name;
+    // Asked for at every change of an entry.
+    static QHash<QString, QString> names;
+    const auto known = names.constFind(code);
+    return known == names.constEnd() ? *names.insert(code, findName(code)) : *known;
 }
 
 QStringList LanguageCode::known()
