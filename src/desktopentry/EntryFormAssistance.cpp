@@ -3,10 +3,12 @@
 
 #include "EntryFormAssistance.h"
 
+#include "EntryTextDialog.h"
 #include "FieldEdit.h"
 #include "FormHistory.h"
 #include "LanguageBar.h"
 #include "LanguageRows.h"
+#include "TrialLine.h"
 #include "fields/FormLayout.h"
 #include "fields/RowSlot.h"
 #include "fields/TabOrder.h"
@@ -25,14 +27,18 @@ EntryFormAssistance::EntryFormAssistance(EntryFormHost &form)
     m_form.formLayout()->spread();
     m_languageRows = std::make_unique<LanguageRows>(m_form, m_rows);
     m_bar = std::make_unique<LanguageBar>(m_form, *m_languageRows);
-    m_history = std::make_unique<FormHistory>(m_form, *m_languageRows);
-    addAction("undoButton", m_history->undoAction());
-    addAction("redoButton", m_history->redoAction());
+    addHistory();
+    addText();
+    addTrial();
     connect(&m_form, &EntryFormHost::recordChanged, this, &EntryFormAssistance::recordChanged);
 }
 
 EntryFormAssistance::~EntryFormAssistance()
 {
+    // What other parts did is taken back first.
+    qDeleteAll(findChildren<QObject *>(QString(), Qt::FindDirectChildrenOnly));
+    m_text.reset();
+    m_trial.reset();
     m_history.reset();
     m_bar.reset();
     m_languageRows.reset();
@@ -72,13 +78,47 @@ void EntryFormAssistance::addBelow(const FormRow &row, QWidget *widget)
     TabOrder::putBehind(last, widget);
 }
 
-void EntryFormAssistance::addAction(const char *name, QAction *action)
+QToolButton *EntryFormAssistance::addButton(const char *name)
 {
     auto *button = new QToolButton;
     button->setObjectName(QLatin1String(name));
-    button->setDefaultAction(action);
     button->setFocusPolicy(Qt::StrongFocus);
     m_bar->addButton(button);
+    return button;
+}
+
+void EntryFormAssistance::addHistory()
+{
+    m_history = std::make_unique<FormHistory>(m_form, *m_languageRows);
+    addButton("undoButton")->setDefaultAction(m_history->undoAction());
+    addButton("redoButton")->setDefaultAction(m_history->redoAction());
+}
+
+void EntryFormAssistance::addText()
+{
+    m_textButton = addButton("textButton");
+    m_textButton->setText(tr("Te&xt", "button: shows the file of the entry"));
+    m_textButton->setToolTip(tr("Shows the file as it would be saved"));
+    m_textButton->setCheckable(true);
+    connect(m_textButton, &QToolButton::toggled, this, &EntryFormAssistance::showText);
+}
+
+void EntryFormAssistance::showText(bool isShown)
+{
+    if (!isShown) {
+        // It may be in the middle of telling that it was closed.
+        if (m_text)
+            m_text.release()->deleteLater();
+        return;
+    }
+    m_text = std::make_unique<EntryTextDialog>(m_form);
+    connect(m_text.get(), &QDialog::finished, m_textButton, [this] { m_textButton->setChecked(false); });
+    m_text->show();
+}
+
+void EntryFormAssistance::addTrial()
+{
+    m_trial = std::make_unique<TrialLine>(m_form, addButton("tryButton"));
 }
 
 void EntryFormAssistance::edit(const FormRow &row, const QVariant &value)

@@ -8,12 +8,15 @@
 #include <memory>
 
 class QAction;
+class QToolButton;
 
 namespace VelUI {
 
+class EntryTextDialog;
 class FormHistory;
 class LanguageBar;
 class LanguageRows;
+class TrialLine;
 
 /**
  * What the properties form has beyond the plain one.
@@ -56,13 +59,20 @@ Q_SIGNALS:
     void recordChanged();
 
 private:
-    void addAction(const char *name, QAction *action);
+    QToolButton *addButton(const char *name);
+    void addHistory();
+    void addText();
+    void addTrial();
+    void showText(bool isShown);
 
     EntryFormHost &m_form;
     QVector<FormRow> m_rows;
     std::unique_ptr<LanguageRows> m_languageRows;
     std::unique_ptr<LanguageBar> m_bar;
     std::unique_ptr<FormHistory> m_history;
+    std::unique_ptr<EntryTextDialog> m_text; ///< null while it is not shown
+    std::unique_ptr<TrialLine> m_trial;
+    QToolButton *m_textButton = nullptr;
 };
 
 } // namespace VelUI

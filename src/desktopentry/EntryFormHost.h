@@ -36,6 +36,8 @@ public:
     virtual VelUIDesktopEntry baseRecord() const = 0;
     /// What is edited in languages that no field shows; tellEdit() after a change.
     virtual Translations &translations() = 0;
+    /// Of the file that the entry will be; empty where nobody knows.
+    virtual QString filePath() const = 0;
     virtual QString type() const = 0;
     virtual bool isTypeDecided() const = 0;
     /// Shows the rows of another type; nobody is asked.
@@ -51,6 +53,8 @@ public:
 Q_SIGNALS:
     /// The form shows another entry.
     void entryLoaded();
+    /// Another type was set, and not by the user.
+    void typeSet();
     /// What record() gives may have changed.
     void recordChanged();
 };

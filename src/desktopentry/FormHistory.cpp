@@ -135,6 +135,7 @@ FormHistory::FormHistory(EntryFormHost &form, LanguageRows &rows)
     m_stack.resetClean();
     connect(&m_form, &EntryFormHost::recordChanged, this, &FormHistory::look);
     connect(&m_form, &EntryFormHost::entryLoaded, this, &FormHistory::start);
+    connect(&m_form, &EntryFormHost::typeSet, this, &FormHistory::start);
     connect(&m_rows, &LanguageRows::turned, this, [this] {
         m_last.language = m_rows.language();
         m_last.shown = state().shown;

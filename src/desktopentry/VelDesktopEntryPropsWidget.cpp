@@ -52,7 +52,7 @@ void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList 
     if (d->isLoading)
         return;
     if (!d->isCopying)
-        Q_EMIT d->entryLoaded();
+        Q_EMIT d->typeSet();
     Q_EMIT d->recordChanged();
 }
 

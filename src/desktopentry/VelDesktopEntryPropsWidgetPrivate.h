@@ -36,6 +36,7 @@ public:
     VelUIDesktopEntry record() const override { return recordToSave(); }
     VelUIDesktopEntry baseRecord() const override { return recordToChange(); }
     Translations &translations() override { return m_translations; }
+    QString filePath() const override { return path; }
     QString type() const override { return typeChooser.type(); }
     bool isTypeDecided() const override { return typeChooser.isDecided(); }
     void showType(const QString &type, bool isDecided) override;
