@@ -4,6 +4,7 @@
 #include "EntryFormAssistance.h"
 
 #include "EntryTextDialog.h"
+#include "FieldDescriptions.h"
 #include "FieldEdit.h"
 #include "FormHistory.h"
 #include "LanguageBar.h"
@@ -27,9 +28,12 @@ EntryFormAssistance::EntryFormAssistance(EntryFormHost &form)
     m_form.formLayout()->spread();
     m_languageRows = std::make_unique<LanguageRows>(m_form, m_rows);
     m_bar = std::make_unique<LanguageBar>(m_form, *m_languageRows);
+    m_descriptions = std::make_unique<FieldDescriptions>(m_form, *m_languageRows);
     addHistory();
     addText();
     addTrial();
+    // Who shows something beside a field has to look anew.
+    connect(m_languageRows.get(), &LanguageRows::turned, this, &EntryFormAssistance::recordChanged);
     connect(&m_form, &EntryFormHost::recordChanged, this, &EntryFormAssistance::recordChanged);
 }
 
@@ -40,6 +44,7 @@ EntryFormAssistance::~EntryFormAssistance()
     m_text.reset();
     m_trial.reset();
     m_history.reset();
+    m_descriptions.reset();
     m_bar.reset();
     m_languageRows.reset();
     m_form.formLayout()->pack();

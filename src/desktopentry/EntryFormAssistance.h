@@ -13,6 +13,7 @@ class QToolButton;
 namespace VelUI {
 
 class EntryTextDialog;
+class FieldDescriptions;
 class FormHistory;
 class LanguageBar;
 class LanguageRows;
@@ -69,6 +70,7 @@ private:
     QVector<FormRow> m_rows;
     std::unique_ptr<LanguageRows> m_languageRows;
     std::unique_ptr<LanguageBar> m_bar;
+    std::unique_ptr<FieldDescriptions> m_descriptions;
     std::unique_ptr<FormHistory> m_history;
     std::unique_ptr<EntryTextDialog> m_text; ///< null while it is not shown
     std::unique_ptr<TrialLine> m_trial;

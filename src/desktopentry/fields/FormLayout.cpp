@@ -144,6 +144,11 @@ void FormLayout::setRowLabelBold(int row)
     label->setFont(font);
 }
 
+QWidget *FormLayout::labelOf(int row) const
+{
+    return rowItem(row, 0)->widget();
+}
+
 void FormLayout::setField(int row, const QString &label, QWidget *field)
 {
     auto *shown = qobject_cast<QLabel *>(rowItem(row, 0)->widget());

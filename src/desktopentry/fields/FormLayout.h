@@ -40,6 +40,8 @@ public:
     bool isRowVisible(int row) const;
     /// The number of the row that has \a field in it; -1 where none has.
     int rowOf(QWidget *field) const;
+    /// The label of a row, or the button or field that stands in its place.
+    QWidget *labelOf(int row) const;
     /// Shows another widget as the field of a labeled row, under another label, and hides the one before.
     void setField(int row, const QString &label, QWidget *field);
 
