@@ -116,7 +116,8 @@ void EntryFormAssistance::showText(bool isShown)
             m_text.release()->deleteLater();
         return;
     }
-    m_text = std::make_unique<EntryTextDialog>(m_form);
+    m_text = std::make_unique<EntryTextDialog>(
+        m_form, QList<QAction *>{m_history->undoAction(), m_history->redoAction()});
     connect(m_text.get(), &QDialog::finished, m_textButton, [this] { m_textButton->setChecked(false); });
     m_text->show();
 }

@@ -12,13 +12,14 @@
 
 namespace VelUI {
 
-EntryTextDialog::EntryTextDialog(EntryFormHost &form)
+EntryTextDialog::EntryTextDialog(EntryFormHost &form, const QList<QAction *> &history)
     : QDialog(form.form())
     , m_form(form)
     , m_view(new MarkedTextView(this))
     , m_summary(new QLabel(this))
 {
     setObjectName(QStringLiteral("entryTextDialog"));
+    addActions(history);
     setWindowTitle(tr("Text of the entry"));
     m_view->setObjectName(QStringLiteral("entryText"));
     m_view->setAccessibleName(tr("The file as it would be saved"));

@@ -22,7 +22,8 @@ class EntryTextDialog : public QDialog
     Q_OBJECT
 
 public:
-    explicit EntryTextDialog(EntryFormHost &form);
+    /// \a history takes back what was done in the form, here, too.
+    EntryTextDialog(EntryFormHost &form, const QList<QAction *> &history);
 
     bool eventFilter(QObject *watched, QEvent *event) override;
 

@@ -319,11 +319,11 @@ bool VelDesktopEntryEditDialog::setDesktopEntryPath(const QString &path, bool cr
     const VelUIDesktopEntry own = entry;
     if (!pattern.isEmpty() && !d->inheritFrom(pattern, &entry))
         return false;
-    d->form().allowAllTypes();
-    d->form().path = path;
-    d->props->loadFrom(entry);
     d->path = path;
     d->loaded = own;
+    d->form().path = path;
+    d->form().allowAllTypes();
+    d->props->loadFrom(entry);
     if (!loaded)
         d->setNewType();
     setWindowTitle(tr("Desktop Entry Editor") + QStringLiteral(" - ") + path + QStringLiteral("[*]"));

@@ -80,7 +80,7 @@ void tst_EntryFormAssistance::isOffUntilItIsSwitchedOn()
 void tst_EntryFormAssistance::leavesTheFormAsItWas()
 {
     VelDesktopEntryPropsWidget form;
-    form.resize(500, 400);
+    form.resize(800, 400);
     form.show();
     QVERIFY(QTest::qWaitForWindowExposed(&form));
     const QStringList former = places(form);
@@ -161,8 +161,8 @@ void tst_EntryFormAssistance::putsASentenceUnderItsField()
     form.setAssistance(true);
     form.show();
     QVERIFY(QTest::qWaitForWindowExposed(&form));
-    const FormRow &row = *assistance(form).row(QStringLiteral("Exec"));
-    const QWidget *const next = assistance(form).row(QStringLiteral("Terminal"))->field;
+    const FormRow &row = *assistance(form).row(QStringLiteral("Path"));
+    const QWidget *const next = assistance(form).row(QStringLiteral("TryExec"))->field;
     const int formerGap = next->y() - row.field->geometry().bottom();
     const QPointer<QLabel> sentence(new QLabel(QStringLiteral("There is no such program.")));
     sentence->hide();
@@ -170,8 +170,10 @@ void tst_EntryFormAssistance::putsASentenceUnderItsField()
     QCoreApplication::processEvents();
     QCOMPARE(next->y() - row.field->geometry().bottom(), formerGap);
 
+    const int formerWidth = row.field->width();
     sentence->show();
     QCoreApplication::processEvents();
+    QCOMPARE(row.field->width(), formerWidth);
     const int top = sentence->mapTo(form.findChild<QWidget *>(QStringLiteral("content")), QPoint()).y();
     QVERIFY(top > row.field->geometry().bottom());
     QVERIFY(top + sentence->height() <= next->y());
