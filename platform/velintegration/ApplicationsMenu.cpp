@@ -4,15 +4,11 @@
 #include "ApplicationsMenu.h"
 
 #include "FolderCopy.h"
-#include "InstalledApplications.h"
+#include "MenuApplications.h"
 #include "MenuCategories.h"
+#include "ShownNameOrder.h"
 
-#include <velcore/language.h>
-#include <veluiaux/VelUIDesktopEntry.h>
-
-#include <QCollator>
 #include <QFile>
-#include <QLocale>
 
 #include <algorithm>
 #include <cerrno>
@@ -23,36 +19,19 @@ namespace fs = std::filesystem;
 
 namespace {
 
-// By this much of a name it is ordered: marks in an odd order make a collator take very long.
-constexpr int LongestName = 255;
-
 struct MenuItem
 {
-    std::string id;
-    std::string source;
-    QString shownName;
+    const MenuApplication *application;
     std::string fileName;
 };
 using MenuItems = std::vector<MenuItem>;
 
-bool isShownApplication(const VelUIDesktopEntry &entry)
-{
-    return entry.getType() == QLatin1String("Application") && entry.isDisplayable(nullptr);
-}
-
 // The applications by the place of their category.
-std::map<int, MenuItems> collectItems()
+std::map<int, MenuItems> collectItems(const std::vector<MenuApplication> &applications)
 {
     std::map<int, MenuItems> items;
-    for (const InstalledApplication &application : installedApplications()) {
-        const VelUIDesktopEntry entry(QFile::decodeName(application.path.c_str()));
-        if (!isShownApplication(entry))
-            continue;
-        const QString localName = entry.getLocalName();
-        items[menuCategoryOf(entry.getCategories())].push_back(
-            {application.id, application.path, localName.isEmpty() ? entry.getName() : localName,
-             fs::path(application.path).filename().string()});
-    }
+    for (const MenuApplication &application : applications)
+        items[application.category].push_back({&application, application.fileName});
     return items;
 }
 
@@ -66,8 +45,8 @@ void resolveClashes(MenuItems *items)
         for (const MenuItem &item : *items)
             ++uses[item.fileName];
         for (MenuItem &item : *items) {
-            if (uses[item.fileName] > 1 && item.fileName != item.id) {
-                item.fileName = item.id;
+            if (uses[item.fileName] > 1 && item.fileName != item.application->id) {
+                item.fileName = item.application->id;
                 changed = true;
             }
         }
@@ -76,19 +55,17 @@ void resolveClashes(MenuItems *items)
 
 void sortByShownName(MenuItems *items)
 {
-    QCollator collator(QLocale(QString::fromStdString(velLanguageCode())));
-    collator.setCaseSensitivity(Qt::CaseInsensitive);
-    std::sort(items->begin(), items->end(), [&collator](const MenuItem &left, const MenuItem &right) {
-        const int order =
-            collator.compare(left.shownName.left(LongestName), right.shownName.left(LongestName));
-        return order != 0 ? order < 0 : left.fileName < right.fileName;
+    const ShownNameOrder order;
+    std::sort(items->begin(), items->end(), [&order](const MenuItem &left, const MenuItem &right) {
+        return order.isBefore(left.application->shownName, left.fileName, right.application->shownName,
+                              right.fileName);
     });
 }
 
 bool writeDirectoryEntry(const fs::path &folder, const MenuCategory &category, const QStringList &sortOrder)
 {
     const QByteArray entry = menuDirectoryEntry(category, sortOrder);
-    std::ofstream file(folder / ".directory", std::ios::binary);
+    std::ofstream file(menuFolderRecord(folder), std::ios::binary);
     file.write(entry.constData(), entry.size());
     file.close();
     return !file.fail();
@@ -103,7 +80,7 @@ bool writeCategory(const fs::path &folder, const MenuCategory &category, const M
     }
     QStringList sortOrder;
     for (const MenuItem &item : items) {
-        if (!copyFile(item.source, folder / item.fileName))
+        if (!copyFile(item.application->path, folder / item.fileName))
             return false;
         sortOrder.append(QFile::decodeName(item.fileName.c_str()));
     }
@@ -112,9 +89,9 @@ bool writeCategory(const fs::path &folder, const MenuCategory &category, const M
 
 } // namespace
 
-bool buildApplicationsMenu(const fs::path &folder)
+bool buildApplicationsMenu(const fs::path &folder, const std::vector<MenuApplication> &applications)
 {
-    std::map<int, MenuItems> itemsOfCategories = collectItems();
+    std::map<int, MenuItems> itemsOfCategories = collectItems(applications);
     if (itemsOfCategories.empty()) {
         errno = ENODATA;
         return false;

@@ -4,6 +4,7 @@
 #include "FolderReplacement.h"
 
 #include "FolderRemoval.h"
+#include "ResolvedFolder.h"
 
 #include <velcore/files.h>
 
@@ -23,32 +24,6 @@
 namespace fs = std::filesystem;
 
 namespace {
-
-constexpr int MostLinks = 40;
-
-// Where a path leads, with all links followed; empty when they lead in a circle or where another
-// user may have wanted it.
-fs::path resolved(const fs::path &path)
-{
-    std::error_code error;
-    fs::path result = fs::absolute(path, error);
-    if (!result.has_filename()) // a trailing "/"
-        result = result.parent_path();
-    if (Vel::leadsThroughPlantedLink(result))
-        return {};
-    const fs::path canonical = fs::canonical(result, error);
-    if (!error)
-        return canonical;
-    for (int i = 0; i < MostLinks; ++i) {
-        if (!fs::is_symlink(fs::symlink_status(result, error)))
-            return result;
-        const fs::path next = fs::read_symlink(result, error);
-        if (error)
-            return {};
-        result = next.is_absolute() ? next : result.parent_path() / next;
-    }
-    return {};
-}
 
 // Whether \a text is made of two numbers with a "-" between them.
 bool isPair(std::string_view text)
@@ -94,7 +69,7 @@ int FolderReplacement::exchangePaths(const char *first, const char *second)
 }
 
 FolderReplacement::FolderReplacement(const fs::path &target, Exchange exchange)
-    : m_target(resolved(target))
+    : m_target(resolvedFolder(target))
     , m_exchange(exchange)
 {
     if (!isReplaceable())

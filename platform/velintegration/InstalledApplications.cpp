@@ -48,9 +48,11 @@ bool isDesktopFileName(const std::string &name)
 class Walk
 {
 public:
-    Walk(std::set<std::string> *seenIds, std::vector<InstalledApplication> *found)
+    Walk(std::set<std::string> *seenIds, std::vector<InstalledApplication> *found,
+         const std::function<void(const std::string &)> &onFolder)
         : m_seenIds(seenIds)
         , m_found(found)
+        , m_onFolder(onFolder)
     {
     }
 
@@ -59,7 +61,11 @@ public:
         // A link may lead back to a folder that is being walked.
         std::error_code error;
         const fs::path real = fs::canonical(folder, error);
-        if (error || std::find(m_open.begin(), m_open.end(), real) != m_open.end())
+        if (std::find(m_open.begin(), m_open.end(), real) != m_open.end())
+            return;
+        if (m_onFolder)
+            m_onFolder(folder.string());
+        if (error)
             return;
         m_open.push_back(real);
         for (const fs::path &path : sortedContents(folder)) {
@@ -98,17 +104,27 @@ private:
 
     std::set<std::string> *m_seenIds;
     std::vector<InstalledApplication> *m_found;
+    const std::function<void(const std::string &)> &m_onFolder;
     std::vector<fs::path> m_open;
     FolderLimits m_limits;
 };
 
 } // namespace
 
-std::vector<InstalledApplication> installedApplications()
+std::vector<std::string> applicationFolders()
+{
+    std::vector<std::string> folders;
+    for (const fs::path &directory : dataDirectories())
+        folders.push_back((directory / "applications").string());
+    return folders;
+}
+
+std::vector<InstalledApplication> installedApplications(
+    const std::function<void(const std::string &)> &onFolder)
 {
     std::set<std::string> seenIds;
     std::vector<InstalledApplication> found;
-    for (const fs::path &directory : dataDirectories())
-        Walk(&seenIds, &found).enter(directory / "applications", std::string());
+    for (const std::string &folder : applicationFolders())
+        Walk(&seenIds, &found, onFolder).enter(folder, std::string());
     return found;
 }

@@ -61,3 +61,8 @@ QByteArray menuDirectoryEntry(const MenuCategory &category, const QStringList &s
         entry += "SortOrder=" + QByteArray::fromStdString(DesktopEntryValue::fromList(sortOrder)) + '\n';
     return entry;
 }
+
+std::filesystem::path menuFolderRecord(const std::filesystem::path &folder)
+{
+    return folder / ".directory";
+}

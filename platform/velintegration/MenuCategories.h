@@ -7,6 +7,8 @@
 #include <QStringList>
 #include <QVector>
 
+#include <filesystem>
+
 /// A folder of the start menu: a main category of the desktop menu standard, or a folder of ours.
 struct MenuCategory
 {
@@ -31,3 +33,6 @@ int menuCategoryOf(const QStringList &categories);
  * @param sortOrder the file names of its children, in order
  */
 QByteArray menuDirectoryEntry(const MenuCategory &category, const QStringList &sortOrder);
+
+/// The file that holds the name, the icon and the order of a folder of a menu.
+std::filesystem::path menuFolderRecord(const std::filesystem::path &folder);

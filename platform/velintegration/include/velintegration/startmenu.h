@@ -21,6 +21,7 @@
  * The new menu is built beside the old one and takes its place in the end: when anything
  * fails, or no application at all is installed and there is no template, the old one is left as it
  * was, and so is the previous one. What a killed program left beside it an hour ago is removed.
+ * What UpdateStartMenu() remembers is brought up to date.
  *
  * @param menuDir the folder of the menu. Missing parents are made, a link is followed, unless
  *        another user may have planted it (see Vel::leadsThroughPlantedLink)
@@ -30,3 +31,30 @@
  *         link was not followed, 0 where no reason is known, else what the system said
  */
 VELINTEGRATION_EXPORT bool CreateStartMenu(const char *menuDir, const char *templateDir);
+
+/**
+ * Has a start menu follow what is installed. Where there is none yet, one is made as by
+ * CreateStartMenu().
+ *
+ * Applications that came get an entry in the folder of their category, in its place in the order; an
+ * entry whose application changed is brought up to date, and moved when the category is another one;
+ * an entry whose application went is removed, and the folder with it that came empty by this. All of
+ * that happens only to what the user did not touch. An entry is touched when any of its bytes, its
+ * name or its folder is another; its place in the order is nobody's business but the user's. What the
+ * user deleted does not come back, also when the application is installed anew.
+ *
+ * What that takes is remembered in the file of the menu's name with ".sources" behind it. It is plain
+ * text and may be deleted: then nothing is removed or doubled, but what the user had deleted may come
+ * back once. To a menu without a folder of a main category, which somebody made by hand or from a
+ * template, only those applications are added that come from then on.
+ *
+ * When nothing is to be done, no more than the times of folders is looked at, as long as nothing in
+ * them changed in the last two seconds before. Several updates may run at a time, and programs may
+ * edit the menu meanwhile. What a killed update began, the next one ends.
+ *
+ * @param menuDir the folder of the menu; see CreateStartMenu()
+ * @param templateDir what is copied where there is no menu yet; may be null or empty
+ * @return false when no application is installed, which changes nothing, or not everything could be
+ *         done
+ */
+VELINTEGRATION_EXPORT bool UpdateStartMenu(const char *menuDir, const char *templateDir);
