@@ -105,8 +105,7 @@ MenuExecution::MenuExecution(const fs::path &menu, const MenuPlan &plan,
 
 bool MenuExecution::isNeeded() const
 {
-    return !m_plan.steps.empty() || !m_plan.leftovers.empty() || !m_plan.placed.empty()
-        || !m_plan.vacated.empty() || !m_plan.begun.empty();
+    return !m_plan.steps.empty() || !m_plan.begun.empty();
 }
 
 // A folder that looks like a new one is as good as ours; one that went is none any more.
@@ -123,9 +122,10 @@ void MenuExecution::adoptFolders()
 
 bool MenuExecution::run(const Save &save)
 {
+    MenuSources begun = *m_sources;
     for (const MenuStep &step : m_plan.steps)
-        m_sources->entries[step.id] = {step.from, step.to, true};
-    if (!save(*m_sources))
+        begun.entries[step.id] = {step.from, step.to, true};
+    if (!m_plan.steps.empty() && !save(begun))
         return false;
     for (const std::string &place : m_plan.placed)
         m_children[folderOf(place)].come.insert(nameOf(place));
@@ -255,7 +255,7 @@ void MenuExecution::updateOrders()
 
 void MenuExecution::removeFolders()
 {
-    std::set<std::string> emptied = m_plan.begun;
+    std::set<std::string> emptied = m_plan.made;
     for (const auto &[name, children] : m_children) {
         if (!children.gone.empty())
             emptied.insert(name);

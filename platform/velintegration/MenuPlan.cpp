@@ -41,19 +41,6 @@ public:
             m_applications.emplace(application.id, &application);
     }
 
-    void recall(const std::map<std::string, MenuSources::Entry> &entries)
-    {
-        for (const auto &[id, entry] : entries) {
-            const std::optional<Version> version = entry.isChanging ? outcome(entry) : entry.made;
-            if (version)
-                remember(id, *version);
-            for (const Version *begun : {&entry.made, &entry.next}) {
-                if (entry.isChanging && !begun->place.empty())
-                    m_plan.begun.insert(folderOf(begun->place));
-            }
-        }
-    }
-
     void remember(const std::string &id, const Version &version)
     {
         m_plan.remembered[id] = version;
@@ -74,37 +61,6 @@ public:
     }
 
 private:
-    // How far a change came that was begun: what to remember of it, if anything.
-    std::optional<Version> outcome(const MenuSources::Entry &entry)
-    {
-        const bool isDone = !entry.next.place.empty() && stands(m_menu, entry.next);
-        const bool isUndone = !entry.made.place.empty() && stands(m_menu, entry.made);
-        if (isDone) {
-            m_plan.placed.insert(entry.next.place);
-            if (isUndone && entry.made.place != entry.next.place)
-                m_plan.leftovers.push_back(entry.made);
-            else if (!entry.made.place.empty() && entry.made.place != entry.next.place)
-                m_plan.vacated.insert(entry.made.place);
-            return entry.next;
-        }
-        if (isUndone)
-            return entry.made;
-        return outcomeOfTouched(entry);
-    }
-
-    // Neither the old nor the new entry stands there.
-    std::optional<Version> outcomeOfTouched(const MenuSources::Entry &entry)
-    {
-        const bool wasRemoved = entry.next.place.empty() && !isTaken(m_menu, entry.made.place);
-        if (wasRemoved)
-            m_plan.vacated.insert(entry.made.place);
-        const bool wasNotMade = entry.made.place.empty() && !isTaken(m_menu, entry.next.place);
-        if (wasRemoved || wasNotMade)
-            return {};
-        const bool isNext = !entry.next.place.empty() && isTaken(m_menu, entry.next.place);
-        return isNext || entry.made.place.empty() ? entry.next : entry.made;
-    }
-
     void follow(const std::string &id, const Version &version)
     {
         const auto found = m_applications.find(id);
@@ -162,14 +118,86 @@ private:
     MenuPlan m_plan;
 };
 
+// What a killed update began: how far each of its changes came, and what is left to do.
+class Ending
+{
+public:
+    explicit Ending(const MenuSnapshot &menu)
+        : m_menu(menu)
+    {
+    }
+
+    MenuPlan plan(const MenuSources &memory)
+    {
+        for (const auto &[id, entry] : memory.entries) {
+            const std::optional<Version> version = entry.isChanging ? outcome(entry) : entry.made;
+            if (version)
+                m_plan.remembered[id] = *version;
+            for (const Version *begun : {&entry.made, &entry.next}) {
+                if (entry.isChanging && !begun->place.empty())
+                    note(folderOf(begun->place), memory);
+            }
+        }
+        return m_plan;
+    }
+
+private:
+    void note(const std::string &folder, const MenuSources &memory)
+    {
+        m_plan.begun.insert(folder);
+        if (memory.folders.count(folder) == 0)
+            m_plan.made.insert(folder);
+    }
+
+    // What to remember of a change, if anything.
+    std::optional<Version> outcome(const MenuSources::Entry &entry)
+    {
+        const bool isDone = !entry.next.place.empty() && stands(m_menu, entry.next);
+        const bool isUndone = !entry.made.place.empty() && stands(m_menu, entry.made);
+        if (isDone) {
+            m_plan.placed.insert(entry.next.place);
+            if (isUndone && entry.made.place != entry.next.place)
+                m_plan.leftovers.push_back(entry.made);
+            else if (!entry.made.place.empty() && entry.made.place != entry.next.place)
+                m_plan.vacated.insert(entry.made.place);
+            return entry.next;
+        }
+        if (isUndone)
+            return entry.made;
+        return outcomeOfTouched(entry);
+    }
+
+    // Neither the old nor the new entry stands there.
+    std::optional<Version> outcomeOfTouched(const MenuSources::Entry &entry)
+    {
+        const bool wasRemoved = entry.next.place.empty() && !isTaken(m_menu, entry.made.place);
+        if (wasRemoved)
+            m_plan.vacated.insert(entry.made.place);
+        const bool wasNotMade = entry.made.place.empty() && !isTaken(m_menu, entry.next.place);
+        if (wasRemoved || wasNotMade)
+            return {};
+        const bool isNext = !entry.next.place.empty() && isTaken(m_menu, entry.next.place);
+        return isNext || entry.made.place.empty() ? entry.next : entry.made;
+    }
+
+    const MenuSnapshot &m_menu;
+    MenuPlan m_plan;
+};
+
 } // namespace
+
+MenuPlan MenuPlan::ending(const MenuSources &memory, const MenuSnapshot &menu)
+{
+    return Ending(menu).plan(memory);
+}
 
 MenuPlan MenuPlan::of(const std::optional<MenuSources> &memory,
                       const std::vector<MenuApplication> &applications, const MenuSnapshot &menu)
 {
     Planner planner(applications, menu);
     if (memory) {
-        planner.recall(memory->entries);
+        for (const auto &[id, entry] : memory->entries)
+            planner.remember(id, entry.made);
     } else {
         // A menu without any folder of ours was not made of the applications.
         const bool isOwn = menu.folders.empty() && !menu.isEmpty;

@@ -35,18 +35,23 @@ struct MenuPlan
     /// What is remembered when none of the steps is done.
     std::map<std::string, MenuSources::Version> remembered;
     std::vector<MenuStep> steps;
-    /// Untouched entries that a killed update had moved, but not removed yet where they were.
+    /// The other members are about what a killed update began. Untouched entries that it had moved, but
+    /// not removed yet where they were.
     std::vector<MenuSources::Version> leftovers;
-    /// The places that have to stand in the order of their folders, or may not any more, beside those
-    /// of the steps: a killed update did not come that far.
+    /// The places that have to stand in the order of their folders, or may not any more.
     std::set<std::string> placed;
     std::set<std::string> vacated;
-    /// The folders in which it was at work.
+    /// The folders in which it was at work, and those of them that may be new.
     std::set<std::string> begun;
+    std::set<std::string> made;
+
+    /// What is left to do of what a killed update began; this comes before the rest, which finds
+    /// nothing half-done then.
+    static MenuPlan ending(const MenuSources &memory, const MenuSnapshot &menu);
 
     /**
-     * @param memory what was remembered; none when nothing is. Then entries are known by their contents
-     *        and names, and to a menu without a folder of a main category, which was not made of the
+     * @param memory what was remembered, with nothing begun; none when nothing is. Then entries are known by
+     * their contents and names, and to a menu without a folder of a main category, which was not made of the
      *        applications, only what comes later is added
      * @param menu everything in it when nothing is remembered, else its folders of main categories
      */

@@ -30,10 +30,13 @@ bool isCurrent(const MenuSources &sources)
                        [](const FolderStamp &stamp) { return stamp.isCurrent(); });
 }
 
+// All at once, so that it is written down once.
 bool canSettle(const MenuSources &sources)
 {
-    return std::any_of(sources.stamps.begin(), sources.stamps.end(),
-                       [](const FolderStamp &stamp) { return stamp.canSettle(); });
+    const auto isSettled = [](const FolderStamp &stamp) { return stamp.contents.empty(); };
+    return !std::all_of(sources.stamps.begin(), sources.stamps.end(), isSettled)
+        && std::all_of(sources.stamps.begin(), sources.stamps.end(),
+                       [&](const FolderStamp &stamp) { return isSettled(stamp) || stamp.canSettle(); });
 }
 
 } // namespace
@@ -72,10 +75,10 @@ bool StartMenuUpdate::settle() const
     std::optional<MenuSources> sources = MenuSources::fromText(file.read());
     if (!sources || !isCurrent(*sources))
         return false;
-    for (FolderStamp &stamp : sources->stamps) {
-        if (stamp.canSettle())
-            stamp.contents.clear();
-    }
+    if (!canSettle(*sources))
+        return true;
+    for (FolderStamp &stamp : sources->stamps)
+        stamp.contents.clear();
     file.write(sources->toText());
     return true;
 }
@@ -101,21 +104,44 @@ Result StartMenuUpdate::follow() const
         return Result::Failed;
     if (file.isAlone())
         CategoryFolder::removeLeftovers(m_menu);
-    const std::string oldText = file.read();
-    const std::optional<MenuSources> memory = MenuSources::fromText(oldText);
-    const MenuSnapshot menu = memory ? MenuSnapshot::ofCategories(m_menu) : MenuSnapshot::ofAll(m_menu);
-    const MenuPlan plan = MenuPlan::of(memory, look.found.all, menu);
+    std::optional<MenuSources> memory = MenuSources::fromText(file.read());
+    const Result ended = memory ? end(&*memory, &file) : Result::Unchanged;
+    if (ended == Result::Failed)
+        return ended;
 
+    const MenuSnapshot menu = memory ? MenuSnapshot::ofCategories(m_menu) : MenuSnapshot::ofAll(m_menu);
     MenuSources sources = memory.value_or(MenuSources());
     sources.stamps.clear();
-    MenuExecution execution(m_menu, plan, look.found.all, &sources);
-    const auto save = [&file](const MenuSources &begun) { return file.write(begun.toText()); };
-    const bool isDone = !execution.isNeeded() || execution.run(save);
-    if (isDone)
+    const Result result =
+        carryOut(MenuPlan::of(memory, look.found.all, menu), look.found.all, &sources, &file);
+    if (result != Result::Failed)
         NewMenu::setStamps(m_menu, look, &sources);
-    const std::string text = sources.toText();
-    const bool isRemembered = text == oldText || file.write(text);
-    if (!isDone || !isRemembered)
+    if (!remember(sources, &file))
+        return Result::Failed;
+    return result == Result::Unchanged ? ended : result;
+}
+
+Result StartMenuUpdate::end(MenuSources *memory, SourcesFile *file) const
+{
+    const MenuPlan plan = MenuPlan::ending(*memory, MenuSnapshot::ofCategories(m_menu));
+    if (plan.begun.empty())
+        return Result::Unchanged;
+    const Result result = carryOut(plan, {}, memory, file);
+    return result != Result::Failed && remember(*memory, file) ? result : Result::Failed;
+}
+
+Result StartMenuUpdate::carryOut(const MenuPlan &plan, const std::vector<MenuApplication> &applications,
+                                 MenuSources *sources, SourcesFile *file) const
+{
+    MenuExecution execution(m_menu, plan, applications, sources);
+    const auto save = [file](const MenuSources &begun) { return remember(begun, file); };
+    if (execution.isNeeded() && !execution.run(save))
         return Result::Failed;
     return execution.hasChanged() ? Result::Changed : Result::Unchanged;
+}
+
+bool StartMenuUpdate::remember(const MenuSources &sources, SourcesFile *file)
+{
+    const std::string text = sources.toText();
+    return text == file->read() || file->write(text);
 }

@@ -5,8 +5,12 @@
 
 #include <velintegration/startmenu.h>
 
-#include <QDateTime>
 #include <QDir>
+
+#include <fcntl.h>
+#include <sys/file.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 /// How a start menu follows the applications that are installed, and leaves alone what was touched.
 class tst_startmenu_update : public StartMenuUpdateTestCase
@@ -55,6 +59,9 @@ private Q_SLOTS:
     void remembersWhatWasMadeAnew();
     void writesNothingWhenNothingChanged();
     void followsALink();
+    void severalUpdatesAtATime();
+    void waitsForAnotherUpdate();
+    void leavesWhatIsEditedMeanwhile();
 };
 
 void tst_startmenu_update::makesAMenuWhereThereIsNone()
@@ -620,6 +627,82 @@ void tst_startmenu_update::followsALink()
     QCOMPARE(names(path(QStringLiteral("real"))),
              QStringList({QStringLiteral("menu"), QStringLiteral("menu.sources")}));
     QCOMPARE(names(path(QStringLiteral("real/menu/Game"))).size(), 3);
+}
+
+void tst_startmenu_update::severalUpdatesAtATime()
+{
+    for (int round = 0; round < 5; ++round) {
+        for (int i = 0; i < 10; ++i)
+            install(QStringLiteral("a%1-%2.desktop").arg(round).arg(i), i % 2 ? "Game;" : "Office;");
+        if (round > 0)
+            uninstall(QStringLiteral("a%1-0.desktop").arg(round - 1));
+        const QByteArray directory = QFile::encodeName(menu());
+        QVector<pid_t> children;
+        for (int i = 0; i < 4; ++i) {
+            const pid_t child = fork();
+            if (child == 0)
+                _exit(UpdateStartMenu(directory.constData(), nullptr) ? 0 : 1);
+            children.append(child);
+        }
+        for (const pid_t child : qAsConst(children)) {
+            int status = -1;
+            QCOMPARE(waitpid(child, &status, 0), child);
+            QCOMPARE(status, 0);
+        }
+        const auto followed = tree(menu());
+        QDir(path(QStringLiteral("fresh"))).removeRecursively();
+        QVERIFY(CreateStartMenu(QFile::encodeName(path(QStringLiteral("fresh"))).constData(), nullptr));
+        QCOMPARE(followed, tree(path(QStringLiteral("fresh"))));
+    }
+}
+
+// Nothing is done as long as another one is at work, and everything when it has ended.
+void tst_startmenu_update::waitsForAnotherUpdate()
+{
+    install(QStringLiteral("a.desktop"), "Game;");
+    QVERIFY(update());
+    const int other = open(QFile::encodeName(menu() + QStringLiteral(".sources")).constData(), O_RDWR);
+    QVERIFY(other >= 0);
+    QCOMPARE(flock(other, LOCK_EX), 0);
+    install(QStringLiteral("b.desktop"), "Game;");
+    const QByteArray directory = QFile::encodeName(menu());
+    const pid_t child = fork();
+    if (child == 0) {
+        ::close(other);
+        _exit(UpdateStartMenu(directory.constData(), nullptr) ? 0 : 1);
+    }
+    QTest::qWait(100);
+    const QStringList meanwhile = entries();
+    close(other);
+    int status = -1;
+    QCOMPARE(waitpid(child, &status, 0), child);
+    QCOMPARE(status, 0);
+    QCOMPARE(meanwhile, QStringList(QStringLiteral("Game/a.desktop")));
+    QCOMPARE(entries().size(), 2);
+}
+
+// An editor and an application go on saving at the same entry: not one save of the editor is lost.
+void tst_startmenu_update::leavesWhatIsEditedMeanwhile()
+{
+    for (int i = 0; i < 20; ++i)
+        install(QStringLiteral("a%1.desktop").arg(i), "Game;");
+    QVERIFY(update());
+    for (int round = 0; round < 10; ++round) {
+        const QString name = QStringLiteral("a%1.desktop").arg(round);
+        install(name, "Game;", "Comment=new\n");
+        const QByteArray directory = QFile::encodeName(menu());
+        const pid_t child = fork();
+        if (child == 0)
+            _exit(UpdateStartMenu(directory.constData(), nullptr) ? 0 : 1);
+        VelUIDesktopEntry entry(inMenu(QStringLiteral("Game/") + name));
+        entry.setGenericName(QStringLiteral("mine"));
+        QVERIFY(entry.save());
+        int status = -1;
+        QCOMPARE(waitpid(child, &status, 0), child);
+        QVERIFY(read(inMenu(QStringLiteral("Game/") + name)).contains("GenericName=mine"));
+        QVERIFY(update());
+        QVERIFY(read(inMenu(QStringLiteral("Game/") + name)).contains("GenericName=mine"));
+    }
 }
 
 VEL_TEST_GUILESS_MAIN(tst_startmenu_update)
