@@ -247,9 +247,8 @@ void MenuExecution::updateOrders()
         const auto isBefore = [&order](const QString &left, const QString &right) {
             return order.isBefore(left, right);
         };
-        m_isDone = MenuOrder::update(folder, decoded(children.gone), decoded(children.come), isBefore,
-                                     m_menu.parent_path())
-            && m_isDone;
+        m_isDone =
+            MenuOrder::update(folder, decoded(children.gone), decoded(children.come), isBefore) && m_isDone;
     }
 }
 
@@ -275,7 +274,6 @@ void MenuExecution::updateRootOrder()
         (CategoryFolder(m_menu, name).exists() ? m_folders.come : m_folders.gone).insert(name);
     if (m_folders.gone.empty() && m_folders.come.empty())
         return;
-    m_isDone = MenuOrder::update(m_menu, decoded(m_folders.gone), decoded(m_folders.come), isCategoryBefore,
-                                 m_menu.parent_path())
+    m_isDone = MenuOrder::update(m_menu, decoded(m_folders.gone), decoded(m_folders.come), isCategoryBefore)
         && m_isDone;
 }

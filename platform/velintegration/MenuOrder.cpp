@@ -7,13 +7,11 @@
 #include "MenuCategories.h"
 #include "MenuFile.h"
 
-#include <velcore/files.h>
 #include <veluiaux/VelUIDesktopEntry.h>
 
 #include <QFile>
 
 #include <algorithm>
-#include <fstream>
 #include <sstream>
 
 namespace fs = std::filesystem;
@@ -42,19 +40,6 @@ QStringList updated(QStringList order, const QStringList &gone, const QStringLis
     return order;
 }
 
-// The bytes of a record with another order; none when they cannot be made.
-std::string withOrder(const std::string &bytes, const QStringList &order, const fs::path &scratch)
-{
-    const fs::path path = MenuFile::temporaryIn(scratch);
-    std::ofstream(path, std::ios::binary) << bytes;
-    VelUIDesktopEntry record(QFile::decodeName(path.c_str()));
-    record.setSortOrder(order);
-    const std::string changed = record.save() ? Vel::SmallFile(path.string()).bytes() : std::string();
-    std::error_code error;
-    fs::remove(path, error);
-    return changed;
-}
-
 } // namespace
 
 QStringList MenuOrder::inserted(const QStringList &order, const QString &name, const IsBefore &isBefore)
@@ -70,24 +55,21 @@ QStringList MenuOrder::inserted(const QStringList &order, const QString &name, c
 }
 
 bool MenuOrder::update(const fs::path &folder, const QStringList &gone, const QStringList &come,
-                       const IsBefore &isBefore, const fs::path &scratch)
+                       const IsBefore &isBefore)
 {
     const fs::path path = menuFolderRecord(folder);
     for (int attempt = 0; attempt < MostAttempts; ++attempt) {
         const std::string digest = fileDigest(path);
-        MenuFile::Contents old;
         if (digest.empty())
             return true;
-        if (!MenuFile::read(path, &old) || contentsDigest(old.bytes) != digest)
-            continue;
-        const QStringList order = VelUIDesktopEntry(QFile::decodeName(path.c_str())).getSortOrder();
+        // Where this reads something else already, the file is not replaced.
+        VelUIDesktopEntry record(QFile::decodeName(path.c_str()));
+        const QStringList order = record.getSortOrder();
         const QStringList wanted = updated(order, gone, come, isBefore);
         if (wanted == order)
             return true;
-        const std::string bytes = withOrder(old.bytes, wanted, scratch);
-        if (bytes.empty())
-            return false;
-        if (MenuFile::replace(path, digest, bytes))
+        record.setSortOrder(wanted);
+        if (MenuFile::replace(path, digest, record.contents().toStdString()))
             return true;
     }
     return false;

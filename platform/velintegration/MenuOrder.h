@@ -25,11 +25,10 @@ QStringList inserted(const QStringList &order, const QString &name, const IsBefo
  * Takes children out of the order of a folder and puts others into it that do not stand there; nothing
  * is written when that is the case already. A folder without an order stays so.
  *
- * @param scratch a folder for files that nobody looks at
  * @return false when it could not be written
  */
 bool update(const std::filesystem::path &folder, const QStringList &gone, const QStringList &come,
-            const IsBefore &isBefore, const std::filesystem::path &scratch);
+            const IsBefore &isBefore);
 
 /// The same bytes of a folder's record without its order.
 std::string withoutOrder(const std::string &record);

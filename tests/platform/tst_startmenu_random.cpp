@@ -322,11 +322,10 @@ void tst_startmenu_random::losesNothingWhenItIsKilled()
         }
     }
     qInfo("%d kills", killed);
-    // Beside the menu stay at most the scratch files of records, which go after an hour.
-    for (const QString &name : names(path(QStringLiteral("config/vel"))))
-        QVERIFY2(name == QLatin1String("startmenu") || name == QLatin1String("startmenu.sources")
-                     || name.startsWith(QLatin1String(".vel")) || name.endsWith(QLatin1String(".new")),
-                 qPrintable(name));
+    // Nothing half-done stays, but for what would have become the memory; the next one is written over it.
+    QStringList beside = names(path(QStringLiteral("config/vel")));
+    beside.removeAll(QStringLiteral(".startmenu.sources.new"));
+    QCOMPARE(beside, QStringList({QStringLiteral("startmenu"), QStringLiteral("startmenu.sources")}));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_startmenu_random)
