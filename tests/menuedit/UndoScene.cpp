@@ -4,12 +4,16 @@
 #include "UndoScene.h"
 
 #include <menuedit/FileTransfer.h>
+#include <menuedit/FolderOrder.h>
 #include <menuedit/KeptThing.h>
+#include <menuedit/ReplacedThings.h>
 #include <menuedit/StepRecorder.h>
 
 #include <veluiaux/VelUIDesktopEntry.h>
 
 #include <QDir>
+
+#include <unistd.h>
 
 namespace {
 
@@ -29,13 +33,18 @@ bool turn(FileStep step)
 bool UndoScene::step(int number)
 {
     qputenv("XDG_DATA_HOME", QFile::encodeName(path(QStringLiteral("data"))));
-    switch (number % 4) {
+    // Killed early, each process begins with another one.
+    switch ((number + getpid()) % 6) {
     case 0:
         return remove();
     case 1:
         return edit();
     case 2:
+        return replace();
+    case 3:
         return move();
+    case 4:
+        return duplicate();
     default:
         return create();
     }
@@ -83,6 +92,39 @@ bool UndoScene::create()
         && turn(recorder.finish());
 }
 
+// Another entry comes in place of one.
+bool UndoScene::replace()
+{
+    StepRecorder recorder;
+    const QString source = path(QStringLiteral("new/a.desktop"));
+    const QString target = path(QStringLiteral("menu/a.desktop"));
+    ReplacedThings replaced;
+    if (!replaced.putAway(target))
+        return false;
+    recorder.mayMove(source, target);
+    FileProgress nobody;
+    if (!FileTransfer::transfer({{source, target}}, FileTransfer::Action::Move, nobody).succeeded())
+        return false;
+    std::vector<ReplacedThings::Thing> things = replaced.take();
+    for (ReplacedThings::Thing &thing : things)
+        recorder.deleted(thing.path, std::move(thing.kept));
+    return turn(recorder.finish());
+}
+
+// Beside itself, with a place in the order.
+bool UndoScene::duplicate()
+{
+    StepRecorder recorder;
+    const QString copy = games() + QStringLiteral("-2");
+    recorder.mayMake(copy);
+    recorder.mayWrite(path(QStringLiteral("menu/.directory")));
+    FileProgress nobody;
+    return FileTransfer::transfer({{games(), copy}}, FileTransfer::Action::Copy, nobody).succeeded()
+        && FolderOrder::write(path(QStringLiteral("menu")),
+                              {QStringLiteral("*"), QStringLiteral("games"), QStringLiteral("games-2")})
+        && turn(recorder.finish());
+}
+
 // Everything is whole, at its place or where it was put away.
 QString UndoScene::fault() const
 {
@@ -99,14 +141,18 @@ QString UndoScene::fault() const
         isWhole = isWhole || treeOf(place) == m_games;
     if (!isWhole)
         return QStringLiteral("the folder is whole nowhere");
-    const QList<QByteArray> entries = treeOf(path(QStringLiteral("menu"))).values() + treeOf(trash).values();
-    return entries.contains('=' + contents("a")) ? QString() : QStringLiteral("an entry is gone");
+    const QList<QByteArray> entries = treeOf(path(QStringLiteral("menu"))).values() + treeOf(trash).values()
+        + treeOf(path(QStringLiteral("new"))).values();
+    return entries.contains('=' + contents("a")) && entries.contains('=' + contents("new"))
+        ? QString()
+        : QStringLiteral("an entry is gone");
 }
 
 void UndoScene::fill()
 {
     write(path(QStringLiteral("menu/x.desktop")), contents("short"));
     write(path(QStringLiteral("menu/a.desktop")), contents("a"));
+    write(path(QStringLiteral("new/a.desktop")), contents("new"));
     write(games() + QStringLiteral("/.directory"), "[Desktop Entry]\n");
     for (int i = 0; i < 12; ++i)
         write(games() + QStringLiteral("/sub%1/%2").arg(i % 3).arg(i),

@@ -5,7 +5,7 @@
 
 #include "FaultScene.h"
 
-/// Deletions, edits, moves and new folders that are undone and done again.
+/// Deletions, edits, moves, replacements, duplicates and new folders that are undone and done again.
 class UndoScene : public FaultScene
 {
 public:
@@ -24,6 +24,8 @@ private:
     bool edit();
     bool move();
     bool create();
+    bool replace();
+    bool duplicate();
     QString games() const { return path(QStringLiteral("menu/games")); }
 
     Tree m_games;

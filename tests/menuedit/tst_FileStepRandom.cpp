@@ -8,9 +8,11 @@
 #include "OtherFileSystem.h"
 #include "TestCase.h"
 
+#include <menuedit/FileProgress.h>
 #include <menuedit/FileTransfer.h>
 #include <menuedit/FolderOrder.h>
 #include <menuedit/KeptThing.h>
+#include <menuedit/ReplacedThings.h>
 #include <menuedit/StepRecorder.h>
 
 #include <veluiaux/VelUIDesktopEntry.h>
@@ -48,6 +50,8 @@ private:
     void remove(StepRecorder &recorder);
     void transfer(StepRecorder &recorder);
     void cross(StepRecorder &recorder);
+    void replace(StepRecorder &recorder);
+    void duplicate(StepRecorder &recorder);
     void undo();
     void redo();
     void meddle();
@@ -262,6 +266,60 @@ void tst_FileStepRandom::cross(StepRecorder &recorder)
     touch(target);
 }
 
+// What makes room is put away; now and then it comes back, as nothing takes its place.
+void tst_FileStepRandom::replace(StepRecorder &recorder)
+{
+    const QString source = anyItem();
+    const QString target = anyItem();
+    const auto isAtOrBelow = [](const QString &path, const QString &folder) {
+        return path == folder || path.startsWith(folder + QLatin1Char('/'));
+    };
+    if (source.isEmpty() || isAtOrBelow(source, target) || isAtOrBelow(target, source))
+        return;
+    const bool isMove = chance(50);
+    // A link that leads nowhere can be moved alone.
+    if (!isMove && !QFileInfo::exists(source))
+        return;
+    note(QStringLiteral("replace %1 by %2, move %3").arg(target, source).arg(isMove));
+    for (const QString &path : {source, target}) {
+        if (QFileInfo(path).isSymLink())
+            touch(path);
+    }
+    ReplacedThings replaced;
+    QVERIFY(replaced.putAway(target));
+    if (chance(20))
+        return;
+    if (isMove)
+        recorder.mayMove(source, target);
+    else
+        recorder.mayMake(target);
+    FileProgress nobody;
+    const auto action = isMove ? FileTransfer::Action::Move : FileTransfer::Action::Copy;
+    QVERIFY(FileTransfer::transfer({{source, target}}, action, nobody).succeeded());
+    std::vector<ReplacedThings::Thing> things = replaced.take();
+    for (ReplacedThings::Thing &thing : things)
+        recorder.deleted(thing.path, std::move(thing.kept));
+    if (QFileInfo(target).isSymLink())
+        touch(target);
+}
+
+void tst_FileStepRandom::duplicate(StepRecorder &recorder)
+{
+    const QString source = anyItem();
+    const QString target = source + QLatin1Char('-') + fresh();
+    if (source.isEmpty())
+        return;
+    const QString record = QFileInfo(source).path() + QStringLiteral("/.directory");
+    note(QStringLiteral("duplicate %1 as %2").arg(source, target));
+    recorder.mayWrite(record);
+    recorder.mayMake(target);
+    touch(record);
+    FileProgress nobody;
+    if (FileTransfer::transfer({{source, target}}, FileTransfer::Action::Copy, nobody).succeeded())
+        FolderOrder::write(QFileInfo(source).path(), {QStringLiteral("*"), QFileInfo(target).fileName()});
+    touch(record);
+}
+
 void tst_FileStepRandom::operateWith(StepRecorder &recorder)
 {
     const int what = number(100);
@@ -273,8 +331,12 @@ void tst_FileStepRandom::operateWith(StepRecorder &recorder)
         reorder(recorder);
     else if (what < 65)
         remove(recorder);
-    else if (what < 90)
+    else if (what < 80)
         transfer(recorder);
+    else if (what < 86)
+        replace(recorder);
+    else if (what < 92)
+        duplicate(recorder);
     else
         cross(recorder);
 }

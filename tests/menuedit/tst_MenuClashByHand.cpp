@@ -17,6 +17,8 @@
 #include <QSignalSpy>
 #include <QWindow>
 
+#include <sys/stat.h>
+
 /// What is pasted or dropped where its name is taken, by hand.
 class tst_MenuClashByHand : public HandsOnTestCase
 {
@@ -29,6 +31,7 @@ private Q_SLOTS:
     void replacesAFolder();
     void asksAboutSeveral_data();
     void asksAboutSeveral();
+    void leavesNoStepOfAReplacementThatFailed();
     void asksAfterADrag();
     void listsAllOfADropInTheirOrder();
     void keepsWhatIsThereWithoutAssistance();
@@ -214,6 +217,26 @@ void tst_MenuClashByHand::asksAboutSeveral()
     QTRY_COMPARE(before.difference(ExactTree::of(menu()), {"*"}), QString());
     QTRY_COMPARE(rows("games"), QStringLiteral("x1 a1 Sub"));
     QVERIFY(!view().undoAction()->isEnabled());
+}
+
+// Such a thing cannot be copied.
+void tst_MenuClashByHand::leavesNoStepOfAReplacementThatFailed()
+{
+    QVERIFY(QFile::remove(path(QStringLiteral("outside/a.desktop"))));
+    QVERIFY(mkfifo(QFile::encodeName(path(QStringLiteral("outside/a.desktop"))).constData(), 0600) == 0);
+    const ExactTree before = ExactTree::of(menu());
+    QSignalSpy told(&view(), &VelMenuView::told);
+    copyFiles({QStringLiteral("outside/a.desktop")});
+    clickItem(in("games/x.desktop"));
+    ModalDriver modal;
+    expectQuestion(modal, QStringLiteral("alt+r"));
+    XDoTool::press(QStringLiteral("ctrl+v"));
+    QTRY_COMPARE(told.size(), 1);
+    QVERIFY(modal.finished());
+    QVERIFY(told.at(0).at(0).toString().startsWith(QLatin1String("Can't copy ")));
+    QCOMPARE(before.difference(ExactTree::of(menu())), QString());
+    QVERIFY(!view().undoAction()->isEnabled());
+    QTRY_COMPARE(rows("games"), QStringLiteral("x1 a1 Sub"));
 }
 
 void tst_MenuClashByHand::asksAfterADrag()

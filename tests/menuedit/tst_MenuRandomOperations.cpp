@@ -14,6 +14,7 @@
 #include <QAction>
 #include <QClipboard>
 #include <QMimeData>
+#include <QPushButton>
 #include <QRandomGenerator>
 #include <QVector>
 
@@ -37,6 +38,14 @@ private:
         bool isMove;
         QString folder;
         QString following; ///< null for nowhere, empty for the end
+    };
+
+    /// One of them, with what is decided about it.
+    struct Arrival
+    {
+        QString source;
+        QString target;
+        bool isHere;
     };
 
     /// What was at some point of the history.
@@ -64,10 +73,15 @@ private:
     void removeSeveral();
     void moveBlock();
     bool areThere(const QStringList &paths) const;
-    void listAll(const Transfer &transfer, bool isOrder);
-    bool isAnyTaken(const Transfer &transfer) const;
     bool predict(const Transfer &transfer, ModalDriver &modal);
     static bool isRefused(const MenuMirror &mirror, const Transfer &transfer);
+    bool predictWithAssistance(const Transfer &transfer, ModalDriver &modal);
+    bool settle(const Transfer &transfer, ModalDriver &modal, QVector<Arrival> &arrivals);
+    QString answer(const QString &source, const QString &target, const Transfer &transfer, bool isPromised,
+                   ModalDriver &modal);
+    QString freeName(const QString &source, const QString &folder, const QStringList &taken) const;
+    void arrive(const Transfer &transfer, const QVector<Arrival> &arrivals);
+    void duplicate();
 
     QString m_remembered; // on the clipboard; null for nothing
     bool m_isCut = false;
@@ -208,54 +222,16 @@ bool tst_MenuRandomOperations::areThere(const QStringList &paths) const
                        [this](const QString &path) { return m_mirror.contains(path); });
 }
 
-// With assistance each of the files gets its place. A copy of what is here leaves it where it is.
-void tst_MenuRandomOperations::listAll(const Transfer &transfer, bool isOrder)
-{
-    QStringList names;
-    bool isAnyHere = false;
-    for (const QString &source : transfer.sources) {
-        const bool isHere = MenuMirror::folderOf(source) == transfer.folder;
-        isAnyHere = isAnyHere || isHere;
-        if (transfer.isMove || !isHere)
-            names.append(MenuMirror::nameOf(source));
-    }
-    if (transfer.following.isNull() ? transfer.isMove && isAnyHere : transfer.isMove || !isOrder)
-        m_mirror.list(transfer.folder, m_rows.value(transfer.folder), names, transfer.following);
-}
-
-// Nobody is asked about what cannot be done whatever the answer.
-bool tst_MenuRandomOperations::isAnyTaken(const Transfer &transfer) const
-{
-    const auto isIntoItself = [&](const QString &source) {
-        return m_mirror.kindOf(source) == Kind::Folder && MenuMirror::isBelow(transfer.folder, source);
-    };
-    if (!areThere(transfer.sources)
-        || std::any_of(transfer.sources.begin(), transfer.sources.end(), isIntoItself))
-        return false;
-    QStringList names;
-    for (const QString &source : transfer.sources) {
-        const QString name = MenuMirror::nameOf(source);
-        const bool isHere = MenuMirror::folderOf(source) == transfer.folder;
-        if (!isHere && (names.contains(name) || m_mirror.contains(MenuMirror::join(transfer.folder, name))))
-            return true;
-        names.append(name);
-    }
-    return false;
-}
-
 // Carries the transfer out in the plain model, and announces the question that comes.
 bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &modal)
 {
+    if (m_view->assistance())
+        return predictWithAssistance(transfer, modal);
     const QString first = transfer.sources.constFirst();
     const QString name = MenuMirror::nameOf(first);
     const QString target = MenuMirror::join(transfer.folder, name);
     const bool isOwnFolder = MenuMirror::folderOf(first) == transfer.folder;
-    // With assistance each name that is taken is asked about; what is called off changes nothing.
-    if (m_view->assistance() && isAnyTaken(transfer)) {
-        modal.handle([](QWidget *dialog) { qobject_cast<QDialog *>(dialog)->reject(); });
-        return false;
-    }
-    if (!m_view->assistance() && !isOwnFolder && m_mirror.contains(target))
+    if (!isOwnFolder && m_mirror.contains(target))
         modal.answer({QMessageBox::Question, QStringLiteral("Attention"),
                       QStringLiteral("%1 already exists. Overwrite?").arg(full(target)), QMessageBox::Yes,
                       QMessageBox::NoButton},
@@ -263,13 +239,10 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
     const bool isOrder =
         std::all_of(transfer.sources.begin(), transfer.sources.end(),
                     [&](const QString &source) { return MenuMirror::folderOf(source) == transfer.folder; });
-    const bool isAnyGone = !m_mirror.contains(first) || (m_view->assistance() && !areThere(transfer.sources));
-    if (isOrder ? isAnyGone : isRefused(m_mirror, transfer))
+    if (isOrder ? !m_mirror.contains(first) : isRefused(m_mirror, transfer))
         return false;
     const bool isListed = isOwnFolder ? transfer.isMove : !transfer.following.isNull();
-    if (m_view->assistance())
-        listAll(transfer, isOrder);
-    else if (isListed)
+    if (isListed)
         m_mirror.list(transfer.folder, m_rows.value(transfer.folder), name, transfer.following);
     // A folder that is moved is read again, within its folder too.
     if (isOwnFolder && transfer.isMove) {
@@ -287,13 +260,139 @@ bool tst_MenuRandomOperations::predict(const Transfer &transfer, ModalDriver &mo
         else
             m_mirror.copy(source, to);
     }
-    m_selected = QString::fromLatin1("");
-    for (const QString &source : m_view->assistance() ? transfer.sources : QStringList{first}) {
-        const QString to = MenuMirror::join(transfer.folder, MenuMirror::nameOf(source));
-        if (m_selected.isEmpty() && !m_mirror.isHidden(to))
-            m_selected = full(to);
+    m_selected = m_mirror.isHidden(target) ? QString::fromLatin1("") : full(target);
+    return true;
+}
+
+// The same where the user decides about each name that is taken, and all are listed.
+bool tst_MenuRandomOperations::predictWithAssistance(const Transfer &transfer, ModalDriver &modal)
+{
+    const auto isHere = [&](const QString &source) {
+        return MenuMirror::folderOf(source) == transfer.folder;
+    };
+    const bool areAllHere = std::all_of(transfer.sources.begin(), transfer.sources.end(), isHere);
+    for (const QString &source : transfer.sources) {
+        const bool isInside =
+            m_mirror.kindOf(source) == Kind::Folder && MenuMirror::isBelow(transfer.folder, source);
+        if (isInside && !areAllHere)
+            return false;
+    }
+    if (!areThere(transfer.sources))
+        return false;
+    QVector<Arrival> arrivals;
+    if (!settle(transfer, modal, arrivals) || arrivals.isEmpty())
+        return false;
+    arrive(transfer, arrivals);
+    const auto first = std::find_if(arrivals.begin(), arrivals.end(), [this](const Arrival &arrival) {
+        return !m_mirror.isHidden(arrival.target);
+    });
+    m_selected = first == arrivals.end() ? QString::fromLatin1("") : full(first->target);
+    return true;
+}
+
+// False where the user cancels.
+bool tst_MenuRandomOperations::settle(const Transfer &transfer, ModalDriver &modal,
+                                      QVector<Arrival> &arrivals)
+{
+    QStringList promised;
+    for (const QString &source : transfer.sources) {
+        QString name = MenuMirror::nameOf(source);
+        const QString target = MenuMirror::join(transfer.folder, name);
+        const bool isHere = MenuMirror::folderOf(source) == transfer.folder;
+        if (!isHere && (m_mirror.contains(target) || promised.contains(name))) {
+            const QString button = answer(source, target, transfer, promised.contains(name), modal);
+            if (button.isEmpty())
+                return false;
+            if (button == QLatin1String("skipButton"))
+                continue;
+            QStringList taken = promised;
+            for (const QString &other : transfer.sources)
+                taken.append(MenuMirror::nameOf(other));
+            if (button == QLatin1String("keepBothButton"))
+                name = freeName(source, transfer.folder, taken);
+        }
+        promised.append(name);
+        arrivals.append({source, MenuMirror::join(transfer.folder, name), isHere});
     }
     return true;
+}
+
+// The button that is pressed in the question; none to cancel.
+QString tst_MenuRandomOperations::answer(const QString &source, const QString &target,
+                                         const Transfer &transfer, bool isPromised, ModalDriver &modal)
+{
+    const bool isHolding =
+        std::any_of(transfer.sources.begin(), transfer.sources.end(),
+                    [&](const QString &other) { return MenuMirror::isBelow(other, target); });
+    QStringList buttons{QStringLiteral("keepBothButton"), QStringLiteral("skipButton"), QString()};
+    if (!isPromised && !isHolding)
+        buttons += {QStringLiteral("replaceButton"), QStringLiteral("replaceButton")};
+    const QString button = any(buttons);
+    describe(m_step + QStringLiteral("\n%1: %2").arg(source, button));
+    const bool isReplaceable = buttons.size() > 3;
+    modal.handle([button, isReplaceable](QWidget *window) {
+        QCOMPARE(window->windowTitle(), QStringLiteral("Name already taken"));
+        QCOMPARE(window->findChild<QPushButton *>(QStringLiteral("replaceButton")) != nullptr, isReplaceable);
+        if (button.isEmpty())
+            window->close();
+        else
+            window->findChild<QPushButton *>(button)->click();
+    });
+    return button;
+}
+
+QString tst_MenuRandomOperations::freeName(const QString &source, const QString &folder,
+                                           const QStringList &taken) const
+{
+    const QString name = MenuMirror::nameOf(source);
+    const int dot = m_mirror.kindOf(source) == Kind::Folder ? -1 : name.lastIndexOf(QLatin1Char('.'));
+    for (int n = 2;; ++n) {
+        const QString number = QStringLiteral("-%1").arg(n);
+        const QString other = dot > 0 ? name.left(dot) + number + name.mid(dot) : name + number;
+        if (!taken.contains(other) && !m_mirror.contains(MenuMirror::join(folder, other)))
+            return other;
+    }
+}
+
+void tst_MenuRandomOperations::arrive(const Transfer &transfer, const QVector<Arrival> &arrivals)
+{
+    QStringList names;
+    bool isAnyHere = false;
+    for (const Arrival &arrival : arrivals) {
+        isAnyHere = isAnyHere || arrival.isHere;
+        if (transfer.isMove || !arrival.isHere)
+            names.append(MenuMirror::nameOf(arrival.target));
+    }
+    const bool isListed = transfer.following.isNull() ? transfer.isMove && isAnyHere : !names.isEmpty();
+    if (isListed)
+        m_mirror.list(transfer.folder, m_rows.value(transfer.folder), names, transfer.following);
+    for (const Arrival &arrival : arrivals) {
+        if (arrival.isHere)
+            continue;
+        m_mirror.remove(arrival.target);
+        if (transfer.isMove)
+            m_mirror.move(arrival.source, arrival.target);
+        else
+            m_mirror.copy(arrival.source, arrival.target);
+    }
+}
+
+void tst_MenuRandomOperations::duplicate()
+{
+    const QString path = any(shownPaths());
+    if (!m_view->assistance()
+        || (m_mirror.kindOf(path) == Kind::Folder && m_mirror.childrenOf(path).size() > 12))
+        return;
+    describe(QStringLiteral("duplicate %1").arg(path));
+    selectItem(path);
+    const QString folder = MenuMirror::folderOf(path);
+    const QString name = freeName(path, folder, {});
+    action(*m_view, QStringLiteral("duplicateAction"))->trigger();
+    const QStringList rows = m_rows.value(folder);
+    m_mirror.list(folder, rows, name,
+                  rows.value(rows.indexOf(MenuMirror::nameOf(path)) + 1, QString::fromLatin1("")));
+    m_mirror.copy(path, MenuMirror::join(folder, name));
+    m_selected = full(MenuMirror::join(folder, name));
 }
 
 void tst_MenuRandomOperations::paste()
@@ -479,8 +578,10 @@ void tst_MenuRandomOperations::step()
         paste();
     else if (what < 88)
         drop();
-    else if (what < 93)
+    else if (what < 91)
         edit();
+    else if (what < 94)
+        duplicate();
     else
         remove();
 }
