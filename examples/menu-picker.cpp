@@ -4,6 +4,8 @@
 // Lets the user pick an entry of the start menu and prints the command that runs it.
 
 #include <VelMenuDialog.h>
+#include <velcore/dirs.h>
+#include <velintegration/startmenu.h>
 
 #include <QApplication>
 #include <QTextStream>
@@ -11,6 +13,8 @@
 int main(int argc, char **argv)
 {
     QApplication application(argc, argv);
+    // Makes the start menu of a new home, and has it follow the applications that are installed.
+    UpdateStartMenu(GetVelDir(VelDir::StartMenu).c_str(), nullptr);
     VelMenuDialog dialog; // the start menu, read-only, with Ok and Cancel
     if (dialog.exec() != QDialog::Accepted)
         return 1;

@@ -25,9 +25,8 @@ enum ExitStatus { Done = 0, NothingPicked = 1, CannotStart = 2 };
 QString obstacle(const Options &options)
 {
     // Where no application is installed, the menu begins empty.
-    if (options.isStartMenu && !QFileInfo::exists(options.dir)
-        && !CreateStartMenu(QFile::encodeName(options.dir).constData(), nullptr)
-        && !QDir().mkpath(options.dir))
+    if (options.isStartMenu && !UpdateStartMenu(QFile::encodeName(options.dir).constData(), nullptr)
+        && !QFileInfo::exists(options.dir) && !QDir().mkpath(options.dir))
         return QCoreApplication::translate("vel-menuedit", "cannot create the start menu %1")
             .arg(options.dir);
     const QFileInfo info(options.dir);

@@ -75,9 +75,9 @@ QString word(QString text)
 }
 
 // An underscore marks the letter to press; two of them are one to show.
-QString nameOf(const MenuItem &item)
+QString labelOf(const QString &text)
 {
-    return word(plain(item.name).replace(QLatin1Char('_'), QStringLiteral("__")));
+    return word(plain(text).replace(QLatin1Char('_'), QStringLiteral("__")));
 }
 
 void writeIcewm(QString *out, const QVector<MenuItem> &items, int depth)
@@ -88,7 +88,7 @@ void writeIcewm(QString *out, const QVector<MenuItem> &items, int depth)
         // A dash stands for no icon.
         const QString icon =
             item.icon.isEmpty() || !isOnOneLine(item.icon) ? QStringLiteral("-") : word(item.icon);
-        const QString begin = nameOf(item) + QLatin1Char(' ') + icon;
+        const QString begin = labelOf(item.name) + QLatin1Char(' ') + icon;
         *out += indentation(depth);
         if (item.kind == MenuItem::Separator) {
             *out += QLatin1String("separator\n");
@@ -121,11 +121,21 @@ QByteArray MenuFormat::fluxbox(const MenuItem &menu)
     return (out + QLatin1String("[endencoding]\n")).toUtf8();
 }
 
+QByteArray MenuFormat::fluxboxText(const QString &text)
+{
+    return "[encoding] {UTF-8}\n[nop] " + field('(', plain(text), ')').toUtf8() + "\n[endencoding]\n";
+}
+
 QByteArray MenuFormat::icewm(const MenuItem &menu)
 {
     QString out;
     writeIcewm(&out, menu.children, 0);
     return out.toUtf8();
+}
+
+QByteArray MenuFormat::icewmText(const QString &text)
+{
+    return "prog " + labelOf(text).toUtf8() + " - true\n";
 }
 
 QByteArray MenuFormat::rofi(const MenuItem &menu)

@@ -10,11 +10,15 @@ namespace {
 using MenuFormat::Format;
 
 constexpr Format Formats[] = {
-    {"dmenu", true, false, false, MenuFormat::dmenu},     {"fluxbox", true, true, true, MenuFormat::fluxbox},
-    {"icewm", true, false, true, MenuFormat::icewm},      {"json", false, false, false, MenuFormat::json},
-    {"jwm", true, false, false, MenuFormat::jwm},         {"labwc", true, false, false, MenuFormat::openbox},
-    {"openbox", true, false, false, MenuFormat::openbox}, {"rofi", true, false, false, MenuFormat::rofi},
-    {"text", false, false, false, MenuFormat::text},
+    {"dmenu", true, false, false, MenuFormat::dmenu, nullptr},
+    {"fluxbox", true, true, true, MenuFormat::fluxbox, MenuFormat::fluxboxText},
+    {"icewm", true, false, true, MenuFormat::icewm, MenuFormat::icewmText},
+    {"json", false, false, false, MenuFormat::json, nullptr},
+    {"jwm", true, false, false, MenuFormat::jwm, MenuFormat::jwmText},
+    {"labwc", true, false, false, MenuFormat::openbox, MenuFormat::openboxText},
+    {"openbox", true, false, false, MenuFormat::openbox, MenuFormat::openboxText},
+    {"rofi", true, false, false, MenuFormat::rofi, nullptr},
+    {"text", false, false, false, MenuFormat::text, nullptr},
 };
 
 } // namespace

@@ -19,6 +19,8 @@ struct Format
     bool hasPicturesOnly; ///< the icons have to be PNG or XPM pictures
     bool hasLines; ///< a path with a line feed cannot be written
     QByteArray (*print)(const MenuItem &menu);
+    QByteArray (*printText)(
+        const QString &text); ///< a menu with nothing but a text; null where there is none
 };
 
 /// The form \a name; null when there is none.
@@ -28,15 +30,23 @@ QStringList names();
 
 /// A pipe menu of the Openbox window manager, which labwc reads as well; an item runs through vel-open.
 QByteArray openbox(const MenuItem &menu);
+/// The same with nothing in it but a text.
+QByteArray openboxText(const QString &text);
 
 /// What stands between "begin" and "end" in a menu file of the Fluxbox window manager.
 QByteArray fluxbox(const MenuItem &menu);
+/// The same with nothing in it but a text.
+QByteArray fluxboxText(const QString &text);
 
 /// What a "menuprog" of the IceWM window manager prints.
 QByteArray icewm(const MenuItem &menu);
+/// The same with nothing in it but a text.
+QByteArray icewmText(const QString &text);
 
 /// What the "Dynamic" and "Include" tags of the JWM window manager read.
 QByteArray jwm(const MenuItem &menu);
+/// The same with nothing in it but a text.
+QByteArray jwmText(const QString &text);
 
 /// The MenuLines, each with its icon as rofi's dmenu mode takes it.
 QByteArray rofi(const MenuItem &menu);

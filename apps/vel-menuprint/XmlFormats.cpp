@@ -85,16 +85,15 @@ void writeJwm(QXmlStreamWriter *xml, const QVector<MenuItem> &items)
     }
 }
 
-using WriteItems = void (*)(QXmlStreamWriter *, const QVector<MenuItem> &);
-
-QByteArray document(const QString &root, const MenuItem &menu, WriteItems write)
+template <typename Write>
+QByteArray document(const QString &root, Write write)
 {
     QByteArray out;
     QXmlStreamWriter xml(&out);
     xml.setAutoFormatting(true);
     xml.writeStartDocument();
     xml.writeStartElement(root);
-    write(&xml, menu.children);
+    write(&xml);
     xml.writeEndElement();
     xml.writeEndDocument();
     return out;
@@ -104,10 +103,29 @@ QByteArray document(const QString &root, const MenuItem &menu, WriteItems write)
 
 QByteArray MenuFormat::openbox(const MenuItem &menu)
 {
-    return document(QStringLiteral("openbox_pipe_menu"), menu, writeOpenbox);
+    return document(QStringLiteral("openbox_pipe_menu"),
+                    [&menu](QXmlStreamWriter *xml) { writeOpenbox(xml, menu.children); });
+}
+
+QByteArray MenuFormat::openboxText(const QString &text)
+{
+    return document(QStringLiteral("openbox_pipe_menu"), [&text](QXmlStreamWriter *xml) {
+        xml->writeEmptyElement(QStringLiteral("separator"));
+        xml->writeAttribute(QStringLiteral("label"), label(text));
+    });
 }
 
 QByteArray MenuFormat::jwm(const MenuItem &menu)
 {
-    return document(QStringLiteral("JWM"), menu, writeJwm);
+    return document(QStringLiteral("JWM"), [&menu](QXmlStreamWriter *xml) { writeJwm(xml, menu.children); });
+}
+
+QByteArray MenuFormat::jwmText(const QString &text)
+{
+    return document(QStringLiteral("JWM"), [&text](QXmlStreamWriter *xml) {
+        xml->writeStartElement(QStringLiteral("Program"));
+        xml->writeAttribute(QStringLiteral("label"), label(text));
+        xml->writeCharacters(QStringLiteral("true"));
+        xml->writeEndElement();
+    });
 }

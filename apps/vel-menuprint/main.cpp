@@ -11,9 +11,11 @@
 
 #include <support/Program.h>
 #include <velcore/dirs.h>
+#include <velintegration/startmenu.h>
 
 #include <QCommandLineParser>
 #include <QCoreApplication>
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 
@@ -36,6 +38,7 @@ struct Options
     QString iconTheme;
     int iconSize = 0;
     bool isToRun = false;
+    bool isStartMenu = false;
     QString error; ///< what is wrong with the command line; empty when nothing is
 };
 
@@ -97,12 +100,35 @@ Options parse()
         return options;
     const QStringList arguments = parser.positionalArguments();
     options.format = parser.value(switches.format);
-    options.dir = arguments.value(0, QString::fromStdString(GetVelDir(VelDir::StartMenu)));
+    const QString startMenu = QFile::decodeName(GetVelDir(VelDir::StartMenu).c_str());
+    options.dir = arguments.value(0, startMenu);
+    options.isStartMenu = QDir::cleanPath(QDir().absoluteFilePath(options.dir)) == startMenu;
     options.iconTheme = parser.value(switches.iconTheme);
     options.iconSize = parser.value(switches.iconSize).toInt();
     options.isToRun = parser.isSet(switches.run);
     options.error = problemOf(options, arguments);
     return options;
+}
+
+QString noApplication()
+{
+    return QCoreApplication::translate("vel-menuprint",
+                                       "The start menu is empty: no application is installed.");
+}
+
+// Has the start menu follow what is installed, also one that is not there yet. The reason if it is
+// empty because of that.
+QString followApplications(const Options &options)
+{
+    if (!options.isStartMenu || UpdateStartMenu(QFile::encodeName(options.dir).constData(), nullptr))
+        return {};
+    const int reason = errno;
+    if (reason == ENODATA)
+        return noApplication();
+    if (QFileInfo::exists(options.dir))
+        return {};
+    return QCoreApplication::translate("vel-menuprint", "The start menu %1 cannot be made: %2")
+        .arg(options.dir, qt_error_string(reason));
 }
 
 // Whether the directory can be printed; the reason if not.
@@ -154,16 +180,42 @@ void tellOfLongPaths(const MenuItem &menu)
         tellOfLongPaths(child);
 }
 
-int print(const MenuItem &menu, const Options &options)
+bool write(const QByteArray &out)
+{
+    return std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
+        && std::fflush(stdout) == 0;
+}
+
+// Who opens a menu and finds nothing in it has to see why.
+int failToStart(const Options &options, const QString &why)
+{
+    const MenuFormat::Format &format = *MenuFormat::find(options.format);
+    if (options.isStartMenu && !options.isToRun && format.printText)
+        write(format.printText(why));
+    return Program::fail(why, CannotStart);
+}
+
+QByteArray printedEmpty(const MenuFormat::Format &format, const Options &options, const MenuItem &menu,
+                        const QString &whyEmpty)
+{
+    const QString text = whyEmpty.isEmpty()
+        ? QCoreApplication::translate("vel-menuprint", "The start menu is empty: nothing in %1 is shown.")
+              .arg(options.dir)
+        : whyEmpty;
+    Program::printError(text);
+    return format.printText ? format.printText(text) : format.print(menu);
+}
+
+int print(const MenuItem &menu, const Options &options, const QString &whyEmpty)
 {
     const MenuFormat::Format &format = *MenuFormat::find(options.format);
     const MenuItem shown = prepared(menu, format, options);
     if (format.hasLines)
         tellOfLongPaths(shown);
-    const QByteArray out = format.print(shown);
-    const bool written = std::fwrite(out.constData(), 1, size_t(out.size()), stdout) == size_t(out.size())
-        && std::fflush(stdout) == 0;
-    return written ? Done : Program::fail(qt_error_string(errno), CannotWrite);
+    const bool isToBeExplained = options.isStartMenu && shown.children.isEmpty();
+    const bool isWritten =
+        write(isToBeExplained ? printedEmpty(format, options, shown, whyEmpty) : format.print(shown));
+    return isWritten ? Done : Program::fail(qt_error_string(errno), CannotWrite);
 }
 
 // The chosen line, without its end; empty when nothing was chosen.
@@ -204,12 +256,13 @@ int runChosen(const MenuItem &menu)
 
 int run(const Options &options)
 {
+    const QString whyEmpty = followApplications(options);
     const QFileInfo directory(options.dir);
-    const QString why = obstacle(directory);
+    const QString why = directory.exists() || whyEmpty.isEmpty() ? obstacle(directory) : whyEmpty;
     if (!why.isEmpty())
-        return Program::fail(why, CannotStart);
+        return failToStart(options, why);
     const MenuItem menu = readMenu(directory);
-    return options.isToRun ? runChosen(menu) : print(menu, options);
+    return options.isToRun ? runChosen(menu) : print(menu, options, whyEmpty);
 }
 
 } // namespace

@@ -13,6 +13,7 @@
 #include "SourcesFile.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <utility>
 
 namespace fs = std::filesystem;
@@ -100,6 +101,7 @@ Result StartMenuUpdate::follow() const
 {
     SourcesFile file(m_menu);
     const ApplicationsLook look = ApplicationsLook::now();
+    errno = ENODATA;
     if (look.found.all.empty() || !file.lock())
         return Result::Failed;
     if (file.isAlone())

@@ -28,6 +28,7 @@ private Q_SLOTS:
     void beginsWithAnEmptyStartMenuWithoutApplications();
     void failsWhenTheStartMenuCannotBeCreated();
     void leavesAStartMenuThatIsThere();
+    void showsWhatWasInstalledSince();
     void tellsTheWindowManagerWhenItCloses_data();
     void tellsTheWindowManagerWhenItCloses();
     void closesQuietlyWhenNobodyIsTold();
@@ -265,6 +266,22 @@ void tst_vel_menuedit::leavesAStartMenuThatIsThere()
     QVERIFY(finish(program));
     QCOMPARE(QDir(standardDir("startmenu")).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
              QStringList{QStringLiteral("own.desktop")});
+}
+
+void tst_vel_menuedit::showsWhatWasInstalledSince()
+{
+    m_environment.insert(QStringLiteral("XDG_DATA_DIRS"), path(QStringLiteral("data")));
+    const QByteArray application = "[Desktop Entry]\nType=Application\nName=x\nExec=true\nCategories=Game;\n";
+    CommandChannel channel;
+    for (const char *name : {"one", "two"}) {
+        write(QStringLiteral("data/applications/%1.desktop").arg(QLatin1String(name)), application);
+        QProcess program;
+        start(program, {});
+        press(windowNamed(titleOf(standardDir("startmenu"))), QStringLiteral("Escape"));
+        QVERIFY(finish(program));
+        QVERIFY(QFile::exists(standardDir("startmenu")
+                              + QStringLiteral("/Game/%1.desktop").arg(QLatin1String(name))));
+    }
 }
 
 void tst_vel_menuedit::tellsTheWindowManagerWhenItCloses_data()

@@ -53,6 +53,34 @@ int itemCount(const MenuItem &item)
     return count;
 }
 
+// A home of its own, for as long as this object lives.
+class Home
+{
+public:
+    explicit Home(const QString &folder)
+    {
+        const QPair<const char *, const char *> places[] = {
+            {"VEL_CONFIG_HOME", "/config"}, {"XDG_DATA_HOME", "/data"}, {"XDG_DATA_DIRS", "/none"}};
+        for (const auto &place : places) {
+            m_before.append({place.first, qgetenv(place.first)});
+            qputenv(place.first, QFile::encodeName(folder) + place.second);
+        }
+    }
+    ~Home()
+    {
+        for (const auto &[name, value] : m_before) {
+            if (value.isEmpty())
+                qunsetenv(name);
+            else
+                qputenv(name, value);
+        }
+    }
+    Q_DISABLE_COPY_MOVE(Home)
+
+private:
+    QVector<QPair<const char *, QByteArray>> m_before;
+};
+
 QByteArray entry(const QByteArray &name, const QByteArray &more = QByteArray())
 {
     return "[Desktop Entry]\nType=Application\nName=" + name + "\nExec=true\n" + more;
@@ -77,6 +105,14 @@ private Q_SLOTS:
     void tellsThatAMenuIsNotWhole();
     void namesFoldersAsTheirDirectoryFileSays();
     void printsTheStartMenuWithoutADirectory();
+    void makesTheStartMenuOfAFreshHome_data();
+    void makesTheStartMenuOfAFreshHome();
+    void showsWhatWasInstalledSince();
+    void saysWhyThereIsNoStartMenu_data();
+    void saysWhyThereIsNoStartMenu();
+    void saysThatTheStartMenuIsEmpty_data();
+    void saysThatTheStartMenuIsEmpty();
+    void changesNoOtherDirectory();
     void printsText();
     void printsNoControlCharacterAsText();
     void tellsNoControlCharacterOfAPath();
@@ -259,6 +295,114 @@ void tst_vel_menuprint::printsTheStartMenuWithoutADirectory()
     const Result result = print({});
     QCOMPARE(result.status, 0);
     QCOMPARE(result.out, QByteArray("startmenu/\n    Start\n"));
+}
+
+void tst_vel_menuprint::makesTheStartMenuOfAFreshHome_data()
+{
+    QTest::addColumn<QString>("format");
+    QTest::addColumn<QByteArray>("expected");
+    QTest::newRow("text") << "text" << QByteArray("    Games/\n        One\n");
+    QTest::newRow("openbox") << "openbox" << QByteArray("<item label=\"One\"");
+    QTest::newRow("json") << "json" << QByteArray("\"name\": \"One\"");
+}
+
+void tst_vel_menuprint::makesTheStartMenuOfAFreshHome()
+{
+    QFETCH(QString, format);
+    QFETCH(QByteArray, expected);
+    const Home home(folder());
+    write(QStringLiteral("data/applications/one.desktop"), entry("One", "Categories=Game;\n"));
+    const Result result = print({QStringLiteral("--format"), format});
+    QCOMPARE(result.status, 0);
+    QCOMPARE(result.err, QByteArray());
+    QVERIFY2(result.out.contains(expected), result.out.constData());
+}
+
+void tst_vel_menuprint::showsWhatWasInstalledSince()
+{
+    const Home home(folder());
+    write(QStringLiteral("data/applications/one.desktop"), entry("One", "Categories=Game;\n"));
+    QCOMPARE(print({}).out, QByteArray("Start Menu/\n    Games/\n        One\n"));
+    write(QStringLiteral("data/applications/two.desktop"), entry("Two", "Categories=Game;\n"));
+    const QByteArray expected("Start Menu/\n    Games/\n        One\n        Two\n");
+    QCOMPARE(print({}).out, expected);
+    // Also when the directory is named.
+    write(QStringLiteral("data/applications/three.desktop"), entry("Apple", "Categories=Game;\n"));
+    QVERIFY(print({path(QStringLiteral("config/startmenu/"))}).out.contains("Apple"));
+}
+
+void tst_vel_menuprint::saysWhyThereIsNoStartMenu_data()
+{
+    QTest::addColumn<bool>("hasApplication");
+    QTest::addColumn<QByteArray>("why");
+    QTest::newRow("no application") << false
+                                    << QByteArray("The start menu is empty: no application is installed.");
+    QTest::newRow("no place") << true << QByteArray("The start menu @/config/startmenu cannot be made: ");
+}
+
+void tst_vel_menuprint::saysWhyThereIsNoStartMenu()
+{
+    QFETCH(bool, hasApplication);
+    QFETCH(QByteArray, why);
+    const Home home(folder());
+    if (hasApplication) {
+        write(QStringLiteral("data/applications/one.desktop"), entry("One"));
+        write(QStringLiteral("config"), "a file in the way");
+    }
+    why.replace('@', QFile::encodeName(folder()));
+    const Result plain = print({});
+    QCOMPARE(plain.status, 2);
+    QCOMPARE(plain.out, QByteArray());
+    QVERIFY2(plain.err.startsWith("vel-menuprint: " + why), plain.err.constData());
+    QCOMPARE(plain.err.count('\n'), 1);
+    const Result pipe = print({QStringLiteral("--format"), QStringLiteral("openbox")});
+    QCOMPARE(pipe.status, 2);
+    QXmlStreamReader xml(pipe.out);
+    QVERIFY(xml.readNextStartElement() && xml.readNextStartElement());
+    QCOMPARE(xml.name().toString(), QStringLiteral("separator"));
+    QVERIFY(xml.attributes().value(QLatin1String("label")).toUtf8().startsWith(why));
+}
+
+void tst_vel_menuprint::saysThatTheStartMenuIsEmpty_data()
+{
+    QTest::addColumn<bool>("hasApplication");
+    QTest::addColumn<QByteArray>("why");
+    QTest::newRow("no application") << false
+                                    << QByteArray("The start menu is empty: no application is installed.");
+    QTest::newRow("all deleted") << true << QByteArray("The start menu is empty: nothing in @ is shown.");
+}
+
+void tst_vel_menuprint::saysThatTheStartMenuIsEmpty()
+{
+    QFETCH(bool, hasApplication);
+    QFETCH(QByteArray, why);
+    const Home home(folder());
+    const QString menu = path(QStringLiteral("config/startmenu"));
+    if (hasApplication) {
+        write(QStringLiteral("data/applications/one.desktop"), entry("One"));
+        QCOMPARE(print({}).status, 0);
+        QVERIFY(QDir(menu + QStringLiteral("/Other")).removeRecursively());
+    } else {
+        QVERIFY(QDir().mkpath(menu));
+    }
+    why.replace('@', QFile::encodeName(menu));
+    const Result plain = print({});
+    QCOMPARE(plain.status, 0);
+    QCOMPARE(plain.out.count('\n'), 1);
+    QCOMPARE(plain.err, "vel-menuprint: " + why + '\n');
+    const Result pipe = print({QStringLiteral("--format"), QStringLiteral("openbox")});
+    QVERIFY2(pipe.out.contains("label=\"" + why + '"'), pipe.out.constData());
+}
+
+void tst_vel_menuprint::changesNoOtherDirectory()
+{
+    const Home home(folder());
+    write(QStringLiteral("data/applications/one.desktop"), entry("One"));
+    QVERIFY(QDir().mkpath(path(QStringLiteral("other"))));
+    print({path(QStringLiteral("other"))});
+    QVERIFY(QDir(path(QStringLiteral("other"))).isEmpty());
+    QVERIFY(!QFile::exists(path(QStringLiteral("other.sources"))));
+    QVERIFY(!QFile::exists(path(QStringLiteral("config"))));
 }
 
 void tst_vel_menuprint::printsText()

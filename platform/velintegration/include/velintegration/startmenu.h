@@ -54,7 +54,7 @@ VELINTEGRATION_EXPORT bool CreateStartMenu(const char *menuDir, const char *temp
  *
  * @param menuDir the folder of the menu; see CreateStartMenu()
  * @param templateDir what is copied where there is no menu yet; may be null or empty
- * @return false when no application is installed, which changes nothing, or not everything could be
- *         done
+ * @return false when no application is installed, which changes nothing and for which errno is ENODATA,
+ *         or not everything could be done
  */
 VELINTEGRATION_EXPORT bool UpdateStartMenu(const char *menuDir, const char *templateDir);
