@@ -3,6 +3,7 @@
 
 #include "ActionIds.h"
 
+#include <QHash>
 #include <QSet>
 
 #include <algorithm>
@@ -57,13 +58,28 @@ QString usual(const QString &id)
     return result.isEmpty() ? QStringLiteral("action") : result;
 }
 
-QString unused(const QString &id, const QSet<QString> &taken)
+// Ids that no other action has; an entry may have thousands that are alike.
+class UnusedIds
 {
-    QString proposal = id;
-    for (int number = 2; taken.contains(proposal); ++number)
-        proposal = id + QLatin1Char('-') + QString::number(number);
-    return proposal;
-}
+public:
+    explicit UnusedIds(const QStringList &taken)
+        : m_taken(taken.begin(), taken.end())
+    {
+    }
+
+    QString take(const QString &id)
+    {
+        QString proposal = id;
+        for (int &number = m_numbers[id]; m_taken.contains(proposal); ++number)
+            proposal = id + QLatin1Char('-') + QString::number(number + 2);
+        m_taken.insert(proposal);
+        return proposal;
+    }
+
+private:
+    QSet<QString> m_taken;
+    QHash<QString, int> m_numbers; // tried already
+};
 
 VelUIDesktopAction withId(const VelUIDesktopAction &action, const QString &id)
 {
@@ -82,7 +98,7 @@ VelUIDesktopAction withId(const VelUIDesktopAction &action, const QString &id)
 
 QVector<ActionIds::Problem> ActionIds::problems(const QStringList &ids)
 {
-    QSet<QString> taken(ids.begin(), ids.end());
+    UnusedIds unused(ids);
     QSet<QString> earlier;
     QVector<Problem> problems;
     for (int row = 0; row < ids.size(); ++row) {
@@ -93,9 +109,7 @@ QVector<ActionIds::Problem> ActionIds::problems(const QStringList &ids)
         earlier.insert(id);
         if (!fault)
             continue;
-        const QString proposal = unused(usual(id), taken);
-        taken.insert(proposal);
-        problems.append({row, id, *fault, proposal});
+        problems.append({row, id, *fault, unused.take(usual(id))});
     }
     return problems;
 }

@@ -20,6 +20,7 @@ private Q_SLOTS:
     void knowsWhatTheRecordWouldLose_data();
     void knowsWhatTheRecordWouldLose();
     void repairsTheIdsAndNothingElse();
+    void repairsThousandsThatAreAlike();
 };
 
 Q_DECLARE_METATYPE(QVector<int>)
@@ -123,6 +124,16 @@ void tst_ActionIds::repairsTheIdsAndNothingElse()
     QCOMPARE(after.at(1).getExec(), action.getExec());
     QCOMPARE(after.at(1).getOnlyShowIn(), action.getOnlyShowIn());
     QCOMPARE(after.at(1).getNotShowIn(), action.getNotShowIn());
+}
+
+void tst_ActionIds::repairsThousandsThatAreAlike()
+{
+    QStringList ids;
+    for (int i = 0; i < 30000; ++i)
+        ids.append(QString(QChar(0x4e00 + i % 20000)).repeated(1 + i / 20000));
+    const QVector<ActionIds::Problem> problems = ActionIds::problems(ids); // within the time of a test
+    QCOMPARE(problems.size(), ids.size());
+    QCOMPARE(problems.constLast().proposal, QStringLiteral("action-30000"));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_ActionIds)
