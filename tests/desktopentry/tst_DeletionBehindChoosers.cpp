@@ -15,6 +15,7 @@
 
 #include <QFileDialog>
 #include <QPointer>
+#include <QScrollArea>
 #include <QToolButton>
 
 using namespace FormDriving;
@@ -32,6 +33,8 @@ private Q_SLOTS:
     void survivesItBehindTheFileChooser();
     void survivesItBehindTheFileChooserOfAnAction_data();
     void survivesItBehindTheFileChooserOfAnAction();
+    void survivesItBehindAChooserOfTheAssistance_data();
+    void survivesItBehindAChooserOfTheAssistance();
     void survivesItBehindTheIconChooser_data();
     void survivesItBehindTheIconChooser();
     void survivesItBehindTheMenuPicker_data();
@@ -79,8 +82,10 @@ void tst_DeletionBehindChoosers::takeAway(bool onlyTheForm)
 
 void tst_DeletionBehindChoosers::clickButton(QWidget *button)
 {
-    button->setFocus(); // has the form show it
-    QTRY_VERIFY_WITH_TIMEOUT(!button->visibleRegion().isEmpty(), 20000);
+    auto *area = child<QScrollArea>(m_dialog, "scrollArea");
+    if (area->widget()->isAncestorOf(button))
+        area->ensureWidgetVisible(button);
+    QTRY_VERIFY_WITH_TIMEOUT(button->visibleRegion().contains(button->rect().center()), 20000);
     XDoTool::click(button);
 }
 
@@ -124,6 +129,32 @@ void tst_DeletionBehindChoosers::survivesItBehindTheFileChooserOfAnAction()
         XDoTool::click(child<QPushButton>(actions, "addButton"));
     });
     clickButton(child<QToolButton>(m_dialog, "editActionsButton"));
+    QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
+    QCOMPARE(m_dialog.isNull(), !onlyTheForm);
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindAChooserOfTheAssistance_data()
+{
+    QTest::addColumn<QString>("button");
+    QTest::addColumn<bool>("onlyTheForm");
+    for (const char *button : {"chooseButton_Exec", "chooseButton_TryExec", "chooseButton_MimeType",
+                               "chooseButton_Categories", "chooseButton_OnlyShowIn", "newLanguageButton"}) {
+        QTest::addRow("%s, the dialog", button) << QString::fromLatin1(button) << false;
+        QTest::addRow("%s, the form", button) << QString::fromLatin1(button) << true;
+    }
+}
+
+void tst_DeletionBehindChoosers::survivesItBehindAChooserOfTheAssistance()
+{
+    QFETCH(QString, button);
+    QFETCH(bool, onlyTheForm);
+    // Nothing is to be said of it, which would move the rows.
+    QVERIFY(m_dialog->setDesktopEntryPath(
+        write(QStringLiteral("b.desktop"), plainApplication + "Categories=Utility;\n")));
+    m_dialog->setAssistance(true);
+    ModalDriver modal;
+    modal.handle([this, onlyTheForm](QWidget *) { takeAway(onlyTheForm); });
+    clickButton(child<QToolButton>(m_dialog, qPrintable(button)));
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
     QCOMPARE(m_dialog.isNull(), !onlyTheForm);
 }
