@@ -74,6 +74,11 @@ FormFindings::FormFindings(EntryFormAssistance *assistance, Form form)
     connect(&m_soon, &QTimer::timeout, this, &FormFindings::check);
     connect(assistance, &EntryFormAssistance::recordChanged, &m_soon, [this] { m_soon.start(0); });
     connect(&m_lookups, &CachedLookups::known, this, &FormFindings::check);
+    // Whoever comes back may have brought what was missing.
+    connect(qApp, &QGuiApplication::applicationStateChanged, this, [this](Qt::ApplicationState state) {
+        if (state == Qt::ApplicationActive)
+            m_soon.start(0);
+    });
     for (const int step : {1, -1}) {
         const QKeySequence key(step > 0 ? Qt::Key_F8 : int(Qt::SHIFT) | int(Qt::Key_F8));
         auto *const shortcut = new QShortcut(key, m_form.widget);

@@ -97,6 +97,8 @@ private Q_SLOTS:
     void saysUnderTheActionsWhatAnActionIsAbout();
     void saysUnderTheLastRowWhatNoRowIsAbout();
     void goesToTheNextAndThePrevious();
+    void keepsTheFieldInItsPlaceThatTheUserTypesIn();
+    void looksAgainWhenTheUserComesBack();
     void staysWithTheFieldThatIsMeantAfterTheBox_data();
     void staysWithTheFieldThatIsMeantAfterTheBox();
     void offersNoRepairOfWhatIsReadOnly();
@@ -304,6 +306,36 @@ void tst_FormFindings::goesToTheNextAndThePrevious()
         QTRY_VERIFY_WITH_TIMEOUT(previous->hasFocus(), Patience);
     }
     QTRY_VERIFY_WITH_TIMEOUT(isInView(dialog.get(), lineOf(dialog.get(), "Categories")), Patience);
+}
+
+void tst_FormFindings::keepsTheFieldInItsPlaceThatTheUserTypesIn()
+{
+    const auto dialog = edit(Good + "Icon=a.png\n");
+    QVERIFY(dialog);
+    dialog->resize(560, 300);
+    QTRY_COMPARE_WITH_TIMEOUT(said(dialog.get(), "Icon").size(), 1, Patience);
+    QLineEdit *version = line(dialog.get(), "versionEdit");
+    version->setFocus();
+    QTRY_VERIFY_WITH_TIMEOUT(isInView(dialog.get(), version), Patience);
+    const QPoint place = version->mapTo(dialog.get(), QPoint());
+    pathLine(dialog.get(), "execEdit")->setText(QStringLiteral("true 'a' %x"));
+    QTRY_COMPARE_WITH_TIMEOUT(said(dialog.get(), "Exec").size(), 2, Patience);
+    QCOMPARE(version->mapTo(dialog.get(), QPoint()), place);
+    pathLine(dialog.get(), "execEdit")->setText(QStringLiteral("true"));
+    QTRY_VERIFY_WITH_TIMEOUT(said(dialog.get(), "Exec").isEmpty(), Patience);
+    QVERIFY(isInView(dialog.get(), version));
+}
+
+void tst_FormFindings::looksAgainWhenTheUserComesBack()
+{
+    const auto dialog = edit("[Desktop Entry]\nType=Application\nName=Program\nExec="
+                             + path(QStringLiteral("run")).toUtf8() + '\n');
+    QVERIFY(dialog);
+    QTRY_COMPARE_WITH_TIMEOUT(said(dialog.get(), "Exec").size(), 1, Patience);
+    makeProgram(QStringLiteral("run"));
+    QTest::qWait(5500); // answers are taken for good so long
+    Q_EMIT qApp->applicationStateChanged(Qt::ApplicationActive);
+    QTRY_VERIFY_WITH_TIMEOUT(said(dialog.get(), "Exec").isEmpty(), Patience);
 }
 
 void tst_FormFindings::staysWithTheFieldThatIsMeantAfterTheBox_data()
