@@ -5,6 +5,8 @@
 
 #include "MarkedTextView.h"
 
+#include <frame/DialogSize.h>
+
 #include <QDialogButtonBox>
 #include <QEvent>
 #include <QLabel>
@@ -32,7 +34,7 @@ EntryTextDialog::EntryTextDialog(EntryFormHost &form, const QList<QAction *> &hi
     layout->addWidget(m_view);
     layout->addWidget(m_summary);
     layout->addWidget(buttons);
-    resize(560, 400);
+    DialogSize::restore(*this, QStringLiteral("EntryTextDialog"), QSize(560, 400));
 
     // Several signals may tell of one edit.
     m_soon.setSingleShot(true);
@@ -41,6 +43,11 @@ EntryTextDialog::EntryTextDialog(EntryFormHost &form, const QList<QAction *> &hi
     connect(&m_form, &EntryFormHost::recordChanged, &m_soon, QOverload<>::of(&QTimer::start));
     m_form.form()->installEventFilter(this);
     refresh();
+}
+
+EntryTextDialog::~EntryTextDialog()
+{
+    DialogSize::remember(*this, QStringLiteral("EntryTextDialog"));
 }
 
 // It goes with the window that the form is in.

@@ -25,6 +25,9 @@ public:
     /// \a history takes back what was done in the form, here, too.
     EntryTextDialog(EntryFormHost &form, const QList<QAction *> &history);
 
+    /// Remembers the size.
+    ~EntryTextDialog() override;
+
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:

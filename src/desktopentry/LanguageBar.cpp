@@ -96,13 +96,35 @@ void LanguageBar::addButton(QAbstractButton *button)
     m_line->addWidget(button);
 }
 
+// Few edits change what is told: no other takes time.
 void LanguageBar::refresh()
 {
+    const Coverage now = coverage();
+    if (m_box->count() > 0 && now == m_coverage)
+        return;
+    m_coverage = now;
+    QVector<Item> items{itemOf(QString())};
+    const QStringList languages = otherLanguages();
+    for (const QString &language : languages)
+        items.append(itemOf(language));
+    showItems(items);
+    m_note->setText(note());
+    m_box->setAccessibleDescription(m_note->text());
+}
+
+LanguageBar::Coverage LanguageBar::coverage() const
+{
     const VelUIDesktopEntry entry = m_form.record();
-    showItems(itemsOf(entry));
-    const QString note = noteOf(entry);
-    m_note->setText(note);
-    m_box->setAccessibleDescription(note);
+    Coverage coverage;
+    coverage.shown = m_rows.language();
+    const QStringList keys = m_rows.keys();
+    for (const QString &key : keys) {
+        coverage.languages.insert(key, entry.getLanguages(key));
+        coverage.inForce.insert(key, entry.getLanguageInForce(key));
+        if (!isEmpty(Translations::baseValue(entry, key)))
+            coverage.texts.append(key);
+    }
+    return coverage;
 }
 
 void LanguageBar::showItems(const QVector<Item> &items)
@@ -126,51 +148,38 @@ void LanguageBar::showItems(const QVector<Item> &items)
     }
 }
 
-QStringList LanguageBar::languagesOf(const VelUIDesktopEntry &entry) const
+QStringList LanguageBar::otherLanguages() const
 {
     QStringList languages;
-    QStringList own;
-    const QStringList keys = m_rows.keys();
-    for (const QString &key : keys) {
-        languages.append(entry.getLanguages(key));
-        own.append(Translations::ownLanguage(entry, key));
-    }
+    for (const QStringList &existing : m_coverage.languages)
+        languages.append(existing);
     if (!m_rows.language().isEmpty())
         languages.append(m_rows.language());
     languages.removeDuplicates();
-    own.removeDuplicates();
-    // It stands at the top, unless the user sees several languages at once.
-    if (own == QStringList{ownCode()} && m_rows.language() != ownCode())
+    // The user's own stands at the top, unless the user sees several languages at once.
+    const bool seesOthers =
+        std::any_of(m_coverage.inForce.begin(), m_coverage.inForce.end(),
+                    [](const QString &seen) { return !seen.isEmpty() && seen != ownCode(); });
+    if (!seesOthers && m_rows.language() != ownCode())
         languages.removeOne(ownCode());
     std::sort(languages.begin(), languages.end());
     return languages;
 }
 
-QVector<LanguageBar::Item> LanguageBar::itemsOf(const VelUIDesktopEntry &entry) const
-{
-    QVector<Item> items{itemOf(entry, QString())};
-    const QStringList languages = languagesOf(entry);
-    for (const QString &language : languages)
-        items.append(itemOf(entry, language));
-    return items;
-}
-
-LanguageBar::Item LanguageBar::itemOf(const VelUIDesktopEntry &entry, const QString &language) const
+LanguageBar::Item LanguageBar::itemOf(const QString &language) const
 {
     int count = 0;
     int total = 0;
-    bool hasIcon = false;
-    const QStringList keys = m_rows.keys();
-    for (const QString &key : keys) {
-        const QString shown = language.isEmpty() ? entry.getLanguageInForce(key) : language;
-        const bool isTranslated = !shown.isEmpty() && !isEmpty(Translations::value(entry, key, shown));
-        if (key == IconKey)
-            hasIcon = isTranslated;
-        else if (isTranslated || !isEmpty(Translations::baseValue(entry, key)))
-            ++total;
-        count += isTranslated && key != IconKey;
+    bool exists = false;
+    for (auto key = m_coverage.languages.begin(); key != m_coverage.languages.end(); ++key) {
+        const bool isTranslated =
+            language.isEmpty() ? !m_coverage.inForce.value(key.key()).isEmpty() : key->contains(language);
+        exists = exists || isTranslated;
+        if (key.key() == IconKey)
+            continue;
+        count += isTranslated;
+        total += isTranslated || m_coverage.texts.contains(key.key());
     }
-    const bool exists = count > 0 || hasIcon;
     return {language, textOf(language, exists, count, total), exists};
 }
 
@@ -188,13 +197,12 @@ QString LanguageBar::textOf(const QString &language, bool exists, int count, int
     return tr("%1 (%2): no text yet").arg(name, code);
 }
 
-QString LanguageBar::noteOf(const VelUIDesktopEntry &entry) const
+QString LanguageBar::note() const
 {
     LanguageNote::Languages languages;
-    const QStringList keys = m_rows.keys();
-    for (const QString &key : keys) {
-        if (key != IconKey && !isEmpty(Translations::baseValue(entry, key)))
-            languages.insert(key, entry.getLanguages(key));
+    for (const QString &key : m_coverage.texts) {
+        if (key != IconKey)
+            languages.insert(key, m_coverage.languages.value(key));
     }
     return LanguageNote::text(m_rows.language().isEmpty() ? ownCode() : m_rows.language(), languages);
 }

@@ -4,7 +4,9 @@
 #pragma once
 
 #include "EntryFormHost.h"
+#include "LanguageNote.h"
 
+#include <QMap>
 #include <QStringList>
 #include <QWidget>
 
@@ -30,6 +32,20 @@ public:
     void addButton(QAbstractButton *button);
 
 private:
+    // What is told of an entry.
+    struct Coverage
+    {
+        QString shown; // language
+        LanguageNote::Languages languages; // of each key
+        QMap<QString, QString> inForce; // for the user
+        QStringList texts; // keys that have a text for everybody
+
+        bool operator==(const Coverage &other) const
+        {
+            return shown == other.shown && languages == other.languages && inForce == other.inForce
+                && texts == other.texts;
+        }
+    };
     struct Item
     {
         QString language; // empty for the user's own
@@ -39,20 +55,21 @@ private:
 
     void build();
     void refresh();
+    Coverage coverage() const;
     void showItems(const QVector<Item> &items);
     void choose(int item);
     void askForLanguage();
-    Item itemOf(const VelUIDesktopEntry &entry, const QString &language) const;
+    Item itemOf(const QString &language) const;
     static QString textOf(const QString &language, bool exists, int count, int total);
-    QVector<Item> itemsOf(const VelUIDesktopEntry &entry) const;
-    QStringList languagesOf(const VelUIDesktopEntry &entry) const;
-    QString noteOf(const VelUIDesktopEntry &entry) const;
+    QStringList otherLanguages() const;
+    QString note() const;
 
     EntryFormHost &m_form;
     LanguageRows &m_rows;
     QBoxLayout *m_line;
     QComboBox *m_box;
     QLabel *m_note;
+    Coverage m_coverage;
 };
 
 } // namespace VelUI

@@ -140,16 +140,18 @@ bool EntryDocument::flag(std::string_view group, std::string_view key) const
 QStringList EntryDocument::languages(std::string_view group, std::string_view key) const
 {
     QStringList found;
-    const GroupValues values = this->group(group);
+    std::unordered_set<std::string_view> known;
     const auto add = [&](std::string_view language) {
-        const QString name = QString::fromUtf8(language.data(), int(language.size()));
-        if (!language.empty() && values.value(key, language) && !found.contains(name))
-            found.append(name);
+        if (!language.empty() && known.insert(language).second)
+            found.append(QString::fromUtf8(language.data(), int(language.size())));
     };
-    m_text->forEachVariant(values.group(), key,
-                           [&](const DesktopEntryText::Key &line) { add(m_text->locale(line)); });
+    m_text->forEachVariant(this->group(group).group(), key, [&](const DesktopEntryText::Key &line) {
+        const auto *change = m_changes.find(group, key, m_text->locale(line));
+        if (!change || change->value)
+            add(m_text->locale(line));
+    });
     for (const auto &change : m_changes.all()) {
-        if (change.group == group && change.key == key)
+        if (change.value && change.group == group && change.key == key)
             add(change.locale);
     }
     return found;
