@@ -86,6 +86,13 @@ public:
      * files for entries that have none. Off, as it is at first, the view has nothing of that. A further
      * init() keeps it as it is.
      *
+     * In a view that can be edited several rows can be selected, by Ctrl, Shift and Ctrl+A. Delete, Cut,
+     * Copy, a drag, "Hide" and "Show again" are done to all of them, as one step; what lies in a selected
+     * folder goes along with it. Up and Down move those that lie in one folder together, and are disabled for
+     * others. New items, what is pasted and other commands go by the item that the keyboard is on. What can
+     * only be done to one item, Edit and Execute, is disabled, and its slot does nothing. A view whose
+     * selectionMode() a host has set to another one than QAbstractItemView::SingleSelection keeps that.
+     *
      * @param assistance whether the view is to help
      */
     void setAssistance(bool assistance);
@@ -136,10 +143,16 @@ public:
     /// The menu directory that the view was built on, as it was given.
     QString menuDir() const;
 
-    /// The first selected item in the file-system model; invalid when nothing is selected.
+    /**
+     * The selected item in the file-system model; invalid when nothing is selected.
+     *
+     * Of several (setAssistance()) it is the one that the keyboard is on or, where that is not
+     * selected, the first from the top. All of them are in selectionModel()->selectedIndexes(), which
+     * belong to the sorting model.
+     */
     QModelIndex selectedItem() const;
 
-    /// The path of the first selected item; empty when nothing is selected.
+    /// The path of selectedItem(); empty when nothing is selected.
     QString selectedPath() const;
 
     /**
@@ -258,13 +271,13 @@ public Q_SLOTS:
     /// Creates an entry; see createNew().
     void slotFileNew();
     /**
-     * Opens the editor on the selected entry or folder.
+     * Opens the editor on the selected entry or folder; nothing while several are selected.
      *
      * @return whether it was edited and saved
      */
     bool slotEdit();
     /// Deletes the selected item, a folder with everything in it, after asking. With assistance()
-    /// it goes into the trash without a question, and only where there is none is asked.
+    /// all that is selected goes into the trash without a question, and only where there is none is asked.
     void slotDel();
     /**
      * Runs the selected entry with the desktop's program "vel-open", which lives on when the
@@ -272,16 +285,16 @@ public Q_SLOTS:
      * assistance() told() does, and gives the reason when "vel-open" could not start the entry.
      */
     void slotExe();
-    /// Puts the selected item on the clipboard, to be moved where it is pasted.
+    /// Puts the selected item, or all of several, on the clipboard, to be moved where it is pasted.
     void slotCut();
-    /// Puts the selected item on the clipboard, to be copied where it is pasted.
+    /// Puts the selected item, or all of several, on the clipboard, to be copied where it is pasted.
     void slotCopy();
     /// Moves or copies what is on the clipboard into the selected folder or beside the selected item.
     /// A program that holds the clipboard and does not answer is told of after two seconds at most.
     void slotPaste();
-    /// Moves the selected item up by one place.
+    /// Moves the selected item, or several of one folder, up by one place.
     void slotUp();
-    /// Moves the selected item down by one place.
+    /// Moves the selected item, or several of one folder, down by one place.
     void slotDown();
     /// Builds the default start menu anew, after asking; what was in it before is lost. When that
     /// fails, the old menu stays as it was.
@@ -302,9 +315,9 @@ Q_SIGNALS:
 #pragma GCC diagnostic push
 #pragma GCC diagnostic ignored "-Woverloaded-virtual"
     /**
-     * The selection has changed.
+     * The selection has changed, or of several selected items the keyboard is on another one.
      *
-     * @param path the path of the first selected item; empty when nothing is selected
+     * @param path selectedPath() as it is now
      */
     void selectionChanged(const QString &path);
 #pragma GCC diagnostic pop
