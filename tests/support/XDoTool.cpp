@@ -3,13 +3,18 @@
 
 #include "XDoTool.h"
 
+#include <QApplication>
+#include <QPointer>
 #include <QProcess>
 #include <QTest>
 #include <QWidget>
+#include <QWindow>
 
 namespace XDoTool {
 
 namespace {
+
+constexpr int LongestWait = 5000; // milliseconds
 
 bool finish(QProcess &process, const QString &script)
 {
@@ -18,10 +23,25 @@ bool finish(QProcess &process, const QString &script)
         && process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0;
 }
 
+// A modal window takes all keys, but only once it has the focus: until then they would go to the window
+// behind it and be lost. For a dialog, QTest::qWaitForWindowActive() is content with its parent.
+void awaitFocus(const QString &script)
+{
+    const QPointer<QWidget> modal(QApplication::activeModalWidget());
+    const bool isForKeys =
+        script.startsWith(QLatin1String("key ")) || script.startsWith(QLatin1String("type "));
+    if (!modal || QApplication::activePopupWidget() || !isForKeys)
+        return;
+    const bool hasFocus = QTest::qWaitFor(
+        [&modal] { return !modal || QGuiApplication::focusWindow() == modal->windowHandle(); }, LongestWait);
+    Q_UNUSED(hasFocus) // a window that does not want it may be modal, too
+}
+
 } // namespace
 
 void run(const QString &script)
 {
+    awaitFocus(script);
     QProcess process;
     QVERIFY2(finish(process, script),
              qPrintable(script + QLatin1String(": ") + process.errorString() + QLatin1Char(' ')

@@ -12,7 +12,8 @@ class QWidget;
 /**
  * The mouse and the keyboard of the X server, for tests that work as a person does.
  *
- * Events go on while the tool works, also those of a drag.
+ * Events go on while the tool works, also those of a drag. Keys are pressed once the modal window, if
+ * there is one, has the focus.
  */
 namespace XDoTool {
 
