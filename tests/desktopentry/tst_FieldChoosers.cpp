@@ -26,10 +26,11 @@ constexpr int Patience = 20000;
 class OpenForm
 {
 public:
-    OpenForm()
+    explicit OpenForm(const VelUIDesktopEntry &entry = VelUIDesktopEntry())
         : form(new VelDesktopEntryPropsWidget)
     {
         form->setAssistance(true);
+        form->loadFrom(entry);
         form->resize(640, 720);
         form->show();
         isActive = QTest::qWaitForWindowActive(form, Patience);
@@ -206,10 +207,9 @@ void tst_FieldChoosers::chooseCategoriesByTheKeyboardAlone()
 
 void tst_FieldChoosers::chooseAMimeTypeByTheMouse()
 {
-    const OpenForm open;
+    // Of which nothing is to be said that would move the rows.
+    const OpenForm open(entry("[Desktop Entry]\nType=Application\nName=x\nExec=true\nCategories=Utility;\n"));
     QVERIFY(open.isActive);
-    // Nothing is to be said about it that would move the rows.
-    open.form->loadFrom(entry("[Desktop Entry]\nType=Application\nName=x\nExec=true\nCategories=Utility;\n"));
     auto *field = child<StringListEdit>(open.form, "mimeTypeEdit");
     QSignalSpy changed(open.form, &VelDesktopEntryPropsWidget::changed);
     ModalDriver modal;
