@@ -29,6 +29,9 @@ LanguageDialog::LanguageDialog(QWidget *parent)
     m_verdict->setObjectName(QStringLiteral("verdictLabel"));
     m_verdict->setTextFormat(Qt::PlainText);
     m_verdict->setWordWrap(true);
+    // The dialog must not grow while one types.
+    m_verdict->setMinimumSize(fontMetrics().averageCharWidth() * 50, fontMetrics().lineSpacing() * 2);
+    m_verdict->setAlignment(Qt::AlignLeading | Qt::AlignTop);
     fill();
 
     auto *layout = new QVBoxLayout(this);

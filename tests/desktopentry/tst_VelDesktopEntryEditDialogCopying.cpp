@@ -6,12 +6,14 @@
 #include "FormDriving.h"
 
 #include <VelDesktopEntryEditDialog.h>
+#include <VelDesktopEntryPropsWidget.h>
 #include <VelMenuDialog.h>
 #include <VelMenuView.h>
 #include <velcore/dirs.h>
 
 #include <QDir>
 #include <QPointer>
+#include <QToolButton>
 
 using namespace FormDriving;
 
@@ -29,6 +31,8 @@ private Q_SLOTS:
     void copiesNothingFromAFileThatDoesNotLoad();
     void copiesNothingWhenThePickerIsCanceled();
     void survivesItsDeletionBehindThePicker();
+    void passesItsAssistanceToThePicker();
+    void takesACopyBack();
 
 private:
     static QString writeToMenu(const QString &name, const QByteArray &bytes);
@@ -55,7 +59,8 @@ void tst_VelDesktopEntryEditDialogCopying::copyFrom(VelDesktopEntryEditDialog &d
         QCOMPARE(picker->parentWidget(), &dialog);
         QCOMPARE(picker->menuDir(), QString::fromStdString(GetVelDir(VelDir::StartMenu)));
         // It tells the window manager when it goes; nobody takes the command here.
-        modal.answer(warning(QStringLiteral("Can't send command to vel-wm")), QMessageBox::Ok);
+        if (!dialog.assistance())
+            modal.answer(warning(QStringLiteral("Can't send command to vel-wm")), QMessageBox::Ok);
         if (menuEntry.isEmpty()) {
             click(cancelButton(picker));
             return;
@@ -171,6 +176,44 @@ void tst_VelDesktopEntryEditDialogCopying::survivesItsDeletionBehindThePicker()
     click(child<QPushButton>(dialog, "copyButton"));
     QVERIFY(modal.finished());
     QVERIFY(!alive);
+}
+
+void tst_VelDesktopEntryEditDialogCopying::passesItsAssistanceToThePicker()
+{
+    writeToMenu(QStringLiteral("a.desktop"), plainApplication);
+    VelDesktopEntryEditDialog dialog;
+    QVERIFY(dialog.setDesktopEntryPath(path(QStringLiteral("new.desktop")), true));
+    for (const bool isAssisted : {false, true}) {
+        dialog.setAssistance(isAssisted);
+        QCOMPARE(dialog.assistance(), isAssisted);
+        QCOMPARE(dialog.findChild<VelDesktopEntryPropsWidget *>()->assistance(), isAssisted);
+        ModalDriver modal;
+        modal.handle([&](QWidget *window) {
+            if (!isAssisted)
+                modal.answer(warning(QStringLiteral("Can't send command to vel-wm")), QMessageBox::Ok);
+            QCOMPARE(qobject_cast<VelMenuDialog *>(window)->assistance(), isAssisted);
+            click(cancelButton(window));
+        });
+        click(child<QPushButton>(&dialog, "copyButton"));
+        QVERIFY(modal.finished());
+    }
+}
+
+void tst_VelDesktopEntryEditDialogCopying::takesACopyBack()
+{
+    const QString source = writeToMenu(QStringLiteral("full.desktop"), EntrySamples::fullApplication());
+    VelDesktopEntryEditDialog dialog;
+    dialog.setAssistance(true);
+    const QString file = write(QStringLiteral("plain.desktop"), plainApplication);
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    copyFrom(dialog, source);
+    QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Full"));
+    click(child<QToolButton>(&dialog, "undoButton"));
+    QCOMPARE(line(&dialog, "nameEdit")->text(), QStringLiteral("Plain"));
+    QVERIFY(!child<QToolButton>(&dialog, "undoButton")->isEnabled());
+    QVERIFY(!dialog.isWindowModified());
+    click(okButton(&dialog));
+    QCOMPARE(read(file), plainApplication);
 }
 
 VEL_TEST_MAIN(tst_VelDesktopEntryEditDialogCopying)

@@ -35,6 +35,7 @@ private Q_SLOTS:
     void keepsAFolderWhoseRecordCannotBeWritten();
     void goesAwayWhileANewItemIsEdited();
     void editsTheSelectedEntry();
+    void passesItsAssistanceToTheEditor();
     void editsTheRecordOfAFolder();
     void makesTheRecordOfAFolderOnlyWhenSaved();
     void editsNothingElse();
@@ -307,6 +308,24 @@ void tst_VelMenuViewEdit::editsTheSelectedEntry()
     QCOMPARE(changes.count(), 1);
     QCOMPARE(names(view, menu()), QStringList{QStringLiteral("New name")});
     QVERIFY(view.findChildren<VelDesktopEntryEditDialog *>().isEmpty());
+}
+
+void tst_VelMenuViewEdit::passesItsAssistanceToTheEditor()
+{
+    const QString a = writeLetters("a").constFirst();
+    VelMenuView view(menu(), -1, true);
+    QVERIFY(open(view, menu(), 1));
+    select(view, a);
+    ModalDriver modal;
+    for (const bool isAssisted : {true, false}) {
+        view.setAssistance(isAssisted);
+        modal.handle([&](QWidget *dialog) {
+            QCOMPARE(qobject_cast<VelDesktopEntryEditDialog *>(dialog)->assistance(), isAssisted);
+            reject(dialog);
+        });
+        QVERIFY(!view.slotEdit());
+    }
+    QVERIFY(modal.finished());
 }
 
 void tst_VelMenuViewEdit::editsTheRecordOfAFolder()
