@@ -41,6 +41,34 @@ void takeSettings(const QString &manager, Options *options)
     options->updatesAtStart = settings->runsAtStart;
 }
 
+QCommandLineOption commandOption(const char *name, const QString &description)
+{
+    return {QLatin1String(name), description, QStringLiteral("COMMAND")};
+}
+
+/// The options that the parser knows.
+struct Switches
+{
+    QCommandLineOption startMenu = commandOption(
+        "startmenu", QCoreApplication::translate("vel-wmbridge", "Run when the start menu has changed."));
+    QCommandLineOption toolBar = commandOption(
+        "toolbar", QCoreApplication::translate("vel-wmbridge", "Run when the tool bar has changed."));
+    QCommandLineOption shortcut = commandOption(
+        "shortcut",
+        QCoreApplication::translate("vel-wmbridge", "Run when the desktop's entries have changed."));
+    QCommandLineOption other =
+        commandOption("other", QCoreApplication::translate("vel-wmbridge", "Run for every other line."));
+    QCommandLineOption manager{
+        QStringLiteral("for"),
+        QCoreApplication::translate("vel-wmbridge",
+                                    "Do what this window manager needs to show the start menu as it is: %1.")
+            .arg(WindowManagers::names().join(QLatin1String(", "))),
+        QStringLiteral("NAME")};
+    QCommandLineOption replace{
+        QStringLiteral("replace"),
+        QCoreApplication::translate("vel-wmbridge", "Take the channel from the program that has it.")};
+};
+
 Options parse()
 {
     QCommandLineParser parser;
@@ -50,41 +78,20 @@ Options parse()
         "shell for each kind of update. The variable VEL_COMMAND holds the line that came."));
     parser.addHelpOption();
     parser.addVersionOption();
-    const QString command = QStringLiteral("COMMAND");
-    const QCommandLineOption startMenu(
-        QStringLiteral("startmenu"),
-        QCoreApplication::translate("vel-wmbridge", "Run when the start menu has changed."), command);
-    const QCommandLineOption toolBar(
-        QStringLiteral("toolbar"),
-        QCoreApplication::translate("vel-wmbridge", "Run when the tool bar has changed."), command);
-    const QCommandLineOption shortcut(
-        QStringLiteral("shortcut"),
-        QCoreApplication::translate("vel-wmbridge", "Run when the desktop's entries have changed."), command);
-    const QCommandLineOption other(QStringLiteral("other"),
-                                   QCoreApplication::translate("vel-wmbridge", "Run for every other line."),
-                                   command);
-    const QCommandLineOption replace(
-        QStringLiteral("replace"),
-        QCoreApplication::translate("vel-wmbridge", "Take the channel from the program that has it."));
-    const QCommandLineOption manager(
-        QStringLiteral("for"),
-        QCoreApplication::translate("vel-wmbridge",
-                                    "Do what this window manager needs to show the start menu as it is: %1.")
-            .arg(WindowManagers::names().join(QLatin1String(", "))),
-        QStringLiteral("NAME"));
-    parser.addOptions({startMenu, toolBar, shortcut, other, manager, replace});
+    const Switches switches;
+    parser.addOptions({switches.startMenu, switches.toolBar, switches.shortcut, switches.other,
+                       switches.manager, switches.replace});
 
-    QString error = Program::parse(parser);
-    if (error.isEmpty() && !parser.positionalArguments().isEmpty())
-        error = QCoreApplication::translate("vel-wmbridge", "unexpected argument: %1")
-                    .arg(parser.positionalArguments().constFirst());
-    Options options{
-        {parser.value(startMenu), parser.value(toolBar), parser.value(shortcut), parser.value(other)},
-        parser.isSet(replace),
-        false,
-        error};
-    if (parser.isSet(manager) && error.isEmpty())
-        takeSettings(parser.value(manager), &options);
+    Options options;
+    options.error = Program::parse(parser);
+    if (options.error.isEmpty() && !parser.positionalArguments().isEmpty())
+        options.error = QCoreApplication::translate("vel-wmbridge", "unexpected argument: %1")
+                            .arg(parser.positionalArguments().constFirst());
+    options.commands = {parser.value(switches.startMenu), parser.value(switches.toolBar),
+                        parser.value(switches.shortcut), parser.value(switches.other)};
+    options.replace = parser.isSet(switches.replace);
+    if (parser.isSet(switches.manager) && options.error.isEmpty())
+        takeSettings(parser.value(switches.manager), &options);
     return options;
 }
 
