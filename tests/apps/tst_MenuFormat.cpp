@@ -86,6 +86,8 @@ private Q_SLOTS:
     void printsAMenuForIcewm();
     void printsAMenuForJwm();
     void leavesOutPathsOfSeveralLines();
+    void printsATextInThePlaceOfAMenu_data();
+    void printsATextInThePlaceOfAMenu();
     void printsJsonWithAllThatAnEntryTells();
     void quotesACommandForTheShell();
 
@@ -330,6 +332,27 @@ void tst_MenuFormat::leavesOutPathsOfSeveralLines()
         QVERIFY(!format->print(menu).contains("/m/a"));
         QVERIFY(format->print(menu).contains("/m/b"));
     }
+}
+
+void tst_MenuFormat::printsATextInThePlaceOfAMenu_data()
+{
+    QTest::addColumn<QByteArray>("expected");
+    QTest::newRow("fluxbox") << QByteArray("[encoding] {UTF-8}\n[nop] (a (b\\) \"c\" d)\n[endencoding]\n");
+    QTest::newRow("icewm") << QByteArray("prog \"a (b) \\\"c\\\" d\" - true\n");
+    QTest::newRow("jwm") << QByteArray("<Program label=\"a (b) &quot;c&quot; d\">true</Program>");
+    QTest::newRow("labwc") << QByteArray("<separator label=\"a (b) &quot;c&quot; d\"/>");
+    QTest::newRow("openbox") << QByteArray("<separator label=\"a (b) &quot;c&quot; d\"/>");
+    QTest::newRow("rofi") << QByteArray();
+    QTest::newRow("dmenu") << QByteArray();
+}
+
+void tst_MenuFormat::printsATextInThePlaceOfAMenu()
+{
+    QFETCH(QByteArray, expected);
+    const auto printText = MenuFormat::find(QString::fromLatin1(QTest::currentDataTag()))->printText;
+    QCOMPARE(printText == nullptr, expected.isEmpty());
+    if (printText)
+        QVERIFY2(printText(QStringLiteral("a (b) \"c\"\nd")).contains(expected), expected.constData());
 }
 
 void tst_MenuFormat::printsJsonWithAllThatAnEntryTells()
