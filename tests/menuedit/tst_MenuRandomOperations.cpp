@@ -345,7 +345,7 @@ QString tst_MenuRandomOperations::freeName(const QString &source, const QString 
                                            const QStringList &taken) const
 {
     const QString name = MenuMirror::nameOf(source);
-    const int dot = m_mirror.kindOf(source) == Kind::Folder ? -1 : name.lastIndexOf(QLatin1Char('.'));
+    const int dot = QFileInfo(full(source)).isDir() ? -1 : name.lastIndexOf(QLatin1Char('.'));
     for (int n = 2;; ++n) {
         const QString number = QStringLiteral("-%1").arg(n);
         const QString other = dot > 0 ? name.left(dot) + number + name.mid(dot) : name + number;
