@@ -82,8 +82,9 @@ public:
     /**
      * Switches on what helps users beyond the plain tree: a filter (setFilter()), gray rows for
      * entries that the menu does not show, with the reason as their tool tips (setHiddenShown()),
-     * "Hide", "Show again", "Sort by name" and "Open containing folder" in the context menu, and the names of
-     * files for entries that have none. Off, as it is at first, the view has nothing of that. A further
+     * "Hide", "Show again", "Duplicate", "Sort by name" and "Open containing folder" in the context menu, the
+     * names of files for entries that have none, a question for each dropped file whose name is taken, and
+     * entries for dropped web addresses. Off, as it is at first, the view has nothing of that. A further
      * init() keeps it as it is.
      *
      * In a view that can be edited several rows can be selected, by Ctrl, Shift and Ctrl+A. Delete, Cut,
