@@ -45,7 +45,7 @@ const QVector<QStringList> &together()
         list("&Undo|&Redo|Cu&t|&Copy|&Paste|Select &all|Find selected a&gain|Go to &line..."),
         list("New &folder|New entr&y|&Edit|&Delete|&Hide|Sho&w again|E&xecute|Open containin&g "
              "folder|F&ind|Find "
-             "&Next|Cu&t|&Copy|&Paste|Duplic&ate|Default &menu...|&Up|D&own|&Sort by name|&Reload"),
+             "&Next|Cu&t|&Copy|&Paste|Dup&licate|Default &menu...|&Up|D&own|&Sort by name|&Reload"),
         list("Zoom &in|Zoom &out|&Wrap lines|&Fixed-width font|&Proportional font|O&verwrite|&Read only|Wide "
              "cur&sor|"
              "&Center on cursor|Scroll &up|Scroll &down|Scroll to &top|Scroll to botto&m"),
