@@ -38,6 +38,7 @@ public:
     virtual Translations &translations() = 0;
     /// Of the file that the entry will be; empty where nobody knows.
     virtual QString filePath() const = 0;
+    virtual bool isReadOnly() const = 0;
     virtual QString type() const = 0;
     virtual bool isTypeDecided() const = 0;
     /// Shows the rows of another type; nobody is asked.

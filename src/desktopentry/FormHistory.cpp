@@ -167,8 +167,14 @@ void FormHistory::makeActions()
         action->setShortcutContext(Qt::WidgetWithChildrenShortcut);
         m_form.form()->addAction(action);
     }
-    connect(m_undo, &QAction::triggered, &m_stack, &QUndoStack::undo);
-    connect(m_redo, &QAction::triggered, &m_stack, &QUndoStack::redo);
+    const auto onTriggered = [this](QAction *action, void (QUndoStack::*step)()) {
+        connect(action, &QAction::triggered, this, [this, step] {
+            if (!m_form.isReadOnly())
+                (m_stack.*step)();
+        });
+    };
+    onTriggered(m_undo, &QUndoStack::undo);
+    onTriggered(m_redo, &QUndoStack::redo);
     updateActions();
 }
 

@@ -37,6 +37,7 @@ public:
     VelUIDesktopEntry baseRecord() const override { return recordToChange(); }
     Translations &translations() override { return m_translations; }
     QString filePath() const override { return path; }
+    bool isReadOnly() const override { return readOnly; }
     QString type() const override { return typeChooser.type(); }
     bool isTypeDecided() const override { return typeChooser.isDecided(); }
     void showType(const QString &type, bool isDecided) override;

@@ -22,6 +22,7 @@
 #include <QComboBox>
 #include <QMenu>
 #include <QRadioButton>
+#include <QRandomGenerator>
 #include <QSignalSpy>
 #include <QToolButton>
 
@@ -50,6 +51,9 @@ private Q_SLOTS:
     void worksWhereverTheDialogHasTheFocus();
     void hasTheFormsHistoryInTheMenuOfALine();
     void leavesLinesTheirOwnHistoryWithoutAssistance();
+    void takesNothingBackWhereNothingCanBeEdited();
+    void takesBackWhateverWasDone_data();
+    void takesBackWhateverWasDone();
 
 private:
     const QByteArray m_bytes =
@@ -360,6 +364,85 @@ void tst_EntryFormHistory::leavesLinesTheirOwnHistoryWithoutAssistance()
     QTest::keyClicks(comment, QStringLiteral("a"));
     QTest::keySequence(comment, QKeySequence::Undo);
     QCOMPARE(comment->text(), QStringLiteral("Edits"));
+}
+
+void tst_EntryFormHistory::takesNothingBackWhereNothingCanBeEdited()
+{
+    VelDesktopEntryPropsWidget form;
+    form.setAssistance(true);
+    form.loadFrom(entry(m_bytes));
+    QTest::keyClicks(line(form, "commentEdit"), QStringLiteral("a"));
+    form.setReadOnly(true);
+    undo(form);
+    QCOMPARE(line(form, "commentEdit")->text(), QStringLiteral("aEdits"));
+    form.setReadOnly(false);
+    undo(form);
+    QCOMPARE(line(form, "commentEdit")->text(), QStringLiteral("Edits"));
+}
+
+void tst_EntryFormHistory::takesBackWhateverWasDone_data()
+{
+    QTest::addColumn<quint32>("seed");
+    for (quint32 seed = 1; seed <= 20; ++seed)
+        QTest::addRow("seed %u", seed) << seed;
+}
+
+// Types, sets, turns and goes to and fro at random; at the ends stand the same bytes again.
+void tst_EntryFormHistory::takesBackWhateverWasDone()
+{
+    QFETCH(quint32, seed);
+    QRandomGenerator random(seed);
+    VelDesktopEntryPropsWidget form;
+    form.setAssistance(true);
+    form.loadFrom(entry(m_bytes));
+    const FormHistory &history = assistance(form).history();
+    const QString texts[] = {QString(), QStringLiteral("word"), QStringLiteral("two words"),
+                             QString::fromUtf8("\xC3\xA4;%")};
+    for (int i = 0; i < 60; ++i) {
+        const auto &rows = assistance(form).rows();
+        const FormRow row = rows.at(random.bounded(rows.size()));
+        switch (random.bounded(8)) {
+        case 0:
+            undo(form);
+            break;
+        case 1:
+            redo(form);
+            break;
+        case 2:
+            child<QComboBox>(&form, "languageBox")->setCurrentIndex(random.bounded(2));
+            break;
+        case 3: {
+            const QString type = QStringList{application, link, directory}.at(random.bounded(3));
+            if (typeBox(form)->currentData() == type)
+                break;
+            ModalDriver modal;
+            modal.handle([](QWidget *box) { QTest::keyClick(box, Qt::Key_Return); });
+            chooseType(form, type);
+            QVERIFY(modal.finished());
+            break;
+        }
+        default:
+            if (!assistance(form).isShown(row))
+                break;
+            if (qobject_cast<QLineEdit *>(row.field) && random.bounded(2))
+                QTest::keyClicks(row.field, texts[random.bounded(3)].left(5));
+            else if (FieldEdit::value(row.field).userType() == QMetaType::QString)
+                FieldEdit::setValue(row.field, texts[random.bounded(4)]);
+            else if (FieldEdit::value(row.field).userType() == QMetaType::Bool)
+                FieldEdit::setValue(row.field, bool(random.bounded(2)));
+            else if (FieldEdit::value(row.field).userType() == QMetaType::QStringList)
+                FieldEdit::setValue(row.field, QStringList{texts[1 + random.bounded(2)]});
+        }
+    }
+    while (history.redoAction()->isEnabled())
+        redo(form);
+    const QByteArray last = text(form);
+    while (history.undoAction()->isEnabled())
+        undo(form);
+    QCOMPARE(text(form), m_bytes);
+    while (history.redoAction()->isEnabled())
+        redo(form);
+    QCOMPARE(text(form), last);
 }
 
 VEL_TEST_MAIN(tst_EntryFormHistory)
