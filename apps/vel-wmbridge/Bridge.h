@@ -37,7 +37,7 @@ public:
      * Takes the channel and starts to listen.
      *
      * @param replace whether to take it from the program that has it
-     * @return false without a display or when another program has the channel
+     * @return false without a display and a session bus, or when another program has the channel
      */
     bool start(bool replace);
 

@@ -3,6 +3,7 @@
 
 #include <velintegration/wmcommand.h>
 
+#include "BusSender.h"
 #include "XErrorTrap.h"
 
 #include <cstring>
@@ -24,8 +25,10 @@ std::size_t longestCommand(Display *display)
 
 bool SendCommandToWM(Display *display, const char *command)
 {
-    if (!display || !command)
+    if (!command)
         return false;
+    if (!display)
+        return sendCommandOverBus(command);
     const std::size_t length = std::strlen(command);
     if (length > longestCommand(display))
         return false;

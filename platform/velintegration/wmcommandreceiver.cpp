@@ -5,6 +5,7 @@
 
 #include <velintegration/wmcommand.h>
 
+#include "BusReceiver.h"
 #include "CommandLines.h"
 #include "ManagerSelection.h"
 #include "XErrorTrap.h"
@@ -14,6 +15,8 @@
 #include <utility>
 
 #include <X11/Xatom.h>
+#include <sys/epoll.h>
+#include <unistd.h>
 
 namespace {
 
@@ -46,8 +49,20 @@ public:
         property = XInternAtom(display.get(), VelWmCommand::propertyName, False);
         selection.reset(
             new ManagerSelection(display.get(), VelWmCommand::selectionName(DefaultScreen(display.get()))));
+        if (bus.descriptor() >= 0)
+            waitForBoth();
+    }
+    ~WmCommandReceiverPrivate()
+    {
+        if (both >= 0)
+            close(both);
     }
 
+    void waitForBoth();
+    int descriptor() const;
+    bool isOwner() const;
+    bool acquire(bool replace);
+    void processBus();
     void processEvents();
     void handle(const XEvent &event);
     void noteChange(const XPropertyEvent &event);
@@ -61,12 +76,56 @@ public:
     WmCommandReceiver::LostHandler onLost;
     std::unique_ptr<Display, CloseDisplay> display;
     std::unique_ptr<ManagerSelection> selection;
+    BusReceiver bus;
+    int both = -1; // can be read when the display or the bus can
     Atom property = None;
     CommandLines lines;
     bool hasNews = false; // the property has changed since it was read
     Time lastNews = 0;
     int timesKept = 0;
 };
+
+void WmCommandReceiverPrivate::waitForBoth()
+{
+    both = epoll_create1(EPOLL_CLOEXEC);
+    for (const int descriptor : {ConnectionNumber(display.get()), bus.descriptor()}) {
+        epoll_event event = {};
+        event.events = EPOLLIN;
+        epoll_ctl(both, EPOLL_CTL_ADD, descriptor, &event);
+    }
+}
+
+int WmCommandReceiverPrivate::descriptor() const
+{
+    if (both >= 0)
+        return both;
+    return display ? ConnectionNumber(display.get()) : bus.descriptor();
+}
+
+// With a display it is the selection that counts; another receiver may have the bus.
+bool WmCommandReceiverPrivate::isOwner() const
+{
+    return display ? selection->window() != None : bus.isOwner();
+}
+
+bool WmCommandReceiverPrivate::acquire(bool replace)
+{
+    if (display && !selection->acquire(replace))
+        return false;
+    return bus.acquire(replace) || display;
+}
+
+void WmCommandReceiverPrivate::processBus()
+{
+    const bool isLost = bus.read();
+    std::string line;
+    while (bus.take(&line)) {
+        if (onLine)
+            onLine(line);
+    }
+    if (isLost && !display && onLost)
+        onLost();
+}
 
 // Reads the property once for all of its changes that are known, however many there are.
 void WmCommandReceiverPrivate::processEvents()
@@ -176,8 +235,10 @@ void WmCommandReceiverPrivate::lose()
 {
     readProperty();
     selection->release();
+    bus.release();
     handOutLines();
     lines.clear();
+    processBus();
     if (onLost)
         onLost();
 }
@@ -196,7 +257,7 @@ void WmCommandReceiver::setLostHandler(LostHandler onLost)
 
 bool WmCommandReceiver::acquire(bool replace)
 {
-    if (!d->selection || !d->selection->acquire(replace))
+    if (!d->acquire(replace))
         return false;
     // Events that the connection has read already do not make it readable again.
     processEvents();
@@ -207,20 +268,24 @@ void WmCommandReceiver::release()
 {
     if (!isOwner())
         return;
-    d->readProperty();
-    d->selection->release();
-    d->handOutLines();
-    d->lines.clear();
+    if (d->display) {
+        d->readProperty();
+        d->selection->release();
+        d->handOutLines();
+        d->lines.clear();
+    }
+    d->bus.release();
+    d->processBus();
 }
 
 bool WmCommandReceiver::isOwner() const
 {
-    return d->selection && d->selection->window() != None;
+    return d->isOwner();
 }
 
 int WmCommandReceiver::connectionFd() const
 {
-    return d->display ? ConnectionNumber(d->display.get()) : -1;
+    return d->descriptor();
 }
 
 unsigned long WmCommandReceiver::windowId() const
@@ -232,4 +297,5 @@ void WmCommandReceiver::processEvents()
 {
     if (d->display)
         d->processEvents();
+    d->processBus();
 }

@@ -53,11 +53,11 @@ bool isBusActivatable(const QString &path)
 QString sendToWindowManager(const QString &exec)
 {
     const std::unique_ptr<Display, CloseDisplay> display(XOpenDisplay(nullptr));
-    if (!display)
-        return QStringLiteral("cannot open the display");
-    if (!SendCommandToWM(display.get(), (exec.toLocal8Bit() + '\n').constData()))
-        return QStringLiteral("no window manager takes commands here");
-    return {};
+    if (SendCommandToWM(display.get(), (exec.toLocal8Bit() + '\n').constData()))
+        return {};
+    return display
+        ? QStringLiteral("no window manager takes commands here")
+        : QStringLiteral("there is no display, and no window manager takes commands on the session bus");
 }
 
 QString filledIn(const VelUIDesktopEntry &entry, const QString &path)
