@@ -60,6 +60,9 @@ std::optional<std::string> unescaped(std::string_view word)
         result += char(high * 16 + low);
         i += 2;
     }
+    // Nothing stands there in another way than it is written.
+    if (escaped(result) != word)
+        return {};
     return result;
 }
 
