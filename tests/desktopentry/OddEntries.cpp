@@ -327,6 +327,8 @@ Name[de_DE.UTF-8@euro]
 Name[]
 Name[de
 Name[d e]
+Name[d|]
+Comment[|]
 Name[ö]
 Name[de][fr]
 Comment[de]

@@ -345,6 +345,8 @@ void tst_EntryCheck::leavesUnrepairedWhatARecordCannotReach_data()
     QTest::newRow("translation") << Application + "Icon=known\nIcon[de]=a.png\n";
     QTest::newRow("action") << Application
             + "Actions=new;\n[Desktop Action new]\nName=x\nIcon=a.png\nExec=run\n";
+    QTest::newRow("half a group") << QByteArray(
+        "[Desktop Entry]\nType=Application\nName=x\nExec=run\n[half\nIcon=a.png\n");
     QTest::newRow("empty item") << Application + "Categories=Game;;\n";
     QTest::newRow("false flag") << Application + "Terminal=no\n";
 }

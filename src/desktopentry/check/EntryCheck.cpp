@@ -16,6 +16,8 @@
 #include <QCoreApplication>
 #include <QHash>
 
+#include <algorithm>
+
 namespace {
 
 class Text
@@ -61,6 +63,21 @@ void checkValue(const CheckedEntry &entry, const CheckedValue &value)
         check(entry, value);
 }
 
+// A record takes half a header for the begin of a group; what it would change then is not what was
+// looked at.
+bool areGroupsReadAlike(const EntryText &text)
+{
+    const auto isHalfHeader = [](const EntryText::Fault &fault) {
+        return fault.kind == EntryText::Fault::Stray && fault.line.startsWith('[');
+    };
+    const auto isHeaderlike = [](const EntryText::Key &key) { return key.written.startsWith('['); };
+    const auto hasHeaderlike = [isHeaderlike](const EntryText::Group &group) {
+        return std::any_of(group.keys.cbegin(), group.keys.cend(), isHeaderlike);
+    };
+    return std::none_of(text.faults().cbegin(), text.faults().cend(), isHalfHeader)
+        && std::none_of(text.groups().cbegin(), text.groups().cend(), hasHeaderlike);
+}
+
 // What an application needs beyond what every entry does.
 void checkCommand(const CheckedEntry &entry, EntryFindings *findings)
 {
@@ -102,8 +119,9 @@ EntryFindings EntryCheck::check(const VelUIDesktopEntry &record, const QByteArra
     checkCommand(entry, &findings);
     NameChecks::check(entry, &findings);
     LineChecks::check(entry, &findings);
+    const bool readsAlike = areGroupsReadAlike(text);
     for (EntryFinding &finding : findings) {
-        if (finding.repair && !finding.repair->changes(record))
+        if (finding.repair && (!readsAlike || !finding.repair->changes(record)))
             finding.repair.reset();
     }
     return findings;

@@ -45,16 +45,17 @@ bool isOfLocale(char c)
 
 EntryText::Key keyOf(const QByteArray &written, const QByteArray &value)
 {
-    EntryText::Key key{written, written, {}, value, true, false};
+    EntryText::Key key{written, written, {}, value, true, true, false};
     const int bracket = written.indexOf('[');
     if (bracket >= 0) {
         key.name = written.left(bracket);
         key.locale = written.mid(bracket + 1, written.size() - bracket - 2);
-        key.isWellFormed = written.endsWith(']') && !key.locale.isEmpty()
-            && std::all_of(key.locale.cbegin(), key.locale.cend(), isOfLocale);
+        key.isReadable = written.endsWith(']') && !key.locale.isEmpty()
+            && std::all_of(key.locale.cbegin(), key.locale.cend() - 1, isOfLocale);
+        key.isWellFormed = key.isReadable && isOfLocale(key.locale.back());
     }
-    key.isWellFormed =
-        key.isWellFormed && !key.name.isEmpty() && std::all_of(key.name.cbegin(), key.name.cend(), isOfName);
+    if (key.name.isEmpty() || !std::all_of(key.name.cbegin(), key.name.cend(), isOfName))
+        key.isReadable = key.isWellFormed = false;
     return key;
 }
 

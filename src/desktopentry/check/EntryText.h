@@ -21,6 +21,9 @@ public:
         QByteArray locale;
         QByteArray value; ///< with its escapes
         bool isWellFormed = true; ///< of letters, digits and "-" with a language or without
+        /// Whether readers take it for what it would be without its fault: some do not look at the last
+        /// character of the language.
+        bool isReadable = true;
         bool isRepetition = false; ///< the group has such a line above
     };
 

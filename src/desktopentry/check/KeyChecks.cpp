@@ -71,7 +71,7 @@ void checkPlainValues(const EntryText::Group &group, EntryFindings *findings)
 {
     QByteArrayList told;
     for (const EntryText::Key &key : group.keys) {
-        if (key.locale.isEmpty() || !key.isWellFormed || group.lines.contains(key.name)
+        if (key.locale.isEmpty() || !key.isReadable || group.lines.contains(key.name)
             || told.contains(key.name))
             continue;
         const EntryKeys::Key *standard = EntryKeys::find(key.name);
@@ -134,7 +134,7 @@ bool checkWritten(const CheckedValue &value)
     if (!value.key.isWellFormed)
         value.add(EntryProblem::MalformedKey, EntryFinding::Error,
                   Text::tr("No key can be called '%1'.").arg(name));
-    return value.key.isWellFormed;
+    return value.key.isReadable;
 }
 
 } // namespace
