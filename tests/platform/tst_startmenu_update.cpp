@@ -681,7 +681,7 @@ void tst_startmenu_update::waitsForAnotherUpdate()
     QCOMPARE(entries().size(), 2);
 }
 
-// An editor and an application go on saving at the same entry: not one save of the editor is lost.
+// An editor saves an entry while an update replaces it: what was edited is never lost.
 void tst_startmenu_update::leavesWhatIsEditedMeanwhile()
 {
     for (int i = 0; i < 20; ++i)
