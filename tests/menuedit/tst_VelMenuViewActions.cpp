@@ -233,6 +233,23 @@ void tst_VelMenuViewActions::enablesByRule_data()
     ActionState::Selection recent{true, true, false, 1, 3};
     recent.isByTime = true;
     QTest::newRow("in the middle, by time") << recent << QStringLiteral("create edit");
+    const auto several = [](int first, int last, int items) {
+        ActionState::Selection selection{true, true, false, first, 5};
+        selection.items = items;
+        selection.lastRow = last;
+        return selection;
+    };
+    QTest::newRow("several in the middle") << several(1, 2, 2) << QStringLiteral("create remove up down");
+    QTest::newRow("several at the top") << several(0, 1, 2) << QStringLiteral("create remove down");
+    QTest::newRow("several at the bottom") << several(3, 4, 2) << QStringLiteral("create remove up");
+    QTest::newRow("several at both ends") << several(0, 4, 2) << QStringLiteral("create remove up down");
+    QTest::newRow("all of them") << several(0, 4, 5) << QStringLiteral("create remove");
+    ActionState::Selection scattered = several(1, 2, 2);
+    scattered.areSiblings = false;
+    QTest::newRow("several in two folders") << scattered << QStringLiteral("create remove");
+    ActionState::Selection locked = several(1, 2, 2);
+    locked.isAnyLocked = true;
+    QTest::newRow("several, one may not be written") << locked << QStringLiteral("create");
     row("alone", true, true, false, 0, 1, "create edit");
     row("may not be written", true, false, true, 1, 3, "");
 }
@@ -247,6 +264,9 @@ void tst_VelMenuViewActions::enablesByRule()
         result.append(QStringLiteral("create"));
     if (state.edit)
         result.append(QStringLiteral("edit"));
+    // What is done to all is enabled wherever one can be edited.
+    if (state.remove && !state.edit)
+        result.append(QStringLiteral("remove"));
     if (state.paste)
         result.append(QStringLiteral("paste"));
     if (state.up)

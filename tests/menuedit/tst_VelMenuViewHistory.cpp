@@ -421,6 +421,14 @@ void tst_VelMenuViewHistory::namesEveryStep_data()
     row(Kind::DeleteFolder, "Undo deletion of folder 5%2 %1 (3 entries)",
         "Redo deletion of folder 5%2 %1 (3 entries)", "The folder 5%2 %1 was deleted (3 entries).");
     row(Kind::DeleteItems, "Undo deletion of 3 items", "Redo deletion of 3 items", "3 items were deleted.");
+    row(Kind::DeleteFolders, "Undo deletion of 5%2 %1 items (3 entries)",
+        "Redo deletion of 5%2 %1 items (3 entries)", "5%2 %1 items were deleted (3 entries).");
+    row(Kind::ReorderItems, "Undo reordering of 3 items", "Redo reordering of 3 items",
+        "3 items have other places.");
+    row(Kind::HideItems, "Undo hiding of 3 items", "Redo hiding of 3 items",
+        "3 items are hidden: the menu no longer shows them.");
+    row(Kind::ShowItemsAgain, "Undo showing 3 items again", "Redo showing 3 items again",
+        "The menu shows 3 items again.");
     row(Kind::Move, "Undo moving of 5%2 %1 to %1 B", "Redo moving of 5%2 %1 to %1 B",
         "5%2 %1 was moved to %1 B.");
     row(Kind::MoveItems, "Undo moving of 3 items to %1 B", "Redo moving of 3 items to %1 B",
