@@ -162,6 +162,400 @@
     </message>
 </context>
 <context>
+    <name>EntryCheck</name>
+    <message>
+        <source>The condition &apos;%1&apos; needs a file.</source>
+        <translation>A condição &quot;%1&quot; precisa de um arquivo.</translation>
+    </message>
+    <message>
+        <source>The file of the condition &apos;%1&apos; is one in the folder of settings, without &apos;/&apos; before it.</source>
+        <translation>O arquivo da condição &quot;%1&quot; fica na pasta de configurações e não leva &quot;/&quot; antes.</translation>
+    </message>
+    <message>
+        <source>The condition &apos;%1&apos; needs a key.</source>
+        <translation>A condição &quot;%1&quot; precisa de uma chave.</translation>
+    </message>
+    <message>
+        <source>The condition &apos;%1&apos; needs &apos;if-session&apos; or &apos;unless-session&apos; and a session.</source>
+        <translation>A condição &quot;%1&quot; precisa de &quot;if-session&quot; ou &quot;unless-session&quot; e de uma sessão.</translation>
+    </message>
+    <message>
+        <source>The condition &apos;%1&apos; needs a schema and a key.</source>
+        <translation>A condição &quot;%1&quot; precisa de um esquema e de uma chave.</translation>
+    </message>
+    <message>
+        <source>There is no condition &apos;%1&apos;.</source>
+        <translation>Não existe a condição &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>A category is empty.</source>
+        <translation>Uma categoria está vazia.</translation>
+    </message>
+    <message>
+        <source>There is no registered category &apos;%1&apos;; one of your own has to begin with &apos;X-&apos;.</source>
+        <translation>Não existe a categoria registrada &quot;%1&quot;; uma categoria própria deve começar com &quot;X-&quot;.</translation>
+    </message>
+    <message>
+        <source>Change it to &apos;%1&apos;</source>
+        <translation>Alterar para &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; also needs: %2.</source>
+        <translation>A categoria &quot;%1&quot; também precisa de: %2.</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; goes with one of these: %2.</source>
+        <translation>A categoria &quot;%1&quot; acompanha uma destas: %2.</translation>
+    </message>
+    <message>
+        <source>Add &apos;%1&apos;</source>
+        <translation>Adicionar &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>Remove it</source>
+        <translation>Remover</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; is out of use.</source>
+        <translation>A categoria &quot;%1&quot; caiu em desuso.</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; is only for entries that list desktops in &apos;Only show in&apos;.</source>
+        <translation>A categoria &quot;%1&quot; é somente para entradas que listam ambientes em &quot;Mostrar somente em&quot;.</translation>
+    </message>
+    <message>
+        <source>No main category is among them, so menus may not know where to show the entry.</source>
+        <translation>Nenhuma delas é uma categoria principal; os menus podem não saber onde mostrar a entrada.</translation>
+    </message>
+    <message>
+        <source>Several main categories are among them, so the entry may be shown more than once.</source>
+        <translation>Várias delas são categorias principais; a entrada pode aparecer mais de uma vez.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; stands more than once.</source>
+        <translation>&quot;%1&quot; aparece mais de uma vez.</translation>
+    </message>
+    <message>
+        <source>Keep the first</source>
+        <translation>Manter a primeira ocorrência</translation>
+    </message>
+    <message>
+        <source>The application has no command.</source>
+        <translation>O aplicativo não tem comando.</translation>
+    </message>
+    <message>
+        <source>The link leads nowhere.</source>
+        <translation>O link não leva a lugar nenhum.</translation>
+    </message>
+    <message>
+        <source>A quote is not closed.</source>
+        <translation>Há aspas que não foram fechadas.</translation>
+    </message>
+    <message>
+        <source>In quotes, a backslash has to stand before &apos;%1&apos;.</source>
+        <translation>Entre aspas, deve haver uma barra invertida antes de &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>The command ends in a single backslash, which stands for nothing.</source>
+        <translation>O comando termina com uma única barra invertida, que não representa nada.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; has to stand in double quotes.</source>
+        <translation>&quot;%1&quot; deve ficar entre aspas duplas.</translation>
+    </message>
+    <message>
+        <source>Close the quote</source>
+        <translation>Fechar as aspas</translation>
+    </message>
+    <message>
+        <source>Put it in quotes</source>
+        <translation>Colocar entre aspas</translation>
+    </message>
+    <message>
+        <source>Have a shell run it</source>
+        <translation>Executar por meio de um shell</translation>
+    </message>
+    <message>
+        <source>Write &apos;%&apos; as &apos;%%&apos;</source>
+        <translation>Escrever &quot;%&quot; como &quot;%%&quot;</translation>
+    </message>
+    <message>
+        <source>A field code is not complete: &apos;%&apos; ends the command.</source>
+        <translation>Um código de campo está incompleto: o comando termina com &quot;%&quot;.</translation>
+    </message>
+    <message>
+        <source>There is no field code &apos;%%1&apos;.</source>
+        <translation>Não existe o código de campo &quot;%%1&quot;.</translation>
+    </message>
+    <message>
+        <source>The field code &apos;%%1&apos; is out of use; nothing is put in its place.</source>
+        <translation>O código de campo &quot;%%1&quot; caiu em desuso; nada é posto em seu lugar.</translation>
+    </message>
+    <message>
+        <source>Only one of &apos;%f&apos;, &apos;%F&apos;, &apos;%u&apos; and &apos;%U&apos; may stand in a command, and once.</source>
+        <translation>Um comando só pode ter um dos códigos &quot;%f&quot;, &quot;%F&quot;, &quot;%u&quot; e &quot;%U&quot;, e uma única vez.</translation>
+    </message>
+    <message>
+        <source>The field code &apos;%%1&apos; stands more than once.</source>
+        <translation>O código de campo &quot;%%1&quot; aparece mais de uma vez.</translation>
+    </message>
+    <message>
+        <source>The field code &apos;%%1&apos; has to be an argument of its own, not in quotes.</source>
+        <translation>O código de campo &quot;%%1&quot; deve ser um argumento separado, sem aspas.</translation>
+    </message>
+    <message>
+        <source>The path of the program has a blank: it has to stand in quotes.</source>
+        <translation>O caminho do programa contém um espaço: ele deve ficar entre aspas.</translation>
+    </message>
+    <message>
+        <source>There is no program &apos;%1&apos;.</source>
+        <translation>Não existe o programa &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>The command has to begin with a program.</source>
+        <translation>O comando deve começar com um programa.</translation>
+    </message>
+    <message>
+        <source>&apos;Try exec&apos; takes the program alone, without quotes and arguments.</source>
+        <translation>&quot;Comando de teste&quot; aceita apenas o programa, sem aspas nem argumentos.</translation>
+    </message>
+    <message>
+        <source>Keep the program</source>
+        <translation>Manter somente o programa</translation>
+    </message>
+    <message>
+        <source>There is no program &apos;%1&apos;, so the entry is not shown.</source>
+        <translation>Não existe o programa &quot;%1&quot;; por isso, a entrada não é exibida.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is missing.</source>
+        <translation>Falta &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; has translations only, and nothing for all other languages.</source>
+        <translation>&quot;%1&quot; só tem traduções e nada para todos os outros idiomas.</translation>
+    </message>
+    <message>
+        <source>Take &apos;%1&apos;</source>
+        <translation>Usar &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is only for entries of the type &apos;%2&apos;.</source>
+        <translation>&quot;%1&quot; é somente para entradas do tipo &quot;%2&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is out of use here.</source>
+        <translation>&quot;%1&quot; não é mais usado aqui.</translation>
+    </message>
+    <message>
+        <source>No key can be called &apos;%1&apos;.</source>
+        <translation>Nenhuma chave pode se chamar &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>There is no key &apos;%1&apos; here; one of your own has to begin with &apos;X-&apos;.</source>
+        <translation>Não existe a chave &quot;%1&quot; aqui; uma chave própria deve começar com &quot;X-&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; cannot be translated.</source>
+        <translation>&quot;%1&quot; não pode ser traduzido.</translation>
+    </message>
+    <message>
+        <source>&apos;Only show in&apos; and &apos;Not show in&apos; exclude each other.</source>
+        <translation>&quot;Mostrar somente em&quot; e &quot;Não mostrar em&quot; se excluem mutuamente.</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>O arquivo está vazio.</translation>
+    </message>
+    <message>
+        <source>The first group of the file is not &apos;[Desktop Entry]&apos;.</source>
+        <translation>O primeiro grupo do arquivo não é &quot;[Desktop Entry]&quot;.</translation>
+    </message>
+    <message>
+        <source>The name of the file has to end in &apos;.%1&apos;.</source>
+        <translation>O nome do arquivo deve terminar em &quot;.%1&quot;.</translation>
+    </message>
+    <message>
+        <source>Lines of the file end in a carriage return.</source>
+        <translation>Há linhas do arquivo que terminam com um retorno de carro.</translation>
+    </message>
+    <message>
+        <source>A line of the file says nothing: %1</source>
+        <translation>Uma linha do arquivo não diz nada: %1</translation>
+    </message>
+    <message>
+        <source>A line of the file stands before all groups: %1</source>
+        <translation>Uma linha do arquivo vem antes de todos os grupos: %1</translation>
+    </message>
+    <message>
+        <source>A line of the file begins with a blank: %1</source>
+        <translation>Uma linha do arquivo começa com um espaço: %1</translation>
+    </message>
+    <message>
+        <source>A blank stands behind a group: %1</source>
+        <translation>Há um espaço depois de um grupo: %1</translation>
+    </message>
+    <message>
+        <source>The group &apos;%1&apos; stands more than once.</source>
+        <translation>O grupo &quot;%1&quot; aparece mais de uma vez.</translation>
+    </message>
+    <message>
+        <source>No group can be called &apos;%1&apos;.</source>
+        <translation>Nenhum grupo pode se chamar &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>The group &apos;%1&apos; is out of use.</source>
+        <translation>O grupo &quot;%1&quot; caiu em desuso.</translation>
+    </message>
+    <message>
+        <source>There is no group &apos;%1&apos;; one of your own has to begin with &apos;X-&apos;.</source>
+        <translation>Não existe o grupo &quot;%1&quot;; um grupo próprio deve começar com &quot;X-&quot;.</translation>
+    </message>
+    <message>
+        <source>The id &apos;%1&apos; of an action may only have letters A to Z, digits and &apos;-&apos;.</source>
+        <translation>O identificador &quot;%1&quot; de uma ação só pode ter letras de A a Z, dígitos e &quot;-&quot;.</translation>
+    </message>
+    <message>
+        <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
+        <translation>A ação &quot;%1&quot; está descrita, mas não consta em &quot;Ações&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>
+        <translation>&quot;%1&quot; não é um tipo MIME: falta a &quot;/&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: nothing stands behind the &apos;/&apos;.</source>
+        <translation>&quot;%1&quot; não é um tipo MIME: não há nada depois da &quot;/&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: there is no kind &apos;%2&apos;.</source>
+        <translation>&quot;%1&quot; não é um tipo MIME: não existe a classe &quot;%2&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: it has a character that none has.</source>
+        <translation>&quot;%1&quot; não é um tipo MIME: contém um caractere que nenhum tipo tem.</translation>
+    </message>
+    <message>
+        <source>MIME types like &apos;%1&apos; are not used for files.</source>
+        <translation>Tipos MIME como &quot;%1&quot; não são usados para arquivos.</translation>
+    </message>
+    <message>
+        <source>This computer does not know the MIME type &apos;%1&apos;.</source>
+        <translation>Este computador não conhece o tipo MIME &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>An action has no id.</source>
+        <translation>Uma ação não tem identificador.</translation>
+    </message>
+    <message>
+        <source>Nothing says what the action &apos;%1&apos; is.</source>
+        <translation>Nada diz o que é a ação &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>There is no registered desktop &apos;%1&apos;; others have to begin with &apos;X-&apos;.</source>
+        <translation>Não existe o ambiente registrado &quot;%1&quot;; outros devem começar com &quot;X-&quot;.</translation>
+    </message>
+    <message>
+        <source>In your language the entry is shown as &apos;%1&apos;.</source>
+        <translation>No seu idioma, a entrada é exibida como &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>The comment says no more than the name.</source>
+        <translation>O comentário não diz nada além do nome.</translation>
+    </message>
+    <message>
+        <source>The comment says no more than the generic name.</source>
+        <translation>O comentário não diz nada além do nome genérico.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is out of use here; it has to be &apos;true&apos; or &apos;false&apos;.</source>
+        <translation>&quot;%1&quot; não é mais usado aqui; o valor deve ser &quot;true&quot; ou &quot;false&quot;.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; has to be &apos;true&apos; or &apos;false&apos;.</source>
+        <translation>&quot;%1&quot; deve ser &quot;true&quot; ou &quot;false&quot;.</translation>
+    </message>
+    <message>
+        <source>Change it to &apos;true&apos;</source>
+        <translation>Alterar para &quot;true&quot;</translation>
+    </message>
+    <message>
+        <source>The name of an icon has no suffix like &apos;%1&apos;.</source>
+        <translation>O nome de um ícone não leva uma extensão como &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>Remove the suffix</source>
+        <translation>Remover a extensão</translation>
+    </message>
+    <message>
+        <source>No icon theme has an icon &apos;%1&apos;.</source>
+        <translation>Nenhum tema de ícones tem o ícone &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>Write the folder in full</source>
+        <translation>Escrever o caminho completo da pasta</translation>
+    </message>
+    <message>
+        <source>The address does not say how to reach it, as &apos;https:&apos; and &apos;file:&apos; do.</source>
+        <translation>O endereço não diz como chegar até ele, como fazem &quot;https:&quot; e &quot;file:&quot;.</translation>
+    </message>
+    <message>
+        <source>The text is not encoded in UTF-8.</source>
+        <translation>O texto não está codificado em UTF-8.</translation>
+    </message>
+    <message>
+        <source>A control character or tab may not stand here.</source>
+        <translation>Não pode haver aqui um caractere de controle ou uma tabulação.</translation>
+    </message>
+    <message>
+        <source>The type has to be &apos;Application&apos;, &apos;Link&apos; or &apos;Directory&apos;, not &apos;%1&apos;.</source>
+        <translation>O tipo deve ser &quot;Application&quot;, &quot;Link&quot; ou &quot;Directory&quot;, não &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
+        <translation>Os programas que verificam entradas ainda não conhecem a versão 1.5 do padrão.</translation>
+    </message>
+    <message>
+        <source>There is no version &apos;%1&apos; of the standard.</source>
+        <translation>Não existe a versão &quot;%1&quot; do padrão.</translation>
+    </message>
+    <message>
+        <source>There is no encoding &apos;%1&apos;.</source>
+        <translation>Não existe a codificação &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>There is no picture &apos;%1&apos;.</source>
+        <translation>Não existe a imagem &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>An icon has a name or a path that begins with &apos;/&apos;.</source>
+        <translation>Um ícone tem um nome ou um caminho que começa com &quot;/&quot;.</translation>
+    </message>
+    <message>
+        <source>The path of a folder begins with &apos;/&apos;.</source>
+        <translation>O caminho de uma pasta começa com &quot;/&quot;.</translation>
+    </message>
+    <message>
+        <source>There is no folder &apos;%1&apos;.</source>
+        <translation>Não existe a pasta &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>There is no file &apos;%1&apos;.</source>
+        <translation>Não existe o arquivo &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
+        <translation>O D-Bus não consegue iniciar &quot;%1&quot;: é preciso um arquivo com um nome como &quot;org.example.Program.desktop&quot;.</translation>
+    </message>
+</context>
+<context>
+    <name>EntryTrial</name>
+    <message>
+        <source>The entry could not be written to a temporary file.</source>
+        <translation>Não foi possível gravar a entrada em um arquivo temporário.</translation>
+    </message>
+</context>
+<context>
     <name>KeyAssistance</name>
     <message>
         <source>Press the keys of the shortcut. Tab leaves the field.</source>
@@ -181,6 +575,126 @@
     </message>
 </context>
 <context>
+    <name>KeyDescription</name>
+    <message>
+        <source>Whether the entry starts a program, opens an address or describes a folder of the menu.</source>
+        <translation>Se a entrada inicia um programa, abre um endereço ou descreve uma pasta do menu.</translation>
+    </message>
+    <message>
+        <source>The name that menus show.</source>
+        <translation>O nome que os menus mostram.</translation>
+    </message>
+    <message>
+        <source>The icon that menus show: a name from the icon theme, or the full path of a picture.</source>
+        <translation>O ícone que os menus mostram: um nome do tema de ícones ou o caminho completo de uma imagem.</translation>
+    </message>
+    <message>
+        <source>The command that starts the program, with codes such as %f for the files that it opens.</source>
+        <translation>O comando que inicia o programa, com códigos como %f para os arquivos que ele abre.</translation>
+    </message>
+    <message>
+        <source>Whether the program needs a terminal window.</source>
+        <translation>Se o programa precisa de uma janela de terminal.</translation>
+    </message>
+    <message>
+        <source>The folder in which the program starts.</source>
+        <translation>A pasta em que o programa é iniciado.</translation>
+    </message>
+    <message>
+        <source>A program that has to be installed; without it menus leave the entry out.</source>
+        <translation>Um programa que precisa estar instalado; sem ele, os menus omitem a entrada.</translation>
+    </message>
+    <message>
+        <source>The address that the entry opens.</source>
+        <translation>O endereço que a entrada abre.</translation>
+    </message>
+    <message>
+        <source>What kind of program it is, such as: Web browser.</source>
+        <translation>Que tipo de programa é, por exemplo: Navegador da Web.</translation>
+    </message>
+    <message>
+        <source>A sentence about the program, which menus show as a tip.</source>
+        <translation>Uma frase sobre o programa, que os menus mostram como dica.</translation>
+    </message>
+    <message>
+        <source>Whether menus leave the entry out although the program can be used.</source>
+        <translation>Se os menus omitem a entrada, embora o programa possa ser usado.</translation>
+    </message>
+    <message>
+        <source>Whether the entry counts as deleted.</source>
+        <translation>Se a entrada é considerada excluída.</translation>
+    </message>
+    <message>
+        <source>The desktop environments that alone show the entry; none means all.</source>
+        <translation>Os únicos ambientes de área de trabalho que mostram a entrada; nenhum significa todos.</translation>
+    </message>
+    <message>
+        <source>The desktop environments that do not show the entry.</source>
+        <translation>Os ambientes de área de trabalho que não mostram a entrada.</translation>
+    </message>
+    <message>
+        <source>The types of files that the program opens.</source>
+        <translation>Os tipos de arquivos que o programa abre.</translation>
+    </message>
+    <message>
+        <source>The groups of the menu that the program belongs to.</source>
+        <translation>Os grupos do menu a que o programa pertence.</translation>
+    </message>
+    <message>
+        <source>Words by which a search finds the program beside its name.</source>
+        <translation>Palavras pelas quais uma pesquisa encontra o programa, além do nome.</translation>
+    </message>
+    <message>
+        <source>Whether the program tells when it has started, so that the pointer shows it until then.</source>
+        <translation>Se o programa avisa quando terminou de iniciar, para que o ponteiro o indique até lá.</translation>
+    </message>
+    <message>
+        <source>The class of the window by which the desktop knows that the program has started.</source>
+        <translation>A classe da janela pela qual o ambiente reconhece que o programa foi iniciado.</translation>
+    </message>
+    <message>
+        <source>Further things that the program can be started for, such as: New window.</source>
+        <translation>Outras coisas para as quais o programa pode ser iniciado, por exemplo: Nova janela.</translation>
+    </message>
+    <message>
+        <source>The version of the standard for entries that this one follows.</source>
+        <translation>A versão do padrão de entradas que esta segue.</translation>
+    </message>
+    <message>
+        <source>%1 Only for users of one language.</source>
+        <comment>%1 is a sentence about a key</comment>
+        <translation>%1 Somente para usuários de um idioma.</translation>
+    </message>
+</context>
+<context>
+    <name>LanguageNote</name>
+    <message>
+        <source>Users of %1 see these texts.</source>
+        <translation>Os usuários de %1 veem estes textos.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see these texts, and those of %2 where one is missing.</source>
+        <translation>Os usuários de %1 veem estes textos e, onde faltar algum, os de %2.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see these texts, and those without a language where one is missing.</source>
+        <translation>Os usuários de %1 veem estes textos e, onde faltar algum, os sem idioma.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see the texts of %2.</source>
+        <translation>Os usuários de %1 veem os textos de %2.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see the texts without a language.</source>
+        <translation>Os usuários de %1 veem os textos sem idioma.</translation>
+    </message>
+    <message>
+        <source>%1 Texts of their own have: %2.</source>
+        <comment>%1 is a sentence, %2 a list of languages</comment>
+        <translation>%1 Têm textos próprios: %2.</translation>
+    </message>
+</context>
+<context>
     <name>MenuDeletion</name>
     <message>
         <source>There is no trash for %1. It would be deleted for good: this cannot be undone. Delete it?</source>
@@ -196,6 +710,52 @@
     <message>
         <source>%1 cannot be deleted: %2</source>
         <translation>Não foi possível excluir %1: %2</translation>
+    </message>
+    <message numerus="yes">
+        <source>The deletion was canceled. %n items are still there, in whole or in part.</source>
+        <translation>
+            <numerusform>A exclusão foi cancelada. %n item ainda existe, no todo ou em parte.</numerusform>
+            <numerusform>A exclusão foi cancelada. %n itens ainda existem, no todo ou em parte.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>The deletion was canceled. Still there, in whole or in part: %1.</source>
+        <translation>A exclusão foi cancelada. Ainda existem, no todo ou em parte: %1.</translation>
+    </message>
+</context>
+<context>
+    <name>MenuDrop</name>
+    <message>
+        <source>The folder &apos;%1&apos; already has &apos;%2&apos;. Keep both gives the new one another file name, Replace puts the old one into the trash, Skip leaves the new one where it is; Cancel leaves everything as it is.</source>
+        <translation>A pasta &quot;%1&quot; já tem &quot;%2&quot;. &quot;Manter ambos&quot; dá ao novo outro nome de arquivo, &quot;Substituir&quot; move o antigo para a lixeira, &quot;Pular&quot; deixa o novo onde está; &quot;Cancelar&quot; deixa tudo como está.</translation>
+    </message>
+    <message>
+        <source>The folder &apos;%1&apos; already has &apos;%2&apos;, which the new one comes from. Keep both gives the new one another file name, Skip leaves it where it is; Cancel leaves everything as it is.</source>
+        <translation>A pasta &quot;%1&quot; já tem &quot;%2&quot;, do qual o novo provém. &quot;Manter ambos&quot; dá ao novo outro nome de arquivo, &quot;Pular&quot; o deixa onde está; &quot;Cancelar&quot; deixa tudo como está.</translation>
+    </message>
+    <message>
+        <source>Another one that comes to the folder &apos;%1&apos; has the same file name as &apos;%2&apos;. Keep both gives this one another file name, Skip leaves it where it is; Cancel leaves everything as it is.</source>
+        <translation>Outro item que vai para a pasta &quot;%1&quot; tem o mesmo nome de arquivo que &quot;%2&quot;. &quot;Manter ambos&quot; dá a este outro nome de arquivo, &quot;Pular&quot; o deixa onde está; &quot;Cancelar&quot; deixa tudo como está.</translation>
+    </message>
+    <message>
+        <source>Name already taken</source>
+        <translation>Nome já em uso</translation>
+    </message>
+    <message>
+        <source>&amp;Keep both</source>
+        <translation>Manter &amp;ambos</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Substituir</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Pular</translation>
+    </message>
+    <message>
+        <source>&amp;Do the same with all further ones</source>
+        <translation>&amp;Fazer o mesmo com todos os demais</translation>
     </message>
 </context>
 <context>
@@ -456,6 +1016,147 @@
         <source>The folder %1 was deleted (1 entry).</source>
         <translation>A pasta %1 foi excluída (1 entrada).</translation>
     </message>
+    <message numerus="yes">
+        <source>Undo deletion of %1 items (%n entries)</source>
+        <translation>
+            <numerusform>Desfazer a exclusão de %1 itens (%n entrada)</numerusform>
+            <numerusform>Desfazer a exclusão de %1 itens (%n entradas)</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of %1 items (%n entries)</source>
+        <translation>
+            <numerusform>Refazer a exclusão de %1 itens (%n entrada)</numerusform>
+            <numerusform>Refazer a exclusão de %1 itens (%n entradas)</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 items were deleted (%n entries).</source>
+        <translation>
+            <numerusform>%1 itens foram excluídos (%n entrada).</numerusform>
+            <numerusform>%1 itens foram excluídos (%n entradas).</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo reordering of %n items</source>
+        <translation>
+            <numerusform>Desfazer a reordenação de %n item</numerusform>
+            <numerusform>Desfazer a reordenação de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo reordering of %n items</source>
+        <translation>
+            <numerusform>Refazer a reordenação de %n item</numerusform>
+            <numerusform>Refazer a reordenação de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items have other places.</source>
+        <translation>
+            <numerusform>%n item tem outro lugar.</numerusform>
+            <numerusform>%n itens têm outros lugares.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo hiding of %n items</source>
+        <translation>
+            <numerusform>Desfazer a ocultação de %n item</numerusform>
+            <numerusform>Desfazer a ocultação de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo hiding of %n items</source>
+        <translation>
+            <numerusform>Refazer a ocultação de %n item</numerusform>
+            <numerusform>Refazer a ocultação de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items are hidden: the menu no longer shows them.</source>
+        <translation>
+            <numerusform>%n item está oculto: o menu não o mostra mais.</numerusform>
+            <numerusform>%n itens estão ocultos: o menu não os mostra mais.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo showing %n items again</source>
+        <translation>
+            <numerusform>Desfazer a reexibição de %n item</numerusform>
+            <numerusform>Desfazer a reexibição de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo showing %n items again</source>
+        <translation>
+            <numerusform>Refazer a reexibição de %n item</numerusform>
+            <numerusform>Refazer a reexibição de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The menu shows %n items again.</source>
+        <translation>
+            <numerusform>O menu mostra %n item novamente.</numerusform>
+            <numerusform>O menu mostra %n itens novamente.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo sorting of folder %1</source>
+        <translation>Desfazer a ordenação da pasta %1</translation>
+    </message>
+    <message>
+        <source>Redo sorting of folder %1</source>
+        <translation>Refazer a ordenação da pasta %1</translation>
+    </message>
+    <message>
+        <source>The folder %1 was sorted by name.</source>
+        <translation>A pasta %1 foi ordenada por nome.</translation>
+    </message>
+    <message>
+        <source>Undo duplication of %1</source>
+        <translation>Desfazer a duplicação de %1</translation>
+    </message>
+    <message>
+        <source>Redo duplication of %1</source>
+        <translation>Refazer a duplicação de %1</translation>
+    </message>
+    <message>
+        <source>%1 was duplicated. The copy is selected.</source>
+        <translation>%1 foi duplicado. A cópia está selecionada.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo duplication of %n items</source>
+        <translation>
+            <numerusform>Desfazer a duplicação de %n item</numerusform>
+            <numerusform>Desfazer a duplicação de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo duplication of %n items</source>
+        <translation>
+            <numerusform>Refazer a duplicação de %n item</numerusform>
+            <numerusform>Refazer a duplicação de %n itens</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were duplicated. The copies are selected.</source>
+        <translation>
+            <numerusform>%n item foi duplicado. A cópia está selecionada.</numerusform>
+            <numerusform>%n itens foram duplicados. As cópias estão selecionadas.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo deletion of %1 items (1 entry)</source>
+        <translation>Desfazer a exclusão de %1 itens (1 entrada)</translation>
+    </message>
+    <message>
+        <source>Redo deletion of %1 items (1 entry)</source>
+        <translation>Refazer a exclusão de %1 itens (1 entrada)</translation>
+    </message>
+    <message>
+        <source>%1 items were deleted (1 entry).</source>
+        <translation>%1 itens foram excluídos (1 entrada).</translation>
+    </message>
 </context>
 <context>
     <name>QFileSystemModel</name>
@@ -490,6 +1191,10 @@
     <message>
         <source>%1 already exists. Overwrite?</source>
         <translation>%1 já existe. Deseja sobrescrever?</translation>
+    </message>
+    <message>
+        <source>Can&apos;t link %1: %2</source>
+        <translation>Não foi possível criar o link %1: %2</translation>
     </message>
 </context>
 <context>
@@ -982,6 +1687,10 @@ Escolha outra pasta ou outro nome e tente novamente.</translation>
         <source>&lt;b&gt;Desktop entry&lt;/b&gt; is a multipurpose info file for installed apps, devices, etc. It can be used to build menu entries, shortcuts, etc. This dialog implements the &apos;Desktop Entry Standard&apos; of &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt;.&lt;br&gt;&lt;br&gt;Desktop entry file is a text ini-like file with one main section [Desktop Entry] and possible additional sections for each action defined in the main section field &apos;Actions&apos;. All fields are text string pairs: key=value. Value can also be a semicolon separated string list.</source>
         <translation>Uma &lt;b&gt;entrada de desktop&lt;/b&gt; é um arquivo de informações de múltiplos usos para aplicativos instalados, dispositivos, etc. Ela pode ser usada para criar itens de menu, atalhos, etc. Esta janela implementa o &quot;Desktop Entry Standard&quot; de &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt;.&lt;br&gt;&lt;br&gt;O arquivo de uma entrada de desktop é um arquivo de texto no estilo INI com uma seção principal [Desktop Entry] e possíveis seções adicionais para cada ação definida no campo &quot;Actions&quot; da seção principal. Todos os campos são pares de textos: chave=valor. O valor também pode ser uma lista de textos separados por ponto e vírgula.</translation>
     </message>
+    <message>
+        <source>The file %1 is not a desktop entry: it has no group [Desktop Entry].</source>
+        <translation>O arquivo %1 não é uma entrada de desktop: não tem o grupo [Desktop Entry].</translation>
+    </message>
 </context>
 <context>
     <name>VelDesktopEntryPropsWidgetPrivate</name>
@@ -1386,14 +2095,6 @@ serão perdidos. Tem certeza?</translation>
         <translation>O menu é grande demais para ser pesquisado por inteiro. Somente uma parte foi pesquisada.</translation>
     </message>
     <message>
-        <source>Hide</source>
-        <translation>Ocultar</translation>
-    </message>
-    <message>
-        <source>Show again</source>
-        <translation>Mostrar novamente</translation>
-    </message>
-    <message>
         <source>&apos;%1&apos; was not changed: the file %2 cannot be written.</source>
         <translation>&quot;%1&quot; não foi alterado: não é possível gravar no arquivo %2.</translation>
     </message>
@@ -1431,12 +2132,123 @@ serão perdidos. Tem certeza?</translation>
         <translation>A exclusão de %1 foi cancelada. O que ainda não havia sido excluído continua lá.</translation>
     </message>
     <message>
-        <source>Reload</source>
-        <translation>Recarregar</translation>
-    </message>
-    <message>
         <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
         <translation>Este menu está vazio. Pressione %1 para uma nova entrada ou clique aqui com o botão direito para ver o que mais pode ser adicionado.</translation>
+    </message>
+    <message>
+        <source>the program %1 ended with an error</source>
+        <translation>o programa %1 terminou com um erro</translation>
+    </message>
+    <message>
+        <source>the program %1 cannot be run</source>
+        <translation>não foi possível executar o programa %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>And %n more.</source>
+        <translation>
+            <numerusform>E mais %n.</numerusform>
+            <numerusform>E mais %n.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Open containin&amp;g folder</source>
+        <translation>Abrir pasta &amp;que contém o item</translation>
+    </message>
+    <message>
+        <source>The folder %1 was not opened: %2.</source>
+        <translation>A pasta %1 não foi aberta: %2.</translation>
+    </message>
+    <message>
+        <source>New &amp;folder</source>
+        <translation>Nova pa&amp;sta</translation>
+    </message>
+    <message>
+        <source>New entr&amp;y</source>
+        <translation>Nova e&amp;ntrada</translation>
+    </message>
+    <message>
+        <source>&amp;Edit</source>
+        <translation>&amp;Editar</translation>
+    </message>
+    <message>
+        <source>&amp;Delete</source>
+        <translation>Exc&amp;luir</translation>
+    </message>
+    <message>
+        <source>E&amp;xecute</source>
+        <translation>E&amp;xecutar</translation>
+    </message>
+    <message>
+        <source>F&amp;ind</source>
+        <translation>Locali&amp;zar</translation>
+    </message>
+    <message>
+        <source>Find &amp;Next</source>
+        <translation>Localizar &amp;próxima</translation>
+    </message>
+    <message>
+        <source>Cu&amp;t</source>
+        <translation>Recor&amp;tar</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>&amp;Copiar</translation>
+    </message>
+    <message>
+        <source>&amp;Paste</source>
+        <translation>Col&amp;ar</translation>
+    </message>
+    <message>
+        <source>Default &amp;menu...</source>
+        <translation>&amp;Menu padrão...</translation>
+    </message>
+    <message>
+        <source>&amp;Up</source>
+        <translation>Para c&amp;ima</translation>
+    </message>
+    <message>
+        <source>D&amp;own</source>
+        <translation>Para &amp;baixo</translation>
+    </message>
+    <message>
+        <source>Dup&amp;licate</source>
+        <translation>D&amp;uplicar</translation>
+    </message>
+    <message>
+        <source>&amp;Hide</source>
+        <translation>&amp;Ocultar</translation>
+    </message>
+    <message>
+        <source>Sho&amp;w again</source>
+        <translation>Mostrar no&amp;vamente</translation>
+    </message>
+    <message>
+        <source>&amp;Reload</source>
+        <translation>&amp;Recarregar</translation>
+    </message>
+    <message>
+        <source>&amp;Sort by name</source>
+        <translation>Or&amp;denar por nome</translation>
+    </message>
+    <message>
+        <source>The folder %1 is sorted by name already.</source>
+        <translation>A pasta %1 já está ordenada por nome.</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1, because no application is installed. The menu was left as it is.</source>
+        <translation>Não foi possível criar o menu padrão em %1, porque nenhum aplicativo está instalado. O menu ficou como estava.</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1: %2. The menu was left as it is.</source>
+        <translation>Não foi possível criar o menu padrão em %1: %2. O menu ficou como estava.</translation>
+    </message>
+    <message>
+        <source>%1 is no file on this computer. Nothing was moved or copied.</source>
+        <translation>%1 não é um arquivo deste computador. Nada foi movido nem copiado.</translation>
+    </message>
+    <message>
+        <source>%1 was not started: %2.</source>
+        <translation>%1 não foi iniciado: %2.</translation>
     </message>
 </context>
 <context>
@@ -1475,6 +2287,712 @@ serão perdidos. Tem certeza?</translation>
     </message>
 </context>
 <context>
+    <name>VelUI::CategoryChooser</name>
+    <message>
+        <source>Main category</source>
+        <translation>Categoria principal</translation>
+    </message>
+    <message>
+        <source>Goes with %1</source>
+        <translation>Acompanha %1</translation>
+    </message>
+    <message>
+        <source>Only beside &quot;Only show in&quot;</source>
+        <translation>Somente junto com &quot;Mostrar somente em&quot;</translation>
+    </message>
+    <message>
+        <source>Deprecated</source>
+        <translation>Obsoleta</translation>
+    </message>
+    <message>
+        <source>Extension</source>
+        <comment>a category of somebody&apos;s own, X-...</comment>
+        <translation>Extensão</translation>
+    </message>
+    <message>
+        <source>Not registered</source>
+        <translation>Não registrada</translation>
+    </message>
+    <message>
+        <source>Choose categories</source>
+        <translation>Escolher categorias</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <comment>title of a column</comment>
+        <translation>Nome</translation>
+    </message>
+    <message>
+        <source>Category</source>
+        <comment>title of a column</comment>
+        <translation>Categoria</translation>
+    </message>
+    <message>
+        <source>Remark</source>
+        <comment>title of a column</comment>
+        <translation>Observação</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::CategoryNames</name>
+    <message>
+        <source>Audio and video</source>
+        <translation>Áudio e vídeo</translation>
+    </message>
+    <message>
+        <source>Audio</source>
+        <translation>Áudio</translation>
+    </message>
+    <message>
+        <source>Video</source>
+        <translation>Vídeo</translation>
+    </message>
+    <message>
+        <source>Software development</source>
+        <translation>Desenvolvimento de software</translation>
+    </message>
+    <message>
+        <source>Education</source>
+        <translation>Educação</translation>
+    </message>
+    <message>
+        <source>Games</source>
+        <translation>Jogos</translation>
+    </message>
+    <message>
+        <source>Graphics</source>
+        <translation>Gráficos</translation>
+    </message>
+    <message>
+        <source>Internet and network</source>
+        <translation>Internet e rede</translation>
+    </message>
+    <message>
+        <source>Office</source>
+        <translation>Escritório</translation>
+    </message>
+    <message>
+        <source>Science</source>
+        <translation>Ciência</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Configurações</translation>
+    </message>
+    <message>
+        <source>System tools</source>
+        <translation>Ferramentas do sistema</translation>
+    </message>
+    <message>
+        <source>Accessories</source>
+        <translation>Acessórios</translation>
+    </message>
+    <message>
+        <source>Build tools</source>
+        <translation>Ferramentas de compilação</translation>
+    </message>
+    <message>
+        <source>Debuggers</source>
+        <translation>Depuradores</translation>
+    </message>
+    <message>
+        <source>Development environments</source>
+        <translation>Ambientes de desenvolvimento</translation>
+    </message>
+    <message>
+        <source>Designers of user interfaces</source>
+        <translation>Projeto de interfaces gráficas</translation>
+    </message>
+    <message>
+        <source>Profilers</source>
+        <translation>Analisadores de desempenho</translation>
+    </message>
+    <message>
+        <source>Revision control</source>
+        <translation>Controle de versões</translation>
+    </message>
+    <message>
+        <source>Translation tools</source>
+        <translation>Ferramentas de tradução</translation>
+    </message>
+    <message>
+        <source>Calendars</source>
+        <translation>Calendários</translation>
+    </message>
+    <message>
+        <source>Address books</source>
+        <translation>Catálogos de endereços</translation>
+    </message>
+    <message>
+        <source>Databases</source>
+        <translation>Bancos de dados</translation>
+    </message>
+    <message>
+        <source>Dictionaries</source>
+        <translation>Dicionários</translation>
+    </message>
+    <message>
+        <source>Charts</source>
+        <translation>Gráficos de dados</translation>
+    </message>
+    <message>
+        <source>Email</source>
+        <translation>E-mail</translation>
+    </message>
+    <message>
+        <source>Finances</source>
+        <translation>Finanças</translation>
+    </message>
+    <message>
+        <source>Flow charts</source>
+        <translation>Fluxogramas</translation>
+    </message>
+    <message>
+        <source>Handheld devices</source>
+        <translation>Dispositivos portáteis</translation>
+    </message>
+    <message>
+        <source>Project management</source>
+        <translation>Gerenciamento de projetos</translation>
+    </message>
+    <message>
+        <source>Presentations</source>
+        <translation>Apresentações</translation>
+    </message>
+    <message>
+        <source>Spreadsheets</source>
+        <translation>Planilhas</translation>
+    </message>
+    <message>
+        <source>Word processors</source>
+        <translation>Processadores de texto</translation>
+    </message>
+    <message>
+        <source>Two-dimensional graphics</source>
+        <translation>Gráficos bidimensionais</translation>
+    </message>
+    <message>
+        <source>Vector graphics</source>
+        <translation>Gráficos vetoriais</translation>
+    </message>
+    <message>
+        <source>Raster graphics</source>
+        <translation>Gráficos rasterizados</translation>
+    </message>
+    <message>
+        <source>Three-dimensional graphics</source>
+        <translation>Gráficos tridimensionais</translation>
+    </message>
+    <message>
+        <source>Scanning</source>
+        <translation>Digitalização</translation>
+    </message>
+    <message>
+        <source>Text recognition</source>
+        <translation>Reconhecimento de texto</translation>
+    </message>
+    <message>
+        <source>Photography</source>
+        <translation>Fotografia</translation>
+    </message>
+    <message>
+        <source>Desktop publishing</source>
+        <translation>Editoração eletrônica</translation>
+    </message>
+    <message>
+        <source>Viewers</source>
+        <translation>Visualizadores</translation>
+    </message>
+    <message>
+        <source>Text tools</source>
+        <translation>Ferramentas de texto</translation>
+    </message>
+    <message>
+        <source>Desktop settings</source>
+        <translation>Configurações da área de trabalho</translation>
+    </message>
+    <message>
+        <source>Hardware settings</source>
+        <translation>Configurações de hardware</translation>
+    </message>
+    <message>
+        <source>Printing</source>
+        <translation>Impressão</translation>
+    </message>
+    <message>
+        <source>Package managers</source>
+        <translation>Gerenciadores de pacotes</translation>
+    </message>
+    <message>
+        <source>Dial-up connections</source>
+        <translation>Conexões discadas</translation>
+    </message>
+    <message>
+        <source>Instant messaging</source>
+        <translation>Mensagens instantâneas</translation>
+    </message>
+    <message>
+        <source>Chat</source>
+        <translation>Bate-papo</translation>
+    </message>
+    <message>
+        <source>IRC</source>
+        <translation>IRC</translation>
+    </message>
+    <message>
+        <source>News feeds</source>
+        <translation>Fontes de notícias</translation>
+    </message>
+    <message>
+        <source>File transfer</source>
+        <translation>Transferência de arquivos</translation>
+    </message>
+    <message>
+        <source>Amateur radio</source>
+        <translation>Radioamadorismo</translation>
+    </message>
+    <message>
+        <source>Newsgroups</source>
+        <translation>Grupos de notícias</translation>
+    </message>
+    <message>
+        <source>File sharing</source>
+        <translation>Compartilhamento de arquivos</translation>
+    </message>
+    <message>
+        <source>Remote access</source>
+        <translation>Acesso remoto</translation>
+    </message>
+    <message>
+        <source>Telephony</source>
+        <translation>Telefonia</translation>
+    </message>
+    <message>
+        <source>Telephony tools</source>
+        <translation>Ferramentas de telefonia</translation>
+    </message>
+    <message>
+        <source>Video conferences</source>
+        <translation>Videoconferências</translation>
+    </message>
+    <message>
+        <source>Web browsers</source>
+        <translation>Navegadores da Web</translation>
+    </message>
+    <message>
+        <source>Web development</source>
+        <translation>Desenvolvimento Web</translation>
+    </message>
+    <message>
+        <source>MIDI</source>
+        <translation>MIDI</translation>
+    </message>
+    <message>
+        <source>Mixers</source>
+        <translation>Mixers</translation>
+    </message>
+    <message>
+        <source>Sequencers</source>
+        <translation>Sequenciadores</translation>
+    </message>
+    <message>
+        <source>Tuners</source>
+        <translation>Afinadores</translation>
+    </message>
+    <message>
+        <source>Television</source>
+        <translation>Televisão</translation>
+    </message>
+    <message>
+        <source>Audio and video editing</source>
+        <translation>Edição de áudio e vídeo</translation>
+    </message>
+    <message>
+        <source>Players</source>
+        <translation>Reprodutores</translation>
+    </message>
+    <message>
+        <source>Recorders</source>
+        <translation>Gravadores</translation>
+    </message>
+    <message>
+        <source>Disc burning</source>
+        <translation>Gravação de discos</translation>
+    </message>
+    <message>
+        <source>Action games</source>
+        <translation>Jogos de ação</translation>
+    </message>
+    <message>
+        <source>Adventure games</source>
+        <translation>Jogos de aventura</translation>
+    </message>
+    <message>
+        <source>Arcade games</source>
+        <translation>Jogos de fliperama</translation>
+    </message>
+    <message>
+        <source>Board games</source>
+        <translation>Jogos de tabuleiro</translation>
+    </message>
+    <message>
+        <source>Falling blocks games</source>
+        <translation>Jogos de blocos que caem</translation>
+    </message>
+    <message>
+        <source>Card games</source>
+        <translation>Jogos de cartas</translation>
+    </message>
+    <message>
+        <source>Games for children</source>
+        <translation>Jogos infantis</translation>
+    </message>
+    <message>
+        <source>Logic games</source>
+        <translation>Jogos de lógica</translation>
+    </message>
+    <message>
+        <source>Role-playing games</source>
+        <translation>Jogos de RPG</translation>
+    </message>
+    <message>
+        <source>Shooters</source>
+        <translation>Jogos de tiro</translation>
+    </message>
+    <message>
+        <source>Simulations</source>
+        <translation>Simulações</translation>
+    </message>
+    <message>
+        <source>Sports games</source>
+        <translation>Jogos de esportes</translation>
+    </message>
+    <message>
+        <source>Strategy games</source>
+        <translation>Jogos de estratégia</translation>
+    </message>
+    <message>
+        <source>Art</source>
+        <translation>Arte</translation>
+    </message>
+    <message>
+        <source>Construction</source>
+        <translation>Construção</translation>
+    </message>
+    <message>
+        <source>Music</source>
+        <translation>Música</translation>
+    </message>
+    <message>
+        <source>Languages</source>
+        <translation>Idiomas</translation>
+    </message>
+    <message>
+        <source>Artificial intelligence</source>
+        <translation>Inteligência artificial</translation>
+    </message>
+    <message>
+        <source>Astronomy</source>
+        <translation>Astronomia</translation>
+    </message>
+    <message>
+        <source>Biology</source>
+        <translation>Biologia</translation>
+    </message>
+    <message>
+        <source>Chemistry</source>
+        <translation>Química</translation>
+    </message>
+    <message>
+        <source>Computer science</source>
+        <translation>Ciência da computação</translation>
+    </message>
+    <message>
+        <source>Data visualization</source>
+        <translation>Visualização de dados</translation>
+    </message>
+    <message>
+        <source>Economics</source>
+        <translation>Economia</translation>
+    </message>
+    <message>
+        <source>Electricity</source>
+        <translation>Eletricidade</translation>
+    </message>
+    <message>
+        <source>Geography</source>
+        <translation>Geografia</translation>
+    </message>
+    <message>
+        <source>Geology</source>
+        <translation>Geologia</translation>
+    </message>
+    <message>
+        <source>Earth sciences</source>
+        <translation>Ciências da Terra</translation>
+    </message>
+    <message>
+        <source>History</source>
+        <translation>História</translation>
+    </message>
+    <message>
+        <source>Humanities</source>
+        <translation>Ciências humanas</translation>
+    </message>
+    <message>
+        <source>Image processing</source>
+        <translation>Processamento de imagens</translation>
+    </message>
+    <message>
+        <source>Literature</source>
+        <translation>Literatura</translation>
+    </message>
+    <message>
+        <source>Maps</source>
+        <translation>Mapas</translation>
+    </message>
+    <message>
+        <source>Mathematics</source>
+        <translation>Matemática</translation>
+    </message>
+    <message>
+        <source>Numerical analysis</source>
+        <translation>Análise numérica</translation>
+    </message>
+    <message>
+        <source>Medicine</source>
+        <translation>Medicina</translation>
+    </message>
+    <message>
+        <source>Physics</source>
+        <translation>Física</translation>
+    </message>
+    <message>
+        <source>Robotics</source>
+        <translation>Robótica</translation>
+    </message>
+    <message>
+        <source>Spirituality</source>
+        <translation>Espiritualidade</translation>
+    </message>
+    <message>
+        <source>Sports</source>
+        <translation>Esportes</translation>
+    </message>
+    <message>
+        <source>Parallel computing</source>
+        <translation>Computação paralela</translation>
+    </message>
+    <message>
+        <source>Amusement</source>
+        <translation>Diversão</translation>
+    </message>
+    <message>
+        <source>Archiving</source>
+        <translation>Arquivamento</translation>
+    </message>
+    <message>
+        <source>Compression</source>
+        <translation>Compressão</translation>
+    </message>
+    <message>
+        <source>Electronics</source>
+        <translation>Eletrônica</translation>
+    </message>
+    <message>
+        <source>Emulators</source>
+        <translation>Emuladores</translation>
+    </message>
+    <message>
+        <source>Engineering</source>
+        <translation>Engenharia</translation>
+    </message>
+    <message>
+        <source>File tools</source>
+        <translation>Ferramentas de arquivos</translation>
+    </message>
+    <message>
+        <source>File managers</source>
+        <translation>Gerenciadores de arquivos</translation>
+    </message>
+    <message>
+        <source>Terminals</source>
+        <translation>Terminais</translation>
+    </message>
+    <message>
+        <source>File systems</source>
+        <translation>Sistemas de arquivos</translation>
+    </message>
+    <message>
+        <source>Monitors</source>
+        <translation>Monitores do sistema</translation>
+    </message>
+    <message>
+        <source>Security</source>
+        <translation>Segurança</translation>
+    </message>
+    <message>
+        <source>Accessibility</source>
+        <translation>Acessibilidade</translation>
+    </message>
+    <message>
+        <source>Calculators</source>
+        <translation>Calculadoras</translation>
+    </message>
+    <message>
+        <source>Clocks</source>
+        <translation>Relógios</translation>
+    </message>
+    <message>
+        <source>Text editors</source>
+        <translation>Editores de texto</translation>
+    </message>
+    <message>
+        <source>Documentation</source>
+        <translation>Documentação</translation>
+    </message>
+    <message>
+        <source>For adults</source>
+        <translation>Para adultos</translation>
+    </message>
+    <message>
+        <source>Core of the desktop</source>
+        <translation>Núcleo do ambiente de área de trabalho</translation>
+    </message>
+    <message>
+        <source>Made with KDE</source>
+        <translation>Feitos com KDE</translation>
+    </message>
+    <message>
+        <source>Made with GNOME</source>
+        <translation>Feitos com GNOME</translation>
+    </message>
+    <message>
+        <source>Made with Xfce</source>
+        <translation>Feitos com Xfce</translation>
+    </message>
+    <message>
+        <source>Made with GTK</source>
+        <translation>Feitos com GTK</translation>
+    </message>
+    <message>
+        <source>Made with Qt</source>
+        <translation>Feitos com Qt</translation>
+    </message>
+    <message>
+        <source>Made with Motif</source>
+        <translation>Feitos com Motif</translation>
+    </message>
+    <message>
+        <source>Made with Java</source>
+        <translation>Feitos com Java</translation>
+    </message>
+    <message>
+        <source>For the console</source>
+        <translation>Para o console</translation>
+    </message>
+    <message>
+        <source>Screen savers</source>
+        <translation>Protetores de tela</translation>
+    </message>
+    <message>
+        <source>Icons of the system tray</source>
+        <translation>Ícones da bandeja do sistema</translation>
+    </message>
+    <message>
+        <source>Applets of a panel</source>
+        <translation>Miniaplicativos de um painel</translation>
+    </message>
+    <message>
+        <source>Desktop shells</source>
+        <translation>Shells da área de trabalho</translation>
+    </message>
+    <message>
+        <source>Applications</source>
+        <translation>Aplicativos</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::ChoiceDialog</name>
+    <message>
+        <source>Filter</source>
+        <translation>Filtro</translation>
+    </message>
+    <message>
+        <source>Type to filter</source>
+        <translation>Digite para filtrar</translation>
+    </message>
+    <message>
+        <source>Reading...</source>
+        <translation>Lendo...</translation>
+    </message>
+    <message>
+        <source>No match</source>
+        <translation>Nenhuma correspondência</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n chosen</source>
+        <translation>
+            <numerusform>%n escolhido</numerusform>
+            <numerusform>%n escolhidos</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::DesktopChooser</name>
+    <message>
+        <source>Desktop environment</source>
+        <translation>Ambiente de área de trabalho</translation>
+    </message>
+    <message>
+        <source>Remark</source>
+        <comment>title of a column</comment>
+        <translation>Observação</translation>
+    </message>
+    <message>
+        <source>This session</source>
+        <translation>Esta sessão</translation>
+    </message>
+    <message>
+        <source>Not registered</source>
+        <translation>Não registrado</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::EditActionsDialog</name>
+    <message>
+        <source>An action has no id. It can have &quot;%1&quot;.</source>
+        <translation>Uma ação não tem identificador. Ele pode ser &quot;%1&quot;.</translation>
+    </message>
+    <message>
+        <source>Two actions have the id &quot;%1&quot;. The second one can have &quot;%2&quot;.</source>
+        <translation>Duas ações têm o identificador &quot;%1&quot;. A segunda pode ter &quot;%2&quot;.</translation>
+    </message>
+    <message>
+        <source>No entry can hold the id &quot;%1&quot;. It can be &quot;%2&quot;.</source>
+        <translation>Nenhuma entrada pode conter o identificador &quot;%1&quot;. Ele pode ser &quot;%2&quot;.</translation>
+    </message>
+    <message>
+        <source>The id &quot;%1&quot; should have only A to Z, a to z, 0 to 9 and &quot;-&quot; in it, as &quot;%2&quot; has.</source>
+        <translation>O identificador &quot;%1&quot; deveria ter apenas A a Z, a a z, 0 a 9 e &quot;-&quot;, como &quot;%2&quot;.</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n more id(s) should be changed.</source>
+        <translation>
+            <numerusform>Mais %n identificador deveria ser alterado.</numerusform>
+            <numerusform>Mais %n identificadores deveriam ser alterados.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Use &quot;%1&quot;</source>
+        <translation>Usar &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>Use the proposed ids</source>
+        <translation>Usar os identificadores propostos</translation>
+    </message>
+</context>
+<context>
     <name>VelUI::EditActionsWidget</name>
     <message>
         <source>Add action</source>
@@ -1488,6 +3006,20 @@ serão perdidos. Tem certeza?</translation>
         <source>newAction</source>
         <comment>id of a new action</comment>
         <translation>newAction</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::EditStringsDialog</name>
+    <message>
+        <source>The &quot;;&quot; in &quot;%1&quot; does not separate items, it becomes part of one item.</source>
+        <translation>O &quot;;&quot; em &quot;%1&quot; não separa itens; ele passa a fazer parte de um item.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Make %n item(s) of it</source>
+        <translation>
+            <numerusform>Transformar em %n item</numerusform>
+            <numerusform>Transformar em %n itens</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1506,11 +3038,259 @@ serão perdidos. Tem certeza?</translation>
     </message>
 </context>
 <context>
+    <name>VelUI::EntryFormAssistance</name>
+    <message>
+        <source>Te&amp;xt</source>
+        <comment>button: shows the file of the entry</comment>
+        <translation>Te&amp;xto</translation>
+    </message>
+    <message>
+        <source>Shows the file as it would be saved</source>
+        <translation>Mostra o arquivo como seria salvo</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::EntryTextDialog</name>
+    <message>
+        <source>Text of the entry</source>
+        <translation>Texto da entrada</translation>
+    </message>
+    <message>
+        <source>The file as it would be saved</source>
+        <translation>O arquivo como seria salvo</translation>
+    </message>
+    <message>
+        <source>Nothing is changed.</source>
+        <translation>Nada foi alterado.</translation>
+    </message>
+    <message>
+        <source>≠ changed lines: %1, + new lines: %2, removed lines: %3</source>
+        <translation>≠ linhas alteradas: %1, + linhas novas: %2, linhas removidas: %3</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FieldChoosers</name>
+    <message>
+        <source>Choose %1</source>
+        <comment>name of a &quot;Choose...&quot; button</comment>
+        <translation>Escolher %1</translation>
+    </message>
+    <message>
+        <source>Choose...</source>
+        <translation>Escolher...</translation>
+    </message>
+    <message>
+        <source>Chooses from all that are known (Alt+Down)</source>
+        <translation>Escolhe entre todos os conhecidos (Alt+Seta para baixo)</translation>
+    </message>
+    <message>
+        <source>Chooses an installed program (Alt+Down)</source>
+        <translation>Escolhe um programa instalado (Alt+Seta para baixo)</translation>
+    </message>
+    <message>
+        <source>Insert</source>
+        <comment>button: a field code</comment>
+        <translation>Inserir</translation>
+    </message>
+    <message>
+        <source>Insert a field code</source>
+        <translation>Inserir um código de campo</translation>
+    </message>
+    <message>
+        <source>Inserts a code that stands for the files to open, or for a part of this entry</source>
+        <translation>Insere um código que representa os arquivos a abrir ou uma parte desta entrada</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FieldCodes</name>
+    <message>
+        <source>%f: one file; for several files the program is started several times</source>
+        <translation>%f: um arquivo; para vários arquivos, o programa é iniciado várias vezes</translation>
+    </message>
+    <message>
+        <source>%F: all files, each as a word of its own</source>
+        <translation>%F: todos os arquivos, cada um como uma palavra separada</translation>
+    </message>
+    <message>
+        <source>%u: one address (URL) or file; for several the program is started several times</source>
+        <translation>%u: um endereço (URL) ou arquivo; para vários, o programa é iniciado várias vezes</translation>
+    </message>
+    <message>
+        <source>%U: all addresses (URLs) or files, each as a word of its own</source>
+        <translation>%U: todos os endereços (URLs) ou arquivos, cada um como uma palavra separada</translation>
+    </message>
+    <message>
+        <source>%i: --icon and the icon of this entry, if it has one</source>
+        <translation>%i: --icon e o ícone desta entrada, se ela tiver um</translation>
+    </message>
+    <message>
+        <source>%c: the name of this entry, translated</source>
+        <translation>%c: o nome desta entrada, traduzido</translation>
+    </message>
+    <message>
+        <source>%k: where the file of this entry lies</source>
+        <translation>%k: onde fica o arquivo desta entrada</translation>
+    </message>
+    <message>
+        <source>%%: a percent sign</source>
+        <translation>%%: um sinal de porcentagem</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FindingLine</name>
+    <message>
+        <source>Fix</source>
+        <translation>Corrigir</translation>
+    </message>
+    <message>
+        <source>Fix: %1</source>
+        <comment>on a button; %1 is what it does</comment>
+        <translation>Corrigir: %1</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <comment>how bad something is, and what it is</comment>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Erro</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Aviso</translation>
+    </message>
+    <message>
+        <source>Hint</source>
+        <translation>Dica</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FormFindings</name>
+    <message>
+        <source>%1: %2</source>
+        <comment>a key or an action of an entry, and what is wrong with it</comment>
+        <translation>%1: %2</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FormHistory</name>
+    <message>
+        <source>Undo change of %1</source>
+        <translation>Desfazer a alteração de %1</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Desfazer</translation>
+    </message>
+    <message>
+        <source>Redo change of %1</source>
+        <translation>Refazer a alteração de %1</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Refazer</translation>
+    </message>
+</context>
+<context>
     <name>VelUI::FormLayout</name>
     <message>
         <source>Edit %1</source>
         <comment>name of a &quot;...&quot; button</comment>
         <translation>Editar %1</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::LanguageBar</name>
+    <message>
+        <source>&amp;Language:</source>
+        <translation>&amp;Idioma:</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Idioma</translation>
+    </message>
+    <message>
+        <source>Another language...</source>
+        <translation>Outro idioma...</translation>
+    </message>
+    <message>
+        <source>Another language</source>
+        <translation>Outro idioma</translation>
+    </message>
+    <message>
+        <source>Unknown language</source>
+        <translation>Idioma desconhecido</translation>
+    </message>
+    <message>
+        <source>%1 (%2), yours: %3 of %4 texts</source>
+        <translation>%1 (%2), o seu: %3 de %4 textos</translation>
+    </message>
+    <message>
+        <source>%1 (%2), yours: no text yet</source>
+        <translation>%1 (%2), o seu: nenhum texto ainda</translation>
+    </message>
+    <message>
+        <source>%1 (%2): %3 of %4 texts</source>
+        <translation>%1 (%2): %3 de %4 textos</translation>
+    </message>
+    <message>
+        <source>%1 (%2): no text yet</source>
+        <translation>%1 (%2): nenhum texto ainda</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::LanguageDialog</name>
+    <message>
+        <source>Another language</source>
+        <translation>Outro idioma</translation>
+    </message>
+    <message>
+        <source>&amp;Language or its code, such as pt_BR:</source>
+        <translation>&amp;Idioma ou seu código, por exemplo pt_BR:</translation>
+    </message>
+    <message>
+        <source>Language or its code</source>
+        <translation>Idioma ou seu código</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>a language and its code</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>No language has such a code: it is like de, pt_BR or sr@latin.</source>
+        <translation>Nenhum idioma tem um código assim: ele é como de, pt_BR ou sr@latin.</translation>
+    </message>
+    <message>
+        <source>The code %1 is well-formed, but no language of this name is known.</source>
+        <translation>O código %1 está bem formado, mas não se conhece nenhum idioma com esse nome.</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::MimeTypeChooser</name>
+    <message>
+        <source>Choose MIME types</source>
+        <translation>Escolher tipos MIME</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::MimeTypeSource</name>
+    <message>
+        <source>MIME type</source>
+        <translation>Tipo MIME</translation>
+    </message>
+    <message>
+        <source>Description</source>
+        <translation>Descrição</translation>
+    </message>
+    <message>
+        <source>File names</source>
+        <translation>Nomes de arquivos</translation>
+    </message>
+    <message>
+        <source>Not in the database</source>
+        <translation>Não consta no banco de dados</translation>
     </message>
 </context>
 <context>
@@ -1522,6 +3302,81 @@ serão perdidos. Tem certeza?</translation>
     <message>
         <source>Choose application exec path</source>
         <translation>Escolher o caminho do executável do aplicativo</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::ProgramChooser</name>
+    <message>
+        <source>Choose a program</source>
+        <translation>Escolher um programa</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::ProgramSource</name>
+    <message>
+        <source>Program</source>
+        <comment>title of a column</comment>
+        <translation>Programa</translation>
+    </message>
+    <message>
+        <source>Folder</source>
+        <comment>title of a column</comment>
+        <translation>Pasta</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::RowFindings</name>
+    <message numerus="yes">
+        <source>And %n more.</source>
+        <translation>
+            <numerusform>E mais %n.</numerusform>
+            <numerusform>E mais %n.</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::TrialLine</name>
+    <message>
+        <source>Stop</source>
+        <comment>button: ends the trial of an entry</comment>
+        <translation>Parar</translation>
+    </message>
+    <message>
+        <source>T&amp;ry</source>
+        <comment>button: runs the entry</comment>
+        <translation>Te&amp;star</translation>
+    </message>
+    <message>
+        <source>Stops the trial</source>
+        <translation>Interrompe o teste</translation>
+    </message>
+    <message>
+        <source>Runs the entry as it is now, without saving it</source>
+        <translation>Executa a entrada como está agora, sem salvá-la</translation>
+    </message>
+    <message>
+        <source>The program vel-open, which runs entries, could not be started: %1</source>
+        <translation>Não foi possível iniciar o programa vel-open, que executa as entradas: %1</translation>
+    </message>
+    <message>
+        <source>The trial was stopped.</source>
+        <translation>O teste foi interrompido.</translation>
+    </message>
+    <message>
+        <source>The entry was started (exit status 0).</source>
+        <translation>A entrada foi iniciada (status de saída 0).</translation>
+    </message>
+    <message>
+        <source>The entry was started (exit status 0): %1</source>
+        <translation>A entrada foi iniciada (status de saída 0): %1</translation>
+    </message>
+    <message>
+        <source>The entry could not be started (exit status %1).</source>
+        <translation>Não foi possível iniciar a entrada (status de saída %1).</translation>
+    </message>
+    <message>
+        <source>The entry could not be started (exit status %1): %2</source>
+        <translation>Não foi possível iniciar a entrada (status de saída %1): %2</translation>
     </message>
 </context>
 </TS>

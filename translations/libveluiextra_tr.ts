@@ -162,6 +162,400 @@
     </message>
 </context>
 <context>
+    <name>EntryCheck</name>
+    <message>
+        <source>The condition &apos;%1&apos; needs a file.</source>
+        <translation>&apos;%1&apos; koşulu için bir dosya gerekiyor.</translation>
+    </message>
+    <message>
+        <source>The file of the condition &apos;%1&apos; is one in the folder of settings, without &apos;/&apos; before it.</source>
+        <translation>&apos;%1&apos; koşulunun dosyası ayarlar klasöründedir ve önüne &apos;/&apos; konmaz.</translation>
+    </message>
+    <message>
+        <source>The condition &apos;%1&apos; needs a key.</source>
+        <translation>&apos;%1&apos; koşulu için bir anahtar gerekiyor.</translation>
+    </message>
+    <message>
+        <source>The condition &apos;%1&apos; needs &apos;if-session&apos; or &apos;unless-session&apos; and a session.</source>
+        <translation>&apos;%1&apos; koşulu için &apos;if-session&apos; veya &apos;unless-session&apos; ile bir oturum gerekiyor.</translation>
+    </message>
+    <message>
+        <source>The condition &apos;%1&apos; needs a schema and a key.</source>
+        <translation>&apos;%1&apos; koşulu için bir şema ve bir anahtar gerekiyor.</translation>
+    </message>
+    <message>
+        <source>There is no condition &apos;%1&apos;.</source>
+        <translation>&apos;%1&apos; diye bir koşul yok.</translation>
+    </message>
+    <message>
+        <source>A category is empty.</source>
+        <translation>Kategorilerden biri boş.</translation>
+    </message>
+    <message>
+        <source>There is no registered category &apos;%1&apos;; one of your own has to begin with &apos;X-&apos;.</source>
+        <translation>Kayıtlı bir &apos;%1&apos; kategorisi yok; size özel bir kategori &apos;X-&apos; ile başlamalıdır.</translation>
+    </message>
+    <message>
+        <source>Change it to &apos;%1&apos;</source>
+        <translation>&apos;%1&apos; olarak değiştir</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; also needs: %2.</source>
+        <translation>&apos;%1&apos; kategorisi şunu da gerektirir: %2.</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; goes with one of these: %2.</source>
+        <translation>&apos;%1&apos; kategorisi şunlardan biriyle birlikte kullanılır: %2.</translation>
+    </message>
+    <message>
+        <source>Add &apos;%1&apos;</source>
+        <translation>&apos;%1&apos; ekle</translation>
+    </message>
+    <message>
+        <source>Remove it</source>
+        <translation>Kaldır</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; is out of use.</source>
+        <translation>&apos;%1&apos; kategorisi artık kullanılmıyor.</translation>
+    </message>
+    <message>
+        <source>The category &apos;%1&apos; is only for entries that list desktops in &apos;Only show in&apos;.</source>
+        <translation>&apos;%1&apos; kategorisi yalnızca &apos;Yalnızca şurada göster&apos; alanında masaüstü belirten girdiler içindir.</translation>
+    </message>
+    <message>
+        <source>No main category is among them, so menus may not know where to show the entry.</source>
+        <translation>Aralarında ana kategori yok; menüler girdiyi nerede göstereceğini bilemeyebilir.</translation>
+    </message>
+    <message>
+        <source>Several main categories are among them, so the entry may be shown more than once.</source>
+        <translation>Aralarında birkaç ana kategori var; girdi birden çok kez gösterilebilir.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; stands more than once.</source>
+        <translation>&apos;%1&apos; birden çok kez geçiyor.</translation>
+    </message>
+    <message>
+        <source>Keep the first</source>
+        <translation>İlkini bırak</translation>
+    </message>
+    <message>
+        <source>The application has no command.</source>
+        <translation>Uygulamanın komutu yok.</translation>
+    </message>
+    <message>
+        <source>The link leads nowhere.</source>
+        <translation>Bağ hiçbir yere götürmüyor.</translation>
+    </message>
+    <message>
+        <source>A quote is not closed.</source>
+        <translation>Bir tırnak kapatılmamış.</translation>
+    </message>
+    <message>
+        <source>In quotes, a backslash has to stand before &apos;%1&apos;.</source>
+        <translation>Tırnak içinde &apos;%1&apos; önüne ters bölü konmalıdır.</translation>
+    </message>
+    <message>
+        <source>The command ends in a single backslash, which stands for nothing.</source>
+        <translation>Komut, hiçbir anlamı olmayan tek bir ters bölü ile bitiyor.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; has to stand in double quotes.</source>
+        <translation>&apos;%1&apos; çift tırnak içinde olmalıdır.</translation>
+    </message>
+    <message>
+        <source>Close the quote</source>
+        <translation>Tırnağı kapat</translation>
+    </message>
+    <message>
+        <source>Put it in quotes</source>
+        <translation>Tırnak içine al</translation>
+    </message>
+    <message>
+        <source>Have a shell run it</source>
+        <translation>Kabuğa çalıştır</translation>
+    </message>
+    <message>
+        <source>Write &apos;%&apos; as &apos;%%&apos;</source>
+        <translation>&apos;%&apos; yerine &apos;%%&apos; yaz</translation>
+    </message>
+    <message>
+        <source>A field code is not complete: &apos;%&apos; ends the command.</source>
+        <translation>Bir alan kodu eksik: komut &apos;%&apos; ile bitiyor.</translation>
+    </message>
+    <message>
+        <source>There is no field code &apos;%%1&apos;.</source>
+        <translation>&apos;%%1&apos; diye bir alan kodu yok.</translation>
+    </message>
+    <message>
+        <source>The field code &apos;%%1&apos; is out of use; nothing is put in its place.</source>
+        <translation>&apos;%%1&apos; alan kodu artık kullanılmıyor; yerine hiçbir şey konmaz.</translation>
+    </message>
+    <message>
+        <source>Only one of &apos;%f&apos;, &apos;%F&apos;, &apos;%u&apos; and &apos;%U&apos; may stand in a command, and once.</source>
+        <translation>Bir komutta &apos;%f&apos;, &apos;%F&apos;, &apos;%u&apos; ve &apos;%U&apos; kodlarından yalnızca biri ve yalnızca bir kez bulunabilir.</translation>
+    </message>
+    <message>
+        <source>The field code &apos;%%1&apos; stands more than once.</source>
+        <translation>&apos;%%1&apos; alan kodu birden çok kez geçiyor.</translation>
+    </message>
+    <message>
+        <source>The field code &apos;%%1&apos; has to be an argument of its own, not in quotes.</source>
+        <translation>&apos;%%1&apos; alan kodu tırnak içinde değil, ayrı bir argüman olmalıdır.</translation>
+    </message>
+    <message>
+        <source>The path of the program has a blank: it has to stand in quotes.</source>
+        <translation>Programın yolunda boşluk var: tırnak içinde olmalıdır.</translation>
+    </message>
+    <message>
+        <source>There is no program &apos;%1&apos;.</source>
+        <translation>&apos;%1&apos; diye bir program yok.</translation>
+    </message>
+    <message>
+        <source>The command has to begin with a program.</source>
+        <translation>Komut bir programla başlamalıdır.</translation>
+    </message>
+    <message>
+        <source>&apos;Try exec&apos; takes the program alone, without quotes and arguments.</source>
+        <translation>&apos;Denenecek komut&apos; yalnızca programı alır; tırnak ve argüman almaz.</translation>
+    </message>
+    <message>
+        <source>Keep the program</source>
+        <translation>Yalnızca programı bırak</translation>
+    </message>
+    <message>
+        <source>There is no program &apos;%1&apos;, so the entry is not shown.</source>
+        <translation>&apos;%1&apos; diye bir program olmadığı için girdi gösterilmiyor.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is missing.</source>
+        <translation>&apos;%1&apos; eksik.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; has translations only, and nothing for all other languages.</source>
+        <translation>&apos;%1&apos; için yalnızca çeviriler var, diğer diller için bir değer yok.</translation>
+    </message>
+    <message>
+        <source>Take &apos;%1&apos;</source>
+        <translation>&apos;%1&apos; kullan</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is only for entries of the type &apos;%2&apos;.</source>
+        <translation>&apos;%1&apos; yalnızca &apos;%2&apos; türündeki girdiler içindir.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is out of use here.</source>
+        <translation>&apos;%1&apos; burada artık kullanılmıyor.</translation>
+    </message>
+    <message>
+        <source>No key can be called &apos;%1&apos;.</source>
+        <translation>Hiçbir anahtarın adı &apos;%1&apos; olamaz.</translation>
+    </message>
+    <message>
+        <source>There is no key &apos;%1&apos; here; one of your own has to begin with &apos;X-&apos;.</source>
+        <translation>Burada &apos;%1&apos; diye bir anahtar yok; size özel bir anahtar &apos;X-&apos; ile başlamalıdır.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; cannot be translated.</source>
+        <translation>&apos;%1&apos; çevrilemez.</translation>
+    </message>
+    <message>
+        <source>&apos;Only show in&apos; and &apos;Not show in&apos; exclude each other.</source>
+        <translation>&apos;Yalnızca şurada göster&apos; ve &apos;Şurada gösterme&apos; birbirini dışlar.</translation>
+    </message>
+    <message>
+        <source>The file is empty.</source>
+        <translation>Dosya boş.</translation>
+    </message>
+    <message>
+        <source>The first group of the file is not &apos;[Desktop Entry]&apos;.</source>
+        <translation>Dosyanın ilk grubu &apos;[Desktop Entry]&apos; değil.</translation>
+    </message>
+    <message>
+        <source>The name of the file has to end in &apos;.%1&apos;.</source>
+        <translation>Dosyanın adı &apos;.%1&apos; ile bitmelidir.</translation>
+    </message>
+    <message>
+        <source>Lines of the file end in a carriage return.</source>
+        <translation>Dosyanın satırları satır başı karakteriyle bitiyor.</translation>
+    </message>
+    <message>
+        <source>A line of the file says nothing: %1</source>
+        <translation>Dosyanın bir satırı hiçbir şey belirtmiyor: %1</translation>
+    </message>
+    <message>
+        <source>A line of the file stands before all groups: %1</source>
+        <translation>Dosyanın bir satırı tüm grupların önünde duruyor: %1</translation>
+    </message>
+    <message>
+        <source>A line of the file begins with a blank: %1</source>
+        <translation>Dosyanın bir satırı boşlukla başlıyor: %1</translation>
+    </message>
+    <message>
+        <source>A blank stands behind a group: %1</source>
+        <translation>Bir grubun ardında boşluk var: %1</translation>
+    </message>
+    <message>
+        <source>The group &apos;%1&apos; stands more than once.</source>
+        <translation>&apos;%1&apos; grubu birden çok kez geçiyor.</translation>
+    </message>
+    <message>
+        <source>No group can be called &apos;%1&apos;.</source>
+        <translation>Hiçbir grubun adı &apos;%1&apos; olamaz.</translation>
+    </message>
+    <message>
+        <source>The group &apos;%1&apos; is out of use.</source>
+        <translation>&apos;%1&apos; grubu artık kullanılmıyor.</translation>
+    </message>
+    <message>
+        <source>There is no group &apos;%1&apos;; one of your own has to begin with &apos;X-&apos;.</source>
+        <translation>&apos;%1&apos; diye bir grup yok; size özel bir grup &apos;X-&apos; ile başlamalıdır.</translation>
+    </message>
+    <message>
+        <source>The id &apos;%1&apos; of an action may only have letters A to Z, digits and &apos;-&apos;.</source>
+        <translation>Bir eylemin &apos;%1&apos; kimliğinde yalnızca A ile Z arası harfler, rakamlar ve &apos;-&apos; bulunabilir.</translation>
+    </message>
+    <message>
+        <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
+        <translation>&apos;%1&apos; eylemi tanımlanmış, ama &apos;Eylemler&apos; alanında adı geçmiyor.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>
+        <translation>&apos;%1&apos; bir MIME türü değil: &apos;/&apos; yok.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: nothing stands behind the &apos;/&apos;.</source>
+        <translation>&apos;%1&apos; bir MIME türü değil: &apos;/&apos; işaretinden sonra bir şey yok.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: there is no kind &apos;%2&apos;.</source>
+        <translation>&apos;%1&apos; bir MIME türü değil: &apos;%2&apos; diye bir sınıf yok.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is no MIME type: it has a character that none has.</source>
+        <translation>&apos;%1&apos; bir MIME türü değil: hiçbirinde bulunmayan bir karakter içeriyor.</translation>
+    </message>
+    <message>
+        <source>MIME types like &apos;%1&apos; are not used for files.</source>
+        <translation>&apos;%1&apos; gibi MIME türleri dosyalar için kullanılmaz.</translation>
+    </message>
+    <message>
+        <source>This computer does not know the MIME type &apos;%1&apos;.</source>
+        <translation>Bu bilgisayar &apos;%1&apos; MIME türünü tanımıyor.</translation>
+    </message>
+    <message>
+        <source>An action has no id.</source>
+        <translation>Eylemlerden birinin kimliği yok.</translation>
+    </message>
+    <message>
+        <source>Nothing says what the action &apos;%1&apos; is.</source>
+        <translation>&apos;%1&apos; eyleminin ne olduğu hiçbir yerde belirtilmemiş.</translation>
+    </message>
+    <message>
+        <source>There is no registered desktop &apos;%1&apos;; others have to begin with &apos;X-&apos;.</source>
+        <translation>Kayıtlı bir &apos;%1&apos; masaüstü yok; diğerleri &apos;X-&apos; ile başlamalıdır.</translation>
+    </message>
+    <message>
+        <source>In your language the entry is shown as &apos;%1&apos;.</source>
+        <translation>Sizin dilinizde girdi &apos;%1&apos; olarak gösteriliyor.</translation>
+    </message>
+    <message>
+        <source>The comment says no more than the name.</source>
+        <translation>Yorum, addan fazlasını söylemiyor.</translation>
+    </message>
+    <message>
+        <source>The comment says no more than the generic name.</source>
+        <translation>Yorum, genel addan fazlasını söylemiyor.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; is out of use here; it has to be &apos;true&apos; or &apos;false&apos;.</source>
+        <translation>&apos;%1&apos; burada artık kullanılmıyor; &apos;true&apos; veya &apos;false&apos; olmalıdır.</translation>
+    </message>
+    <message>
+        <source>&apos;%1&apos; has to be &apos;true&apos; or &apos;false&apos;.</source>
+        <translation>&apos;%1&apos; için değer &apos;true&apos; veya &apos;false&apos; olmalıdır.</translation>
+    </message>
+    <message>
+        <source>Change it to &apos;true&apos;</source>
+        <translation>&apos;true&apos; olarak değiştir</translation>
+    </message>
+    <message>
+        <source>The name of an icon has no suffix like &apos;%1&apos;.</source>
+        <translation>Bir simgenin adında &apos;%1&apos; gibi bir uzantı olmaz.</translation>
+    </message>
+    <message>
+        <source>Remove the suffix</source>
+        <translation>Uzantıyı kaldır</translation>
+    </message>
+    <message>
+        <source>No icon theme has an icon &apos;%1&apos;.</source>
+        <translation>Hiçbir simge temasında &apos;%1&apos; simgesi yok.</translation>
+    </message>
+    <message>
+        <source>Write the folder in full</source>
+        <translation>Klasörün tam yolunu yaz</translation>
+    </message>
+    <message>
+        <source>The address does not say how to reach it, as &apos;https:&apos; and &apos;file:&apos; do.</source>
+        <translation>Adres, &apos;https:&apos; ve &apos;file:&apos; gibi, kendisine nasıl ulaşılacağını belirtmiyor.</translation>
+    </message>
+    <message>
+        <source>The text is not encoded in UTF-8.</source>
+        <translation>Metin UTF-8 ile kodlanmamış.</translation>
+    </message>
+    <message>
+        <source>A control character or tab may not stand here.</source>
+        <translation>Burada denetim karakteri veya sekme bulunamaz.</translation>
+    </message>
+    <message>
+        <source>The type has to be &apos;Application&apos;, &apos;Link&apos; or &apos;Directory&apos;, not &apos;%1&apos;.</source>
+        <translation>Tür &apos;Application&apos;, &apos;Link&apos; veya &apos;Directory&apos; olmalıdır, &apos;%1&apos; değil.</translation>
+    </message>
+    <message>
+        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
+        <translation>Girdileri denetleyen programlar standardın 1.5 sürümünü henüz tanımıyor.</translation>
+    </message>
+    <message>
+        <source>There is no version &apos;%1&apos; of the standard.</source>
+        <translation>Standardın &apos;%1&apos; diye bir sürümü yok.</translation>
+    </message>
+    <message>
+        <source>There is no encoding &apos;%1&apos;.</source>
+        <translation>&apos;%1&apos; diye bir kodlama yok.</translation>
+    </message>
+    <message>
+        <source>There is no picture &apos;%1&apos;.</source>
+        <translation>&apos;%1&apos; diye bir resim yok.</translation>
+    </message>
+    <message>
+        <source>An icon has a name or a path that begins with &apos;/&apos;.</source>
+        <translation>Simge bir ad veya &apos;/&apos; ile başlayan bir yol olmalıdır.</translation>
+    </message>
+    <message>
+        <source>The path of a folder begins with &apos;/&apos;.</source>
+        <translation>Bir klasörün yolu &apos;/&apos; ile başlar.</translation>
+    </message>
+    <message>
+        <source>There is no folder &apos;%1&apos;.</source>
+        <translation>&apos;%1&apos; diye bir klasör yok.</translation>
+    </message>
+    <message>
+        <source>There is no file &apos;%1&apos;.</source>
+        <translation>&apos;%1&apos; diye bir dosya yok.</translation>
+    </message>
+    <message>
+        <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
+        <translation>D-Bus &apos;%1&apos; girdisini başlatamaz: &apos;org.example.Program.desktop&apos; gibi bir adı olan bir dosya gerekiyor.</translation>
+    </message>
+</context>
+<context>
+    <name>EntryTrial</name>
+    <message>
+        <source>The entry could not be written to a temporary file.</source>
+        <translation>Girdi geçici bir dosyaya yazılamadı.</translation>
+    </message>
+</context>
+<context>
     <name>KeyAssistance</name>
     <message>
         <source>Press the keys of the shortcut. Tab leaves the field.</source>
@@ -181,6 +575,126 @@
     </message>
 </context>
 <context>
+    <name>KeyDescription</name>
+    <message>
+        <source>Whether the entry starts a program, opens an address or describes a folder of the menu.</source>
+        <translation>Girdinin bir program mı başlattığı, bir adres mi açtığı, yoksa menünün bir klasörünü mü tanımladığı.</translation>
+    </message>
+    <message>
+        <source>The name that menus show.</source>
+        <translation>Menülerin gösterdiği ad.</translation>
+    </message>
+    <message>
+        <source>The icon that menus show: a name from the icon theme, or the full path of a picture.</source>
+        <translation>Menülerin gösterdiği simge: simge temasından bir ad veya bir resmin tam yolu.</translation>
+    </message>
+    <message>
+        <source>The command that starts the program, with codes such as %f for the files that it opens.</source>
+        <translation>Programı başlatan komut; açacağı dosyalar için %f gibi kodlar içerebilir.</translation>
+    </message>
+    <message>
+        <source>Whether the program needs a terminal window.</source>
+        <translation>Programın bir uçbirim penceresi gerektirip gerektirmediği.</translation>
+    </message>
+    <message>
+        <source>The folder in which the program starts.</source>
+        <translation>Programın başlatıldığı klasör.</translation>
+    </message>
+    <message>
+        <source>A program that has to be installed; without it menus leave the entry out.</source>
+        <translation>Kurulu olması gereken bir program; o yoksa menüler girdiyi göstermez.</translation>
+    </message>
+    <message>
+        <source>The address that the entry opens.</source>
+        <translation>Girdinin açtığı adres.</translation>
+    </message>
+    <message>
+        <source>What kind of program it is, such as: Web browser.</source>
+        <translation>Programın ne tür bir program olduğu, örneğin: Web tarayıcısı.</translation>
+    </message>
+    <message>
+        <source>A sentence about the program, which menus show as a tip.</source>
+        <translation>Program hakkında, menülerin ipucu olarak gösterdiği bir cümle.</translation>
+    </message>
+    <message>
+        <source>Whether menus leave the entry out although the program can be used.</source>
+        <translation>Program kullanılabildiği hâlde menülerin girdiyi dışarıda bırakıp bırakmayacağı.</translation>
+    </message>
+    <message>
+        <source>Whether the entry counts as deleted.</source>
+        <translation>Girdinin silinmiş sayılıp sayılmayacağı.</translation>
+    </message>
+    <message>
+        <source>The desktop environments that alone show the entry; none means all.</source>
+        <translation>Girdiyi gösteren tek masaüstü ortamları; hiçbiri yoksa tümü gösterir.</translation>
+    </message>
+    <message>
+        <source>The desktop environments that do not show the entry.</source>
+        <translation>Girdiyi göstermeyen masaüstü ortamları.</translation>
+    </message>
+    <message>
+        <source>The types of files that the program opens.</source>
+        <translation>Programın açtığı dosya türleri.</translation>
+    </message>
+    <message>
+        <source>The groups of the menu that the program belongs to.</source>
+        <translation>Programın ait olduğu menü grupları.</translation>
+    </message>
+    <message>
+        <source>Words by which a search finds the program beside its name.</source>
+        <translation>Bir aramanın, adının yanı sıra programı bulmasını sağlayan sözcükler.</translation>
+    </message>
+    <message>
+        <source>Whether the program tells when it has started, so that the pointer shows it until then.</source>
+        <translation>Programın başladığını bildirip bildirmediği; bildirirse imleç o ana kadar bunu gösterir.</translation>
+    </message>
+    <message>
+        <source>The class of the window by which the desktop knows that the program has started.</source>
+        <translation>Masaüstünün programın başladığını anlamasını sağlayan pencere sınıfı.</translation>
+    </message>
+    <message>
+        <source>Further things that the program can be started for, such as: New window.</source>
+        <translation>Programın başlatılabileceği diğer işler, örneğin: Yeni pencere.</translation>
+    </message>
+    <message>
+        <source>The version of the standard for entries that this one follows.</source>
+        <translation>Bu girdinin uyduğu girdi standardının sürümü.</translation>
+    </message>
+    <message>
+        <source>%1 Only for users of one language.</source>
+        <comment>%1 is a sentence about a key</comment>
+        <translation>%1 Yalnızca tek bir dilin kullanıcıları için.</translation>
+    </message>
+</context>
+<context>
+    <name>LanguageNote</name>
+    <message>
+        <source>Users of %1 see these texts.</source>
+        <translation>%1 kullananlar bu metinleri görür.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see these texts, and those of %2 where one is missing.</source>
+        <translation>%1 kullananlar bu metinleri, eksik olanların yerine %2 metinlerini görür.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see these texts, and those without a language where one is missing.</source>
+        <translation>%1 kullananlar bu metinleri, eksik olanların yerine dili belirtilmemiş metinleri görür.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see the texts of %2.</source>
+        <translation>%1 kullananlar %2 metinlerini görür.</translation>
+    </message>
+    <message>
+        <source>Users of %1 see the texts without a language.</source>
+        <translation>%1 kullananlar dili belirtilmemiş metinleri görür.</translation>
+    </message>
+    <message>
+        <source>%1 Texts of their own have: %2.</source>
+        <comment>%1 is a sentence, %2 a list of languages</comment>
+        <translation>%1 Kendi metinleri olanlar: %2.</translation>
+    </message>
+</context>
+<context>
     <name>MenuDeletion</name>
     <message>
         <source>There is no trash for %1. It would be deleted for good: this cannot be undone. Delete it?</source>
@@ -195,6 +709,51 @@
     <message>
         <source>%1 cannot be deleted: %2</source>
         <translation>%1 silinemiyor: %2</translation>
+    </message>
+    <message numerus="yes">
+        <source>The deletion was canceled. %n items are still there, in whole or in part.</source>
+        <translation>
+            <numerusform>Silme işlemi iptal edildi. %n öge tümüyle veya kısmen hâlâ duruyor.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>The deletion was canceled. Still there, in whole or in part: %1.</source>
+        <translation>Silme işlemi iptal edildi. Tümüyle veya kısmen hâlâ duranlar: %1.</translation>
+    </message>
+</context>
+<context>
+    <name>MenuDrop</name>
+    <message>
+        <source>The folder &apos;%1&apos; already has &apos;%2&apos;. Keep both gives the new one another file name, Replace puts the old one into the trash, Skip leaves the new one where it is; Cancel leaves everything as it is.</source>
+        <translation>&apos;%1&apos; klasöründe &apos;%2&apos; zaten var. &apos;İkisini de tut&apos; yenisine başka bir dosya adı verir, &apos;Değiştir&apos; eskisini çöp kutusuna atar, &apos;Atla&apos; yenisini olduğu yerde bırakır; &apos;İptal&apos; her şeyi olduğu gibi bırakır.</translation>
+    </message>
+    <message>
+        <source>The folder &apos;%1&apos; already has &apos;%2&apos;, which the new one comes from. Keep both gives the new one another file name, Skip leaves it where it is; Cancel leaves everything as it is.</source>
+        <translation>&apos;%1&apos; klasöründe, yenisinin de kaynağı olan &apos;%2&apos; zaten var. &apos;İkisini de tut&apos; yenisine başka bir dosya adı verir, &apos;Atla&apos; onu olduğu yerde bırakır; &apos;İptal&apos; her şeyi olduğu gibi bırakır.</translation>
+    </message>
+    <message>
+        <source>Another one that comes to the folder &apos;%1&apos; has the same file name as &apos;%2&apos;. Keep both gives this one another file name, Skip leaves it where it is; Cancel leaves everything as it is.</source>
+        <translation>&apos;%1&apos; klasörüne gelen başka bir ögenin dosya adı &apos;%2&apos; ile aynı. &apos;İkisini de tut&apos; buna başka bir dosya adı verir, &apos;Atla&apos; bunu olduğu yerde bırakır; &apos;İptal&apos; her şeyi olduğu gibi bırakır.</translation>
+    </message>
+    <message>
+        <source>Name already taken</source>
+        <translation>Ad zaten kullanılıyor</translation>
+    </message>
+    <message>
+        <source>&amp;Keep both</source>
+        <translation>İkisini de t&amp;ut</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Değiştir</translation>
+    </message>
+    <message>
+        <source>&amp;Skip</source>
+        <translation>&amp;Atla</translation>
+    </message>
+    <message>
+        <source>&amp;Do the same with all further ones</source>
+        <translation>Sonrakilerin &amp;tümü için aynısını yap</translation>
     </message>
 </context>
 <context>
@@ -443,6 +1002,132 @@
         <source>The folder %1 was deleted (1 entry).</source>
         <translation>%1 klasörü silindi (1 girdi).</translation>
     </message>
+    <message numerus="yes">
+        <source>Undo deletion of %1 items (%n entries)</source>
+        <translation>
+            <numerusform>%1 ögeyi (%n girdi) silmeyi geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo deletion of %1 items (%n entries)</source>
+        <translation>
+            <numerusform>%1 ögeyi (%n girdi) silmeyi yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%1 items were deleted (%n entries).</source>
+        <translation>
+            <numerusform>%1 öge silindi (%n girdi).</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo reordering of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi sıralamayı geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo reordering of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi sıralamayı yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items have other places.</source>
+        <translation>
+            <numerusform>%n öge başka bir yerde.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo hiding of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi gizlemeyi geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo hiding of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi gizlemeyi yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items are hidden: the menu no longer shows them.</source>
+        <translation>
+            <numerusform>%n öge gizlendi: menü artık göstermiyor.</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo showing %n items again</source>
+        <translation>
+            <numerusform>%n ögeyi yeniden göstermeyi geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo showing %n items again</source>
+        <translation>
+            <numerusform>%n ögeyi yeniden göstermeyi yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>The menu shows %n items again.</source>
+        <translation>
+            <numerusform>Menü %n ögeyi yeniden gösteriyor.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo sorting of folder %1</source>
+        <translation>%1 klasörünü ada göre sıralamayı geri al</translation>
+    </message>
+    <message>
+        <source>Redo sorting of folder %1</source>
+        <translation>%1 klasörünü ada göre sıralamayı yinele</translation>
+    </message>
+    <message>
+        <source>The folder %1 was sorted by name.</source>
+        <translation>%1 klasörü ada göre sıralandı.</translation>
+    </message>
+    <message>
+        <source>Undo duplication of %1</source>
+        <translation>%1 çoğaltmayı geri al</translation>
+    </message>
+    <message>
+        <source>Redo duplication of %1</source>
+        <translation>%1 çoğaltmayı yinele</translation>
+    </message>
+    <message>
+        <source>%1 was duplicated. The copy is selected.</source>
+        <translation>%1 çoğaltıldı. Kopyası seçili.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Undo duplication of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi çoğaltmayı geri al</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Redo duplication of %n items</source>
+        <translation>
+            <numerusform>%n ögeyi çoğaltmayı yinele</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>%n items were duplicated. The copies are selected.</source>
+        <translation>
+            <numerusform>%n öge çoğaltıldı. Kopyaları seçili.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Undo deletion of %1 items (1 entry)</source>
+        <translation>%1 ögeyi (1 girdi) silmeyi geri al</translation>
+    </message>
+    <message>
+        <source>Redo deletion of %1 items (1 entry)</source>
+        <translation>%1 ögeyi (1 girdi) silmeyi yinele</translation>
+    </message>
+    <message>
+        <source>%1 items were deleted (1 entry).</source>
+        <translation>%1 öge silindi (1 girdi).</translation>
+    </message>
 </context>
 <context>
     <name>QFileSystemModel</name>
@@ -477,6 +1162,10 @@
     <message>
         <source>%1 already exists. Overwrite?</source>
         <translation>%1 zaten var. Üzerine yazılsın mı?</translation>
+    </message>
+    <message>
+        <source>Can&apos;t link %1: %2</source>
+        <translation>%1 için bağ oluşturulamıyor: %2</translation>
     </message>
 </context>
 <context>
@@ -969,6 +1658,10 @@ Başka bir klasör veya ad seçip yeniden deneyin.</translation>
         <source>&lt;b&gt;Desktop entry&lt;/b&gt; is a multipurpose info file for installed apps, devices, etc. It can be used to build menu entries, shortcuts, etc. This dialog implements the &apos;Desktop Entry Standard&apos; of &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt;.&lt;br&gt;&lt;br&gt;Desktop entry file is a text ini-like file with one main section [Desktop Entry] and possible additional sections for each action defined in the main section field &apos;Actions&apos;. All fields are text string pairs: key=value. Value can also be a semicolon separated string list.</source>
         <translation>&lt;b&gt;Masaüstü girdisi&lt;/b&gt;, kurulu uygulamalar, aygıtlar vb. için çok amaçlı bir bilgi dosyasıdır. Menü ögeleri, kısayollar vb. oluşturmak için kullanılabilir. Bu iletişim kutusu, &lt;a href=&quot;https://www.freedesktop.org&quot;&gt;https://www.freedesktop.org&lt;/a&gt; adresindeki &apos;Desktop Entry Standard&apos; standardını uygular.&lt;br&gt;&lt;br&gt;Masaüstü girdisi dosyası, bir ana bölümü [Desktop Entry] ve ana bölümün &apos;Actions&apos; alanında tanımlanan her eylem için ek bölümleri olabilen, ini benzeri bir metin dosyasıdır. Tüm alanlar metin çiftleridir: anahtar=değer. Değer, noktalı virgülle ayrılmış bir dizge listesi de olabilir.</translation>
     </message>
+    <message>
+        <source>The file %1 is not a desktop entry: it has no group [Desktop Entry].</source>
+        <translation>%1 dosyası bir masaüstü girdisi değil: [Desktop Entry] grubu yok.</translation>
+    </message>
 </context>
 <context>
     <name>VelDesktopEntryPropsWidgetPrivate</name>
@@ -1373,14 +2066,6 @@ kaybolacak. Emin misiniz?</translation>
         <translation>Menü tümüyle aranamayacak kadar büyük. Yalnızca bir bölümü arandı.</translation>
     </message>
     <message>
-        <source>Hide</source>
-        <translation>Gizle</translation>
-    </message>
-    <message>
-        <source>Show again</source>
-        <translation>Yeniden göster</translation>
-    </message>
-    <message>
         <source>&apos;%1&apos; was not changed: the file %2 cannot be written.</source>
         <translation>&apos;%1&apos; değiştirilmedi: %2 dosyasına yazılamıyor.</translation>
     </message>
@@ -1418,12 +2103,122 @@ kaybolacak. Emin misiniz?</translation>
         <translation>%1 silme işlemi iptal edildi. Henüz silinmemiş olanlar hâlâ duruyor.</translation>
     </message>
     <message>
-        <source>Reload</source>
-        <translation>Yeniden yükle</translation>
-    </message>
-    <message>
         <source>This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.</source>
         <translation>Bu menü boş. Yeni girdi için %1 tuşuna basın veya başka neler eklenebileceğini görmek için burada sağ tıklayın.</translation>
+    </message>
+    <message>
+        <source>the program %1 ended with an error</source>
+        <translation>%1 programı bir hatayla sonlandı</translation>
+    </message>
+    <message>
+        <source>the program %1 cannot be run</source>
+        <translation>%1 programı çalıştırılamıyor</translation>
+    </message>
+    <message numerus="yes">
+        <source>And %n more.</source>
+        <translation>
+            <numerusform>Ve %n tane daha.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Open containin&amp;g folder</source>
+        <translation>Bulunduğu &amp;klasörü aç</translation>
+    </message>
+    <message>
+        <source>The folder %1 was not opened: %2.</source>
+        <translation>%1 klasörü açılmadı: %2.</translation>
+    </message>
+    <message>
+        <source>New &amp;folder</source>
+        <translation>Yeni klas&amp;ör</translation>
+    </message>
+    <message>
+        <source>New entr&amp;y</source>
+        <translation>Yeni &amp;girdi</translation>
+    </message>
+    <message>
+        <source>&amp;Edit</source>
+        <translation>&amp;Düzenle</translation>
+    </message>
+    <message>
+        <source>&amp;Delete</source>
+        <translation>&amp;Sil</translation>
+    </message>
+    <message>
+        <source>E&amp;xecute</source>
+        <translation>&amp;Çalıştır</translation>
+    </message>
+    <message>
+        <source>F&amp;ind</source>
+        <translation>&amp;Bul</translation>
+    </message>
+    <message>
+        <source>Find &amp;Next</source>
+        <translation>S&amp;onrakini Bul</translation>
+    </message>
+    <message>
+        <source>Cu&amp;t</source>
+        <translation>K&amp;es</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>Ko&amp;pyala</translation>
+    </message>
+    <message>
+        <source>&amp;Paste</source>
+        <translation>Yapış&amp;tır</translation>
+    </message>
+    <message>
+        <source>Default &amp;menu...</source>
+        <translation>Öntanımlı &amp;menü...</translation>
+    </message>
+    <message>
+        <source>&amp;Up</source>
+        <translation>&amp;Yukarı</translation>
+    </message>
+    <message>
+        <source>D&amp;own</source>
+        <translation>A&amp;şağı</translation>
+    </message>
+    <message>
+        <source>Dup&amp;licate</source>
+        <translation>Çoğa&amp;lt</translation>
+    </message>
+    <message>
+        <source>&amp;Hide</source>
+        <translation>Gi&amp;zle</translation>
+    </message>
+    <message>
+        <source>Sho&amp;w again</source>
+        <translation>Ye&amp;niden göster</translation>
+    </message>
+    <message>
+        <source>&amp;Reload</source>
+        <translation>Yeniden y&amp;ükle</translation>
+    </message>
+    <message>
+        <source>&amp;Sort by name</source>
+        <translation>Ada göre sı&amp;rala</translation>
+    </message>
+    <message>
+        <source>The folder %1 is sorted by name already.</source>
+        <translation>%1 klasörü zaten ada göre sıralı.</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1, because no application is installed. The menu was left as it is.</source>
+        <translation>Öntanımlı menü %1 içinde oluşturulamadı, çünkü kurulu uygulama yok. Menü olduğu gibi kaldı.</translation>
+    </message>
+    <message>
+        <source>The default menu could not be built in %1: %2. The menu was left as it is.</source>
+        <translation>Öntanımlı menü %1 içinde oluşturulamadı: %2. Menü olduğu gibi kaldı.</translation>
+    </message>
+    <message>
+        <source>%1 is no file on this computer. Nothing was moved or copied.</source>
+        <translation>%1 bu bilgisayardaki bir dosya değil. Hiçbir şey taşınmadı veya kopyalanmadı.</translation>
+    </message>
+    <message>
+        <source>%1 was not started: %2.</source>
+        <translation>%1 başlatılmadı: %2.</translation>
     </message>
 </context>
 <context>
@@ -1462,6 +2257,710 @@ kaybolacak. Emin misiniz?</translation>
     </message>
 </context>
 <context>
+    <name>VelUI::CategoryChooser</name>
+    <message>
+        <source>Main category</source>
+        <translation>Ana kategori</translation>
+    </message>
+    <message>
+        <source>Goes with %1</source>
+        <translation>%1 ile birlikte</translation>
+    </message>
+    <message>
+        <source>Only beside &quot;Only show in&quot;</source>
+        <translation>Yalnızca &quot;Yalnızca şurada göster&quot; ile birlikte</translation>
+    </message>
+    <message>
+        <source>Deprecated</source>
+        <translation>Kullanımdan kalkmış</translation>
+    </message>
+    <message>
+        <source>Extension</source>
+        <comment>a category of somebody&apos;s own, X-...</comment>
+        <translation>Uzantı</translation>
+    </message>
+    <message>
+        <source>Not registered</source>
+        <translation>Kayıtlı değil</translation>
+    </message>
+    <message>
+        <source>Choose categories</source>
+        <translation>Kategorileri seçin</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <comment>title of a column</comment>
+        <translation>Ad</translation>
+    </message>
+    <message>
+        <source>Category</source>
+        <comment>title of a column</comment>
+        <translation>Kategori</translation>
+    </message>
+    <message>
+        <source>Remark</source>
+        <comment>title of a column</comment>
+        <translation>Not</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::CategoryNames</name>
+    <message>
+        <source>Audio and video</source>
+        <translation>Ses ve video</translation>
+    </message>
+    <message>
+        <source>Audio</source>
+        <translation>Ses</translation>
+    </message>
+    <message>
+        <source>Video</source>
+        <translation>Video</translation>
+    </message>
+    <message>
+        <source>Software development</source>
+        <translation>Yazılım geliştirme</translation>
+    </message>
+    <message>
+        <source>Education</source>
+        <translation>Eğitim</translation>
+    </message>
+    <message>
+        <source>Games</source>
+        <translation>Oyunlar</translation>
+    </message>
+    <message>
+        <source>Graphics</source>
+        <translation>Grafik</translation>
+    </message>
+    <message>
+        <source>Internet and network</source>
+        <translation>İnternet ve ağ</translation>
+    </message>
+    <message>
+        <source>Office</source>
+        <translation>Ofis</translation>
+    </message>
+    <message>
+        <source>Science</source>
+        <translation>Bilim</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Ayarlar</translation>
+    </message>
+    <message>
+        <source>System tools</source>
+        <translation>Sistem araçları</translation>
+    </message>
+    <message>
+        <source>Accessories</source>
+        <translation>Donatılar</translation>
+    </message>
+    <message>
+        <source>Build tools</source>
+        <translation>Derleme araçları</translation>
+    </message>
+    <message>
+        <source>Debuggers</source>
+        <translation>Hata ayıklayıcılar</translation>
+    </message>
+    <message>
+        <source>Development environments</source>
+        <translation>Geliştirme ortamları</translation>
+    </message>
+    <message>
+        <source>Designers of user interfaces</source>
+        <translation>Arayüz tasarlayıcıları</translation>
+    </message>
+    <message>
+        <source>Profilers</source>
+        <translation>Başarım çözümleyiciler</translation>
+    </message>
+    <message>
+        <source>Revision control</source>
+        <translation>Sürüm denetimi</translation>
+    </message>
+    <message>
+        <source>Translation tools</source>
+        <translation>Çeviri araçları</translation>
+    </message>
+    <message>
+        <source>Calendars</source>
+        <translation>Takvimler</translation>
+    </message>
+    <message>
+        <source>Address books</source>
+        <translation>Adres defterleri</translation>
+    </message>
+    <message>
+        <source>Databases</source>
+        <translation>Veri tabanları</translation>
+    </message>
+    <message>
+        <source>Dictionaries</source>
+        <translation>Sözlükler</translation>
+    </message>
+    <message>
+        <source>Charts</source>
+        <translation>Çizelgeler</translation>
+    </message>
+    <message>
+        <source>Email</source>
+        <translation>E-posta</translation>
+    </message>
+    <message>
+        <source>Finances</source>
+        <translation>Finans</translation>
+    </message>
+    <message>
+        <source>Flow charts</source>
+        <translation>Akış şemaları</translation>
+    </message>
+    <message>
+        <source>Handheld devices</source>
+        <translation>El aygıtları</translation>
+    </message>
+    <message>
+        <source>Project management</source>
+        <translation>Proje yönetimi</translation>
+    </message>
+    <message>
+        <source>Presentations</source>
+        <translation>Sunumlar</translation>
+    </message>
+    <message>
+        <source>Spreadsheets</source>
+        <translation>Hesap tabloları</translation>
+    </message>
+    <message>
+        <source>Word processors</source>
+        <translation>Sözcük işlemciler</translation>
+    </message>
+    <message>
+        <source>Two-dimensional graphics</source>
+        <translation>İki boyutlu grafik</translation>
+    </message>
+    <message>
+        <source>Vector graphics</source>
+        <translation>Vektör grafik</translation>
+    </message>
+    <message>
+        <source>Raster graphics</source>
+        <translation>Piksel grafik</translation>
+    </message>
+    <message>
+        <source>Three-dimensional graphics</source>
+        <translation>Üç boyutlu grafik</translation>
+    </message>
+    <message>
+        <source>Scanning</source>
+        <translation>Tarama</translation>
+    </message>
+    <message>
+        <source>Text recognition</source>
+        <translation>Metin tanıma</translation>
+    </message>
+    <message>
+        <source>Photography</source>
+        <translation>Fotoğrafçılık</translation>
+    </message>
+    <message>
+        <source>Desktop publishing</source>
+        <translation>Masaüstü yayıncılık</translation>
+    </message>
+    <message>
+        <source>Viewers</source>
+        <translation>Görüntüleyiciler</translation>
+    </message>
+    <message>
+        <source>Text tools</source>
+        <translation>Metin araçları</translation>
+    </message>
+    <message>
+        <source>Desktop settings</source>
+        <translation>Masaüstü ayarları</translation>
+    </message>
+    <message>
+        <source>Hardware settings</source>
+        <translation>Donanım ayarları</translation>
+    </message>
+    <message>
+        <source>Printing</source>
+        <translation>Yazdırma</translation>
+    </message>
+    <message>
+        <source>Package managers</source>
+        <translation>Paket yöneticileri</translation>
+    </message>
+    <message>
+        <source>Dial-up connections</source>
+        <translation>Çevirmeli bağlantılar</translation>
+    </message>
+    <message>
+        <source>Instant messaging</source>
+        <translation>Anlık ileti</translation>
+    </message>
+    <message>
+        <source>Chat</source>
+        <translation>Sohbet</translation>
+    </message>
+    <message>
+        <source>IRC</source>
+        <translation>IRC</translation>
+    </message>
+    <message>
+        <source>News feeds</source>
+        <translation>Haber akışları</translation>
+    </message>
+    <message>
+        <source>File transfer</source>
+        <translation>Dosya aktarımı</translation>
+    </message>
+    <message>
+        <source>Amateur radio</source>
+        <translation>Amatör telsiz</translation>
+    </message>
+    <message>
+        <source>Newsgroups</source>
+        <translation>Haber grupları</translation>
+    </message>
+    <message>
+        <source>File sharing</source>
+        <translation>Dosya paylaşımı</translation>
+    </message>
+    <message>
+        <source>Remote access</source>
+        <translation>Uzaktan erişim</translation>
+    </message>
+    <message>
+        <source>Telephony</source>
+        <translation>Telefon</translation>
+    </message>
+    <message>
+        <source>Telephony tools</source>
+        <translation>Telefon araçları</translation>
+    </message>
+    <message>
+        <source>Video conferences</source>
+        <translation>Görüntülü görüşmeler</translation>
+    </message>
+    <message>
+        <source>Web browsers</source>
+        <translation>Web tarayıcıları</translation>
+    </message>
+    <message>
+        <source>Web development</source>
+        <translation>Web geliştirme</translation>
+    </message>
+    <message>
+        <source>MIDI</source>
+        <translation>MIDI</translation>
+    </message>
+    <message>
+        <source>Mixers</source>
+        <translation>Karıştırıcılar</translation>
+    </message>
+    <message>
+        <source>Sequencers</source>
+        <translation>Sıralayıcılar</translation>
+    </message>
+    <message>
+        <source>Tuners</source>
+        <translation>Akort araçları</translation>
+    </message>
+    <message>
+        <source>Television</source>
+        <translation>Televizyon</translation>
+    </message>
+    <message>
+        <source>Audio and video editing</source>
+        <translation>Ses ve video düzenleme</translation>
+    </message>
+    <message>
+        <source>Players</source>
+        <translation>Oynatıcılar</translation>
+    </message>
+    <message>
+        <source>Recorders</source>
+        <translation>Kaydediciler</translation>
+    </message>
+    <message>
+        <source>Disc burning</source>
+        <translation>Disk yazma</translation>
+    </message>
+    <message>
+        <source>Action games</source>
+        <translation>Aksiyon oyunları</translation>
+    </message>
+    <message>
+        <source>Adventure games</source>
+        <translation>Macera oyunları</translation>
+    </message>
+    <message>
+        <source>Arcade games</source>
+        <translation>Atari oyunları</translation>
+    </message>
+    <message>
+        <source>Board games</source>
+        <translation>Masa oyunları</translation>
+    </message>
+    <message>
+        <source>Falling blocks games</source>
+        <translation>Düşen blok oyunları</translation>
+    </message>
+    <message>
+        <source>Card games</source>
+        <translation>Kart oyunları</translation>
+    </message>
+    <message>
+        <source>Games for children</source>
+        <translation>Çocuk oyunları</translation>
+    </message>
+    <message>
+        <source>Logic games</source>
+        <translation>Mantık oyunları</translation>
+    </message>
+    <message>
+        <source>Role-playing games</source>
+        <translation>Rol yapma oyunları</translation>
+    </message>
+    <message>
+        <source>Shooters</source>
+        <translation>Nişancı oyunları</translation>
+    </message>
+    <message>
+        <source>Simulations</source>
+        <translation>Benzetimler</translation>
+    </message>
+    <message>
+        <source>Sports games</source>
+        <translation>Spor oyunları</translation>
+    </message>
+    <message>
+        <source>Strategy games</source>
+        <translation>Strateji oyunları</translation>
+    </message>
+    <message>
+        <source>Art</source>
+        <translation>Sanat</translation>
+    </message>
+    <message>
+        <source>Construction</source>
+        <translation>İnşaat</translation>
+    </message>
+    <message>
+        <source>Music</source>
+        <translation>Müzik</translation>
+    </message>
+    <message>
+        <source>Languages</source>
+        <translation>Diller</translation>
+    </message>
+    <message>
+        <source>Artificial intelligence</source>
+        <translation>Yapay zekâ</translation>
+    </message>
+    <message>
+        <source>Astronomy</source>
+        <translation>Gökbilim</translation>
+    </message>
+    <message>
+        <source>Biology</source>
+        <translation>Biyoloji</translation>
+    </message>
+    <message>
+        <source>Chemistry</source>
+        <translation>Kimya</translation>
+    </message>
+    <message>
+        <source>Computer science</source>
+        <translation>Bilgisayar bilimi</translation>
+    </message>
+    <message>
+        <source>Data visualization</source>
+        <translation>Veri görselleştirme</translation>
+    </message>
+    <message>
+        <source>Economics</source>
+        <translation>Ekonomi</translation>
+    </message>
+    <message>
+        <source>Electricity</source>
+        <translation>Elektrik</translation>
+    </message>
+    <message>
+        <source>Geography</source>
+        <translation>Coğrafya</translation>
+    </message>
+    <message>
+        <source>Geology</source>
+        <translation>Jeoloji</translation>
+    </message>
+    <message>
+        <source>Earth sciences</source>
+        <translation>Yer bilimleri</translation>
+    </message>
+    <message>
+        <source>History</source>
+        <translation>Tarih</translation>
+    </message>
+    <message>
+        <source>Humanities</source>
+        <translation>Beşerî bilimler</translation>
+    </message>
+    <message>
+        <source>Image processing</source>
+        <translation>Görüntü işleme</translation>
+    </message>
+    <message>
+        <source>Literature</source>
+        <translation>Edebiyat</translation>
+    </message>
+    <message>
+        <source>Maps</source>
+        <translation>Haritalar</translation>
+    </message>
+    <message>
+        <source>Mathematics</source>
+        <translation>Matematik</translation>
+    </message>
+    <message>
+        <source>Numerical analysis</source>
+        <translation>Sayısal çözümleme</translation>
+    </message>
+    <message>
+        <source>Medicine</source>
+        <translation>Tıp</translation>
+    </message>
+    <message>
+        <source>Physics</source>
+        <translation>Fizik</translation>
+    </message>
+    <message>
+        <source>Robotics</source>
+        <translation>Robotik</translation>
+    </message>
+    <message>
+        <source>Spirituality</source>
+        <translation>Maneviyat</translation>
+    </message>
+    <message>
+        <source>Sports</source>
+        <translation>Spor</translation>
+    </message>
+    <message>
+        <source>Parallel computing</source>
+        <translation>Koşut hesaplama</translation>
+    </message>
+    <message>
+        <source>Amusement</source>
+        <translation>Eğlence</translation>
+    </message>
+    <message>
+        <source>Archiving</source>
+        <translation>Arşivleme</translation>
+    </message>
+    <message>
+        <source>Compression</source>
+        <translation>Sıkıştırma</translation>
+    </message>
+    <message>
+        <source>Electronics</source>
+        <translation>Elektronik</translation>
+    </message>
+    <message>
+        <source>Emulators</source>
+        <translation>Öykünücüler</translation>
+    </message>
+    <message>
+        <source>Engineering</source>
+        <translation>Mühendislik</translation>
+    </message>
+    <message>
+        <source>File tools</source>
+        <translation>Dosya araçları</translation>
+    </message>
+    <message>
+        <source>File managers</source>
+        <translation>Dosya yöneticileri</translation>
+    </message>
+    <message>
+        <source>Terminals</source>
+        <translation>Uçbirimler</translation>
+    </message>
+    <message>
+        <source>File systems</source>
+        <translation>Dosya sistemleri</translation>
+    </message>
+    <message>
+        <source>Monitors</source>
+        <translation>Sistem izleyicileri</translation>
+    </message>
+    <message>
+        <source>Security</source>
+        <translation>Güvenlik</translation>
+    </message>
+    <message>
+        <source>Accessibility</source>
+        <translation>Erişilebilirlik</translation>
+    </message>
+    <message>
+        <source>Calculators</source>
+        <translation>Hesap makineleri</translation>
+    </message>
+    <message>
+        <source>Clocks</source>
+        <translation>Saatler</translation>
+    </message>
+    <message>
+        <source>Text editors</source>
+        <translation>Metin düzenleyiciler</translation>
+    </message>
+    <message>
+        <source>Documentation</source>
+        <translation>Belgelendirme</translation>
+    </message>
+    <message>
+        <source>For adults</source>
+        <translation>Yetişkinler için</translation>
+    </message>
+    <message>
+        <source>Core of the desktop</source>
+        <translation>Masaüstünün çekirdeği</translation>
+    </message>
+    <message>
+        <source>Made with KDE</source>
+        <translation>KDE ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>Made with GNOME</source>
+        <translation>GNOME ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>Made with Xfce</source>
+        <translation>Xfce ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>Made with GTK</source>
+        <translation>GTK ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>Made with Qt</source>
+        <translation>Qt ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>Made with Motif</source>
+        <translation>Motif ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>Made with Java</source>
+        <translation>Java ile yapılanlar</translation>
+    </message>
+    <message>
+        <source>For the console</source>
+        <translation>Konsol için</translation>
+    </message>
+    <message>
+        <source>Screen savers</source>
+        <translation>Ekran koruyucular</translation>
+    </message>
+    <message>
+        <source>Icons of the system tray</source>
+        <translation>Sistem tepsisi simgeleri</translation>
+    </message>
+    <message>
+        <source>Applets of a panel</source>
+        <translation>Panel uygulamacıkları</translation>
+    </message>
+    <message>
+        <source>Desktop shells</source>
+        <translation>Masaüstü kabukları</translation>
+    </message>
+    <message>
+        <source>Applications</source>
+        <translation>Uygulamalar</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::ChoiceDialog</name>
+    <message>
+        <source>Filter</source>
+        <translation>Süzgeç</translation>
+    </message>
+    <message>
+        <source>Type to filter</source>
+        <translation>Süzmek için yazın</translation>
+    </message>
+    <message>
+        <source>Reading...</source>
+        <translation>Okunuyor...</translation>
+    </message>
+    <message>
+        <source>No match</source>
+        <translation>Eşleşme yok</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n chosen</source>
+        <translation>
+            <numerusform>%n seçildi</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::DesktopChooser</name>
+    <message>
+        <source>Desktop environment</source>
+        <translation>Masaüstü ortamı</translation>
+    </message>
+    <message>
+        <source>Remark</source>
+        <comment>title of a column</comment>
+        <translation>Not</translation>
+    </message>
+    <message>
+        <source>This session</source>
+        <translation>Bu oturum</translation>
+    </message>
+    <message>
+        <source>Not registered</source>
+        <translation>Kayıtlı değil</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::EditActionsDialog</name>
+    <message>
+        <source>An action has no id. It can have &quot;%1&quot;.</source>
+        <translation>Bir eylemin kimliği yok. Kimliği &quot;%1&quot; olabilir.</translation>
+    </message>
+    <message>
+        <source>Two actions have the id &quot;%1&quot;. The second one can have &quot;%2&quot;.</source>
+        <translation>İki eylemin kimliği &quot;%1&quot;. İkincisininki &quot;%2&quot; olabilir.</translation>
+    </message>
+    <message>
+        <source>No entry can hold the id &quot;%1&quot;. It can be &quot;%2&quot;.</source>
+        <translation>Hiçbir girdi &quot;%1&quot; kimliğini içeremez. &quot;%2&quot; olabilir.</translation>
+    </message>
+    <message>
+        <source>The id &quot;%1&quot; should have only A to Z, a to z, 0 to 9 and &quot;-&quot; in it, as &quot;%2&quot; has.</source>
+        <translation>&quot;%1&quot; kimliğinde, &quot;%2&quot; kimliğinde olduğu gibi, yalnızca A-Z, a-z, 0-9 ve &quot;-&quot; bulunmalıdır.</translation>
+    </message>
+    <message numerus="yes">
+        <source>%n more id(s) should be changed.</source>
+        <translation>
+            <numerusform>%n kimlik daha değiştirilmelidir.</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Use &quot;%1&quot;</source>
+        <translation>&quot;%1&quot; kullan</translation>
+    </message>
+    <message>
+        <source>Use the proposed ids</source>
+        <translation>Önerilen kimlikleri kullan</translation>
+    </message>
+</context>
+<context>
     <name>VelUI::EditActionsWidget</name>
     <message>
         <source>Add action</source>
@@ -1475,6 +2974,19 @@ kaybolacak. Emin misiniz?</translation>
         <source>newAction</source>
         <comment>id of a new action</comment>
         <translation>newAction</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::EditStringsDialog</name>
+    <message>
+        <source>The &quot;;&quot; in &quot;%1&quot; does not separate items, it becomes part of one item.</source>
+        <translation>&quot;%1&quot; içindeki &quot;;&quot; ögeleri ayırmaz, tek bir ögenin parçası olur.</translation>
+    </message>
+    <message numerus="yes">
+        <source>Make %n item(s) of it</source>
+        <translation>
+            <numerusform>Bundan %n öge yap</numerusform>
+        </translation>
     </message>
 </context>
 <context>
@@ -1493,11 +3005,259 @@ kaybolacak. Emin misiniz?</translation>
     </message>
 </context>
 <context>
+    <name>VelUI::EntryFormAssistance</name>
+    <message>
+        <source>Te&amp;xt</source>
+        <comment>button: shows the file of the entry</comment>
+        <translation>&amp;Metin</translation>
+    </message>
+    <message>
+        <source>Shows the file as it would be saved</source>
+        <translation>Dosyayı kaydedileceği biçimiyle gösterir</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::EntryTextDialog</name>
+    <message>
+        <source>Text of the entry</source>
+        <translation>Girdinin metni</translation>
+    </message>
+    <message>
+        <source>The file as it would be saved</source>
+        <translation>Kaydedileceği biçimiyle dosya</translation>
+    </message>
+    <message>
+        <source>Nothing is changed.</source>
+        <translation>Hiçbir şey değişmedi.</translation>
+    </message>
+    <message>
+        <source>≠ changed lines: %1, + new lines: %2, removed lines: %3</source>
+        <translation>≠ değişen satırlar: %1, + yeni satırlar: %2, kaldırılan satırlar: %3</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FieldChoosers</name>
+    <message>
+        <source>Choose %1</source>
+        <comment>name of a &quot;Choose...&quot; button</comment>
+        <translation>%1 seç</translation>
+    </message>
+    <message>
+        <source>Choose...</source>
+        <translation>Seç...</translation>
+    </message>
+    <message>
+        <source>Chooses from all that are known (Alt+Down)</source>
+        <translation>Bilinenlerin tümü arasından seçtirir (Alt+Aşağı)</translation>
+    </message>
+    <message>
+        <source>Chooses an installed program (Alt+Down)</source>
+        <translation>Kurulu bir program seçtirir (Alt+Aşağı)</translation>
+    </message>
+    <message>
+        <source>Insert</source>
+        <comment>button: a field code</comment>
+        <translation>Ekle</translation>
+    </message>
+    <message>
+        <source>Insert a field code</source>
+        <translation>Alan kodu ekle</translation>
+    </message>
+    <message>
+        <source>Inserts a code that stands for the files to open, or for a part of this entry</source>
+        <translation>Açılacak dosyaların veya bu girdinin bir bölümünün yerini tutan bir kod ekler</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FieldCodes</name>
+    <message>
+        <source>%f: one file; for several files the program is started several times</source>
+        <translation>%f: tek dosya; birden çok dosya için program birden çok kez başlatılır</translation>
+    </message>
+    <message>
+        <source>%F: all files, each as a word of its own</source>
+        <translation>%F: tüm dosyalar, her biri ayrı bir sözcük olarak</translation>
+    </message>
+    <message>
+        <source>%u: one address (URL) or file; for several the program is started several times</source>
+        <translation>%u: tek adres (URL) veya dosya; birden çoğu için program birden çok kez başlatılır</translation>
+    </message>
+    <message>
+        <source>%U: all addresses (URLs) or files, each as a word of its own</source>
+        <translation>%U: tüm adresler (URL) veya dosyalar, her biri ayrı bir sözcük olarak</translation>
+    </message>
+    <message>
+        <source>%i: --icon and the icon of this entry, if it has one</source>
+        <translation>%i: --icon ve varsa bu girdinin simgesi</translation>
+    </message>
+    <message>
+        <source>%c: the name of this entry, translated</source>
+        <translation>%c: bu girdinin çevrilmiş adı</translation>
+    </message>
+    <message>
+        <source>%k: where the file of this entry lies</source>
+        <translation>%k: bu girdinin dosyasının bulunduğu yer</translation>
+    </message>
+    <message>
+        <source>%%: a percent sign</source>
+        <translation>%%: yüzde işareti</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FindingLine</name>
+    <message>
+        <source>Fix</source>
+        <translation>Düzelt</translation>
+    </message>
+    <message>
+        <source>Fix: %1</source>
+        <comment>on a button; %1 is what it does</comment>
+        <translation>Düzelt: %1</translation>
+    </message>
+    <message>
+        <source>%1: %2</source>
+        <comment>how bad something is, and what it is</comment>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Hata</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Uyarı</translation>
+    </message>
+    <message>
+        <source>Hint</source>
+        <translation>İpucu</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FormFindings</name>
+    <message>
+        <source>%1: %2</source>
+        <comment>a key or an action of an entry, and what is wrong with it</comment>
+        <translation>%1: %2</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::FormHistory</name>
+    <message>
+        <source>Undo change of %1</source>
+        <translation>%1 değişikliğini geri al</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Geri al</translation>
+    </message>
+    <message>
+        <source>Redo change of %1</source>
+        <translation>%1 değişikliğini yinele</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Yinele</translation>
+    </message>
+</context>
+<context>
     <name>VelUI::FormLayout</name>
     <message>
         <source>Edit %1</source>
         <comment>name of a &quot;...&quot; button</comment>
         <translation>%1 düzenle</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::LanguageBar</name>
+    <message>
+        <source>&amp;Language:</source>
+        <translation>&amp;Dil:</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Dil</translation>
+    </message>
+    <message>
+        <source>Another language...</source>
+        <translation>Başka dil...</translation>
+    </message>
+    <message>
+        <source>Another language</source>
+        <translation>Başka dil</translation>
+    </message>
+    <message>
+        <source>Unknown language</source>
+        <translation>Bilinmeyen dil</translation>
+    </message>
+    <message>
+        <source>%1 (%2), yours: %3 of %4 texts</source>
+        <translation>%1 (%2), sizin diliniz: %3 / %4 metin</translation>
+    </message>
+    <message>
+        <source>%1 (%2), yours: no text yet</source>
+        <translation>%1 (%2), sizin diliniz: henüz metin yok</translation>
+    </message>
+    <message>
+        <source>%1 (%2): %3 of %4 texts</source>
+        <translation>%1 (%2): %3 / %4 metin</translation>
+    </message>
+    <message>
+        <source>%1 (%2): no text yet</source>
+        <translation>%1 (%2): henüz metin yok</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::LanguageDialog</name>
+    <message>
+        <source>Another language</source>
+        <translation>Başka dil</translation>
+    </message>
+    <message>
+        <source>&amp;Language or its code, such as pt_BR:</source>
+        <translation>&amp;Dil veya kodu, örneğin pt_BR:</translation>
+    </message>
+    <message>
+        <source>Language or its code</source>
+        <translation>Dil veya kodu</translation>
+    </message>
+    <message>
+        <source>%1 (%2)</source>
+        <comment>a language and its code</comment>
+        <translation>%1 (%2)</translation>
+    </message>
+    <message>
+        <source>No language has such a code: it is like de, pt_BR or sr@latin.</source>
+        <translation>Hiçbir dilin böyle bir kodu yok: kodlar de, pt_BR veya sr@latin gibidir.</translation>
+    </message>
+    <message>
+        <source>The code %1 is well-formed, but no language of this name is known.</source>
+        <translation>%1 kodu doğru biçimde, ama bu adla bilinen bir dil yok.</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::MimeTypeChooser</name>
+    <message>
+        <source>Choose MIME types</source>
+        <translation>MIME türlerini seçin</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::MimeTypeSource</name>
+    <message>
+        <source>MIME type</source>
+        <translation>MIME türü</translation>
+    </message>
+    <message>
+        <source>Description</source>
+        <translation>Açıklama</translation>
+    </message>
+    <message>
+        <source>File names</source>
+        <translation>Dosya adları</translation>
+    </message>
+    <message>
+        <source>Not in the database</source>
+        <translation>Veri tabanında yok</translation>
     </message>
 </context>
 <context>
@@ -1509,6 +3269,80 @@ kaybolacak. Emin misiniz?</translation>
     <message>
         <source>Choose application exec path</source>
         <translation>Uygulamanın çalıştırma yolunu seçin</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::ProgramChooser</name>
+    <message>
+        <source>Choose a program</source>
+        <translation>Program seçin</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::ProgramSource</name>
+    <message>
+        <source>Program</source>
+        <comment>title of a column</comment>
+        <translation>Program</translation>
+    </message>
+    <message>
+        <source>Folder</source>
+        <comment>title of a column</comment>
+        <translation>Klasör</translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::RowFindings</name>
+    <message numerus="yes">
+        <source>And %n more.</source>
+        <translation>
+            <numerusform>Ve %n tane daha.</numerusform>
+        </translation>
+    </message>
+</context>
+<context>
+    <name>VelUI::TrialLine</name>
+    <message>
+        <source>Stop</source>
+        <comment>button: ends the trial of an entry</comment>
+        <translation>Durdur</translation>
+    </message>
+    <message>
+        <source>T&amp;ry</source>
+        <comment>button: runs the entry</comment>
+        <translation>D&amp;ene</translation>
+    </message>
+    <message>
+        <source>Stops the trial</source>
+        <translation>Denemeyi durdurur</translation>
+    </message>
+    <message>
+        <source>Runs the entry as it is now, without saving it</source>
+        <translation>Girdiyi kaydetmeden, şu anki hâliyle çalıştırır</translation>
+    </message>
+    <message>
+        <source>The program vel-open, which runs entries, could not be started: %1</source>
+        <translation>Girdileri çalıştıran vel-open programı başlatılamadı: %1</translation>
+    </message>
+    <message>
+        <source>The trial was stopped.</source>
+        <translation>Deneme durduruldu.</translation>
+    </message>
+    <message>
+        <source>The entry was started (exit status 0).</source>
+        <translation>Girdi başlatıldı (çıkış durumu 0).</translation>
+    </message>
+    <message>
+        <source>The entry was started (exit status 0): %1</source>
+        <translation>Girdi başlatıldı (çıkış durumu 0): %1</translation>
+    </message>
+    <message>
+        <source>The entry could not be started (exit status %1).</source>
+        <translation>Girdi başlatılamadı (çıkış durumu %1).</translation>
+    </message>
+    <message>
+        <source>The entry could not be started (exit status %1): %2</source>
+        <translation>Girdi başlatılamadı (çıkış durumu %1): %2</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Pfade, Symbole, Listen und Aktionen</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Unterstützung</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Nicht gespeicherte Änderungen</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>Der Eintrag %1 wurde geändert.
+Sollen die Änderungen gespeichert werden?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ und eine dritte
         <source>cannot open %1</source>
         <translation>%1 kann nicht geöffnet werden</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>%1 kann nicht geöffnet werden: Die Datei gibt es nicht, --create legt einen neuen Eintrag an</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>%1 kann nicht geöffnet werden: Es ist keine normale Datei</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>%1 kann nicht geöffnet werden: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ und eine dritte
         <translation>Gibt einen Menüordner in seiner Reihenfolge aus.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (ein Pipe-Menü), json oder text (Voreinstellung).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>Der Menüordner; das Startmenü, wenn keiner angegeben ist.</translation>
     </message>
@@ -732,6 +757,50 @@ und eine dritte
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>Das Menü hat mehr als %1 Einträge oder %2 Ebenen; der Rest wurde ausgelassen. Suchen Sie nach Verknüpfungen, die immer wieder in dieselben Ordner führen.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Was ausgegeben wird: %1. Die Voreinstellung ist text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Das Symbolthema, aus dem die Dateien der Symbole genommen werden; ohne Angabe das des Benutzers.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Die Kantenlänge der Symbole in Pixeln, voreingestellt 24.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Liest eine der Zeilen, die rofi oder dmenu bekommen hat, von der Standardeingabe und startet ihren Eintrag.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>die Größe der Symbole liegt nicht zwischen 1 und %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Das Startmenü ist leer: Keine Anwendung ist installiert.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Das Startmenü %1 kann nicht angelegt werden: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 wird weggelassen, weil das Zeilenende in seinem Namen in diesem Format nicht geschrieben werden kann. Benennen Sie es um.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Das Startmenü ist leer: Nichts in %1 wird angezeigt.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>vel-open kann nicht ausgeführt werden: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>„%1“ gibt es im Menü nicht.</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ und eine dritte
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>der Kanal kann nicht übernommen werden: es gibt keine Anzeige, oder ein anderes Programm hat ihn</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>unbekannter Fenstermanager: %1 (bekannt sind %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Tut, was dieser Fenstermanager braucht, um das Startmenü zu zeigen, wie es ist: %1.</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Rutas, iconos, listas y acciones</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Ayudas</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Cambios sin guardar</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>Se ha cambiado la entrada %1.
+¿Desea guardar los cambios?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ y una tercera
         <source>cannot open %1</source>
         <translation>no se puede abrir %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>no se puede abrir %1: el archivo no existe, --create crea una entrada nueva</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>no se puede abrir %1: no es un archivo normal</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>no se puede abrir %1: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ y una tercera
         <translation>Muestra una carpeta de menú en su orden.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (un menú «pipe»), json o text (predeterminado).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>La carpeta de menú; el menú de inicio si no se indica ninguna.</translation>
     </message>
@@ -732,6 +757,50 @@ y una tercera
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>El menú tiene más de %1 elementos o %2 niveles; se ha omitido el resto. Busque enlaces que lleven una y otra vez a las mismas carpetas.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Qué se muestra: %1. El valor predeterminado es text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>El tema de iconos del que se toman los archivos de los iconos; el del usuario si no se indica ninguno.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>El lado de los iconos en píxeles, 24 si no se indica otra cosa.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Leer de la entrada estándar una de las líneas que recibió rofi o dmenu e iniciar su entrada.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>el tamaño de los iconos no está entre 1 y %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>El menú de inicio está vacío: no hay ninguna aplicación instalada.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>No se puede crear el menú de inicio %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 se omite, porque el fin de línea de su nombre no se puede escribir en este formato. Cámbiele el nombre.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>El menú de inicio está vacío: no se muestra nada de %1.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>no se puede ejecutar vel-open: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>No hay ningún «%1» en el menú.</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ y una tercera
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>no se puede tomar el canal: no hay pantalla o lo tiene otro programa</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>gestor de ventanas desconocido: %1 (se conocen %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Hacer lo que necesita este gestor de ventanas para mostrar el menú de inicio tal como está: %1.</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Chemins, icônes, listes et actions</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Assistance</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Modifications non enregistrées</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>L&apos;entrée %1 a été modifiée.
+Voulez-vous enregistrer les modifications ?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ et une troisième
         <source>cannot open %1</source>
         <translation>impossible d&apos;ouvrir %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>impossible d&apos;ouvrir %1 : ce fichier n&apos;existe pas, --create crée une nouvelle entrée</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>impossible d&apos;ouvrir %1 : ce n&apos;est pas un fichier ordinaire</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>impossible d&apos;ouvrir %1 : %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ et une troisième
         <translation>Affiche un dossier de menu dans son ordre.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (un menu «&#xa0;pipe&#xa0;»), json ou text (par défaut).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>Le dossier de menu&#xa0;; le menu de démarrage si aucun n&apos;est indiqué.</translation>
     </message>
@@ -732,6 +757,50 @@ et une troisième
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>Le menu a plus de %1 éléments ou %2 niveaux&#xa0;; le reste a été omis. Cherchez des liens qui mènent encore et encore aux mêmes dossiers.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Ce qui est affiché : %1. La valeur par défaut est text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Le thème d&apos;icônes d&apos;où viennent les fichiers des icônes ; celui de l&apos;utilisateur si aucun n&apos;est indiqué.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Le côté des icônes en pixels, 24 par défaut.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Lire sur l&apos;entrée standard l&apos;une des lignes données à rofi ou dmenu et démarrer son entrée.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>la taille des icônes n&apos;est pas comprise entre 1 et %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Le menu de démarrage est vide : aucune application n&apos;est installée.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Le menu de démarrage %1 ne peut pas être créé : %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 est omis, car la fin de ligne contenue dans son nom ne peut pas être écrite dans ce format. Renommez-le.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Le menu de démarrage est vide : rien dans %1 n&apos;est affiché.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>impossible d&apos;exécuter vel-open : %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>Il n&apos;y a pas de « %1 » dans le menu.</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ et une troisième
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>impossible de prendre le canal&#xa0;: il n&apos;y a pas d&apos;affichage ou un autre programme le tient</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>gestionnaire de fenêtres inconnu : %1 (sont connus %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Faire ce dont ce gestionnaire de fenêtres a besoin pour afficher le menu de démarrage tel qu&apos;il est : %1.</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Percorsi, icone, elenchi e azioni</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Assistenza</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Modifiche non salvate</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>La voce %1 è stata modificata.
+Vuoi salvare le modifiche?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ e una terza
         <source>cannot open %1</source>
         <translation>impossibile aprire %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>impossibile aprire %1: il file non esiste, --create crea una nuova voce</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>impossibile aprire %1: non è un file normale</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>impossibile aprire %1: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ e una terza
         <translation>Stampa una cartella di menu nel suo ordine.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (un menu «pipe»), json o text (predefinito).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>La cartella di menu; il menu di avvio se non ne è indicata nessuna.</translation>
     </message>
@@ -732,6 +757,50 @@ e una terza
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>Il menu ha più di %1 elementi o %2 livelli; il resto è stato omesso. Cercare collegamenti che portano più volte alle stesse cartelle.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Che cosa stampare: %1. Il valore predefinito è text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Il tema di icone da cui prendere i file delle icone; quello dell&apos;utente se non ne è indicato nessuno.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Il lato delle icone in pixel, 24 se non indicato.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Legge dallo standard input una delle righe date a rofi o dmenu e avvia la sua voce.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>la dimensione delle icone non è compresa tra 1 e %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Il menu di avvio è vuoto: nessuna applicazione è installata.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Impossibile creare il menu di avvio %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 è tralasciato, perché la fine di riga nel suo nome non si può scrivere in questo formato. Rinominalo.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Il menu di avvio è vuoto: nulla in %1 viene mostrato.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>impossibile eseguire vel-open: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>Nel menu non c&apos;è «%1».</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ e una terza
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>impossibile prendere il canale: non c&apos;è un display o lo tiene un altro programma</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>gestore delle finestre sconosciuto: %1 (quelli noti sono %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Fa ciò che serve a questo gestore delle finestre per mostrare il menu di avvio com&apos;è: %1.</translation>
     </message>
 </context>
 </TS>

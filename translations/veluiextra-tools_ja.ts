@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>パス、アイコン、リスト、アクション</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>アシスタンス(&amp;A)</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>保存されていない変更</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>エントリ %1 は変更されています。
+変更を保存しますか?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ and a third one
         <source>cannot open %1</source>
         <translation>%1 を開けません</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>%1 を開けません: そのようなファイルはありません。--create を付けると新しいエントリを作成します</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>%1 を開けません: 通常のファイルではありません</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>%1 を開けません: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ and a third one
         <translation>メニューフォルダをその順序で出力します。</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (パイプメニュー)、json、text (標準) のいずれかです。</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>メニューフォルダです。省略した場合はスタートメニューです。</translation>
     </message>
@@ -732,6 +757,50 @@ and a third one
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>メニューの項目が %1 個、または階層が %2 段を超えているため、残りは省略されました。同じフォルダに何度もつながるリンクがないか確認してください。</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>出力する内容です: %1。標準は text です。</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>アイコンのファイルを取り出すアイコンテーマです。省略した場合は利用者のテーマです。</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>アイコンの一辺のピクセル数です。標準は 24 です。</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>rofi または dmenu に渡された行の 1 つを標準入力から読み取り、そのエントリを起動します。</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>アイコンのサイズが 1 から %1 の範囲にありません</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>スタートメニューは空です: アプリケーションがインストールされていません。</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>スタートメニュー %1 を作成できません: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 は省略されました。名前に含まれる改行をこの形式では書けません。名前を変更してください。</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>スタートメニューは空です: %1 には表示されるものがありません。</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>vel-open を実行できません: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>メニューに「%1」はありません。</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ and a third one
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>チャンネルを引き継げません: ディスプレイがないか、別のプログラムが使用中です</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>不明なウィンドウマネージャ: %1 (対応しているもの: %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>このウィンドウマネージャがスタートメニューを現在の内容で表示するために必要なことを行います: %1。</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Ścieżki, ikony, listy i działania</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Pomoc w pracy</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Niezapisane zmiany</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>Wpis %1 został zmieniony.
+Zapisać zmiany?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ i jeszcze trzeci
         <source>cannot open %1</source>
         <translation>nie można otworzyć %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>nie można otworzyć %1: nie ma takiego pliku, --create tworzy nowy wpis</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>nie można otworzyć %1: to nie jest zwykły plik</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>nie można otworzyć %1: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ i jeszcze trzeci
         <translation>Wypisuje katalog menu w jego kolejności.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (menu potokowe), json lub text (domyślnie).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>Katalog menu; menu startowe, jeśli żadnego nie podano.</translation>
     </message>
@@ -732,6 +757,50 @@ i jeszcze trzeci
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>Menu ma więcej niż %1 elementów lub %2 poziomów; reszta została pominięta. Poszukaj dowiązań, które wciąż prowadzą do tych samych katalogów.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Co wypisać: %1. Domyślnie text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Motyw ikon, z którego brane są pliki ikon; motyw użytkownika, jeśli żadnego nie podano.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Długość boku ikon w pikselach, domyślnie 24.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Odczytaj ze standardowego wejścia jeden z wierszy przekazanych do rofi lub dmenu i uruchom jego wpis.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>rozmiar ikon nie mieści się między 1 a %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Menu startowe jest puste: nie zainstalowano żadnego programu.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Nie można utworzyć menu startowego %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 zostaje pominięte, bo znaku końca wiersza w nazwie nie można zapisać w tym formacie. Zmień nazwę.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Menu startowe jest puste: nic z %1 nie jest pokazywane.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>nie można uruchomić vel-open: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>W menu nie ma „%1”.</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ i jeszcze trzeci
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>nie można przejąć kanału: nie ma ekranu lub ma go inny program</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>nieznany zarządca okien: %1 (znane: %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Zrób to, czego ten zarządca okien potrzebuje, aby pokazać menu startowe takim, jakie jest: %1.</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Caminhos, ícones, listas e ações</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Assistência</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Alterações não salvas</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>A entrada %1 foi alterada.
+Deseja salvar as alterações?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ e uma terceira
         <source>cannot open %1</source>
         <translation>não foi possível abrir %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>não foi possível abrir %1: o arquivo não existe, --create cria uma nova entrada</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>não foi possível abrir %1: não é um arquivo comum</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>não foi possível abrir %1: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ e uma terceira
         <translation>Imprime uma pasta de menu em sua ordem.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (um menu &quot;pipe&quot;), json ou text (padrão).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>A pasta de menu; o menu Iniciar se nenhuma for informada.</translation>
     </message>
@@ -732,6 +757,50 @@ e uma terceira
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>O menu tem mais de %1 itens ou %2 níveis; o restante foi omitido. Procure links que levem repetidamente às mesmas pastas.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>O que imprimir: %1. O padrão é text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>O tema de ícones do qual obter os arquivos dos ícones; o do próprio usuário se nenhum for informado.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>O lado dos ícones em pixels, 24 por padrão.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Ler da entrada padrão uma das linhas passadas ao rofi ou ao dmenu e iniciar sua entrada.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>o tamanho dos ícones não está entre 1 e %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>O menu Iniciar está vazio: nenhum aplicativo está instalado.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Não foi possível criar o menu Iniciar %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 foi omitido, pois a quebra de linha em seu nome não pode ser escrita neste formato. Renomeie-o.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>O menu Iniciar está vazio: nada em %1 é exibido.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>não foi possível executar vel-open: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>Não há &quot;%1&quot; no menu.</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ e uma terceira
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>não foi possível tomar o canal: não há tela ou outro programa o tem</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>gerenciador de janelas desconhecido: %1 (os conhecidos são %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Fazer o que este gerenciador de janelas precisa para mostrar o menu Iniciar como ele é: %1.</translation>
     </message>
 </context>
 </TS>

@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Пути, значки, списки и действия</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Помощь в работе</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Несохранённые изменения</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>Запись %1 изменена.
+Сохранить изменения?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ and a third one
         <source>cannot open %1</source>
         <translation>не удалось открыть %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>не удалось открыть %1: такого файла нет, новую запись создаёт --create</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>не удалось открыть %1: это не обычный файл</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>не удалось открыть %1: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ and a third one
         <translation>Выводит папку меню в её порядке.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (конвейерное меню), json или text (по умолчанию).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>Папка меню; если не указана — меню запуска.</translation>
     </message>
@@ -732,6 +757,50 @@ and a third one
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>В меню больше %1 элементов или %2 уровней; остальное пропущено. Поищите ссылки, которые снова и снова ведут в одни и те же папки.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Что выводить: %1. По умолчанию text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Тема, из которой берутся файлы значков; если не указана — тема пользователя.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Сторона значков в пикселях, по умолчанию 24.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Читает из стандартного ввода одну из строк, переданных rofi или dmenu, и запускает её запись.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>размер значков не лежит между 1 и %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Меню запуска пусто: не установлено ни одного приложения.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Не удалось создать меню запуска %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>Пропущено: %1. Перевод строки в имени нельзя записать в этом формате. Переименуйте этот объект.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Меню запуска пусто: в %1 нечего показать.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>не удалось выполнить vel-open: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>В меню нет «%1».</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ and a third one
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>не удалось занять канал: нет дисплея или канал занят другой программой</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>неизвестный диспетчер окон: %1 (известны %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Сделать то, что нужно этому диспетчеру окон, чтобы показать меню запуска таким, какое оно есть: %1.</translation>
     </message>
 </context>
 </TS>

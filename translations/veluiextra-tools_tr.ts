@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Yollar, simgeler, listeler ve eylemler</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Yardımcı</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Kaydedilmemiş değişiklikler</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>%1 girdisi değiştirildi.
+Değişiklikler kaydedilsin mi?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ ve bir üçüncüsü
         <source>cannot open %1</source>
         <translation>%1 açılamıyor</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>%1 açılamıyor: böyle bir dosya yok, --create yeni bir girdi oluşturur</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>%1 açılamıyor: sıradan bir dosya değil</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>%1 açılamıyor: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ ve bir üçüncüsü
         <translation>Bir menü klasörünü kendi sırasıyla yazdırır.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (boru menüsü), json veya text (öntanımlı).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>Menü klasörü; verilmezse başlat menüsü.</translation>
     </message>
@@ -732,6 +757,50 @@ ve bir üçüncüsü
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>Menüde %1 ögeden veya %2 düzeyden fazlası var; geri kalanı atlandı. Aynı klasörlere tekrar tekrar götüren bağlantıları arayın.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Ne yazdırılacağı: %1. Öntanımlısı text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Simge dosyalarının alınacağı simge teması; verilmezse kullanıcının kendi teması.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Simgelerin piksel olarak kenar uzunluğu, öntanımlı 24.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>rofi veya dmenu programına verilen satırlardan birini standart girdiden oku ve girdisini başlat.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>simge boyutu 1 ile %1 arasında değil</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Başlat menüsü boş: kurulu uygulama yok.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>%1 başlat menüsü oluşturulamıyor: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>%1 dışarıda bırakıldı, çünkü adındaki satır sonu bu biçimde yazılamaz. Yeniden adlandırın.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Başlat menüsü boş: %1 içindeki hiçbir şey gösterilmiyor.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>vel-open çalıştırılamıyor: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>Menüde &quot;%1&quot; yok.</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ ve bir üçüncüsü
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>kanal alınamıyor: ekran yok veya kanal başka bir programda</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>bilinmeyen pencere yöneticisi: %1 (bilinenler: %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Bu pencere yöneticisinin başlat menüsünü olduğu gibi göstermesi için gerekeni yap: %1.</translation>
     </message>
 </context>
 </TS>

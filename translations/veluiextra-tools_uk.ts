@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>Шляхи, піктограми, списки та дії</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>&amp;Допомога в роботі</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>Незбережені зміни</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>Запис %1 змінено.
+Зберегти зміни?</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ and a third one
         <source>cannot open %1</source>
         <translation>не вдалося відкрити %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>не вдалося відкрити %1: такого файла немає, новий запис створює --create</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>не вдалося відкрити %1: це не звичайний файл</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>не вдалося відкрити %1: %2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ and a third one
         <translation>Виводить теку меню в її порядку.</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox (конвеєрне меню), json або text (типово).</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>Тека меню; меню запуску, якщо її не вказано.</translation>
     </message>
@@ -732,6 +757,50 @@ and a third one
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>У меню понад %1 елементів або %2 рівнів; решту пропущено. Пошукайте посилання, які знову і знову ведуть до тих самих тек.</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>Що виводити: %1. Типово text.</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>Тема, з якої беруться файли піктограм; якщо не вказано — тема користувача.</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>Сторона піктограм у пікселях, типово 24.</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>Читає зі стандартного вводу один з рядків, переданих rofi або dmenu, і запускає його запис.</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>розмір піктограм не лежить між 1 і %1</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>Меню запуску порожнє: не встановлено жодної програми.</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>Не вдалося створити меню запуску %1: %2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>Пропущено: %1. Кінець рядка в назві не можна записати в цьому форматі. Перейменуйте цей об&apos;єкт.</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>Меню запуску порожнє: у %1 немає чого показати.</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>не вдалося виконати vel-open: %1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>У меню немає «%1».</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ and a third one
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>не вдалося зайняти канал: немає дисплея або його утримує інша програма</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>невідомий засіб керування вікнами: %1 (відомі %2)</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>Зробити те, що потрібно цьому засобу керування вікнами, щоб показати меню запуску таким, яким воно є: %1.</translation>
     </message>
 </context>
 </TS>

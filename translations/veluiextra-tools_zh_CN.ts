@@ -31,6 +31,10 @@
         <source>Paths, icons, lists and actions</source>
         <translation>路径、图标、列表和操作</translation>
     </message>
+    <message>
+        <source>&amp;Assistance</source>
+        <translation>辅助(&amp;A)</translation>
+    </message>
 </context>
 <context>
     <name>EditorCommands</name>
@@ -356,6 +360,19 @@
     </message>
 </context>
 <context>
+    <name>EntryWindow</name>
+    <message>
+        <source>Unsaved changes</source>
+        <translation>未保存的更改</translation>
+    </message>
+    <message>
+        <source>The entry %1 was changed.
+Save the changes?</source>
+        <translation>条目 %1 已更改。
+要保存更改吗？</translation>
+    </message>
+</context>
+<context>
     <name>FileIconsPage</name>
     <message>
         <source>File icons</source>
@@ -600,6 +617,18 @@ and a third one
         <source>cannot open %1</source>
         <translation>无法打开 %1</translation>
     </message>
+    <message>
+        <source>cannot open %1: there is no such file, --create makes a new entry</source>
+        <translation>无法打开 %1：没有此文件，--create 可新建条目</translation>
+    </message>
+    <message>
+        <source>cannot open %1: it is no regular file</source>
+        <translation>无法打开 %1：它不是常规文件</translation>
+    </message>
+    <message>
+        <source>cannot open %1: %2</source>
+        <translation>无法打开 %1：%2</translation>
+    </message>
 </context>
 <context>
     <name>vel-gallery</name>
@@ -706,10 +735,6 @@ and a third one
         <translation>按顺序输出菜单文件夹。</translation>
     </message>
     <message>
-        <source>openbox (a pipe menu), json or text (the default).</source>
-        <translation>openbox（管道菜单）、json 或 text（默认）。</translation>
-    </message>
-    <message>
         <source>The menu directory; the start menu when none is given.</source>
         <translation>菜单文件夹；未指定时为开始菜单。</translation>
     </message>
@@ -732,6 +757,50 @@ and a third one
     <message>
         <source>The menu has more than %1 items or %2 levels, and the rest of it is left out. Look for links that lead into the same folders again.</source>
         <translation>该菜单超过 %1 个项目或 %2 层，其余部分已省略。请检查是否有反复指向相同文件夹的链接。</translation>
+    </message>
+    <message>
+        <source>What to print: %1. The default is text.</source>
+        <translation>要输出的内容：%1。默认为 text。</translation>
+    </message>
+    <message>
+        <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
+        <translation>从中取用图标文件的图标主题；未指定时为用户自己的主题。</translation>
+    </message>
+    <message>
+        <source>The edge of the icons in pixels, 24 by default.</source>
+        <translation>图标的边长（像素），默认为 24。</translation>
+    </message>
+    <message>
+        <source>Reads one of the lines that rofi or dmenu was given from standard input and starts its entry.</source>
+        <translation>从标准输入读取曾提供给 rofi 或 dmenu 的其中一行，并启动其条目。</translation>
+    </message>
+    <message>
+        <source>the size of icons is not between 1 and %1</source>
+        <translation>图标大小不在 1 到 %1 之间</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: no application is installed.</source>
+        <translation>开始菜单为空：没有安装任何应用程序。</translation>
+    </message>
+    <message>
+        <source>The start menu %1 cannot be made: %2</source>
+        <translation>无法创建开始菜单 %1：%2</translation>
+    </message>
+    <message>
+        <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
+        <translation>已省略 %1，因为其名称中的换行符无法以此格式写入。请将其重命名。</translation>
+    </message>
+    <message>
+        <source>The start menu is empty: nothing in %1 is shown.</source>
+        <translation>开始菜单为空：%1 中没有可显示的内容。</translation>
+    </message>
+    <message>
+        <source>cannot run vel-open: %1</source>
+        <translation>无法运行 vel-open：%1</translation>
+    </message>
+    <message>
+        <source>There is no &quot;%1&quot; in the menu.</source>
+        <translation>菜单中没有“%1”。</translation>
     </message>
 </context>
 <context>
@@ -775,6 +844,14 @@ and a third one
     <message>
         <source>cannot take the channel: there is no display, or another program has it</source>
         <translation>无法接管通道：没有显示器，或另一个程序正占用它</translation>
+    </message>
+    <message>
+        <source>unknown window manager: %1 (known are %2)</source>
+        <translation>未知的窗口管理器：%1（已知的有 %2）</translation>
+    </message>
+    <message>
+        <source>Do what this window manager needs to show the start menu as it is: %1.</source>
+        <translation>执行此窗口管理器所需的操作，使其按现状显示开始菜单：%1。</translation>
     </message>
 </context>
 </TS>
