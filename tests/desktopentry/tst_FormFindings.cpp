@@ -250,10 +250,10 @@ void tst_FormFindings::describesTheFieldToThoseWhoDoNotSeeIt()
     QVERIFY(dialog);
     QLineEdit *icon = child<VelUI::IconEdit>(dialog.get(), "iconEdit")->findChild<QLineEdit *>();
     const QString description = QStringLiteral("Error: The name of an icon has no suffix like '.png'.");
-    QTRY_COMPARE_WITH_TIMEOUT(icon->accessibleDescription(), description, Patience);
+    QTRY_VERIFY_WITH_TIMEOUT(icon->accessibleDescription().endsWith(description), Patience);
     QAccessibleInterface *face = QAccessible::queryAccessibleInterface(icon);
     QVERIFY(face);
-    QCOMPARE(face->text(QAccessible::Description), description);
+    QVERIFY(face->text(QAccessible::Description).endsWith(description));
     XDoTool::click(fixButton(dialog.get(), "Icon"));
     QTRY_COMPARE_WITH_TIMEOUT(icon->text(), QStringLiteral("a"), Patience);
     QTRY_VERIFY_WITH_TIMEOUT(!icon->accessibleDescription().contains(QStringLiteral("suffix")), Patience);
