@@ -64,6 +64,8 @@ QToolButton *FieldChoosers::addButton(const FormRow &row, const QString &text, c
     button->setObjectName(QStringLiteral("chooseButton_") + row.key);
     button->setAccessibleName(tr("Choose %1", "name of a \"Choose...\" button").arg(row.label));
     button->setToolTip(tip);
+    // Back from the choice, the form shows what has the keyboard: this, and not where one was before.
+    button->setFocusPolicy(Qt::StrongFocus);
     button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Fixed); // as wide as those above and below
     m_place(row, button);
     return button;

@@ -10,6 +10,8 @@
 #include <desktopentry/StringListEdit.h>
 
 #include <QMenu>
+#include <QScrollArea>
+#include <QScrollBar>
 #include <QSignalSpy>
 #include <QToolButton>
 #include <QTreeView>
@@ -97,6 +99,7 @@ private Q_SLOTS:
     void areGoneWhileTheFormIsReadOnly();
     void chooseCategoriesByTheKeyboardAlone();
     void chooseAMimeTypeByTheMouse();
+    void stayInViewWhenTheyWereClicked();
     void chooseADesktop();
     void changeNothingWhenCanceled();
     void changeNothingWhenTheSameIsChosen();
@@ -230,6 +233,29 @@ void tst_FieldChoosers::chooseAMimeTypeByTheMouse()
     QTRY_COMPARE_WITH_TIMEOUT(changed.count(), 1, Patience);
     QVERIFY(modal.finished());
     QCOMPARE(field->strings(), QStringList(QStringLiteral("image/png")));
+}
+
+void tst_FieldChoosers::stayInViewWhenTheyWereClicked()
+{
+    const OpenForm open(entry("[Desktop Entry]\nType=Application\nName=x\nExec=true\nCategories=Utility;\n"));
+    QVERIFY(open.isActive);
+    open.form->setFocus();
+    auto *area = child<QScrollArea>(open.form, "scrollArea");
+    QToolButton *const chooser = open.button("MimeType");
+    area->ensureWidgetVisible(chooser);
+    QTRY_VERIFY_WITH_TIMEOUT(!chooser->visibleRegion().isEmpty(), Patience);
+    const int scrolled = area->verticalScrollBar()->value();
+    QVERIFY(scrolled > 0);
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        QVERIFY(QTest::qWaitForWindowActive(window, Patience));
+        XDoTool::run(QStringLiteral("key Escape"));
+        QTRY_VERIFY_WITH_TIMEOUT(!window->isVisible(), Patience);
+    });
+    XDoTool::click(chooser);
+    QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), Patience);
+    QTRY_VERIFY_WITH_TIMEOUT(chooser->hasFocus(), Patience);
+    QCOMPARE(area->verticalScrollBar()->value(), scrolled);
 }
 
 void tst_FieldChoosers::chooseADesktop()
