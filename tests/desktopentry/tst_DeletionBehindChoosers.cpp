@@ -18,6 +18,8 @@
 #include <QScrollArea>
 #include <QToolButton>
 
+#include <functional>
+
 using namespace FormDriving;
 
 /// The host takes the entry dialog or its form away while the user chooses something.
@@ -44,7 +46,8 @@ private:
     // Each as it is with the form alone taken away, and with the dialog around it.
     static void addRows();
     void takeAway(bool onlyTheForm);
-    void clickButton(QWidget *button);
+    // Clicks again when the window was still being placed, until \a isDone.
+    void clickButton(QWidget *button, const std::function<bool()> &isDone);
 
     QPointer<VelDesktopEntryEditDialog> m_dialog;
 };
@@ -56,7 +59,8 @@ void tst_DeletionBehindChoosers::init()
     QVERIFY(
         m_dialog->setDesktopEntryPath(write(QStringLiteral("a.desktop"), EntrySamples::fullApplication())));
     m_dialog->show();
-    QVERIFY(QTest::qWaitForWindowActive(m_dialog, 20000));
+    QTRY_VERIFY_WITH_TIMEOUT((m_dialog->activateWindow(), QTest::qWaitForWindowActive(m_dialog, 1000)),
+                             20000);
 }
 
 void tst_DeletionBehindChoosers::cleanup()
@@ -80,7 +84,7 @@ void tst_DeletionBehindChoosers::takeAway(bool onlyTheForm)
         delete m_dialog;
 }
 
-void tst_DeletionBehindChoosers::clickButton(QWidget *button)
+void tst_DeletionBehindChoosers::clickButton(QWidget *button, const std::function<bool()> &isDone)
 {
     // What the assistance adds moves everything when it is laid out.
     for (int i = 0; i < 5; ++i)
@@ -89,7 +93,12 @@ void tst_DeletionBehindChoosers::clickButton(QWidget *button)
     if (area->widget()->isAncestorOf(button))
         area->ensureWidgetVisible(button);
     QTRY_VERIFY_WITH_TIMEOUT(button->visibleRegion().contains(button->rect().center()), 20000);
-    XDoTool::click(button);
+    const QPointer<QWidget> guarded(button);
+    bool isSeen = false;
+    for (int i = 0; i < 5 && guarded && !isSeen; ++i) {
+        XDoTool::click(button);
+        isSeen = QTest::qWaitFor(isDone, 8000);
+    }
 }
 
 void tst_DeletionBehindChoosers::survivesItBehindTheFileChooser_data()
@@ -105,7 +114,8 @@ void tst_DeletionBehindChoosers::survivesItBehindTheFileChooser()
         QVERIFY(qobject_cast<QFileDialog *>(window));
         takeAway(onlyTheForm);
     });
-    clickButton(child<QWidget>(m_dialog, "tryExecEdit")->findChild<QToolButton *>());
+    clickButton(child<QWidget>(m_dialog, "tryExecEdit")->findChild<QToolButton *>(),
+                [&modal] { return modal.finished(); });
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
     QCOMPARE(m_dialog.isNull(), !onlyTheForm);
 }
@@ -129,7 +139,7 @@ void tst_DeletionBehindChoosers::survivesItBehindTheFileChooserOfAnAction()
         });
         click(child<QPushButton>(actions, "addButton"));
     });
-    clickButton(child<QToolButton>(m_dialog, "editActionsButton"));
+    clickButton(child<QToolButton>(m_dialog, "editActionsButton"), [&modal] { return modal.finished(); });
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
     QCOMPARE(m_dialog.isNull(), !onlyTheForm);
 }
@@ -155,7 +165,7 @@ void tst_DeletionBehindChoosers::survivesItBehindAChooserOfTheAssistance()
     m_dialog->setAssistance(true);
     ModalDriver modal;
     modal.handle([this, onlyTheForm](QWidget *) { takeAway(onlyTheForm); });
-    clickButton(child<QToolButton>(m_dialog, qPrintable(button)));
+    clickButton(child<QToolButton>(m_dialog, qPrintable(button)), [&modal] { return modal.finished(); });
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
     QCOMPARE(m_dialog.isNull(), !onlyTheForm);
 }
@@ -169,7 +179,10 @@ void tst_DeletionBehindChoosers::survivesItBehindTheIconChooser_data()
 void tst_DeletionBehindChoosers::survivesItBehindTheIconChooser()
 {
     QFETCH(bool, onlyTheForm);
-    clickButton(child<QWidget>(m_dialog, "iconEdit")->findChild<KIconButton *>());
+    clickButton(child<QWidget>(m_dialog, "iconEdit")->findChild<KIconButton *>(), [this] {
+        auto *opened = m_dialog->findChild<KIconDialog *>();
+        return opened && opened->isVisible();
+    });
     KIconDialog *chooser = nullptr;
     QTRY_VERIFY_WITH_TIMEOUT((chooser = m_dialog->findChild<KIconDialog *>()) && chooser->isVisible(), 20000);
     QVERIFY(QTest::qWaitForWindowActive(chooser, 20000));
@@ -210,7 +223,7 @@ void tst_DeletionBehindChoosers::survivesItBehindTheMenuPicker()
         if (onlyTheForm)
             window->close();
     });
-    clickButton(child<QPushButton>(m_dialog, "copyButton"));
+    clickButton(child<QPushButton>(m_dialog, "copyButton"), [&modal] { return modal.finished(); });
     QTRY_VERIFY_WITH_TIMEOUT(modal.finished(), 20000);
     QCOMPARE(m_dialog.isNull(), !onlyTheForm);
 }
