@@ -93,7 +93,7 @@ bool hasOwnKeys(const QByteArray &type)
 void checkOwner(const EntryKeys::Key &standard, const CheckedValue &value)
 {
     const auto *type = EntryText::key(value.group, "Type");
-    if (!value.isMain() || standard.onlyFor.isEmpty() || !type || type->value == standard.onlyFor
+    if (isAction(value.group) || standard.onlyFor.isEmpty() || !type || type->value == standard.onlyFor
         || !hasOwnKeys(type->value))
         return;
     const QString sentence = Text::tr("'%1' is only for entries of the type '%2'.")
