@@ -47,8 +47,10 @@ public:
     /// Whether the dialog helps its users beyond the plain one; see setAssistance().
     bool assistance() const;
     /**
-     * Switches on what goes beyond the plain dialog. Off, as it is at first, the dialog has nothing of
-     * that. It is passed on to the menu that "Copy from..." opens.
+     * Switches on what goes beyond the plain dialog: what is wrong with the entry is said under its
+     * rows, values are chosen from lists, every language of the entry is shown, everything is taken
+     * back and done again, and the entry is tried and its file looked at before it is saved. Off, as
+     * it is at first, the dialog has nothing of that. It is passed on to the menu that "Copy from..." opens.
      *
      * @param assistance whether the dialog is to help
      */

@@ -19,7 +19,8 @@ class VelUIDesktopEntry;
  *
  * It has a row for each key, with a second row for the user's own language where the key has
  * one; rows that do not belong to the type of the entry (Application, Link or Directory) are
- * hidden and emptied, and come back with their values when the user takes the type back. Values go into the entry exactly as they were typed.
+ * hidden and emptied, and come back with their values when the user takes the type back. Values go into the
+ * entry exactly as they were typed.
  *
  * With setAssistance() the form also helps its user beyond that.
  *
@@ -79,8 +80,10 @@ public:
     /// Whether the form helps its users beyond the plain one; see setAssistance().
     bool assistance() const;
     /**
-     * Switches on what goes beyond the plain form. Off, as it is at first, the form has nothing of
-     * that.
+     * Switches on what goes beyond the plain form: what is wrong with the entry is said under its
+     * rows, values are chosen from lists, every language of the entry is shown, everything is taken
+     * back and done again, and the entry is tried and its file looked at before it is saved. Off, as
+     * it is at first, the form has nothing of that.
      *
      * @param assistance whether the form is to help
      */

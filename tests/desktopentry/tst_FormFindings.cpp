@@ -9,6 +9,7 @@
 #include <VelDesktopEntryPropsWidget.h>
 #include <desktopentry/FindingLine.h>
 #include <desktopentry/IconEdit.h>
+#include <desktopentry/KeyDescription.h>
 #include <desktopentry/PathEdit.h>
 #include <desktopentry/StringListEdit.h>
 
@@ -249,11 +250,12 @@ void tst_FormFindings::describesTheFieldToThoseWhoDoNotSeeIt()
     const auto dialog = edit(Good + "Icon=a.png\n");
     QVERIFY(dialog);
     QLineEdit *icon = child<VelUI::IconEdit>(dialog.get(), "iconEdit")->findChild<QLineEdit *>();
-    const QString description = QStringLiteral("Error: The name of an icon has no suffix like '.png'.");
-    QTRY_VERIFY_WITH_TIMEOUT(icon->accessibleDescription().endsWith(description), Patience);
+    const QString description = KeyDescription::of(QStringLiteral("Icon"))
+        + QStringLiteral(" Error: The name of an icon has no suffix like '.png'.");
+    QTRY_COMPARE_WITH_TIMEOUT(icon->accessibleDescription(), description, Patience);
     QAccessibleInterface *face = QAccessible::queryAccessibleInterface(icon);
     QVERIFY(face);
-    QVERIFY(face->text(QAccessible::Description).endsWith(description));
+    QCOMPARE(face->text(QAccessible::Description), description);
     XDoTool::click(fixButton(dialog.get(), "Icon"));
     QTRY_COMPARE_WITH_TIMEOUT(icon->text(), QStringLiteral("a"), Patience);
     QTRY_VERIFY_WITH_TIMEOUT(!icon->accessibleDescription().contains(QStringLiteral("suffix")), Patience);
