@@ -10,6 +10,7 @@
 #include <QDialogButtonBox>
 #include <QEvent>
 #include <QLabel>
+#include <QScreen>
 #include <QVBoxLayout>
 
 namespace VelUI {
@@ -35,6 +36,7 @@ EntryTextDialog::EntryTextDialog(EntryFormHost &form, const QList<QAction *> &hi
     layout->addWidget(m_summary);
     layout->addWidget(buttons);
     DialogSize::restore(*this, QStringLiteral("EntryTextDialog"), QSize(560, 400));
+    placeBesideForm();
 
     // Several signals may tell of one edit.
     m_soon.setSingleShot(true);
@@ -56,6 +58,17 @@ bool EntryTextDialog::eventFilter(QObject *watched, QEvent *event)
     if (watched == parent() && event->type() == QEvent::Hide && !event->spontaneous())
         reject();
     return QDialog::eventFilter(watched, event);
+}
+
+// Who types in the form wants to see both.
+void EntryTextDialog::placeBesideForm()
+{
+    const QRect form = m_form.form()->window()->frameGeometry();
+    const QRect available = m_form.form()->screen()->availableGeometry();
+    if (form.right() + frameGeometry().width() <= available.right())
+        move(form.right() + 1, form.top());
+    else if (form.left() - frameGeometry().width() >= available.left())
+        move(form.left() - frameGeometry().width(), form.top());
 }
 
 void EntryTextDialog::refresh()

@@ -31,6 +31,7 @@ public:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
+    void placeBesideForm();
     void refresh();
     static QString summary(const ChangedLines &text);
 
