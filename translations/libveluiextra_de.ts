@@ -714,8 +714,8 @@
     <message numerus="yes">
         <source>The deletion was canceled. %n items are still there, in whole or in part.</source>
         <translation>
-            <numerusform>Das Löschen wurde abgebrochen. %n Element ist ganz oder teilweise noch da.</numerusform>
-            <numerusform>Das Löschen wurde abgebrochen. %n Elemente sind ganz oder teilweise noch da.</numerusform>
+            <numerusform>Das Löschen wurde abgebrochen. %n Objekt ist ganz oder teilweise noch da.</numerusform>
+            <numerusform>Das Löschen wurde abgebrochen. %n Objekte sind ganz oder teilweise noch da.</numerusform>
         </translation>
     </message>
     <message>
@@ -1019,85 +1019,85 @@
     <message numerus="yes">
         <source>Undo deletion of %1 items (%n entries)</source>
         <translation>
-            <numerusform>Löschen von %1 Elementen (%n Eintrag) rückgängig machen</numerusform>
-            <numerusform>Löschen von %1 Elementen (%n Einträge) rückgängig machen</numerusform>
+            <numerusform>Löschen von %1 Objekten (%n Eintrag) rückgängig machen</numerusform>
+            <numerusform>Löschen von %1 Objekten (%n Einträge) rückgängig machen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Redo deletion of %1 items (%n entries)</source>
         <translation>
-            <numerusform>Löschen von %1 Elementen (%n Eintrag) wiederholen</numerusform>
-            <numerusform>Löschen von %1 Elementen (%n Einträge) wiederholen</numerusform>
+            <numerusform>Löschen von %1 Objekten (%n Eintrag) wiederherstellen</numerusform>
+            <numerusform>Löschen von %1 Objekten (%n Einträge) wiederherstellen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>%1 items were deleted (%n entries).</source>
         <translation>
-            <numerusform>%1 Elemente wurden gelöscht (%n Eintrag).</numerusform>
-            <numerusform>%1 Elemente wurden gelöscht (%n Einträge).</numerusform>
+            <numerusform>%1 Objekte wurden gelöscht (%n Eintrag).</numerusform>
+            <numerusform>%1 Objekte wurden gelöscht (%n Einträge).</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Undo reordering of %n items</source>
         <translation>
-            <numerusform>Umordnen von %n Element rückgängig machen</numerusform>
-            <numerusform>Umordnen von %n Elementen rückgängig machen</numerusform>
+            <numerusform>Umordnen von %n Objekt rückgängig machen</numerusform>
+            <numerusform>Umordnen von %n Objekten rückgängig machen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Redo reordering of %n items</source>
         <translation>
-            <numerusform>Umordnen von %n Element wiederholen</numerusform>
-            <numerusform>Umordnen von %n Elementen wiederholen</numerusform>
+            <numerusform>Umordnen von %n Objekt wiederherstellen</numerusform>
+            <numerusform>Umordnen von %n Objekten wiederherstellen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>%n items have other places.</source>
         <translation>
-            <numerusform>%n Element steht an anderer Stelle.</numerusform>
-            <numerusform>%n Elemente stehen an anderen Stellen.</numerusform>
+            <numerusform>%n Objekt steht an anderer Stelle.</numerusform>
+            <numerusform>%n Objekte stehen an anderen Stellen.</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Undo hiding of %n items</source>
         <translation>
-            <numerusform>Ausblenden von %n Element rückgängig machen</numerusform>
-            <numerusform>Ausblenden von %n Elementen rückgängig machen</numerusform>
+            <numerusform>Ausblenden von %n Objekt rückgängig machen</numerusform>
+            <numerusform>Ausblenden von %n Objekten rückgängig machen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Redo hiding of %n items</source>
         <translation>
-            <numerusform>Ausblenden von %n Element wiederholen</numerusform>
-            <numerusform>Ausblenden von %n Elementen wiederholen</numerusform>
+            <numerusform>Ausblenden von %n Objekt wiederherstellen</numerusform>
+            <numerusform>Ausblenden von %n Objekten wiederherstellen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>%n items are hidden: the menu no longer shows them.</source>
         <translation>
-            <numerusform>%n Element ist ausgeblendet: Das Menü zeigt es nicht mehr.</numerusform>
-            <numerusform>%n Elemente sind ausgeblendet: Das Menü zeigt sie nicht mehr.</numerusform>
+            <numerusform>%n Objekt ist ausgeblendet: Das Menü zeigt es nicht mehr.</numerusform>
+            <numerusform>%n Objekte sind ausgeblendet: Das Menü zeigt sie nicht mehr.</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Undo showing %n items again</source>
         <translation>
-            <numerusform>Wiederanzeigen von %n Element rückgängig machen</numerusform>
-            <numerusform>Wiederanzeigen von %n Elementen rückgängig machen</numerusform>
+            <numerusform>Wiederanzeigen von %n Objekt rückgängig machen</numerusform>
+            <numerusform>Wiederanzeigen von %n Objekten rückgängig machen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Redo showing %n items again</source>
         <translation>
-            <numerusform>Wiederanzeigen von %n Element wiederholen</numerusform>
-            <numerusform>Wiederanzeigen von %n Elementen wiederholen</numerusform>
+            <numerusform>Wiederanzeigen von %n Objekt wiederherstellen</numerusform>
+            <numerusform>Wiederanzeigen von %n Objekten wiederherstellen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>The menu shows %n items again.</source>
         <translation>
-            <numerusform>Das Menü zeigt %n Element wieder.</numerusform>
-            <numerusform>Das Menü zeigt %n Elemente wieder.</numerusform>
+            <numerusform>Das Menü zeigt %n Objekt wieder.</numerusform>
+            <numerusform>Das Menü zeigt %n Objekte wieder.</numerusform>
         </translation>
     </message>
     <message>
@@ -1106,7 +1106,7 @@
     </message>
     <message>
         <source>Redo sorting of folder %1</source>
-        <translation>Sortieren des Ordners %1 wiederholen</translation>
+        <translation>Sortieren des Ordners %1 wiederherstellen</translation>
     </message>
     <message>
         <source>The folder %1 was sorted by name.</source>
@@ -1118,7 +1118,7 @@
     </message>
     <message>
         <source>Redo duplication of %1</source>
-        <translation>Duplizieren von %1 wiederholen</translation>
+        <translation>Duplizieren von %1 wiederherstellen</translation>
     </message>
     <message>
         <source>%1 was duplicated. The copy is selected.</source>
@@ -1127,35 +1127,35 @@
     <message numerus="yes">
         <source>Undo duplication of %n items</source>
         <translation>
-            <numerusform>Duplizieren von %n Element rückgängig machen</numerusform>
-            <numerusform>Duplizieren von %n Elementen rückgängig machen</numerusform>
+            <numerusform>Duplizieren von %n Objekt rückgängig machen</numerusform>
+            <numerusform>Duplizieren von %n Objekten rückgängig machen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>Redo duplication of %n items</source>
         <translation>
-            <numerusform>Duplizieren von %n Element wiederholen</numerusform>
-            <numerusform>Duplizieren von %n Elementen wiederholen</numerusform>
+            <numerusform>Duplizieren von %n Objekt wiederherstellen</numerusform>
+            <numerusform>Duplizieren von %n Objekten wiederherstellen</numerusform>
         </translation>
     </message>
     <message numerus="yes">
         <source>%n items were duplicated. The copies are selected.</source>
         <translation>
-            <numerusform>%n Element wurde dupliziert. Die Kopie ist ausgewählt.</numerusform>
-            <numerusform>%n Elemente wurden dupliziert. Die Kopien sind ausgewählt.</numerusform>
+            <numerusform>%n Objekt wurde dupliziert. Die Kopie ist ausgewählt.</numerusform>
+            <numerusform>%n Objekte wurden dupliziert. Die Kopien sind ausgewählt.</numerusform>
         </translation>
     </message>
     <message>
         <source>Undo deletion of %1 items (1 entry)</source>
-        <translation>Löschen von %1 Elementen (1 Eintrag) rückgängig machen</translation>
+        <translation>Löschen von %1 Objekten (1 Eintrag) rückgängig machen</translation>
     </message>
     <message>
         <source>Redo deletion of %1 items (1 entry)</source>
-        <translation>Löschen von %1 Elementen (1 Eintrag) wiederholen</translation>
+        <translation>Löschen von %1 Objekten (1 Eintrag) wiederherstellen</translation>
     </message>
     <message>
         <source>%1 items were deleted (1 entry).</source>
-        <translation>%1 Elemente wurden gelöscht (1 Eintrag).</translation>
+        <translation>%1 Objekte wurden gelöscht (1 Eintrag).</translation>
     </message>
 </context>
 <context>
@@ -3185,11 +3185,11 @@ gehen verloren. Sind Sie sicher?</translation>
     </message>
     <message>
         <source>Redo change of %1</source>
-        <translation>Änderung von %1 wiederholen</translation>
+        <translation>Änderung von %1 wiederherstellen</translation>
     </message>
     <message>
         <source>Redo</source>
-        <translation>Wiederholen</translation>
+        <translation>Wiederherstellen</translation>
     </message>
 </context>
 <context>
