@@ -100,6 +100,8 @@ QString GlobalShortcuts::filePath()
 QString GlobalShortcuts::find(const QString &path, const QKeySequence &sequence)
 {
     const QByteArray bytes = path.isEmpty() ? QByteArray() : contents(path);
+    if (bytes.isEmpty())
+        return {};
     const KeyMatcher matcher(sequence);
     CSimpleIniA ini;
     if (!mayMatch(bytes, matcher) || ini.LoadData(bytes.constData(), std::size_t(bytes.size())) < 0)
