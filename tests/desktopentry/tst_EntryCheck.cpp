@@ -156,6 +156,8 @@ void tst_EntryCheck::finds_data()
     row("malformed group", Application + "[X-[Own]\n", P::MalformedGroup, error, "");
     row("old group of another type", Application + "[KDE Desktop Entry]\nType=Application\nName=x\nURL=y:z\n",
         P::KeyOfOtherType, error, "URL");
+    row("type in the old group", "[Desktop Entry]\nName=x\nURL=y:z\n[KDE Desktop Entry]\nType=Application\n",
+        P::KeyOfOtherType, error, "URL");
     row("old group", Application + "[KDE Desktop Entry]\nType=Link\nName=x\nURL=y:z\n", P::DeprecatedGroup,
         warning, "");
     row("malformed key", Application + "X_Own=x\n", P::MalformedKey, error, "X_Own");

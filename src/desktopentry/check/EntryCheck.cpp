@@ -57,7 +57,7 @@ const QHash<QByteArray, Check> &checks()
 
 void checkValue(const CheckedEntry &entry, const CheckedValue &value)
 {
-    if (!KeyChecks::checkKey(value) || !ValueChecks::checkKind(value))
+    if (!KeyChecks::checkKey(entry, value) || !ValueChecks::checkKind(value))
         return;
     if (const Check check = checks().value(value.key.name))
         check(entry, value);

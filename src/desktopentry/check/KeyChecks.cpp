@@ -90,9 +90,20 @@ bool hasOwnKeys(const QByteArray &type)
     return known.contains(type);
 }
 
-void checkOwner(const EntryKeys::Key &standard, const CheckedValue &value)
+// The type of the group; where it has none, that of another group which plays the same role.
+const EntryText::Key *typeOf(const CheckedEntry &entry, const EntryText::Group &group)
 {
-    const auto *type = EntryText::key(value.group, "Type");
+    const EntryText::Key *type = EntryText::key(group, "Type");
+    for (const EntryText::Group &other : entry.text.groups()) {
+        if (!type && KeyChecks::isOfStandard(other) && !isAction(other))
+            type = EntryText::key(other, "Type");
+    }
+    return type;
+}
+
+void checkOwner(const CheckedEntry &entry, const EntryKeys::Key &standard, const CheckedValue &value)
+{
+    const auto *type = typeOf(entry, value.group);
     if (isAction(value.group) || standard.onlyFor.isEmpty() || !type || type->value == standard.onlyFor
         || !hasOwnKeys(type->value))
         return;
@@ -139,7 +150,7 @@ bool checkWritten(const CheckedValue &value)
 
 } // namespace
 
-bool KeyChecks::checkKey(const CheckedValue &value)
+bool KeyChecks::checkKey(const CheckedEntry &entry, const CheckedValue &value)
 {
     if (!checkWritten(value) || !isOfStandard(value.group) || EntryKeys::isExtension(value.key.name))
         return false;
@@ -156,7 +167,7 @@ bool KeyChecks::checkKey(const CheckedValue &value)
         return false;
     }
     checkDeprecated(*standard, value);
-    checkOwner(*standard, value);
+    checkOwner(entry, *standard, value);
     return true;
 }
 

@@ -10,7 +10,7 @@ namespace KeyChecks {
 
 /// Names, repetitions and languages of the keys of any \a group; true for \a key when its value can be
 /// looked at.
-bool checkKey(const CheckedValue &value);
+bool checkKey(const CheckedEntry &entry, const CheckedValue &value);
 /// The keys that \a group has to have, and those that exclude each other.
 void checkGroup(const EntryText::Group &group, EntryFindings *findings);
 
