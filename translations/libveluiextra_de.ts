@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>Die Aktion „%1“ ist beschrieben, aber „Aktionen“ nennt sie nicht.</translation>
+        <translation>Die Aktion „%1“ ist beschrieben, aber „Actions“ nennt sie nicht.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>La acción «%1» está descrita, pero «Acciones» no la menciona.</translation>
+        <translation>La acción «%1» está descrita, pero «Actions» no la menciona.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>L&apos;azione «%1» è descritta, ma «Azioni» non la nomina.</translation>
+        <translation>L&apos;azione «%1» è descritta, ma «Actions» non la nomina.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>
@@ -2146,7 +2146,7 @@ andranno persi. Sei sicuro?</translation>
     <message numerus="yes">
         <source>And %n more.</source>
         <translation>
-            <numerusform>E un altro.</numerusform>
+            <numerusform>E %n altro.</numerusform>
             <numerusform>E altri %n.</numerusform>
         </translation>
     </message>
@@ -3329,7 +3329,7 @@ andranno persi. Sei sicuro?</translation>
     <message numerus="yes">
         <source>And %n more.</source>
         <translation>
-            <numerusform>E un altro.</numerusform>
+            <numerusform>E %n altro.</numerusform>
             <numerusform>E altri %n.</numerusform>
         </translation>
     </message>

@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>アクション「%1」の記述がありますが、「アクション」に挙げられていません。</translation>
+        <translation>アクション「%1」の記述がありますが、「Actions」に挙げられていません。</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

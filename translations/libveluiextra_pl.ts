@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>Działanie „%1” jest opisane, ale nie wymieniono go w polu „Działania”.</translation>
+        <translation>Działanie „%1” jest opisane, ale nie wymieniono go w polu „Actions”.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>A ação &quot;%1&quot; está descrita, mas não consta em &quot;Ações&quot;.</translation>
+        <translation>A ação &quot;%1&quot; está descrita, mas não consta em &quot;Actions&quot;.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

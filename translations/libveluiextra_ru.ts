@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>Действие «%1» описано, но не названо в поле «Действия».</translation>
+        <translation>Действие «%1» описано, но не названо в поле «Actions».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>&apos;%1&apos; eylemi tanımlanmış, ama &apos;Eylemler&apos; alanında adı geçmiyor.</translation>
+        <translation>&apos;%1&apos; eylemi tanımlanmış, ama &apos;Actions&apos; alanında adı geçmiyor.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

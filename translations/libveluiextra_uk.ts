@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>Дію «%1» описано, але не названо в полі «Дії».</translation>
+        <translation>Дію «%1» описано, але не названо в полі «Actions».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>

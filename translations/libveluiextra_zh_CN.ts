@@ -417,7 +417,7 @@
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>操作“%1”有说明，但“操作”中没有列出它。</translation>
+        <translation>操作“%1”有说明，但“Actions”中没有列出它。</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>
