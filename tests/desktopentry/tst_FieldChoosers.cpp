@@ -242,6 +242,8 @@ void tst_FieldChoosers::stayInViewWhenTheyWereClicked()
     open.form->setFocus();
     auto *area = child<QScrollArea>(open.form, "scrollArea");
     QToolButton *const chooser = open.button("MimeType");
+    open.form->resize(open.form->width(), 250); // too little for all rows
+    QTRY_VERIFY_WITH_TIMEOUT(area->verticalScrollBar()->maximum() > 0, Patience);
     area->ensureWidgetVisible(chooser);
     QTRY_VERIFY_WITH_TIMEOUT(!chooser->visibleRegion().isEmpty(), Patience);
     const int scrolled = area->verticalScrollBar()->value();
