@@ -306,6 +306,7 @@ void tst_EntryCheck::repairs_data()
     row("Categories=Game;Fun;", P::UnknownCategory, "Categories=Game;X-Fun;");
     row("Categories=Game;Application;", P::DeprecatedCategory, "Categories=Game;");
     row("Categories=TrayIcon;Game;", P::ReservedCategory, "Categories=Game;");
+    row("Categories=Player;", P::MissingRelatedCategory, "Categories=Player;Audio;AudioVideo;");
     row("Categories=Video;Player;", P::MissingRelatedCategory, "Categories=Video;Player;AudioVideo;");
     row("Categories=Game;Game;", P::RepeatedItem, "Categories=Game;");
     row("MimeType=Text/Plain, image/png;", P::MalformedMimeType, "MimeType=text/plain;image/png;");

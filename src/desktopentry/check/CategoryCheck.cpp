@@ -59,6 +59,25 @@ QString listed(const QVector<QStringList> &related)
     return texts.join(QLatin1String(", "));
 }
 
+// What \a category needs and \a items lack, and what that needs in its turn.
+QStringList missingFor(const Category &category, const QStringList &items)
+{
+    QStringList missing;
+    const auto add = [&](const Category &needing) {
+        for (const QString &name : needing.related.value(0)) {
+            if (!items.contains(name) && !missing.contains(name))
+                missing.append(name);
+        }
+    };
+    add(category);
+    for (int i = 0; i < missing.size(); ++i) {
+        const Category *const needed = RegisteredCategories::find(missing.at(i));
+        if (needed && needed->kind == Kind::Main)
+            add(*needed);
+    }
+    return missing;
+}
+
 // A main category that wants another one may not stand without it.
 void checkRelated(const Category &category, const QStringList &items, const CheckedValue &value)
 {
@@ -66,17 +85,13 @@ void checkRelated(const Category &category, const QStringList &items, const Chec
     if (category.related.isEmpty()
         || std::any_of(category.related.cbegin(), category.related.cend(), isSatisfied))
         return;
-    QStringList repaired = items;
-    for (const QString &name : category.related.constFirst()) {
-        if (!repaired.contains(name))
-            repaired.append(name);
-    }
+    const QStringList added = missingFor(category, items);
     const bool isMain = category.kind == Kind::Main;
     const QString sentence = isMain ? Text::tr("The category '%1' also needs: %2.")
                                     : Text::tr("The category '%1' goes with one of these: %2.");
     value.add(EntryProblem::MissingRelatedCategory, isMain ? EntryFinding::Error : EntryFinding::Hint,
               sentence.arg(category.name, listed(category.related)),
-              Text::tr("Add '%1'").arg(category.related.constFirst().join(QLatin1String("', '"))), repaired);
+              Text::tr("Add '%1'").arg(added.join(QLatin1String("', '"))), items + added);
 }
 
 void checkKnown(const Category &category, const QByteArray &item, const QStringList &items,
