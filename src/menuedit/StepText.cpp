@@ -126,7 +126,9 @@ QString StepText::done() const
 // Names may hold a % of their own, so all of it is filled in at once.
 QString StepText::filledIn(const char *text) const
 {
-    const QString translated = QCoreApplication::translate("MenuHistory", text, nullptr, m_count);
+    // With a number, a catalog has no answer for a text that has but one form.
+    const int number = QLatin1String(text).contains(QLatin1String("%n")) ? m_count : -1;
+    const QString translated = QCoreApplication::translate("MenuHistory", text, nullptr, number);
     const bool hasItem = translated.contains(QLatin1String("%1"));
     const bool hasFolder = translated.contains(QLatin1String("%2"));
     if (hasItem && hasFolder)
