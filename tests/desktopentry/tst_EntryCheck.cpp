@@ -161,6 +161,7 @@ void tst_EntryCheck::finds_data()
     row("old group", Application + "[KDE Desktop Entry]\nType=Link\nName=x\nURL=y:z\n", P::DeprecatedGroup,
         warning, "");
     row("malformed key", Application + "X_Own=x\n", P::MalformedKey, error, "X_Own");
+    row("language that others read", Application + "Name[d|]=x\n", P::MalformedKey, warning, "Name");
     row("malformed language", Application + "Name[d e]=x\n", P::MalformedKey, error, "Name");
     row("unknown key", Application + "Own=x\n", P::UnknownKey, error, "Own");
     row("key twice", Application + "Exec=run\n", P::RepeatedKey, error, "Exec");

@@ -237,9 +237,8 @@ void tst_EntryCheckValidator::neverMilder()
                              .arg(ownErrors.size());
     QVERIFY(errors > 0);
     QVERIFY2(missed.isEmpty(), qPrintable(missed.value(0)));
-    // Seeing errors everywhere would miss none, either. Among the odd ones are names of keys whose last
-    // character the validator does not look at, each with all values.
-    const int allowed = origin == QLatin1String("corpus") ? 0 : 1 + errors / 15;
+    // Seeing errors everywhere would miss none, either.
+    const int allowed = origin == QLatin1String("corpus") ? 0 : 1 + errors / 40;
     QVERIFY2(ownErrors.size() <= allowed, qPrintable(ownErrors.value(0)));
 }
 

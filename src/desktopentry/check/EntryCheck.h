@@ -11,7 +11,7 @@
 #include <QByteArray>
 #include <QString>
 
-/// Tells what is wrong with an entry, by the desktop entry standard and the menu specification of
+/// Tells what is wrong with an entry, by the desktop entry standard and the menu standard of
 /// freedesktop.org.
 ///
 /// What desktop-file-validate takes for an error is an error here. Knows no widget, looks at no disk: what

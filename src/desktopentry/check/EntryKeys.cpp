@@ -42,7 +42,7 @@ constexpr Row Rows[] = {
     {"StartupWMClass", ValueType::Text, "Application"},
     {"URL", ValueType::Text, "Link"},
     {"PrefersNonDefaultGPU", ValueType::Flag},
-    // Of the autostart specification.
+    // Of the autostart standard.
     {"AutostartCondition", ValueType::Text, "Application"},
     // Reserved for one desktop.
     {"ServiceTypes", ValueType::Text},

@@ -143,7 +143,8 @@ bool checkWritten(const CheckedValue &value)
         value.add(EntryProblem::RepeatedKey, EntryFinding::Error,
                   Text::tr("'%1' stands more than once.").arg(name));
     if (!value.key.isWellFormed)
-        value.add(EntryProblem::MalformedKey, EntryFinding::Error,
+        value.add(EntryProblem::MalformedKey,
+                  value.key.isReadable ? EntryFinding::Warning : EntryFinding::Error,
                   Text::tr("No key can be called '%1'.").arg(name));
     return value.key.isReadable;
 }

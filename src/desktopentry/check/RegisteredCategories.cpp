@@ -9,7 +9,7 @@ namespace RegisteredCategories {
 
 namespace {
 
-// The related ones as the specification writes them: "or" between lists, ";" within one.
+// The related ones as the register writes them: "or" between lists, ";" within one.
 struct Row
 {
     const char *name;

@@ -7,13 +7,13 @@
 #include <QStringList>
 #include <QVector>
 
-/// The categories of applications that the desktop menu specification of freedesktop.org registers.
+/// The categories of applications that freedesktop.org registers for menus.
 ///
 /// A pure table; names for users stand elsewhere. Categories are compared letter by letter, case
-/// included, as the specification has it.
+/// included, as menus do.
 namespace RegisteredCategories {
 
-/// What the specification says of a category.
+/// What is registered of a category.
 enum class Kind {
     Main, ///< every application should have at least one of these
     Additional, ///< says more about an application that has a main category
@@ -26,12 +26,12 @@ struct Category
 {
     QString name;
     Kind kind;
-    /// The categories that it goes with, in the order of the specification: it wants all of one of
+    /// The categories that it goes with, in the order of the register: it wants all of one of
     /// these lists beside it. Empty where it goes with anything.
     QVector<QStringList> related;
 };
 
-/// All categories: the main ones first, then the others, in the order of the specification.
+/// All categories: the main ones first, then the others, in the order of the register.
 const QVector<Category> &all();
 
 /// The category of \a name, null when none is registered under it. The pointer stays good.
