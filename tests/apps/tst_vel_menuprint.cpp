@@ -32,7 +32,7 @@ Result print(const QStringList &arguments, const QByteArray &input = QByteArray(
     process.start(QStringLiteral(VEL_PROGRAM), arguments);
     process.write(input);
     process.closeWriteChannel();
-    if (!process.waitForFinished(120000))
+    if (!process.waitForFinished())
         QTest::qFail("the program hangs", __FILE__, __LINE__);
     return {process.exitCode(), process.readAllStandardOutput(), process.readAllStandardError()};
 }
