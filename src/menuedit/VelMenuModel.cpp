@@ -4,11 +4,12 @@
 #include "VelMenuModel.h"
 
 #include "DimmedIcon.h"
+#include "DropContents.h"
 #include "EntryDisplay.h"
 #include "FolderWatch.h"
-#include "MenuClipboard.h"
 #include "MenuDrop.h"
 #include "MenuIconProvider.h"
+#include "RowLook.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
@@ -17,10 +18,6 @@
 #include <QDir>
 #include <QFileIconProvider>
 #include <QFileInfo>
-#include <QFont>
-#include <QGuiApplication>
-#include <QPalette>
-#include <QTextDocument>
 #include <QTimer>
 
 namespace {
@@ -33,29 +30,6 @@ constexpr int MostAtOnce = 20;
 
 // The columns that the base class uses in signals of its own, whatever columnCount() says.
 constexpr int BaseColumns = 4;
-
-// Not that of what is disabled: it is to be read.
-QColor grayText()
-{
-    constexpr double Strength = 0.55;
-    const QColor text = QGuiApplication::palette().color(QPalette::Text);
-    const QColor base = QGuiApplication::palette().color(QPalette::Base);
-    const auto mixed = [](double from, double to) { return to + (from - to) * Strength; };
-    return QColor::fromRgbF(mixed(text.redF(), base.redF()), mixed(text.greenF(), base.greenF()),
-                            mixed(text.blueF(), base.blueF()));
-}
-
-// Data may stand in a URL as a whole.
-QString noFile(const QUrl &url)
-{
-    constexpr int LongestShown = 200;
-    QString address = url.toDisplayString();
-    if (address.size() > LongestShown)
-        address = address.left(LongestShown) + QStringLiteral("...");
-    return QCoreApplication::translate("VelMenuView",
-                                       "%1 is no file on this computer. Nothing was moved or copied.")
-        .arg(address);
-}
 
 RowCache::Display readDisplay(const QString &file)
 {
@@ -109,10 +83,8 @@ QVariant VelMenuModel::data(const QModelIndex &index, int role) const
             return displayName(index);
         if (role == HiddenRole)
             return isHidden(index);
-        if (m_isAssisted && (role == Qt::ForegroundRole || role == Qt::FontRole))
-            return markOf(index, role);
-        if (m_isAssisted && (role == Qt::ToolTipRole || role == Qt::AccessibleDescriptionRole))
-            return explanation(index, role);
+        if (m_isAssisted && RowLook::isOf(role))
+            return lookOf(index, role);
         if (role == Qt::DecorationRole)
             return iconOf(index);
     }
@@ -138,25 +110,21 @@ bool VelMenuModel::dropMimeData(const QMimeData *data, Qt::DropAction action, in
                                 const QModelIndex &parent)
 {
     Q_UNUSED(column)
-    if (parent.row() < 0 || parent.column() < 0 || !parent.model() || !data || !data->hasUrls()
-        || action == Qt::IgnoreAction)
+    if (parent.row() < 0 || parent.column() < 0 || !parent.model() || action == Qt::IgnoreAction)
         return false;
-    const QStringList sources = MenuClipboard::localPaths(data);
-    if (sources.isEmpty())
+    const DropContents contents = DropContents::of(data, m_isAssisted);
+    if (contents.sources.isEmpty())
         return false;
-    const QPointer<VelMenuModel> self(this);
-    const QList<QUrl> foreign = MenuClipboard::foreignUrls(data);
-    for (const QUrl &url : foreign) {
-        if (m_isAssisted && WebAddress::isOne(url))
-            continue;
+    if (!contents.refusal.isEmpty()) {
         DropResult refusal;
-        refusal.complaint = noFile(url);
+        refusal.complaint = contents.refusal;
         m_dropHost->finished(refusal);
         return false;
     }
-    const QVector<WebAddress> addresses = WebAddress::withTitles(foreign, MenuClipboard::titleTexts(data));
+    const QPointer<VelMenuModel> self(this);
     const DropResult result =
-        MenuDrop(*this, *m_watch, *m_dropHost, {sources, action, row, parent, m_isAssisted, addresses})
+        MenuDrop(*this, *m_watch, *m_dropHost,
+                 {contents.sources, action, row, parent, m_isAssisted, contents.addresses})
             .carryOut();
     if (!self)
         return false;
@@ -336,22 +304,6 @@ QVariant VelMenuModel::displayName(const QModelIndex &index) const
     return name.isEmpty() && m_isAssisted ? QFileSystemModel::data(index, Qt::DisplayRole) : name;
 }
 
-// Gray stands for what the menu does not show or is about to lose, slanted for what has no name of
-// its own.
-QVariant VelMenuModel::markOf(const QModelIndex &index, int role) const
-{
-    const QString path = pathOf(index);
-    const EntryState::Kind state = m_cache->display(path).value_or(RowCache::Display()).state;
-    if (role == Qt::ForegroundRole && (EntryState::isOutsideMenu(state) || m_cut.contains(path)))
-        return grayText();
-    if (role == Qt::FontRole && state != EntryState::Kind::Shown && !EntryState::isOutsideMenu(state)) {
-        QFont font;
-        font.setItalic(true);
-        return font;
-    }
-    return {};
-}
-
 QVariant VelMenuModel::iconOf(const QModelIndex &index) const
 {
     QVariant icon;
@@ -364,15 +316,11 @@ QVariant VelMenuModel::iconOf(const QModelIndex &index) const
     return m_cut.isEmpty() || !m_cut.contains(pathOf(index)) ? icon : DimmedIcon::of(icon.value<QIcon>());
 }
 
-QVariant VelMenuModel::explanation(const QModelIndex &index, int role) const
+QVariant VelMenuModel::lookOf(const QModelIndex &index, int role) const
 {
     const QString path = pathOf(index);
-    if (m_cache->display(path).value_or(RowCache::Display()).state == EntryState::Kind::Shown)
-        return {};
-    const QString text = EntryState::explanation(path);
-    return role == Qt::ToolTipRole && Qt::mightBeRichText(text)
-        ? Qt::convertFromPlainText(text, Qt::WhiteSpaceNormal)
-        : text;
+    const EntryState::Kind state = m_cache->display(path).value_or(RowCache::Display()).state;
+    return RowLook::data({path, state, m_cut.contains(path)}, role);
 }
 
 bool VelMenuModel::isHidden(const QModelIndex &index) const

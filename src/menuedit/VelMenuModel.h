@@ -89,9 +89,8 @@ Q_SIGNALS:
     void changed();
 
 private:
-    QVariant markOf(const QModelIndex &index, int role) const;
     QVariant iconOf(const QModelIndex &index) const;
-    QVariant explanation(const QModelIndex &index, int role) const;
+    QVariant lookOf(const QModelIndex &index, int role) const;
     bool loadItemInfo(const QString &path, bool isFolder) const;
     QString pathOf(const QModelIndex &index) const;
     QVariant displayName(const QModelIndex &index) const;
