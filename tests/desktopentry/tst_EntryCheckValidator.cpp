@@ -152,8 +152,8 @@ private:
     QVector<Sample> samplesOf(const QString &origin) const;
     EntryFindings findingsOf(const Sample &sample);
     QVector<Repaired> repairsOf(const QVector<Sample> &samples);
-    QString faultOf(const Repaired &repair, const Sample &sample, const Complaints &before,
-                    const Complaints &after);
+    QString faultOf(const Repaired &repair, const Sample &sample, const Complaints &complaintsBefore,
+                    const Complaints &complaintsAfter);
 
     QVector<Sample> m_corpus;
 };
@@ -267,16 +267,21 @@ void tst_EntryCheckValidator::repairsWhatItOffersTo_data()
 
 // What a repair did wrong; empty when it did what it says.
 QString tst_EntryCheckValidator::faultOf(const Repaired &repair, const Sample &sample,
-                                         const Complaints &before, const Complaints &after)
+                                         const Complaints &complaintsBefore,
+                                         const Complaints &complaintsAfter)
 {
     const QByteArray key = repair.finding.key.toUtf8();
+    QByteArray before = sample.bytes;
+    // A new line behind the last one gives that the end that it lacks.
+    if (!before.endsWith('\n') && repair.after.bytes.startsWith(before + '\n'))
+        before.append('\n');
     for (const QByteArray &line :
-         linesOnlyIn(repair.after.bytes, sample.bytes) + linesOnlyIn(sample.bytes, repair.after.bytes)) {
+         linesOnlyIn(repair.after.bytes, before) + linesOnlyIn(before, repair.after.bytes)) {
         if (!line.trimmed().startsWith(key))
             return QStringLiteral("changes another line: ") + QString::fromUtf8(line);
     }
-    const int had = errorsLike(before, repair.finding);
-    if (had > 0 && errorsLike(after, repair.finding) >= had)
+    const int had = errorsLike(complaintsBefore, repair.finding);
+    if (had > 0 && errorsLike(complaintsAfter, repair.finding) >= had)
         return QStringLiteral("does not help the validator");
     const EntryFindings findings = findingsOf(repair.after);
     const bool isStillThere = std::any_of(findings.cbegin(), findings.cend(), [&](const EntryFinding &other) {
