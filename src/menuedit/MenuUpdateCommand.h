@@ -20,11 +20,12 @@ int kindOf(const QString &dir);
 /// The command line for a directory of \a kind, line feed included; empty for any other kind.
 QByteArray forKind(int kind);
 
-/// Whether anybody takes commands on the application's display, which nobody does off X11.
+/// Whether anybody takes commands on the application's X display; false off X11, where that shows only when
+/// one is sent.
 bool isHeard();
 
-/// Sends a command over the application's display; whether the window manager has got it, which it
-/// never has off X11.
+/// Sends a command over the application's X display, off X11 without one; whether the window manager has got
+/// it.
 bool send(const QByteArray &command);
 
 } // namespace MenuUpdateCommand

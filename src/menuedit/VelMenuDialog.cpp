@@ -255,11 +255,12 @@ bool VelMenuDialog::updateWM()
     const QByteArray command = MenuUpdateCommand::forKind(d->menuKind);
     if (command.isEmpty())
         return false;
-    // Where nobody shows the menu, nobody has to read it anew.
-    if (assistance() && !MenuUpdateCommand::isHeard())
-        return false;
+    const bool isHeard = MenuUpdateCommand::isHeard();
     if (MenuUpdateCommand::send(command))
         return true;
+    // Where nobody shows the menu, nobody has to read it anew.
+    if (assistance() && !isHeard)
+        return false;
     MessageBox::show(this, QMessageBox::Warning, tr("Warning"), tr("Can't send command to vel-wm"));
     return false;
 }

@@ -3,6 +3,7 @@
 
 #include "MenuTestCase.h"
 #include "ModalDriver.h"
+#include "WindowManager.h"
 
 #include <EditShortcutsDialog.h>
 #include <ShortcutsModel.h>
@@ -13,6 +14,7 @@
 #include <shortcuts/KeyboardLayout.h>
 
 #include <QAction>
+#include <QProcess>
 #include <QX11Info>
 #include <QtPlugin>
 
@@ -29,6 +31,7 @@ private Q_SLOTS:
     void hasADisplayThatIsNoneOfX11();
     void sendsNoCommandThere();
     void warnsThatNoWindowManagerIsToldThere();
+    void tellsTheWindowManagerOverTheBus();
     void namesKeysThere();
     void opensAndClosesEachDialogThere();
 };
@@ -56,6 +59,28 @@ void tst_OtherPlatform::warnsThatNoWindowManagerIsToldThere()
     dialog->show();
     dialog.reset();
     QVERIFY(modal.finished());
+}
+
+void tst_OtherPlatform::tellsTheWindowManagerOverTheBus()
+{
+    qunsetenv("DISPLAY");
+    QProcess bus;
+    bus.start(QStringLiteral("dbus-daemon"),
+              {QStringLiteral("--session"), QStringLiteral("--nofork"), QStringLiteral("--print-address=1")});
+    QVERIFY(bus.waitForReadyRead(20000));
+    qputenv("DBUS_SESSION_BUS_ADDRESS", bus.readLine().trimmed());
+    QDir().mkpath(startMenu());
+    VelMenuDialog dialog(startMenu(), -1, true, true);
+    dialog.setAssistance(true);
+    QVERIFY(!dialog.updateWM());
+    WindowManager manager;
+    QVERIFY(manager.owns());
+    QVERIFY(dialog.updateWM());
+    QTRY_COMPARE(manager.lines(), QList<QByteArray>{"VELWM_UPDATE_STARTMENU"});
+    bus.terminate();
+    QVERIFY(bus.waitForFinished(20000));
+    qunsetenv("DBUS_SESSION_BUS_ADDRESS");
+    QVERIFY(!dialog.updateWM());
 }
 
 void tst_OtherPlatform::namesKeysThere()
