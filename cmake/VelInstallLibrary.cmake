@@ -1,29 +1,30 @@
 # SPDX-FileCopyrightText: The veluiextra developers
 # SPDX-License-Identifier: LGPL-2.1-or-later
 
-# Installs the library so that find_package(VelUIExtra) and pkg-config find it.
+# Installs the library so that find_package(${VEL_PACKAGE}) and pkg-config find it.
 
 include(CMakePackageConfigHelpers)
 include(VelPkgConfig)
 
-set(VEL_CMAKE_DIR "${CMAKE_INSTALL_LIBDIR}/cmake/VelUIExtra")
+set(VEL_CMAKE_DIR "${CMAKE_INSTALL_LIBDIR}/cmake/${VEL_PACKAGE}")
 
 set_target_properties(veluiextra PROPERTIES EXPORT_NAME VelUIExtra)
 install(TARGETS veluiextra EXPORT VelUIExtraTargets
     LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT devel)
 install(DIRECTORY "${VEL_PUBLIC_INCLUDE_DIR}/" "${CMAKE_CURRENT_BINARY_DIR}/include/"
-    DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/veluiextra COMPONENT devel FILES_MATCHING PATTERN "*.h")
+    DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/veluiextra${VEL_QT_SUFFIX} COMPONENT devel FILES_MATCHING PATTERN "*.h")
 
-install(EXPORT VelUIExtraTargets NAMESPACE VelUIExtra:: DESTINATION ${VEL_CMAKE_DIR} COMPONENT devel)
+install(EXPORT VelUIExtraTargets NAMESPACE ${VEL_PACKAGE}:: DESTINATION ${VEL_CMAKE_DIR} COMPONENT devel)
 if(VEL_PLATFORM STREQUAL "bundled")
+    install(EXPORT VelCoreTargets NAMESPACE Vel:: DESTINATION ${VEL_CMAKE_DIR} COMPONENT devel)
     install(EXPORT VelPlatformTargets NAMESPACE Vel:: DESTINATION ${VEL_CMAKE_DIR} COMPONENT devel)
 endif()
 configure_package_config_file("${PROJECT_SOURCE_DIR}/cmake/VelUIExtraConfig.cmake.in"
-    "${CMAKE_CURRENT_BINARY_DIR}/VelUIExtraConfig.cmake" INSTALL_DESTINATION ${VEL_CMAKE_DIR})
-write_basic_package_version_file("${CMAKE_CURRENT_BINARY_DIR}/VelUIExtraConfigVersion.cmake"
+    "${CMAKE_CURRENT_BINARY_DIR}/${VEL_PACKAGE}Config.cmake" INSTALL_DESTINATION ${VEL_CMAKE_DIR})
+write_basic_package_version_file("${CMAKE_CURRENT_BINARY_DIR}/${VEL_PACKAGE}ConfigVersion.cmake"
     COMPATIBILITY SameMajorVersion)
-install(FILES "${CMAKE_CURRENT_BINARY_DIR}/VelUIExtraConfig.cmake"
-    "${CMAKE_CURRENT_BINARY_DIR}/VelUIExtraConfigVersion.cmake"
+install(FILES "${CMAKE_CURRENT_BINARY_DIR}/${VEL_PACKAGE}Config.cmake"
+    "${CMAKE_CURRENT_BINARY_DIR}/${VEL_PACKAGE}ConfigVersion.cmake"
     DESTINATION ${VEL_CMAKE_DIR} COMPONENT devel)
 
-vel_install_pkgconfig(veluiextra COMPONENT devel TEMPLATE "${PROJECT_SOURCE_DIR}/cmake/veluiextra.pc.in")
+vel_install_pkgconfig(veluiextra${VEL_QT_SUFFIX} COMPONENT devel TEMPLATE "${PROJECT_SOURCE_DIR}/cmake/veluiextra.pc.in")

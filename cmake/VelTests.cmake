@@ -3,7 +3,7 @@
 
 # The build folder would stand in every test's command line, and the compiler cache would
 # miss in any other tree; QFINDTESTDATA, which needs it, is not used.
-set_target_properties(Qt5::Test PROPERTIES INTERFACE_COMPILE_DEFINITIONS QT_TESTLIB_LIB)
+set_target_properties(${VEL_QT}::Test PROPERTIES INTERFACE_COMPILE_DEFINITIONS QT_TESTLIB_LIB)
 
 # vel_add_test(<name> [X11] [SHARED] [BARE] [SOURCES <file>...] [LIBRARIES <target>...]
 #              [LABELS <label>...])
