@@ -3,6 +3,8 @@
 
 #include "EntryTrial.h"
 
+#include <frame/LibraryPlace.h>
+
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -67,7 +69,8 @@ void EntryTrial::start(const VelUIDesktopEntry &entry, const QString &path)
     });
     m_process->setStandardInputFile(QProcess::nullDevice());
     m_process->setStandardOutputFile(QProcess::nullDevice());
-    m_process->start(QStringLiteral("vel-open"), {QStringLiteral("--exec"), m_written});
+    m_process->start(LibraryPlace::program(QStringLiteral("vel-open")),
+                     {QStringLiteral("--exec"), m_written});
 }
 
 void EntryTrial::stop()

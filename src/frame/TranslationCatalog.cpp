@@ -3,6 +3,8 @@
 
 // The library's start-up work: its translations go into the application that loads it.
 
+#include "LibraryPlace.h"
+
 #include <QCoreApplication>
 #include <QLocale>
 #include <QThread>
@@ -13,17 +15,24 @@
 
 namespace {
 
+bool loadCatalogFrom(const QString &directory)
+{
+    // Without a directory Qt would look in the working directory.
+    if (directory.isEmpty())
+        return false;
+    auto translator = std::make_unique<QTranslator>(QCoreApplication::instance());
+    if (!translator->load(QLocale::system(), QStringLiteral("libveluiextra"), QStringLiteral("_"), directory))
+        return false;
+    QCoreApplication::installTranslator(translator.release()); // the application's now
+    return true;
+}
+
 void loadCatalog()
 {
     const QString directory = QStringLiteral(VEL_TRANSLATIONS_DIR);
-    if (directory.isEmpty())
-        return;
-
-    auto translator = std::make_unique<QTranslator>(QCoreApplication::instance());
     // A missing catalog is no error: the texts stay English.
-    if (!translator->load(QLocale::system(), QStringLiteral("libveluiextra"), QStringLiteral("_"), directory))
-        return;
-    QCoreApplication::installTranslator(translator.release()); // the application's now
+    if (!directory.isEmpty() && !loadCatalogFrom(directory))
+        loadCatalogFrom(LibraryPlace::catalogs());
 }
 
 // A library opened by a worker thread leaves the translator to the application's thread.

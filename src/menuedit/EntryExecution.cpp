@@ -3,6 +3,7 @@
 
 #include "EntryExecution.h"
 
+#include <frame/LibraryPlace.h>
 #include <frame/MessageBox.h>
 
 #include <QCoreApplication>
@@ -36,7 +37,7 @@ QProcess *makeProcess(QWidget *owner)
 // Goes with the process when it could not be started.
 bool isStarted(QProcess *process, const QString &path)
 {
-    process->start(program(), argumentsFor(path));
+    process->start(LibraryPlace::program(program()), argumentsFor(path));
     if (process->waitForStarted(StartTime))
         return true;
     delete process;

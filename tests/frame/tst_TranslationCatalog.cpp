@@ -11,6 +11,7 @@ namespace {
 
 const char english[] = "New entry, 0 translators\n";
 const char german[] = "Neuer Eintrag, 1 translators\n";
+const char germanBeside[] = "Eintrag von nebenan, 1 translators\n";
 
 } // namespace
 
@@ -30,17 +31,22 @@ private Q_SLOTS:
     void waitsForTheApplicationWhenLoadedBeforeIt();
     void loadsAtOnceWhenOpenedOnTheApplicationThread();
     void waitsForTheEventLoopWhenOpenedOnAnotherThread();
+    void takesTheCatalogBesideTheLibraryElse();
+    void followsTheLinkThatTheLibraryIsLoadedBy();
+    void asksTheFixedDirectoryFirst();
     void doesNothingWithoutADirectory();
     void libraryLooksInItsFixedDirectory();
 
 private:
     QByteArray probe(const QString &program, const QStringList &arguments, const QString &language);
     void addCatalog(const QString &name);
+    void addCatalogBeside(const QString &name);
 };
 
 void tst_TranslationCatalog::init()
 {
     TestCase::init();
+    QDir(QStringLiteral(VEL_BESIDE_DIR)).removeRecursively();
     QDir(QStringLiteral(VEL_CATALOG_DIR)).removeRecursively();
     QVERIFY(QDir().mkpath(QStringLiteral(VEL_CATALOG_DIR)));
 }
@@ -48,6 +54,12 @@ void tst_TranslationCatalog::init()
 void tst_TranslationCatalog::addCatalog(const QString &name)
 {
     QVERIFY(QFile::copy(QStringLiteral(VEL_MESSAGES), QStringLiteral(VEL_CATALOG_DIR "/") + name));
+}
+
+void tst_TranslationCatalog::addCatalogBeside(const QString &name)
+{
+    QVERIFY(QDir().mkpath(QStringLiteral(VEL_BESIDE_DIR)));
+    QVERIFY(QFile::copy(QStringLiteral(VEL_MESSAGES_BESIDE), QStringLiteral(VEL_BESIDE_DIR "/") + name));
 }
 
 QByteArray tst_TranslationCatalog::probe(const QString &program, const QStringList &arguments,
@@ -148,9 +160,38 @@ void tst_TranslationCatalog::waitsForTheEventLoopWhenOpenedOnAnotherThread()
              QByteArray("started: ") + english + "running: " + german);
 }
 
+void tst_TranslationCatalog::takesTheCatalogBesideTheLibraryElse()
+{
+    addCatalog(QStringLiteral("libveluiextra_fr.qm"));
+    addCatalogBeside(QStringLiteral("libveluiextra_de.qm"));
+
+    QCOMPARE(probe(QStringLiteral(VEL_LINKED_PROBE), {}, QStringLiteral("de_DE.UTF-8")),
+             QByteArray("started: ") + germanBeside + "running: " + germanBeside);
+}
+
+void tst_TranslationCatalog::followsTheLinkThatTheLibraryIsLoadedBy()
+{
+    addCatalogBeside(QStringLiteral("libveluiextra_de.qm"));
+    const QString link = path(QStringLiteral("plugin.so"));
+    QVERIFY(QFile::link(QStringLiteral(VEL_WITH_DIRECTORY), link));
+
+    QCOMPARE(probe(QStringLiteral(VEL_PROBE), {QStringLiteral("after"), link}, QStringLiteral("de")),
+             QByteArray("started: ") + germanBeside + "running: " + germanBeside);
+}
+
+void tst_TranslationCatalog::asksTheFixedDirectoryFirst()
+{
+    addCatalog(QStringLiteral("libveluiextra_de.qm"));
+    addCatalogBeside(QStringLiteral("libveluiextra_de.qm"));
+
+    QCOMPARE(probe(QStringLiteral(VEL_LINKED_PROBE), {}, QStringLiteral("de")),
+             QByteArray("started: ") + german + "running: " + german);
+}
+
 void tst_TranslationCatalog::doesNothingWithoutADirectory()
 {
     addCatalog(QStringLiteral("libveluiextra_de.qm"));
+    addCatalogBeside(QStringLiteral("libveluiextra_de.qm"));
     QVERIFY(QDir::setCurrent(QStringLiteral(VEL_CATALOG_DIR)));
 
     QCOMPARE(probe(QStringLiteral(VEL_PROBE),

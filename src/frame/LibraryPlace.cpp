@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "LibraryPlace.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QStandardPaths>
+
+#include <dlfcn.h>
+
+namespace {
+
+const char ofThisLibrary = 0;
+
+// The path \a relative to the library's folder. Links are followed first: where /lib is a link, what
+// belongs to the library lies beside the folder that it leads to.
+QString beside(const char *relative)
+{
+    Dl_info info;
+    if (!dladdr(&ofThisLibrary, &info) || !info.dli_fname)
+        return {};
+    const QString library = QFileInfo(QFile::decodeName(info.dli_fname)).canonicalFilePath();
+    if (library.isEmpty())
+        return {};
+    return QDir::cleanPath(QFileInfo(library).path() + QLatin1Char('/') + QFile::decodeName(relative));
+}
+
+} // namespace
+
+QString LibraryPlace::catalogs()
+{
+    return beside(VEL_CATALOGS_FROM_LIBRARY);
+}
+
+QString LibraryPlace::program(const QString &name)
+{
+    if (!QStandardPaths::findExecutable(name).isEmpty())
+        return name;
+    const QString folder = beside(VEL_PROGRAMS_FROM_LIBRARY);
+    const QString installed = folder.isEmpty() ? QString() : QStandardPaths::findExecutable(name, {folder});
+    return installed.isEmpty() ? name : installed;
+}

@@ -1,0 +1,22 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QString>
+
+/**
+ * What is installed with the library, found from where the library itself lies: what was installed
+ * together may be moved together.
+ */
+namespace LibraryPlace {
+
+/// The folder of the translation catalogs that came with the library; it need not exist. Empty where
+/// the library cannot tell where it lies.
+QString catalogs();
+
+/// How the desktop's program \a name is started: by its name where PATH has it, else by its path
+/// where it was installed with the library, else by its name.
+QString program(const QString &name);
+
+} // namespace LibraryPlace
