@@ -35,7 +35,7 @@ std::string GetVelDir(VelDir kind)
         return userDesktopDirectory();
     case VelDir::Pictures: {
         const std::string data = absoluteVariable("VEL_DATA_DIR");
-        return below(data.empty() ? std::string(VEL_INSTALLED_DATA_DIR) : data, "pixmaps");
+        return below(data.empty() ? velInstalledDataDir() : data, "pixmaps");
     }
     }
     return {};

@@ -3,6 +3,8 @@
 
 #include <velintegration/help.h>
 
+#include <velcore/dirs.h>
+
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -20,7 +22,7 @@ bool leadsOutside(const QString &page)
 // The first of the help folders that has the page; empty when none has.
 QString pagePath(const QString &page)
 {
-    QStringList folders = {QStringLiteral(VEL_INSTALLED_DATA_DIR)};
+    QStringList folders = {QFile::decodeName(velInstalledDataDir().c_str())};
     const QString data = QFile::decodeName(qgetenv("VEL_DATA_DIR"));
     if (QDir::isAbsolutePath(data))
         folders.prepend(data);

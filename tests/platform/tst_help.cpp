@@ -3,11 +3,18 @@
 
 #include "TestCase.h"
 
+#include <velcore/dirs.h>
 #include <velintegration/help.h>
 
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
+
+// The installed folder of this test.
+std::string velInstalledDataDir()
+{
+    return VEL_INSTALLED_DATA_DIR;
+}
 
 /// A program of ours stands in for the one that opens pages, and notes what it is asked for.
 class HelpTest : public TestCase

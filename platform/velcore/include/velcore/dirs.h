@@ -33,3 +33,13 @@ enum class VelDir {
  * @return the path; empty for a kind that is not listed in VelDir
  */
 VELCORE_EXPORT std::string GetVelDir(VelDir kind);
+
+/**
+ * Returns the folder of what is installed for the desktop's programs: its pictures and help pages.
+ *
+ * It is found from where this library lies, so that a prefix may be moved; where nothing is
+ * installed there, it is the folder that the library was built for. The environment has no say.
+ *
+ * @return the absolute path, in UTF-8 and without a trailing "/"; it need not exist
+ */
+VELCORE_EXPORT std::string velInstalledDataDir();
