@@ -7,6 +7,7 @@
 
 #include <QCommandLineParser>
 #include <QCoreApplication>
+#include <QDir>
 #include <QLibraryInfo>
 #include <QLocale>
 #include <QTranslator>
@@ -30,6 +31,11 @@ bool loadCatalog(const QString &name, const QString &directory)
         return false;
     QCoreApplication::installTranslator(translator.release()); // the application's now
     return true;
+}
+
+QString besideProgram(const QString &relative)
+{
+    return QDir::cleanPath(QCoreApplication::applicationDirPath() + QLatin1Char('/') + relative);
 }
 
 // Without HOME Qt looks for the user's files in the root of the file system, and not where the
@@ -59,10 +65,13 @@ void Program::loadCatalogs()
     loadCatalog(QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
 
     const QString name = QStringLiteral("veluiextra-tools");
-    const QString besideProgram =
-        QCoreApplication::applicationDirPath() + QLatin1String("/../share/vel/translations");
-    if (!loadCatalog(name, besideProgram))
+    if (!loadCatalog(name, besideProgram(QStringLiteral(VEL_DATA_FROM_PROGRAM "/translations"))))
         loadCatalog(name, QStringLiteral(VEL_TRANSLATIONS_DIR));
+}
+
+QString Program::iconFolder()
+{
+    return besideProgram(QStringLiteral(VEL_ICONS_FROM_PROGRAM));
 }
 
 bool Program::mayWantNoWindow(int argc, char **argv)

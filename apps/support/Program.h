@@ -26,11 +26,14 @@ void describe(const QString &name);
  * Makes the programs' and Qt's own texts speak the user's language; goes after the application object,
  * which owns the translators.
  *
- * The programs' catalog is taken from the directory "../share/vel/translations" beside the program,
- * so that a program works from any prefix, else from the library's fixed directory. Without a
+ * The programs' catalog is taken from the prefix that the program itself lies in, wherever that was
+ * moved to, else from the library's fixed directory. Without a
  * catalog the texts stay English.
  */
 void loadCatalogs();
+
+/// The folder of the icon themes in the prefix that the program itself lies in; it need not exist.
+QString iconFolder();
 
 /// Whether help or the version may be asked for, which are to be had without a display.
 bool mayWantNoWindow(int argc, char **argv);

@@ -6,8 +6,17 @@
 #include "Program.h"
 
 #include <QApplication>
+#include <QIcon>
 
 namespace Program {
+
+/// Has icons found in the program's own prefix, too, which the desktop may not know of.
+inline void findOwnIcons()
+{
+    const QStringList folders = QIcon::themeSearchPaths();
+    if (!folders.contains(iconFolder()))
+        QIcon::setThemeSearchPaths(folders + QStringList{iconFolder()});
+}
 
 /**
  * The whole main() of the program \a name, which opens windows.
@@ -28,7 +37,10 @@ int runWithWindows(int &argc, char **argv, const QString &name, int wrongUsage, 
     }
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
     QGuiApplication::setDesktopFileName(name);
-    return runAs<QApplication>(argc, argv, wrongUsage, parse, run);
+    return runAs<QApplication>(argc, argv, wrongUsage, parse, [run](const auto &options) {
+        findOwnIcons();
+        return run(options);
+    });
 }
 
 } // namespace Program
