@@ -187,6 +187,7 @@ public Q_SLOTS:
 
 private:
     friend class ShortcutRows; // reads all rows at once
+    friend class RowsListening; // has it tell of rows that come and go
     friend class SpokenChanges; // has it tell screen readers of changes
     using Objects = QList<IShortcutObject *>;
     using Group = QMap<QString, Objects>;
@@ -206,4 +207,5 @@ private:
     QStringList m_groupNames;
     QVector<Group> m_groups;
     int m_spokenChanges = 0; // how many want that it tells of changes
+    int m_rowsListeners = 0; // how many want to hear of rows
 };

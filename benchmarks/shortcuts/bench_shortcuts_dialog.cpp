@@ -16,8 +16,14 @@
 
 #include <QAction>
 #include <QApplication>
+#include <QDialogButtonBox>
 #include <QDir>
+#include <QGridLayout>
+#include <QGroupBox>
 #include <QIcon>
+#include <QKeySequenceEdit>
+#include <QLabel>
+#include <QRadioButton>
 #include <QTemporaryDir>
 #include <QTreeView>
 
@@ -97,6 +103,45 @@ void showPeer(Application *application)
     showUntilPainted(&dialog);
 }
 
+// The least that such a dialog can be: the same widgets, and a tree that shows all shortcuts.
+void showBare(Application *application)
+{
+    QDialog dialog;
+    dialog.setWindowTitle(QStringLiteral("Configure shortcuts"));
+    dialog.resize(614, 504);
+    auto *layout = new QVBoxLayout(&dialog);
+    auto *tree = new QTreeView(&dialog);
+    tree->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    layout->addWidget(tree);
+    auto *box = new QGroupBox(QStringLiteral("Choose a key for selected action"), &dialog);
+    auto *grid = new QGridLayout(box);
+    grid->addWidget(new QRadioButton(QStringLiteral("Default key:"), box), 0, 0, 2, 1);
+    grid->addWidget(new QLabel(box), 0, 1, 2, 2);
+    grid->addWidget(new QRadioButton(QStringLiteral("Assign key:"), box), 2, 0);
+    auto *key = new QKeySequenceEdit(box);
+    key->setEnabled(false);
+    grid->addWidget(key, 2, 1, 1, 2);
+    box->setEnabled(false);
+    layout->addWidget(box);
+    layout->addWidget(new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel
+                                               | QDialogButtonBox::Reset | QDialogButtonBox::RestoreDefaults,
+                                           &dialog));
+    tree->setModel(&application->model);
+    for (int group = 0; group < application->model.rowCount(); ++group)
+        tree->expand(application->model.index(group, 0));
+    tree->setColumnWidth(0, 250);
+    showUntilPainted(&dialog);
+}
+
+bool compareBare(const char *title, Application *application, double limit)
+{
+    Comparison comparison(title);
+    comparison.add("EditShortcutsDialog", [application] { showOurs(application); });
+    comparison.add(
+        "the same form of plain Qt widgets and a bare tree", [application] { showBare(application); }, limit);
+    return comparison.run(61);
+}
+
 bool compare(const char *title, Application *application, double limit)
 {
     Comparison comparison(title);
@@ -131,6 +176,9 @@ int main(int argc, char **argv)
 
     bool kept = compare("shortcut dialog, 500 actions", &small, 0.20);
     kept = compare("shortcut dialog, 2,000 actions", &large, 0.12) && kept;
+
+    kept = compareBare("shortcut dialog beside its widgets, 500 actions", &small, 1.10) && kept;
+    kept = compareBare("shortcut dialog beside its widgets, 2,000 actions", &large, 1.20) && kept;
 
     kept = compareAssisted("shortcut dialog with assistance, 500 actions", &small) && kept;
     kept = compareAssisted("shortcut dialog with assistance, 2,000 actions", &large) && kept;

@@ -60,7 +60,7 @@ void EditShortcutsDialogPrivate::connectAssistance()
 void EditShortcutsDialogPrivate::fillTree()
 {
     form.treeView->setModel(m_model);
-    form.treeView->expandAll();
+    form.treeView->openAllGroups();
     form.treeView->resizeColumnToContents(0);
 }
 

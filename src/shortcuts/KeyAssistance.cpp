@@ -35,6 +35,7 @@ constexpr int FieldColumn = 2;
 KeyAssistance::KeyAssistance(const EditShortcutsForm &form, ShortcutsModel *shortcuts)
     : m_form(form)
     , m_model(shortcuts)
+    , m_rowsListening(shortcuts, this)
 {
     addNoneButton();
     addClashBox();
@@ -108,7 +109,6 @@ void KeyAssistance::connectForm()
     if (m_model) {
         connect(m_model, &QAbstractItemModel::dataChanged, this, later);
         connect(m_model, &QObject::destroyed, this, later);
-        m_model->installEventFilter(this);
     }
     connect(m_form.customKeyRB, &QRadioButton::clicked, this, &KeyAssistance::enterField);
     // The arrow keys move the focus to the button when they have pressed it.

@@ -5,6 +5,7 @@
 
 #include "ClashLine.h"
 #include "EditShortcutsForm.h"
+#include "RowsListening.h"
 
 #include <QKeySequence>
 #include <QObject>
@@ -64,6 +65,7 @@ private:
 
     const EditShortcutsForm m_form;
     const QPointer<ShortcutsModel> m_model;
+    const RowsListening m_rowsListening;
     QPointer<QPushButton> m_noneButton;
     QPointer<ClashBox> m_clashBox;
     QTimer m_timer; // many changes at once are shown once

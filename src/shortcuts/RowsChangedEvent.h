@@ -8,7 +8,7 @@
 /**
  * Sent by a ShortcutsModel to itself after a shortcut was registered or removed.
  *
- * The model emits no signal then; a view of ours learns of it with an event filter.
+ * The model emits no signal then; a view of ours learns of it with RowsListening.
  */
 class RowsChangedEvent : public QEvent
 {

@@ -129,6 +129,8 @@ void ShortcutsModel::shiftPersistentIndexes(int group, int firstRow)
 
 void ShortcutsModel::announceRows()
 {
+    if (m_rowsListeners == 0)
+        return;
     RowsChangedEvent event;
     QCoreApplication::sendEvent(this, &event);
 }

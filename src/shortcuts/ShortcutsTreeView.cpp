@@ -46,7 +46,7 @@ ShortcutsTreeView::~ShortcutsTreeView() = default;
 void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
 {
     if (model()) {
-        model()->removeEventFilter(this);
+        m_rowsListening.reset();
         disconnect(model(), &QObject::destroyed, this, nullptr);
     }
     m_hidden.forget();
@@ -54,12 +54,22 @@ void ShortcutsTreeView::setModel(QAbstractItemModel *newModel)
     m_closedGroups.clear();
     QTreeView::setModel(newModel);
     if (ShortcutsModel *shortcuts = shortcutsModel()) {
-        shortcuts->installEventFilter(this);
+        m_rowsListening = std::make_unique<RowsListening>(shortcuts, this);
         connect(shortcuts, &QObject::destroyed, this, [this] { setModel(nullptr); });
         m_hidden.start(*shortcuts);
         hideRows(*shortcuts, {});
         m_groups = shortcuts->rowCount();
     }
+}
+
+void ShortcutsTreeView::openAllGroups()
+{
+    if (!shortcutsModel()) {
+        expandAll();
+        return;
+    }
+    for (int group = 0; group < model()->rowCount(); ++group)
+        expand(model()->index(group, 0));
 }
 
 bool ShortcutsTreeView::isShortcutCurrent() const
@@ -109,6 +119,15 @@ void ShortcutsTreeView::dataChanged(const QModelIndex &topLeft, const QModelInde
         return;
     const ShortcutsModel *shortcuts = shortcutsModel();
     Q_EMIT currentShortcutChanged(shortcuts->defaultKeySequence(current), shortcuts->keySequence(current));
+}
+
+void ShortcutsTreeView::drawRow(QPainter *painter, const QStyleOptionViewItem &option,
+                                const QModelIndex &index) const
+{
+    QStyleOptionViewItem open = option;
+    if (shortcutsModel() && index.parent().isValid())
+        open.state |= QStyle::State_Open;
+    QTreeView::drawRow(painter, open, index);
 }
 
 int ShortcutsTreeView::sizeHintForColumn(int column) const

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "HiddenRows.h"
+#include "RowsListening.h"
 #include "ShortcutFilter.h"
 #include "ShortcutIndex.h"
 
@@ -14,6 +15,7 @@
 #include <QVector>
 
 #include <functional>
+#include <memory>
 
 class ShortcutsModel;
 
@@ -41,6 +43,9 @@ public:
     bool isShortcutCurrent() const;
     /// The pending key of the current item; empty when that is no shortcut.
     QKeySequence currentKeySequence() const;
+
+    /// Opens all groups. Unlike expandAll() it does not have the view remember every single shortcut.
+    void openAllGroups();
 
     /// Makes a shortcut current and seen, whatever the filter hides.
     void goTo(const QModelIndex &row);
@@ -72,6 +77,9 @@ protected:
                      const QVector<int> &roles = QVector<int>()) override;
     /// The width of all items, hidden ones and those of closed groups left out.
     int sizeHintForColumn(int column) const override;
+    /// Shortcuts are drawn as the open rows that expandAll() makes of them: icons in their state On.
+    void drawRow(QPainter *painter, const QStyleOptionViewItem &option,
+                 const QModelIndex &index) const override;
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
@@ -86,6 +94,7 @@ private:
     QVector<QModelIndex> widestItems(const ShortcutsModel &shortcuts, int column) const;
     int indentationOf(const QModelIndex &index) const;
 
+    std::unique_ptr<RowsListening> m_rowsListening;
     HiddenRows m_hidden{this};
     ShortcutFilter m_filter;
     Count m_tellCount;

@@ -5,6 +5,7 @@
 #include "ShortcutsModel.h"
 #include "TestCase.h"
 
+#include <shortcuts/RowsChangedEvent.h>
 #include <shortcuts/ShortcutsTreeView.h>
 
 #include <QAction>
@@ -46,6 +47,8 @@ private Q_SLOTS:
     void isAPlainTreeWithAnotherModel();
     void isAsWideAsItsWidestText_data();
     void isAsWideAsItsWidestText();
+    void drawsOpenGroupsAsIfAllWereExpanded();
+    void isToldOfRowsWhileItListensOnly();
 
     void hidesRowsThatAreEmptyWhenItOpens();
     void hidesRowsThatBecomeEmpty();
@@ -288,6 +291,78 @@ void tst_ShortcutsTreeView::isAsWideAsItsWidestText()
     view.resizeColumnToContents(0);
     plain.resizeColumnToContents(0);
     QCOMPARE(view.columnWidth(0), plain.columnWidth(0));
+}
+
+void tst_ShortcutsTreeView::drawsOpenGroupsAsIfAllWereExpanded()
+{
+    QPixmap red(16, 16);
+    red.fill(Qt::red);
+    QPixmap blue(16, 16);
+    blue.fill(Qt::blue);
+    QIcon icon(red);
+    icon.addPixmap(blue, QIcon::Normal, QIcon::On);
+    m_open->setIcon(icon);
+
+    QVector<QImage> pictures;
+    ShortcutsTreeView opened;
+    opened.setModel(m_model.get());
+    opened.openAllGroups();
+    QTreeView plain;
+    plain.setModel(m_model.get());
+    plain.expandAll();
+    for (QTreeView *tree : {&plain, static_cast<QTreeView *>(&opened)}) {
+        tree->resize(300, 200);
+        tree->setColumnWidth(0, 200);
+        pictures.append(tree->grab().toImage());
+    }
+    QCOMPARE(pictures.at(1), pictures.at(0));
+    // And the view remembers the groups alone.
+    QVERIFY(opened.isExpanded(m_model->index(0, 0)) && opened.isExpanded(m_model->index(1, 0)));
+    QVERIFY(plain.isExpanded(row(0, 0)));
+    QVERIFY(!opened.isExpanded(row(0, 0)));
+}
+
+namespace {
+
+class RowsCounter : public QObject
+{
+public:
+    int count = 0;
+
+    bool eventFilter(QObject *watched, QEvent *event) override
+    {
+        count += event->type() == RowsChangedEvent::eventType() ? 1 : 0;
+        return QObject::eventFilter(watched, event);
+    }
+};
+
+} // namespace
+
+void tst_ShortcutsTreeView::isToldOfRowsWhileItListensOnly()
+{
+    RowsCounter counter;
+    ShortcutsModel model(nullptr, QString());
+    model.installEventFilter(&counter);
+    const auto registerOne = [&](const char *name) {
+        model.registerAction(str(name), new QAction(str(name), m_owner.get()), str("Edit"));
+    };
+    registerOne("a");
+    QCOMPARE(counter.count, 0);
+    {
+        ShortcutsTreeView view;
+        view.setModel(&model);
+        registerOne("b");
+        QCOMPARE(counter.count, 1);
+        view.setModel(nullptr);
+        registerOne("c");
+        QCOMPARE(counter.count, 1);
+        view.setModel(&model);
+        registerOne("d");
+        QCOMPARE(counter.count, 2);
+    }
+    registerOne("e");
+    QCOMPARE(counter.count, 2);
+    model.removeEventFilter(&counter);
 }
 
 void tst_ShortcutsTreeView::hidesRowsThatAreEmptyWhenItOpens()
