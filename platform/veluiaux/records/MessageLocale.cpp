@@ -5,34 +5,82 @@
 
 #include <unistd.h>
 
+#include <algorithm>
 #include <cstring>
 #include <iterator>
+#include <vector>
 
 namespace {
 
 // By rank; the first that is set and not empty counts.
 constexpr std::string_view Variables[] = {"LC_ALL=", "LC_MESSAGES=", "LANG="};
 
-} // namespace
-
-MessageLocale MessageLocale::current()
+// The environment as it was when the locale was worked out from it.
+class KnownEnvironment
 {
-    // One walk over the environment instead of three: this runs for every local value.
-    std::string_view values[std::size(Variables)];
-    for (char **entry = ::environ; entry && *entry; ++entry) {
-        if ((*entry)[0] != 'L' || ((*entry)[1] != 'C' && (*entry)[1] != 'A'))
-            continue;
+public:
+    /// Whether it is still that one: the same strings in the same places, and in those that count
+    /// the same text. A look at the strings themselves would be ten times as much memory to read.
+    bool isSame() const;
+    /// The text of the locale in the environment of now, which is the known one from now on.
+    std::string_view read();
+
+private:
+    struct Entry
+    {
+        const char *place = nullptr;
+        std::string text;
+    };
+
+    std::vector<const char *> m_places; // with the null at the end; empty if nothing is known
+    Entry m_entries[std::size(Variables)];
+};
+
+bool KnownEnvironment::isSame() const
+{
+    if (m_places.empty() || !::environ)
+        return false;
+    // Never beyond the end of a shorter one.
+    for (std::size_t i = 0; ::environ[i] == m_places[i]; ++i) {
+        if (!m_places[i])
+            return std::all_of(std::begin(m_entries), std::end(m_entries),
+                               [](const Entry &entry) { return !entry.place || entry.text == entry.place; });
+    }
+    return false;
+}
+
+std::string_view KnownEnvironment::read()
+{
+    m_places.clear();
+    for (Entry &entry : m_entries)
+        entry.place = nullptr;
+    for (char **place = ::environ; place && *place; ++place) {
+        m_places.push_back(*place);
         for (std::size_t i = 0; i < std::size(Variables); ++i) {
-            const std::string_view name = Variables[i];
-            if (values[i].empty() && std::strncmp(*entry, name.data(), name.size()) == 0)
-                values[i] = *entry + name.size();
+            Entry &entry = m_entries[i];
+            const bool isEmpty = !entry.place || entry.text.size() == Variables[i].size();
+            if (isEmpty && std::strncmp(*place, Variables[i].data(), Variables[i].size()) == 0)
+                entry = {*place, *place};
         }
     }
-    for (const std::string_view value : values) {
-        if (!value.empty())
-            return MessageLocale(value);
+    m_places.push_back(nullptr);
+    for (std::size_t i = 0; i < std::size(Variables); ++i) {
+        if (m_entries[i].place && m_entries[i].text.size() > Variables[i].size())
+            return m_entries[i].place + Variables[i].size();
     }
-    return MessageLocale({});
+    return {};
+}
+
+} // namespace
+
+// This runs for every local value. Each thread knows the environment by itself, so none waits.
+MessageLocale MessageLocale::current()
+{
+    thread_local KnownEnvironment environment;
+    thread_local MessageLocale locale({});
+    if (!environment.isSame())
+        locale = MessageLocale(environment.read());
+    return locale;
 }
 
 MessageLocale::MessageLocale(std::string_view text)

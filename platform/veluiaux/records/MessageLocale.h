@@ -20,7 +20,8 @@ public:
     /// The ranks of a match run from 1, the language alone, to this, all three parts.
     static constexpr int BestRank = 4;
 
-    /// The locale of the running process.
+    /// The locale of the running process. Worked out once for each thread, and anew when variables
+    /// were set or removed, or the text of one of these three was changed where it stands.
     static MessageLocale current();
     /// The locale written as "lang_COUNTRY.ENCODING@MODIFIER", all but the first optional.
     explicit MessageLocale(std::string_view text);
