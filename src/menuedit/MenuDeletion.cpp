@@ -146,7 +146,7 @@ void MenuDeletion::putAway(const QStringList &paths, Outcome *outcome)
         return;
     outcome->isChanged = !gone.isEmpty();
     forget(gone);
-    m_history.add(recorder, deleted.text(), gone);
+    outcome->isStep = m_history.add(recorder, deleted.text(), gone);
 }
 
 // What may not be taken from its folder is not asked about, nor what has gone by itself.
@@ -225,7 +225,7 @@ void MenuDeletion::tellWhatStays(const QStringList &paths, const Outcome &outcom
     if (!texts.isEmpty())
         m_voice.tell(texts.join(QLatin1Char('\n')),
                      outcome.complaints.isEmpty() ? MenuVoice::Warning : MenuVoice::Failure,
-                     m_view->currentIndex());
+                     m_view->currentIndex(), outcome.isStep);
 }
 
 QString MenuDeletion::canceledText(const QStringList &paths) const

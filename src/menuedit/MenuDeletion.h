@@ -43,6 +43,7 @@ private:
         QStringList complaints; ///< what cannot be deleted, and why
         bool isCanceled = false;
         bool isChanged = false;
+        bool isStep = false; ///< whether any of it can be taken back
     };
 
     void putAway(const QStringList &paths, Outcome *outcome);

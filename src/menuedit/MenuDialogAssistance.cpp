@@ -43,7 +43,12 @@ MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout,
     if (!dialog->focusWidget())
         view->setFocus();
     m_message->setUndoAction(view->undoAction());
-    connect(view, &VelMenuView::told, m_message.get(), &MessageLine::tell);
+    connect(view, &VelMenuView::told, m_message.get(), [this](const QString &text, int kind) {
+        if (VelMenuViewPrivate::voiceOf(*m_view).isRest())
+            m_message->tellRest(text, kind);
+        else
+            m_message->tell(text, kind);
+    });
     connect(m_filterBar.get(), &MenuFilterBar::textChanged, m_message.get(), &MessageLine::clear);
     takeKeys();
     dialog->installEventFilter(this);

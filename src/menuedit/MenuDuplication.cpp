@@ -132,12 +132,13 @@ void MenuDuplication::duplicate()
     QStringList targets;
     for (const FileTransfer::Item &item : items)
         targets.append(item.target);
-    m_history.add(recorder,
-                  items.size() == 1 ? StepText(StepText::Kind::Duplicate, name)
-                                    : StepText(StepText::Kind::DuplicateItems, QString(), items.size()),
-                  targets);
+    const bool isStep =
+        m_history.add(recorder,
+                      items.size() == 1 ? StepText(StepText::Kind::Duplicate, name)
+                                        : StepText(StepText::Kind::DuplicateItems, QString(), items.size()),
+                      targets);
     if (self && !complaints.isEmpty())
-        m_voice.tell(complaints.join(QLatin1Char('\n')), MenuVoice::Failure);
+        m_voice.tell(complaints.join(QLatin1Char('\n')), MenuVoice::Failure, QModelIndex(), isStep);
     if (self)
         Q_EMIT changed();
 }

@@ -41,6 +41,20 @@ QString takeBack(const QString &path, FreeName::Kind kind)
     return isGone ? QString() : record.errorString();
 }
 
+QString textOfWhatStays(const QString &path, const QString &left, const QString &reason)
+{
+    return left == path ? QCoreApplication::translate(
+                              "VelMenuView",
+                              "%1 could not be deleted: %2. Make sure that the folder that holds it may "
+                              "be written, then try again.")
+                              .arg(path, reason)
+                        : QCoreApplication::translate(
+                              "VelMenuView",
+                              "%1 was deleted in part only, because %2 could not be deleted: %3. Make sure "
+                              "that its folder may be written, then delete the rest.")
+                              .arg(path, left, reason);
+}
+
 // Removes the item, with a window that tells when it takes long.
 TreeRemoval::Result removeTree(QWidget *view, const QString &path)
 {
@@ -81,16 +95,21 @@ bool MenuEditing::createNew(FreeName::Kind kind)
     if (recorder)
         recorder->mayMake(path);
     const bool isWritten = writeNew(path, kind, name.number);
-    const bool kept = isWritten && offerNew(path, kind);
+    QString complaint;
+    const bool kept = isWritten && offerNew(path, kind, &complaint);
+    if (!isWritten)
+        complaint =
+            QCoreApplication::translate("VelMenuView",
+                                        "%1 could not be saved. Make sure that the folder %2 may be written "
+                                        "and that the disk is not full, then try again.")
+                .arg(path, folder);
+    bool isStep = false;
     if (self)
-        m_history.add(recorder, StepText(StepText::Kind::Create, m_history.nameOf(path)), {path});
+        isStep = m_history.add(recorder, StepText(StepText::Kind::Create, m_history.nameOf(path)), {path});
     if (self)
         Q_EMIT changed();
-    if (self && !isWritten)
-        tell(QCoreApplication::translate("VelMenuView",
-                                         "%1 could not be saved. Make sure that the folder %2 may be written "
-                                         "and that the disk is not full, then try again.")
-                 .arg(path, folder));
+    if (self && !complaint.isEmpty())
+        m_voice.tell(complaint, MenuVoice::Failure, m_selection.shown(path), isStep);
     return kept;
 }
 
@@ -131,8 +150,9 @@ bool MenuEditing::writeNew(const QString &path, FreeName::Kind kind, const QStri
     return true;
 }
 
-// Opens the editor on a new item and takes the item away again unless it is accepted.
-bool MenuEditing::offerNew(const QString &path, FreeName::Kind kind)
+// Opens the editor on a new item and takes the item away again unless it is accepted; what the user is to
+// hear when it stays.
+bool MenuEditing::offerNew(const QString &path, FreeName::Kind kind, QString *complaint)
 {
     m_find.clear();
     m_selection.show(path);
@@ -145,7 +165,7 @@ bool MenuEditing::offerNew(const QString &path, FreeName::Kind kind)
     m_menu.files().forgetItemInfo(path);
     m_selection.leave(path);
     if (!whyNotGone.isEmpty())
-        tellWhatStays(path, path, whyNotGone);
+        *complaint = textOfWhatStays(path, path, whyNotGone);
     return false;
 }
 
@@ -218,24 +238,9 @@ void MenuEditing::remove(const QString &path)
                 .arg(path),
             MenuVoice::Warning, m_selection.shown(path));
     else if (self && !result.succeeded())
-        tellWhatStays(path, QFile::decodeName(result.path.c_str()),
-                      QString::fromLocal8Bit(result.error.message().c_str()));
-}
-
-void MenuEditing::tellWhatStays(const QString &path, const QString &left, const QString &reason)
-{
-    const QString text = left == path
-        ? QCoreApplication::translate(
-              "VelMenuView",
-              "%1 could not be deleted: %2. Make sure that the folder that holds it may "
-              "be written, then try again.")
-              .arg(path, reason)
-        : QCoreApplication::translate(
-              "VelMenuView",
-              "%1 was deleted in part only, because %2 could not be deleted: %3. Make sure "
-              "that its folder may be written, then delete the rest.")
-              .arg(path, left, reason);
-    tell(text, m_selection.shown(path));
+        tell(textOfWhatStays(path, QFile::decodeName(result.path.c_str()),
+                             QString::fromLocal8Bit(result.error.message().c_str())),
+             m_selection.shown(path));
 }
 
 void MenuEditing::tell(const QString &text, const QModelIndex &at)

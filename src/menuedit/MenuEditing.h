@@ -49,8 +49,7 @@ private:
     QString selectedFolder() const;
     bool writeNew(const QString &path, FreeName::Kind kind, const QString &number);
     bool openEditor(const QString &path);
-    bool offerNew(const QString &path, FreeName::Kind kind);
-    void tellWhatStays(const QString &path, const QString &left, const QString &reason);
+    bool offerNew(const QString &path, FreeName::Kind kind, QString *complaint);
     void tell(const QString &text, const QModelIndex &at = QModelIndex());
 
     QTreeView *const m_view;

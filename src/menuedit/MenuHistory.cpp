@@ -109,14 +109,15 @@ std::unique_ptr<StepRecorder> MenuHistory::record() const
     return isOn() ? std::make_unique<StepRecorder>() : nullptr;
 }
 
-void MenuHistory::add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text,
+bool MenuHistory::add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text,
                       const QStringList &items)
 {
     FileStep step = recorder && isOn() ? recorder->finish() : FileStep();
     if (step.isEmpty())
-        return;
+        return false;
     m_stack.push(new StepCommand(std::move(step), text, items));
     m_voice.tell(text.done(), MenuVoice::Note);
+    return true;
 }
 
 QString MenuHistory::nameOf(const QString &path) const

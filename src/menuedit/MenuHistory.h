@@ -55,8 +55,9 @@ public:
      *
      * @param items the paths of what it was done to, where it was or is: what there is of them is
      *        selected when it was undone or done again
+     * @return whether there is such a step
      */
-    void add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text, const QStringList &items);
+    bool add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text, const QStringList &items);
     /// The shown name of the item at \a path.
     QString nameOf(const QString &path) const;
 

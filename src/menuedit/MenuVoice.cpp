@@ -4,6 +4,7 @@
 #include "MenuVoice.h"
 
 #include <QAbstractItemView>
+#include <QPointer>
 
 #include <utility>
 
@@ -15,10 +16,14 @@ MenuVoice::MenuVoice(QAbstractItemView *view, std::function<bool()> isHeard)
 
 MenuVoice::~MenuVoice() = default;
 
-void MenuVoice::tell(const QString &text, Kind kind, const QModelIndex &at)
+void MenuVoice::tell(const QString &text, Kind kind, const QModelIndex &at, bool isRest)
 {
+    const QPointer<MenuVoice> self(this);
+    m_isRest = isRest;
     if (m_isHeard())
         Q_EMIT told(text, kind);
     else if (kind != Note)
         m_tip.show(text, at);
+    if (self)
+        m_isRest = false;
 }

@@ -40,8 +40,13 @@ public:
      * Whoever listens may delete the view.
      *
      * @param at the item of the view that it is about; invalid for none
+     * @param isRest whether it is what was not done of something whose other part was done, was told of
+     *        in a note, and can be taken back
      */
-    void tell(const QString &text, Kind kind, const QModelIndex &at = QModelIndex());
+    void tell(const QString &text, Kind kind, const QModelIndex &at = QModelIndex(), bool isRest = false);
+
+    /// Whether what is being told is the rest of something; who shows one text at a time keeps the note.
+    bool isRest() const { return m_isRest; }
 
 Q_SIGNALS:
     void told(const QString &text, int kind);
@@ -49,4 +54,5 @@ Q_SIGNALS:
 private:
     const std::function<bool()> m_isHeard;
     ReadableTip m_tip;
+    bool m_isRest = false;
 };

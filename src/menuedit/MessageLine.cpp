@@ -58,6 +58,19 @@ void MessageLine::tell(const QString &text, int kind)
     m_isAtRest = false;
     m_isUndoable = m_hasChanged && kind < Warning;
     m_hasChanged = false;
+    say(text, kind);
+}
+
+void MessageLine::tellRest(const QString &text, int kind)
+{
+    if (m_isUndoable)
+        say(m_label->text() + QLatin1Char('\n') + text, kind);
+    else
+        tell(text, kind);
+}
+
+void MessageLine::say(const QString &text, int kind)
+{
     show(text, kind);
     QAccessibleEvent event(m_label, QAccessible::Alert);
     QAccessible::updateAccessibility(&event);

@@ -25,6 +25,8 @@ public:
 
     /// Tells \a text in plain text; \a kind as VelMenuView::told() has it.
     void tell(const QString &text, int kind);
+    /// Tells \a text below the note that it shows, which can be taken back as before.
+    void tellRest(const QString &text, int kind);
     /// Has the Tab key come by behind \a previous.
     void setTabOrderAfter(QWidget *previous);
 
@@ -38,6 +40,7 @@ public:
     void setUndoAction(QAction *action);
 
 private:
+    void say(const QString &text, int kind);
     void show(const QString &text, int kind);
     void updateButton();
 

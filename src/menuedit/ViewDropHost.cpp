@@ -18,6 +18,7 @@
 #include <QFileInfo>
 #include <QFileSystemModel>
 #include <QMessageBox>
+#include <QPointer>
 #include <QSortFilterProxyModel>
 
 #include <algorithm>
@@ -106,10 +107,11 @@ public:
                            [](const DropItem &item) { return item.isReplacing; });
         if (isAnyBack)
             m_recorder.reset();
-        if (m_recorder)
-            remember(result);
-        if (!result.complaint.isEmpty())
-            tellAt(result.targets.value(0), result.complaint);
+        // Whoever hears of it may take the view away, and this with it.
+        const QPointer<MenuHistory> history(&VelMenuViewPrivate::historyOf(*m_view));
+        const bool isStep = m_recorder && remember(result);
+        if (history && !result.complaint.isEmpty())
+            tellAt(result.targets.value(0), result.complaint, isStep);
     }
 
 private:
@@ -139,7 +141,7 @@ private:
     }
 
     // Also what was done before something failed.
-    void remember(const DropResult &result)
+    bool remember(const DropResult &result)
     {
         MenuHistory &history = VelMenuViewPrivate::historyOf(*m_view);
         QStringList paths = result.targets;
@@ -147,8 +149,8 @@ private:
             if (item.isFile())
                 paths.append(item.source);
         }
-        history.add(m_recorder, textOf(history), paths);
-        m_recorder.reset();
+        const std::unique_ptr<StepRecorder> recorder = std::move(m_recorder);
+        return history.add(recorder, textOf(history), paths);
     }
 
     StepText textOf(const MenuHistory &history) const
@@ -177,12 +179,12 @@ private:
     }
 
     // Tells without a window: the user goes on undisturbed, the item tells why nothing happened.
-    void tellAt(const QString &path, const QString &text) const
+    void tellAt(const QString &path, const QString &text, bool isRest) const
     {
         QModelIndex shown;
         if (files() && !path.isEmpty() && QFileInfo::exists(path))
             shown = proxy()->mapFromSource(files()->index(path));
-        VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown);
+        VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown, isRest);
     }
 
     VelMenuView *const m_view;

@@ -3,6 +3,7 @@
 
 #include "HandsOnTestCase.h"
 #include "ModalDriver.h"
+#include "OrdinaryUser.h"
 #include "VelMenuDialog.h"
 #include "VelMenuView.h"
 #include "XDoTool.h"
@@ -14,13 +15,17 @@
 #include <QDialogButtonBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QMenu>
 #include <QPushButton>
+#include <QScopeGuard>
 #include <QSignalSpy>
 #include <QVBoxLayout>
 
 #include <private/qguiapplication_p.h>
 #include <qpa/qplatformaccessibility.h>
 #include <qpa/qplatformintegration.h>
+
+#include <algorithm>
 
 namespace {
 
@@ -53,6 +58,8 @@ private Q_SLOTS:
     void tellsWhyTheMenuCannotBeChanged();
     void helpsWhoPicksToo();
     void takesBackWhatItTells();
+    void takesBackTheDonePartOfWhatFailed_data();
+    void takesBackTheDonePartOfWhatFailed();
     void leavesNothingBehind();
 
 private:
@@ -323,6 +330,64 @@ void tst_MenuDialogAssistance::takesBackWhatItTells()
     filterEdit()->setText(QStringLiteral("nowhere"));
     QTRY_VERIFY(message()->text().startsWith(QLatin1String("Nothing in this menu")));
     QVERIFY(!button->isVisible());
+}
+
+void tst_MenuDialogAssistance::takesBackTheDonePartOfWhatFailed_data()
+{
+    QTest::addColumn<QString>("action");
+    QTest::addColumn<QString>("note");
+    QTest::addColumn<QString>("failure");
+    QTest::newRow("delete") << "deleteAction"
+                            << "A was deleted."
+                            << "%1 cannot be deleted: Permission denied";
+    QTest::newRow("hide") << "hideAction"
+                          << "A is hidden: the menu no longer shows it."
+                          << "'X' was not changed: the file %1 cannot be written.";
+}
+
+void tst_MenuDialogAssistance::takesBackTheDonePartOfWhatFailed()
+{
+    QFETCH(QString, action);
+    QFETCH(QString, note);
+    QFETCH(QString, failure);
+    const QString a = writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    const QString x = writeEntry(QStringLiteral("fixed/x.desktop"), QStringLiteral("X"));
+    writeFolder(QString(), QStringLiteral("Menu"), "fixed;a.desktop;");
+    const QByteArray bytes = read(a);
+    openAssisted(2);
+    QVERIFY(open(view(), QFileInfo(x).path(), 1));
+    const QByteArray dataHome = qgetenv("XDG_DATA_HOME");
+    qputenv("XDG_DATA_HOME", QFile::encodeName(folder()));
+    const auto restored = qScopeGuard([&] { qputenv("XDG_DATA_HOME", dataHome); });
+    const OrdinaryUser user(folder());
+    QVERIFY(QFile::setPermissions(x, QFile::ReadOwner));
+    QVERIFY(QFile::setPermissions(QFileInfo(x).path(), QFile::ReadOwner | QFile::ExeOwner));
+    clickItem(a);
+    XDoTool::press(QStringLiteral("shift+Up"));
+    QTRY_COMPARE(view().selectionModel()->selectedIndexes().size(), 2);
+
+    const QList<QAction *> actions = view().findChild<QMenu *>()->actions();
+    const auto wanted = std::find_if(actions.begin(), actions.end(), [&](const QAction *candidate) {
+        return candidate->objectName() == action;
+    });
+    QVERIFY(wanted != actions.end());
+    (*wanted)->trigger();
+
+    QTRY_COMPARE(message()->text(), note + QLatin1Char('\n') + failure.arg(x));
+    QVERIFY(dialog()->findChild<QLabel *>(QStringLiteral("messageIcon"))->isVisible());
+    auto *button = dialog()->findChild<QPushButton *>(QStringLiteral("messageUndoButton"));
+    QVERIFY(button->isVisible() && button->isEnabled());
+    const auto isBack = [&] { return QFile::exists(a) && read(a) == bytes; };
+    QVERIFY(!isBack());
+    XDoTool::click(button);
+    QTRY_VERIFY(isBack());
+    QVERIFY2(message()->text().startsWith(QLatin1String("Done: Undo ")), qPrintable(message()->text()));
+    // A failure of its own has nothing to take back.
+    Q_EMIT view().told(QStringLiteral("Failed."), 2);
+    QCOMPARE(message()->text(), QStringLiteral("Failed."));
+    QVERIFY(!button->isVisible());
+    QVERIFY(
+        QFile::setPermissions(QFileInfo(x).path(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
 }
 
 void tst_MenuDialogAssistance::leavesNothingBehind()
