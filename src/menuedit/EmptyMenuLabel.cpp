@@ -4,6 +4,7 @@
 #include "EmptyMenuLabel.h"
 
 #include "ShownMenu.h"
+#include "StartMenu.h"
 #include "VelMenuProxyModel.h"
 
 #include <QCoreApplication>
@@ -16,6 +17,30 @@ namespace {
 // Milliseconds: the rows of a folder come a moment after it.
 constexpr int UntilEmpty = 300;
 
+// Why it is empty, as far as one can tell, and how to begin.
+QString textOf(const QString &directory)
+{
+    const QString newKey = QKeySequence(QKeySequence::New).toString(QKeySequence::NativeText);
+    if (directory != StartMenu::directory())
+        return QCoreApplication::translate(
+                   "VelMenuView",
+                   "This menu is empty. Press %1 for a new entry, or right-click here "
+                   "for what else can be added.")
+            .arg(newKey);
+    // As the button reads.
+    const QString build = QCoreApplication::translate("VelMenuView", "Default menu...");
+    return (StartMenu::isAnyApplicationInstalled()
+                ? QCoreApplication::translate(
+                    "VelMenuView",
+                    "This menu is empty. Press '%2' to fill it with the applications "
+                    "that are installed, or %1 for a new entry.")
+                : QCoreApplication::translate(
+                    "VelMenuView",
+                    "This menu is empty, because no application was found that is installed. Once there "
+                    "is one, press '%2'. Until then, press %1 for an entry of your own."))
+        .arg(newKey, build);
+}
+
 } // namespace
 
 EmptyMenuLabel::EmptyMenuLabel(QTreeView *view, const ShownMenu &menu)
@@ -25,11 +50,6 @@ EmptyMenuLabel::EmptyMenuLabel(QTreeView *view, const ShownMenu &menu)
 {
     setObjectName(QStringLiteral("emptyMenuLabel"));
     setTextFormat(Qt::PlainText);
-    setText(
-        QCoreApplication::translate(
-            "VelMenuView",
-            "This menu is empty. Press %1 for a new entry, or right-click here for what else can be added.")
-            .arg(QKeySequence(QKeySequence::New).toString(QKeySequence::NativeText)));
     setAlignment(Qt::AlignCenter);
     setWordWrap(true);
     setMargin(fontMetrics().height());
@@ -38,7 +58,7 @@ EmptyMenuLabel::EmptyMenuLabel(QTreeView *view, const ShownMenu &menu)
     view->viewport()->installEventFilter(this);
     m_patience.setSingleShot(true);
     m_patience.setInterval(UntilEmpty);
-    connect(&m_patience, &QTimer::timeout, this, [this] { setVisible(isEmpty()); });
+    connect(&m_patience, &QTimer::timeout, this, &EmptyMenuLabel::appear);
     const QAbstractItemModel *rows = &menu.proxy();
     connect(rows, &QAbstractItemModel::rowsInserted, this, &EmptyMenuLabel::look);
     connect(rows, &QAbstractItemModel::rowsRemoved, this, &EmptyMenuLabel::look);
@@ -61,6 +81,14 @@ bool EmptyMenuLabel::isEmpty() const
 {
     const QModelIndex root = m_view->rootIndex();
     return root.isValid() && !m_menu.proxy().isFiltered() && m_menu.proxy().rowCount(root) == 0;
+}
+
+void EmptyMenuLabel::appear()
+{
+    if (!isEmpty())
+        return;
+    setText(textOf(m_menu.directory()));
+    show();
 }
 
 void EmptyMenuLabel::look()

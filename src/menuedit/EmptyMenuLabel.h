@@ -10,7 +10,7 @@ class QTreeView;
 class ShownMenu;
 
 /**
- * Says in the middle of the tree how to begin, while a menu has nothing in it.
+ * Says in the middle of the tree why a menu has nothing in it, and how to begin.
  */
 class EmptyMenuLabel : public QLabel
 {
@@ -26,6 +26,7 @@ protected:
 
 private:
     bool isEmpty() const;
+    void appear();
     void look();
 
     QTreeView *const m_view;

@@ -6,13 +6,17 @@
 #include "MenuVoice.h"
 #include "WaitCursor.h"
 
+#include <frame/DesktopEntryRecord.h>
+#include <frame/EntryPath.h>
 #include <frame/MessageBox.h>
 
 #include <velcore/dirs.h>
 #include <velintegration/startmenu.h>
 
+#include <QDirIterator>
 #include <QFile>
 #include <QPointer>
+#include <QStandardPaths>
 
 #include <cerrno>
 
@@ -42,6 +46,23 @@ QString failureText(int error)
 QString StartMenu::directory()
 {
     return QString::fromStdString(GetVelDir(VelDir::StartMenu));
+}
+
+bool StartMenu::isAnyApplicationInstalled()
+{
+    const QStringList folders = QStandardPaths::standardLocations(QStandardPaths::ApplicationsLocation);
+    for (const QString &folder : folders) {
+        QDirIterator files(folder, QDir::Files, QDirIterator::Subdirectories);
+        while (files.hasNext()) {
+            const QString file = files.next();
+            if (!EntryPath::isEntry(file))
+                continue;
+            const VelUIDesktopEntry entry(file);
+            if (entry.getType() == QLatin1String("Application") && entry.isDisplayable(nullptr))
+                return true;
+        }
+    }
+    return false;
 }
 
 bool StartMenu::recreate(QWidget *asker, MenuVoice &voice, const std::function<void()> &begins)

@@ -18,6 +18,9 @@ namespace StartMenu {
 /// Where it is, whether or not there is one.
 QString directory();
 
+/// Whether there is any application that a default menu can be built of.
+bool isAnyApplicationInstalled();
+
 /**
  * Builds the default menu anew after asking over \a asker, which may go away meanwhile. When the
  * menu cannot be built, the old one stays, a warning is logged, and the user is told why.

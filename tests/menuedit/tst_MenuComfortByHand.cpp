@@ -12,6 +12,7 @@
 #include <QImage>
 #include <QLabel>
 #include <QLayout>
+#include <QScopeGuard>
 #include <QToolBar>
 
 /// What makes the work with a menu easier while there is assistance, by hand.
@@ -30,6 +31,8 @@ private Q_SLOTS:
     void isNamedPlainly_data();
     void isNamedPlainly();
     void tellsHowToBeginAnEmptyMenu();
+    void tellsWhyTheStartMenuIsEmpty_data();
+    void tellsWhyTheStartMenuIsEmpty();
     void choosesFromTheMenuByLetters();
 
 private:
@@ -289,6 +292,39 @@ void tst_MenuComfortByHand::tellsHowToBeginAnEmptyMenu()
     QTRY_VERIFY(label()->isVisible());
     dialog()->setAssistance(false);
     QVERIFY(!label());
+}
+
+void tst_MenuComfortByHand::tellsWhyTheStartMenuIsEmpty_data()
+{
+    QTest::addColumn<QByteArray>("keys"); // of the one application
+    QTest::addColumn<QString>("text");
+    const QString none = QStringLiteral("This menu is empty, because no application was found that is "
+                                        "installed. Once there is one, press 'Default menu...'. Until then, "
+                                        "press Ctrl+N for an entry of your own.");
+    QTest::newRow("no application") << QByteArray() << none;
+    QTest::newRow("one that no menu shows") << QByteArray("Exec=true\nNoDisplay=true\n") << none;
+    QTest::newRow("an application")
+        << QByteArray("Exec=true\n")
+        << QStringLiteral("This menu is empty. Press 'Default menu...' to fill it with the applications that "
+                          "are installed, or Ctrl+N for a new entry.");
+}
+
+void tst_MenuComfortByHand::tellsWhyTheStartMenuIsEmpty()
+{
+    QFETCH(QByteArray, keys);
+    QFETCH(QString, text);
+    const QByteArray dataDirs = qgetenv("XDG_DATA_DIRS");
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("data"))));
+    const auto restored = qScopeGuard([&] { qputenv("XDG_DATA_DIRS", dataDirs); });
+    if (!keys.isEmpty())
+        write(QStringLiteral("data/applications/far/piano.desktop"),
+              entryText(QStringLiteral("Piano"), keys));
+    QVERIFY(QDir().mkpath(startMenu()));
+    openDialog(startMenu(), 0);
+    dialog()->setAssistance(true);
+    const auto *label = view().findChild<QLabel *>(QStringLiteral("emptyMenuLabel"));
+    QTRY_VERIFY(label && label->isVisible());
+    QCOMPARE(label->text(), text);
 }
 
 void tst_MenuComfortByHand::choosesFromTheMenuByLetters()
