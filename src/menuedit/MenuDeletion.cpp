@@ -69,6 +69,14 @@ QString complaint(const QString &path, const std::error_code &error)
         .arg(path, QString::fromLocal8Bit(error.message().c_str()));
 }
 
+// Whether it is a folder that holds what may not be taken out of it; such a folder cannot be moved, either.
+bool isFixed(const QString &path)
+{
+    const QFileInfo info(path);
+    return info.isDir() && !info.isSymLink() && !info.isWritable()
+        && !OnDisk::namesIn(path).value_or(QSet<QString>{path}).isEmpty();
+}
+
 FileWork deletingFiles(QWidget *view)
 {
     return FileWork(view, QCoreApplication::translate("VelMenuView", "Delete"),
@@ -154,7 +162,7 @@ void MenuDeletion::Outcome::refuse(const QString &path)
 {
     if (!OnDisk::exists(path))
         return;
-    if (QFileInfo(QFileInfo(path).absolutePath()).isWritable())
+    if (QFileInfo(QFileInfo(path).absolutePath()).isWritable() && !isFixed(path))
         untrashed.append(path);
     else
         complaints.append(complaint(path, std::make_error_code(std::errc::permission_denied)));

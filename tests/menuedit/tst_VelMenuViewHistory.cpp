@@ -4,6 +4,7 @@
 #include "EditTestCase.h"
 #include "ExactTree.h"
 #include "ModalDriver.h"
+#include "OrdinaryUser.h"
 #include "VelMenuView.h"
 
 #include <menuedit/StepText.h>
@@ -30,6 +31,7 @@ private Q_SLOTS:
     void forgetsEverythingWhenItShowsAnotherMenu();
     void asksOnlyWhereThereIsNoTrash_data();
     void asksOnlyWhereThereIsNoTrash();
+    void asksNothingAboutAFolderThatMayNotBeWritten();
     void keepsWhatStandsInTheTrashAlready();
     void tellsWhyItRefuses();
     void dropsWhatCanNeverBeUndone();
@@ -175,6 +177,25 @@ void tst_VelMenuViewHistory::asksOnlyWhereThereIsNoTrash()
     QCOMPARE(QFile::exists(m_a), !isSure);
     QCOMPARE(changes.count(), isSure ? 1 : 0);
     QCOMPARE(view->undoAction()->text(), QStringLiteral("Undo deletion of B"));
+}
+
+// The trash is not what is missing, and no answer would help.
+void tst_VelMenuViewHistory::asksNothingAboutAFolderThatMayNotBeWritten()
+{
+    const QString fixed =
+        QFileInfo(writeEntry(QStringLiteral("fixed/x.desktop"), QStringLiteral("X"))).path();
+    const auto view = make();
+    QSignalSpy told(view.get(), &VelMenuView::told);
+    {
+        const OrdinaryUser user(folder());
+        QVERIFY(QFile::setPermissions(fixed, QFile::ReadOwner | QFile::ExeOwner));
+        remove(*view, fixed);
+        QVERIFY(QFile::setPermissions(fixed, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+    }
+    QCOMPARE(told.value(0),
+             QVariantList({QStringLiteral("%1 cannot be deleted: Permission denied").arg(fixed), 2}));
+    QVERIFY(QFile::exists(fixed + QStringLiteral("/x.desktop")));
+    QVERIFY(!view->undoAction()->isEnabled());
 }
 
 void tst_VelMenuViewHistory::keepsWhatStandsInTheTrashAlready()
