@@ -4,6 +4,7 @@
 #include "KeyMatcher.h"
 
 #include "KeySequences.h"
+#include "KeySymbols.h"
 #include "QuotedText.h"
 
 #include <cstring>
@@ -64,7 +65,7 @@ KeyMatcher::KeyMatcher(const QKeySequence &wanted)
     m_wantedKey = wanted[0] & ~int(Qt::KeyboardModifierMask);
     for (unsigned int mask = 0; mask <= KeyNames::AllModifiers; ++mask) {
         if ((mask & ~KeyNames::AllModifiers) == 0)
-            m_wantedMasks[mask] = KeyNames::qtModifiers(mask) == (wanted[0] & ModifiersButKeypad);
+            m_wantedMasks[mask] = KeySymbols::modifiersOf(mask) == (wanted[0] & ModifiersButKeypad);
     }
 }
 
@@ -106,7 +107,7 @@ std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
     const std::optional<int> code = KeyNames::codeFromKeyString(QByteArray(parts.key, int(parts.keyLength)));
     if (!code || !KeyNames::roundTrips(*code))
         return std::nullopt;
-    return m_wanted[0] == (*code | KeyNames::qtModifiers(parts.mask));
+    return m_wanted[0] == (*code | KeySymbols::modifiersOf(parts.mask));
 }
 
 bool KeyMatcher::matchesText(std::string_view fileKey) const

@@ -3,13 +3,14 @@
 
 #include "KeyNames.h"
 
+#include "KeySymbols.h"
+
 #include <QKeySequence>
 
-#include <KKeyServer>
-
-#include <X11/Xlib.h>
-
 #include <array>
+
+// Last: the macros of Xlib's header hide names of Qt.
+#include <X11/Xlib.h>
 
 namespace {
 
@@ -40,16 +41,6 @@ bool equals(QLatin1String known, const char *name, std::size_t length)
     return std::size_t(known.size()) == length && qstrnicmp(name, known.data(), uint(length)) == 0;
 }
 
-// Deprecated because other layouts need the modifiers too; a key string is independent of the
-// layout, it names the key symbol.
-bool keyFromSymbol(unsigned int symbol, int *key)
-{
-    QT_WARNING_PUSH
-    QT_WARNING_DISABLE_DEPRECATED
-    return KKeyServer::symXToKeyQt(symbol, key);
-    QT_WARNING_POP
-}
-
 } // namespace
 
 unsigned int KeyNames::modifierBit(const char *name, std::size_t length)
@@ -61,26 +52,18 @@ unsigned int KeyNames::modifierBit(const char *name, std::size_t length)
     return 0;
 }
 
-int KeyNames::qtModifiers(unsigned int mask)
-{
-    int modifiers = 0;
-    KKeyServer::modXToQt(mask, &modifiers);
-    return modifiers;
-}
-
 QString KeyNames::toKeyString(int code)
 {
-    int symbol = 0;
-    unsigned int mask = 0;
-    if (!KKeyServer::keyQtToSymX(code, &symbol) || !KKeyServer::keyQtToModX(code, &mask))
+    const std::optional<KeySymbols::Symbol> symbol = KeySymbols::ofKey(code);
+    if (!symbol)
         return {};
-    const char *symbolName = XKeysymToString(static_cast<KeySym>(symbol));
+    const char *symbolName = XKeysymToString(static_cast<KeySym>(symbol->symbol));
     if (!symbolName)
         return QLatin1String("");
 
     QString text;
     for (const Modifier &modifier : Modifiers) {
-        if (mask & modifier.bit)
+        if (symbol->mask & modifier.bit)
             text += modifier.name + QLatin1Char('+');
     }
     return text + QString::fromLocal8Bit(symbolName);
@@ -109,10 +92,8 @@ std::optional<int> KeyNames::codeFromKeyString(const QByteArray &keyString)
         mask |= modifierBit(keyString.constData() + begin, std::size_t(end - begin));
         begin = end + 1;
     }
-    int key = 0;
-    if (!keyFromSymbol(static_cast<unsigned int>(symbol), &key))
-        return std::nullopt;
-    return key | qtModifiers(mask);
+    const std::optional<int> key = KeySymbols::keyOf(static_cast<unsigned int>(symbol));
+    return key ? std::optional<int>(*key | KeySymbols::modifiersOf(mask)) : std::nullopt;
 }
 
 QString KeyNames::portableText(int code)

@@ -27,9 +27,6 @@ constexpr unsigned int AllModifiers = 0x4d;
  */
 unsigned int modifierBit(const char *name, std::size_t length);
 
-/// The Qt modifiers of an X11 modifier mask.
-int qtModifiers(unsigned int mask);
-
 /// The key string of a Qt key code, see VelKeyServer::KeyQtToKeyStringX().
 QString toKeyString(int code);
 

@@ -29,7 +29,6 @@
 #include <algorithm>
 #include <memory>
 #include <random>
-#include <utility>
 
 namespace {
 
@@ -548,10 +547,6 @@ void tst_ShortcutSessions::keepsWhatAPlainModelKeeps()
         ? quint32(qEnvironmentVariableIntValue("VEL_TEST_SEED"))
         : std::random_device()() & 0x3fffffff;
     qInfo("seed %u, %d sessions", seed, rounds);
-    // Said once, by what reads the desktop's keys; these need no X server.
-    static bool isSaid = false;
-    if (!std::exchange(isSaid, true))
-        expectWarning(QRegularExpression(QStringLiteral("KKeyServer accessed from non-X11 platform")));
     qputenv("VEL_CONFIG_HOME", QFile::encodeName(folder()));
     write(QStringLiteral("keyshortcutrc"), "[ShortCutKeys]\nMeta|F3=VELWM_RUN\nMeta|F4=VELWM_SHOW_ICON\n");
     for (int i = 0; i < rounds && !QTest::currentTestFailed(); ++i)

@@ -1,0 +1,121 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#include "KeySymbols.h"
+
+#include <QHash>
+#include <QX11Info>
+
+#include <KKeyServer>
+
+// Last: the macros of Xlib's headers hide names of Qt.
+#include <X11/X.h>
+#include <X11/XF86keysym.h>
+#include <X11/keysym.h>
+
+namespace {
+
+struct Modifier
+{
+    unsigned int mask;
+    Qt::KeyboardModifier modifier;
+};
+
+constexpr Modifier UsualModifiers[] = {{ControlMask, Qt::ControlModifier},
+                                       {ShiftMask, Qt::ShiftModifier},
+                                       {Mod1Mask, Qt::AltModifier},
+                                       {Mod4Mask, Qt::MetaModifier}};
+
+constexpr unsigned int FirstOfFunctionKeys = 0x3000; // below, symbols are characters
+constexpr unsigned int FirstOfKeypad = 0xff80;
+constexpr unsigned int LastOfKeypad = 0xffbf;
+
+using Keys = QHash<unsigned int, int>; // by symbol
+
+void addKey(int code, Keys *keys)
+{
+    int symbol = 0;
+    if (KKeyServer::keyQtToSymX(code, &symbol) && unsigned(symbol) >= FirstOfFunctionKeys
+        && !keys->contains(unsigned(symbol)))
+        keys->insert(unsigned(symbol), code);
+}
+
+void addKeyOfKeypad(int key, Keys *keys)
+{
+    int symbol = 0;
+    const int code = key | int(Qt::KeypadModifier);
+    if (KKeyServer::keyQtToSymX(code, &symbol) && unsigned(symbol) >= FirstOfKeypad
+        && unsigned(symbol) <= LastOfKeypad)
+        keys->insert(unsigned(symbol), code);
+}
+
+// The way back from what needs no X server.
+Keys allKeys()
+{
+    Keys keys = {{XK_KP_Equal, Qt::Key_Equal}, {XF86XK_Clear, Qt::Key_Clear}};
+    for (int key = Qt::Key_Escape; key <= Qt::Key_MicMute; ++key)
+        addKey(key, &keys);
+    addKey(Qt::Key_Select, &keys);
+    addKey(Qt::Key_Sleep, &keys);
+    for (int key = Qt::Key_Space; key <= Qt::Key_AsciiTilde; ++key)
+        addKeyOfKeypad(key, &keys);
+    for (int key = Qt::Key_Escape; key <= Qt::Key_F35; ++key)
+        addKeyOfKeypad(key, &keys);
+    return keys;
+}
+
+std::optional<int> usualKeyOf(unsigned int symbol)
+{
+    if (symbol < FirstOfFunctionKeys) {
+        const bool isLowerCase = symbol >= XK_a && symbol <= XK_z;
+        return int(isLowerCase ? symbol - XK_a + XK_A : symbol);
+    }
+    static const Keys keys = allKeys();
+    const auto key = keys.constFind(symbol);
+    return key == keys.constEnd() ? std::nullopt : std::optional<int>(*key);
+}
+
+bool maskOf(int code, unsigned int *mask)
+{
+    if (QX11Info::isPlatformX11())
+        return KKeyServer::keyQtToModX(code, mask);
+    for (const Modifier &each : UsualModifiers) {
+        if (code & each.modifier)
+            *mask |= each.mask;
+    }
+    return true;
+}
+
+} // namespace
+
+std::optional<KeySymbols::Symbol> KeySymbols::ofKey(int code)
+{
+    Symbol symbol;
+    const bool isKnown = KKeyServer::keyQtToSymX(code, &symbol.symbol) && maskOf(code, &symbol.mask);
+    return isKnown ? std::optional<Symbol>(symbol) : std::nullopt;
+}
+
+// KKeyServer's function is deprecated because other layouts need the modifiers too; a key string is
+// independent of the layout, it names the key symbol.
+std::optional<int> KeySymbols::keyOf(unsigned int symbol)
+{
+    if (!QX11Info::isPlatformX11())
+        return usualKeyOf(symbol);
+    int key = 0;
+    QT_WARNING_PUSH
+    QT_WARNING_DISABLE_DEPRECATED
+    const bool isKnown = KKeyServer::symXToKeyQt(symbol, &key);
+    QT_WARNING_POP
+    return isKnown ? std::optional<int>(key) : std::nullopt;
+}
+
+int KeySymbols::modifiersOf(unsigned int mask)
+{
+    int modifiers = 0;
+    if (QX11Info::isPlatformX11())
+        KKeyServer::modXToQt(mask, &modifiers);
+    else
+        for (const Modifier &each : UsualModifiers)
+            modifiers |= mask & each.mask ? int(each.modifier) : 0;
+    return modifiers;
+}
