@@ -9,6 +9,7 @@ include(VelPkgConfig)
 set(VEL_CMAKE_DIR "${CMAKE_INSTALL_LIBDIR}/cmake/${VEL_PACKAGE}")
 
 set_target_properties(veluiextra PROPERTIES EXPORT_NAME VelUIExtra)
+vel_set_install_rpath(veluiextra "${CMAKE_INSTALL_LIBDIR}")
 install(TARGETS veluiextra EXPORT VelUIExtraTargets
     LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT devel)
 install(DIRECTORY "${VEL_PUBLIC_INCLUDE_DIR}/" "${CMAKE_CURRENT_BINARY_DIR}/include/"

@@ -3,16 +3,17 @@
 
 # vel_install_pkgconfig(<name> COMPONENT <component> TEMPLATE <file>)
 #
-# Installs <name>.pc. What the template names as @VARIABLE@ is filled in now, except the prefix:
-# that is the one of the installation itself, which may be given to "cmake --install" only.
+# Installs <name>.pc. What the template names as @VARIABLE@ is filled in; @prefix@ and @libdir@ are
+# given as seen from the file itself, so that the prefix may be chosen late, and moved.
 function(vel_install_pkgconfig name)
     cmake_parse_arguments(ARG "" "COMPONENT;TEMPLATE" "" ${ARGN})
-    set(prefix "@CMAKE_INSTALL_PREFIX@")
-    set(half_done "${CMAKE_CURRENT_BINARY_DIR}/${name}.pc.in")
-    configure_file("${ARG_TEMPLATE}" "${half_done}" @ONLY)
-    install(CODE "
-        configure_file(\"${half_done}\" \"${CMAKE_CURRENT_BINARY_DIR}/${name}.pc\" @ONLY)
-        file(INSTALL \"${CMAKE_CURRENT_BINARY_DIR}/${name}.pc\"
-            DESTINATION \"\${CMAKE_INSTALL_PREFIX}/${CMAKE_INSTALL_LIBDIR}/pkgconfig\")"
-        COMPONENT ${ARG_COMPONENT})
+    file(RELATIVE_PATH way_up "${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig" "${CMAKE_INSTALL_PREFIX}")
+    string(REGEX REPLACE "/$" "" prefix "\${pcfiledir}/${way_up}")
+    set(libdir "\${prefix}/${CMAKE_INSTALL_LIBDIR}")
+    if(IS_ABSOLUTE "${CMAKE_INSTALL_LIBDIR}")
+        set(libdir "${CMAKE_INSTALL_LIBDIR}")
+    endif()
+    configure_file("${ARG_TEMPLATE}" "${CMAKE_CURRENT_BINARY_DIR}/${name}.pc" @ONLY)
+    install(FILES "${CMAKE_CURRENT_BINARY_DIR}/${name}.pc"
+        DESTINATION "${CMAKE_INSTALL_LIBDIR}/pkgconfig" COMPONENT ${ARG_COMPONENT})
 endfunction()

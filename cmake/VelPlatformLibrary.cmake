@@ -50,6 +50,7 @@ function(vel_add_platform_library name)
         VERSION ${PROJECT_VERSION}
         SOVERSION ${PROJECT_VERSION_MAJOR})
 
+    vel_set_install_rpath(${name} "${CMAKE_INSTALL_LIBDIR}")
     install(TARGETS ${name} EXPORT ${export}
         LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT platform NAMELINK_COMPONENT platform-devel)
     install(FILES ${headers} "${export_header}"
