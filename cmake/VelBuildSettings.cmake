@@ -1,9 +1,12 @@
 # SPDX-FileCopyrightText: The veluiextra developers
 # SPDX-License-Identifier: LGPL-2.1-or-later
 
-# Options and the settings that all of our own targets share.
+# Options and the settings that all of our own targets share. Within another project only the
+# libraries are built, and nothing of that project's changes: what is set here ends with this folder.
 
-option(VEL_BUILD_TESTS "Build the tests" ON)
+option(VEL_BUILD_APPS "Build the programs" ${PROJECT_IS_TOP_LEVEL})
+option(VEL_BUILD_DESIGNER "Build the plugin for Qt Designer" ${PROJECT_IS_TOP_LEVEL})
+option(VEL_BUILD_TESTS "Build the tests" ${PROJECT_IS_TOP_LEVEL})
 option(VEL_BUILD_BENCHMARKS "Build the benchmarks" OFF)
 option(VEL_BUILD_FUZZERS "Build the fuzz targets, with clang; the preset \"fuzz\" has the settings for that" OFF)
 option(VEL_WARNINGS_AS_ERRORS "Stop at a compiler warning" OFF)
@@ -18,9 +21,17 @@ if(NOT VEL_PLATFORM MATCHES "^(bundled|system)$")
     message(FATAL_ERROR "VEL_PLATFORM is \"${VEL_PLATFORM}\", it has to be \"bundled\" or \"system\"")
 endif()
 
-find_program(VEL_CCACHE ccache)
-if(VEL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
-    set(CMAKE_CXX_COMPILER_LAUNCHER "${VEL_CCACHE}")
+if(VEL_BUILD_TESTS AND NOT (VEL_BUILD_APPS AND VEL_BUILD_DESIGNER))
+    message(FATAL_ERROR "VEL_BUILD_TESTS needs VEL_BUILD_APPS and VEL_BUILD_DESIGNER")
+endif()
+
+# Another project decides by itself about a compiler cache.
+if(PROJECT_IS_TOP_LEVEL)
+    find_program(VEL_CCACHE ccache)
+    if(VEL_CCACHE AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
+        set(CMAKE_CXX_COMPILER_LAUNCHER "${VEL_CCACHE}")
+    endif()
+    set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
 endif()
 
 if(VEL_BUILD_FUZZERS AND NOT (CMAKE_CXX_COMPILER_ID STREQUAL "Clang" AND VEL_PLATFORM STREQUAL "bundled"))
@@ -34,11 +45,10 @@ set(CMAKE_CXX_VISIBILITY_PRESET hidden)
 set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
 set(CMAKE_POSITION_INDEPENDENT_CODE ON)
 set(CMAKE_AUTOMOC ON)
-set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
 
-# Libraries and programs side by side: a program run from the build tree finds its neighbors.
+# Libraries and programs lie as they are installed: what is run from the build tree finds its neighbors.
 set(CMAKE_RUNTIME_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/bin")
-set(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/lib")
+get_filename_component(CMAKE_LIBRARY_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/${CMAKE_INSTALL_LIBDIR}" ABSOLUTE)
 set(CMAKE_ARCHIVE_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/lib")
 
 if(VEL_SANITIZE)
