@@ -46,6 +46,10 @@ class ShortcutsModel;
  * While something is changed the buttons Ok and Reset are enabled. A key counts as a change from
  * its first chord on; it is entered when the focus leaves, when the window is closed and with Ok,
  * and dropped with Cancel.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT EditShortcutsDialog : public QDialog
 {

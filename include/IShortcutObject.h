@@ -25,6 +25,10 @@
  *
  * When what it wraps goes away, the object has to emit deleteMe(); it is deleted within that
  * emission and must not be used afterwards.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT IShortcutObject : public QObject
 {

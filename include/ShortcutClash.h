@@ -23,6 +23,10 @@ class ShortcutsModel;
  *
  * EditShortcutsDialog refuses a pending key of another shortcut and a GlobalKey; all else is
  * advice.
+ *
+ * A plain value; find() is for the GUI thread alone.
+ *
+ * \since 1.0
  */
 struct VELUIEXTRA_EXPORT ShortcutClash
 {

@@ -27,6 +27,8 @@ class ShortcutsModel;
  * \endcode
  *
  * The functions keep no state and open no window. They are to be called on the GUI thread.
+ *
+ * \since 1.0
  */
 namespace ShortcutScheme {
 

@@ -21,8 +21,9 @@ class ShortcutsModel;
  * key stand there, too; groups without a shortcut do not. Line breaks and runs of blanks in names
  * become one blank.
  *
- * The functions keep no state, change nothing and cannot fail. They are to be called on the GUI
- * thread.
+ * The functions keep no state, change nothing and cannot fail. They are to be called on the GUI thread.
+ *
+ * \since 1.0
  */
 namespace ShortcutSheet {
 

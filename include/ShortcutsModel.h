@@ -44,6 +44,10 @@ class QShortcut;
  * The model owns the shortcut objects, never the shortcuts and actions themselves. When one of
  * these is destroyed, its object goes without a signal; its row stays and shows nothing.
  * Persistent indexes keep pointing to their shortcuts all the same.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT ShortcutsModel : public QAbstractItemModel
 {

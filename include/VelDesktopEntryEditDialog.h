@@ -27,6 +27,10 @@ class VelDesktopEntryEditDialogPrivate;
  *
  * The size is remembered in the application's default QSettings, so the application needs an
  * organization name and an application name.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelDesktopEntryEditDialog : public QDialog
 {

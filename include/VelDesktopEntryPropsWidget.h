@@ -27,6 +27,10 @@ class VelUIDesktopEntry;
  * The form keeps no record: values come in with loadFrom() and go out with saveTo(), which
  * may be given another record. It neither checks the values nor touches a file;
  * VelDesktopEntryEditDialog does.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelDesktopEntryPropsWidget : public QWidget
 {

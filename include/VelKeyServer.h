@@ -20,6 +20,8 @@ class QKeySequence;
  * The functions keep no state and report no error but by an empty result. They are to be
  * called on the GUI thread of an application that runs under X11; elsewhere the usual
  * assignment of the modifiers is assumed.
+ *
+ * \since 1.0
  */
 namespace VelKeyServer {
 

@@ -34,6 +34,10 @@ class VelMenuDialogPrivate;
  * if (dialog.exec() == QDialog::Accepted)
  *     run(dialog.selectedItemExec(QString(), QString(), nullptr, nullptr));
  * \endcode
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelMenuDialog : public QDialog
 {
@@ -62,7 +66,8 @@ public:
      */
     explicit VelMenuDialog(QWidget *parent = nullptr);
 
-    /// Remembers the size and, with assistance(), which folders are open, and tells the window manager; see updateWM().
+    /// Remembers the size and, with assistance(), which folders are open, and tells the window manager; see
+    /// updateWM().
     ~VelMenuDialog() override;
 
     /// The menu directory shown.

@@ -36,6 +36,10 @@ class VelMenuViewPrivate;
  *
  * A menu directory that does not exist gives an empty tree until it appears; looking creates
  * nothing.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelMenuView : public QTreeView
 {

@@ -27,7 +27,9 @@ class VelUIDesktopEntry;
  * \endcode
  *
  * Every call looks at the file as it is now, so an icon is never older than its file. The
- * icons returned look up the theme when they are painted. GUI thread only.
+ * icons returned look up the theme when they are painted. For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelMimeTypeIconProvider : public QFileIconProvider
 {

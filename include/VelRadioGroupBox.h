@@ -35,6 +35,10 @@ class VelRadioGroupBoxPrivate;
  *
  * \note The property "checked" and QGroupBox::setChecked(), which is not virtual, change this
  * box alone and leave the others of its group as they are.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelRadioGroupBox : public QGroupBox
 {

@@ -50,7 +50,9 @@ class QSettings;
  * }
  * \endcode
  *
- * For use on the GUI thread. All objects of a process on one file see each other's changes.
+ * For the GUI thread alone. All objects of a process on one file see each other's changes.
+ *
+ * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelSettings
 {

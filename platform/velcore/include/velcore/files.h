@@ -18,6 +18,10 @@ namespace Vel {
  *
  * What is no regular file (a named pipe, a device) or larger than the limit is not read. The file
  * stays open for as long as this object lives, so that no later file can be mistaken for it.
+ *
+ * Different objects may be used in different threads; one object may not.
+ *
+ * \since 1.0
  */
 class VELCORE_EXPORT SmallFile
 {

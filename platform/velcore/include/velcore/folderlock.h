@@ -15,6 +15,10 @@ namespace Vel {
  * It is a lock on the folder itself, which leaves nothing behind, also when its holder is killed.
  * Take it for the moment between a last look at the old file and the renaming of the new one, never
  * for reading. Who holds a lock must not stop others for good: after a second they go on without.
+ *
+ * Different objects may be used in different threads; one object may not.
+ *
+ * \since 1.0
  */
 class VELCORE_EXPORT FolderLock
 {

@@ -11,6 +11,10 @@
 /**
  * What a program needs that has a start menu follow the applications all the time. Others call
  * UpdateStartMenu() when they begin.
+ *
+ * The functions may be called from any thread, while none changes the environment.
+ *
+ * \since 1.0
  */
 namespace VelStartMenu {
 

@@ -17,6 +17,10 @@ typedef struct _XDisplay Display; // NOLINT(bugprone-reserved-identifier)
  * The channel is an ICCCM manager selection, one a screen; its owner is the window manager.
  * Commands are appended to a property of the owner's window. Where there is no X display, a name on
  * the session bus stands for it; its owner has the method that takes a command.
+ *
+ * What stands here may be used from any thread.
+ *
+ * \since 1.0
  */
 namespace VelWmCommand {
 

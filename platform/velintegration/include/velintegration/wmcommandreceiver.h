@@ -44,6 +44,8 @@ class WmCommandReceiverPrivate;
  *
  * All calls come from one thread. The callbacks run inside acquire() and processEvents() and
  * may not delete the receiver.
+ *
+ * \since 1.0
  */
 class VELINTEGRATION_EXPORT WmCommandReceiver
 {

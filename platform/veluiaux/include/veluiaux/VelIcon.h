@@ -21,7 +21,9 @@
  * An emblem stands in the corner that is given, in right-to-left layouts too; an emblem that
  * the theme lacks is left out. Pixmaps are made at the pixel ratio of the device.
  *
- * GUI thread only, as pixmaps are.
+ * For the GUI thread alone, as pixmaps are.
+ *
+ * \since 1.0
  */
 class VELUIAUX_EXPORT VelIcon
 {

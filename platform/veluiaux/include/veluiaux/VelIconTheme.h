@@ -9,6 +9,10 @@
 
 /**
  * The icon theme in use, and the names of the icons that stand for things in it.
+ *
+ * For the GUI thread alone.
+ *
+ * \since 1.0
  */
 class VELUIAUX_EXPORT VelIconTheme
 {

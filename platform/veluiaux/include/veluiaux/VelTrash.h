@@ -7,6 +7,10 @@
 
 /**
  * The user's trash can.
+ *
+ * May be called from any thread, while none changes the environment.
+ *
+ * \since 1.0
  */
 class VELUIAUX_EXPORT VelTrash
 {

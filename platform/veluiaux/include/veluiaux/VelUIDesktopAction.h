@@ -21,6 +21,8 @@ class VelUIDesktopActionData;
  *
  * A "Local" text is the one for the user's language as it was when the record gave the
  * action. All texts are empty, and all lists have no items, until they are set.
+ *
+ * \since 1.0
  */
 class VELUIAUX_EXPORT VelUIDesktopAction
 {

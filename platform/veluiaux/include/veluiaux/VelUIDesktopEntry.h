@@ -32,6 +32,8 @@ class VelUIExecFormatData;
  *
  * A value class: copies share their data until one of them is changed. Different records may
  * be used in different threads, also on the same file; one record may not.
+ *
+ * \since 1.0
  */
 class VELUIAUX_EXPORT VelUIDesktopEntry
 {
