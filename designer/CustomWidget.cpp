@@ -57,6 +57,10 @@ QString CustomWidget::domXml() const
 {
     QString objectName = m_info.className;
     objectName[0] = objectName.at(0).toLower();
-    return QStringLiteral("<ui language=\"c++\"><widget class=\"%1\" name=\"%2\">%3</widget></ui>")
-        .arg(m_info.className, objectName, m_info.properties);
+    return QStringLiteral("<ui language=\"c++\"><widget class=\"%1\" name=\"%2\">%3</widget>"
+                          "<customwidgets><customwidget><class>%1</class><extends>%4</extends>"
+                          "<header>%5</header><propertyspecifications>%6</propertyspecifications>"
+                          "</customwidget></customwidgets></ui>")
+        .arg(m_info.className, objectName, m_info.properties, m_info.base, m_info.header,
+             m_info.specifications);
 }

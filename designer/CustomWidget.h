@@ -16,6 +16,10 @@ struct CustomWidgetInfo
     QString help;
     /// The size and properties of a new widget, as the inside of its <widget> element.
     QString properties;
+    /// The class that Designer takes the properties of when the plugin is not there.
+    QString base;
+    /// What Designer knows of single properties, as the inside of <propertyspecifications>.
+    QString specifications;
     bool isContainer;
     QWidget *(*create)(QWidget *parent);
 };

@@ -25,33 +25,55 @@ QString sizeOf(int width, int height)
         .arg(height);
 }
 
+// A text for the program, which no translator gets to see.
+QString plainText(const QString &property)
+{
+    return QStringLiteral("<stringpropertyspecification name=\"%1\" type=\"singleline\" notr=\"true\"/>")
+        .arg(property);
+}
+
+QString toolTip(const QString &property, const QString &text)
+{
+    return QStringLiteral("<tooltip name=\"%1\">%2</tooltip>").arg(property, text.toHtmlEscaped());
+}
+
 CustomWidgetInfo menuView()
 {
-    return {QStringLiteral("VelMenuView"),
-            QStringLiteral("VelMenuView.h"),
-            QStringLiteral(":/veluiextra-designer/icons/menuview.png"),
-            QStringLiteral("Tree of a menu directory"),
-            QStringLiteral(
-                "Shows the start menu, or another menu directory, in the desktop's order. A view made in a "
-                "form shows the start menu and cannot be edited; construct one in code for the rest."),
-            sizeOf(240, 320),
-            false,
-            create<VelMenuView>};
+    return {
+        QStringLiteral("VelMenuView"),
+        QStringLiteral("VelMenuView.h"),
+        QStringLiteral(":/veluiextra-designer/icons/menuview.png"),
+        QStringLiteral("Tree of a menu directory"),
+        QStringLiteral(
+            "Shows the start menu, or the directory that the property \"menuDir\" names, in the desktop's "
+            "order. With \"editable\" the user can change it, in a preview, too; \"assistance\" switches on "
+            "what goes beyond the plain tree."),
+        sizeOf(240, 320),
+        QStringLiteral("QTreeView"),
+        toolTip(QStringLiteral("menuDir"), QStringLiteral("The menu directory; empty for the start menu"))
+            + toolTip(QStringLiteral("itemIconSize"),
+                      QStringLiteral("The edge of the icons in pixels; -1 leaves it to the style"))
+            + plainText(QStringLiteral("menuDir")),
+        false,
+        create<VelMenuView>};
 }
 
 CustomWidgetInfo radioGroupBox()
 {
-    return {QStringLiteral("VelRadioGroupBox"),
-            QStringLiteral("VelRadioGroupBox.h"),
-            QStringLiteral(":/veluiextra-designer/icons/radiogroupbox.png"),
-            QStringLiteral("Group box whose title is a radio button"),
-            QStringLiteral(
-                "The boxes under one parent exclude one another. The property \"checked\" set in a form goes "
-                "past that exclusivity: set it on one box of a group only, or call setChecked() in code."),
-            sizeOf(200, 120)
-                + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
-            true,
-            create<VelRadioGroupBox>};
+    return {
+        QStringLiteral("VelRadioGroupBox"),
+        QStringLiteral("VelRadioGroupBox.h"),
+        QStringLiteral(":/veluiextra-designer/icons/radiogroupbox.png"),
+        QStringLiteral("Group box whose title is a radio button"),
+        QStringLiteral(
+            "The boxes under one parent exclude one another: of those whose property \"checked\" is set in a "
+            "form, the last one counts, as with setChecked() in code."),
+        sizeOf(200, 120)
+            + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
+        QStringLiteral("QGroupBox"),
+        QString(),
+        true,
+        create<VelRadioGroupBox>};
 }
 
 CustomWidgetInfo entryProperties()
@@ -64,6 +86,9 @@ CustomWidgetInfo entryProperties()
                 "Shows and edits a desktop entry record: load it with loadFrom() and write it back with "
                 "saveTo() in code. The property \"assistance\" switches on what goes beyond the plain form."),
             sizeOf(420, 400),
+            QStringLiteral("QWidget"),
+            toolTip(QStringLiteral("type"), QStringLiteral("Application, Link or Directory"))
+                + plainText(QStringLiteral("type")),
             false,
             create<VelDesktopEntryPropsWidget>};
 }

@@ -35,7 +35,14 @@ class VelUIDesktopEntry;
 class VELUIEXTRA_EXPORT VelDesktopEntryPropsWidget : public QWidget
 {
     Q_OBJECT
+    /// See setAssistance().
     Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
+    /// Whether the user can look at the values only. See setReadOnly().
+    Q_PROPERTY(bool readOnly READ isReadOnly WRITE setReadOnly)
+    /// "Application", "Link" or "Directory". See setType().
+    Q_PROPERTY(QString type READ type WRITE setType)
+    /// Whether there is a button beside the field of a Link's address. See setShowURLInfoButton().
+    Q_PROPERTY(bool showURLInfoButton READ showURLInfoButton WRITE setShowURLInfoButton)
 
 public:
     /**
@@ -54,6 +61,16 @@ public:
      * @param allowedTypes the types to choose from; all three when empty
      */
     void setType(const QString &type, const QStringList &allowedTypes);
+
+    /**
+     * Sets the type of the entry among the types that are allowed already.
+     *
+     * @param type "Application", "Link" or "Directory"; nothing changes when it is empty or not allowed
+     */
+    void setType(const QString &type);
+
+    /// The type that the form shows: "Application", "Link" or "Directory".
+    QString type() const;
 
     /**
      * Shows the values of an entry, with its type where that is allowed.
@@ -81,6 +98,9 @@ public:
      */
     void setReadOnly(bool readOnly);
 
+    /// Whether the user can look at the values only.
+    bool isReadOnly() const;
+
     /// Whether the form helps its users beyond the plain one; see setAssistance().
     bool assistance() const;
     /**
@@ -106,6 +126,9 @@ public:
      * @param show whether to show it; false at the start
      */
     void setShowURLInfoButton(bool show);
+
+    /// Whether there is a button beside the field of a Link's address.
+    bool showURLInfoButton() const;
 
 Q_SIGNALS:
     /// Emitted when the user changed a value; loading an entry emits it once for each path or command

@@ -44,7 +44,14 @@ class VelMenuViewPrivate;
 class VELUIEXTRA_EXPORT VelMenuView : public QTreeView
 {
     Q_OBJECT
+    /// See setAssistance().
     Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
+    /// The menu directory; empty, when it is set, for the start menu. See setMenuDir().
+    Q_PROPERTY(QString menuDir READ menuDir WRITE setMenuDir)
+    /// The edge of the item icons in pixels, -1 while the style decides. See setItemIconSize().
+    Q_PROPERTY(int itemIconSize READ itemIconSize WRITE setItemIconSize)
+    /// Whether the user can change the menu. See setEditable().
+    Q_PROPERTY(bool editable READ isEditable WRITE setEditable)
 
 public:
     /**
@@ -145,8 +152,37 @@ public:
      */
     void setHiddenShown(bool shown);
 
-    /// The menu directory that the view was built on, as it was given.
+    /// The menu directory that the view was built on, as it was given; the start menu's for an empty one.
     QString menuDir() const;
+
+    /**
+     * Shows another menu directory, as init() does, and keeps all else. Nothing happens when the view
+     * shows that directory already.
+     *
+     * @param menuDir the directory; empty for the start menu
+     */
+    void setMenuDir(const QString &menuDir);
+
+    /// The edge of the item icons in pixels; -1 while the style decides.
+    int itemIconSize() const;
+
+    /**
+     * Sets the size of the item icons.
+     *
+     * @param size the edge in pixels; -1 leaves it to the style
+     */
+    void setItemIconSize(int size);
+
+    /// Whether the user can change the menu.
+    bool isEditable() const;
+
+    /**
+     * Lets the user change the menu, or no longer. Starts afresh on the directory, as init() does, when
+     * that is another choice.
+     *
+     * @param editable whether the user can change the menu
+     */
+    void setEditable(bool editable);
 
     /**
      * The selected item in the file-system model; invalid when nothing is selected.

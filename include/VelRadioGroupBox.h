@@ -20,7 +20,9 @@ class VelRadioGroupBoxPrivate;
  * belong to it. The user cannot uncheck a box, only choose another one. A box that is alone
  * below its parent can never be checked.
  *
- * A new box is unchecked: a form checks the one that applies once all of them exist.
+ * A new box is unchecked: a form checks the one that applies once all of them exist. A form that
+ * uic or QUiLoader builds checks its box while it makes the others; that counts, too, when the others
+ * follow before the program waits for events again.
  *
  * \code
  * auto *form = new QWidget;
@@ -33,8 +35,8 @@ class VelRadioGroupBoxPrivate;
  * chooses the box that has the focus. The letter that the title underlines has no shortcut.
  * Screen readers are told of a radio button named by the title.
  *
- * \note The property "checked" and QGroupBox::setChecked(), which is not virtual, change this
- * box alone and leave the others of its group as they are.
+ * The property "checked" and QGroupBox::setChecked(), which is not virtual, uncheck the others of the
+ * group as well.
  *
  * For the GUI thread alone.
  *

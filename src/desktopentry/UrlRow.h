@@ -28,6 +28,7 @@ public:
     QToolButton *infoButton() const;
     /// Shows the button whenever the row is shown, or never.
     void setInfoButtonWanted(bool wanted);
+    bool isInfoButtonWanted() const { return m_isInfoButtonWanted; }
     FormRow row() const;
 
     void setVisible(bool visible) override;

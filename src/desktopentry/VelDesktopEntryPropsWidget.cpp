@@ -56,6 +56,16 @@ void VelDesktopEntryPropsWidget::setType(const QString &type, const QStringList 
     Q_EMIT d->recordChanged();
 }
 
+void VelDesktopEntryPropsWidget::setType(const QString &type)
+{
+    setType(type, d->typeChooser.allowedTypes());
+}
+
+QString VelDesktopEntryPropsWidget::type() const
+{
+    return d->typeChooser.type();
+}
+
 void VelDesktopEntryPropsWidget::loadFrom(const VelUIDesktopEntry &entry)
 {
     d->load(entry);
@@ -79,6 +89,11 @@ void VelDesktopEntryPropsWidget::setReadOnly(bool readOnly)
     d->tellRecordChange();
 }
 
+bool VelDesktopEntryPropsWidget::isReadOnly() const
+{
+    return d->readOnly;
+}
+
 void VelDesktopEntryPropsWidget::setFrameStyle(int style)
 {
     d->scrollArea->setFrameStyle(style);
@@ -87,4 +102,9 @@ void VelDesktopEntryPropsWidget::setFrameStyle(int style)
 void VelDesktopEntryPropsWidget::setShowURLInfoButton(bool show)
 {
     d->rows.urlRow()->setInfoButtonWanted(show);
+}
+
+bool VelDesktopEntryPropsWidget::showURLInfoButton() const
+{
+    return d->rows.urlRow()->isInfoButtonWanted();
 }

@@ -7,6 +7,7 @@
 #include "ItemTransfer.h"
 #include "MenuClipboard.h"
 #include "MenuReordering.h"
+#include "StartMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 #include "VelMenuViewPrivate.h"
@@ -84,6 +85,33 @@ QModelIndex VelMenuView::selectedItem() const
 QString VelMenuView::selectedPath() const
 {
     return d->selection.path();
+}
+
+void VelMenuView::setMenuDir(const QString &menuDir)
+{
+    if ((menuDir.isEmpty() ? StartMenu::directory() : menuDir) != this->menuDir())
+        init(menuDir, -1, isEditable(), nullptr);
+}
+
+int VelMenuView::itemIconSize() const
+{
+    return iconSize().width();
+}
+
+void VelMenuView::setItemIconSize(int size)
+{
+    setIconSize(size < 0 ? QSize() : QSize(size, size));
+}
+
+bool VelMenuView::isEditable() const
+{
+    return d->menu.isEditable();
+}
+
+void VelMenuView::setEditable(bool editable)
+{
+    if (editable != isEditable())
+        init(menuDir(), -1, editable, nullptr);
 }
 
 void VelMenuView::showAndSelect(const QString &path)

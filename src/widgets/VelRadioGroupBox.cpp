@@ -3,6 +3,7 @@
 
 #include <VelRadioGroupBox.h>
 
+#include "EarlyChecks.h"
 #include "IdleMnemonic.h"
 #include "RadioGroupBoxAccessible.h"
 #include "RadioGroupBoxPainter.h"
@@ -51,6 +52,25 @@ bool endsPress(const VelRadioGroupBox &box, const QEvent &event)
     }
 }
 
+// Who listens to toggled() may delete boxes.
+QVector<QPointer<VelRadioGroupBox>> groupOf(const VelRadioGroupBox &box)
+{
+    if (!box.parent())
+        return {};
+    const auto found = box.parent()->findChildren<VelRadioGroupBox *>(QString(), Qt::FindChildrenRecursively);
+    return {found.begin(), found.end()};
+}
+
+void uncheckOthers(const VelRadioGroupBox &box)
+{
+    const VelRadioGroupBox *const self = &box;
+    const QVector<QPointer<VelRadioGroupBox>> group = groupOf(box);
+    for (const QPointer<VelRadioGroupBox> &other : group) {
+        if (other && other != self && other->isChecked())
+            other->setChecked(false);
+    }
+}
+
 bool isPressKey(const QKeyEvent *event)
 {
     return event->key() == Qt::Key_Space || event->key() == Qt::Key_Select;
@@ -80,10 +100,17 @@ void VelRadioGroupBox::init()
     d->pressed = false;
     setCheckable(true);
     setChecked(false);
+    // The property "checked" goes past setChecked(), to the base.
+    connect(this, &QGroupBox::toggled, this, [this](bool on) {
+        if (on)
+            uncheckOthers(*this);
+    });
+    EarlyChecks::fulfill(*this);
 }
 
 void VelRadioGroupBox::setChecked(bool on)
 {
+    EarlyChecks::forget(*this);
     if (!on) {
         const QPointer<VelRadioGroupBox> self(this);
         QGroupBox::setChecked(false);
@@ -93,16 +120,12 @@ void VelRadioGroupBox::setChecked(bool on)
     }
     if (!parent())
         return;
-    const auto found = parent()->findChildren<VelRadioGroupBox *>(QString(), Qt::FindChildrenRecursively);
-    if (found.size() < 2)
+    if (groupOf(*this).size() < 2) {
+        EarlyChecks::note(this);
         return;
-    // Who listens to toggled() may delete boxes, this one included.
-    const QVector<QPointer<VelRadioGroupBox>> group(found.begin(), found.end());
-    const QPointer<VelRadioGroupBox> self(this);
-    for (const QPointer<VelRadioGroupBox> &box : group) {
-        if (box && box != this)
-            box->setChecked(false);
     }
+    const QPointer<VelRadioGroupBox> self(this);
+    uncheckOthers(*this);
     if (self)
         QGroupBox::setChecked(true);
     if (self)
@@ -130,6 +153,8 @@ bool VelRadioGroupBox::event(QEvent *event)
         d->pressed = false;
         update();
     }
+    if (event->type() == QEvent::ParentChange)
+        EarlyChecks::fulfill(*this);
     return QWidget::event(event); // NOLINT(bugprone-parent-virtual-call)
 }
 

@@ -27,7 +27,8 @@ private Q_SLOTS:
     void describesEveryWidget();
     void newWidgetsAreWellFormed();
     void formsLoadWithTheWidgetsInside();
-    void helpWarnsOfCheckedInForms();
+    void tellsWhatIsForTheProgramAlone();
+    void helpTellsOfCheckedInForms();
 
 private:
     QList<QDesignerCustomWidgetInterface *> widgets();
@@ -104,7 +105,26 @@ void tst_WidgetCollection::formsLoadWithTheWidgetsInside()
     QVERIFY(form->findChild<VelDesktopEntryPropsWidget *>(QStringLiteral("properties")));
 }
 
-void tst_WidgetCollection::helpWarnsOfCheckedInForms()
+// Else Designer would have a directory and the name of a type translated.
+void tst_WidgetCollection::tellsWhatIsForTheProgramAlone()
+{
+    QStringList untranslated;
+    for (const QDesignerCustomWidgetInterface *widget : widgets()) {
+        QXmlStreamReader reader(widget->domXml());
+        while (!reader.atEnd()) {
+            if (reader.readNext() == QXmlStreamReader::StartElement
+                && reader.name() == QLatin1String("stringpropertyspecification")
+                && reader.attributes().value(QLatin1String("notr")) == QLatin1String("true"))
+                untranslated.append(widget->name() + QLatin1Char('.')
+                                    + reader.attributes().value(QLatin1String("name")).toString());
+        }
+    }
+    QCOMPARE(untranslated,
+             QStringList(
+                 {QStringLiteral("VelMenuView.menuDir"), QStringLiteral("VelDesktopEntryPropsWidget.type")}));
+}
+
+void tst_WidgetCollection::helpTellsOfCheckedInForms()
 {
     for (const QDesignerCustomWidgetInterface *widget : widgets()) {
         if (widget->name() == QLatin1String("VelRadioGroupBox"))
