@@ -27,7 +27,7 @@ private Q_SLOTS:
     void settlesWhenALaterChangeIsSureToShow_data();
     void settlesWhenALaterChangeIsSureToShow();
     void readsAnewWhatChangedWithinASecond();
-    void givesOneTextForAnUnchangedFile();
+    void keepsATextFromTheSecondLoadOn();
     void doesNotKeepAFileThatIsTooYoung();
     void doesNotKeepAFileFromTheFuture();
     void readsAnewWhatHasChanged_data();
@@ -182,22 +182,27 @@ void tst_SharedTexts::readsAnewWhatChangedWithinASecond()
     QCOMPARE(read(path(QStringLiteral("coarse/x"))), QByteArray("[B]\nKey=1\n"));
 }
 
-void tst_SharedTexts::givesOneTextForAnUnchangedFile()
+void tst_SharedTexts::keepsATextFromTheSecondLoadOn()
 {
     const QByteArray file = settled(QStringLiteral("x"), "[Desktop Entry]\n");
     const auto first = SharedTexts::instance().findOrRead(file, EntryFile::read);
+    QCOMPARE(SharedTexts::instance().cost(), std::size_t(0));
     const auto second = SharedTexts::instance().findOrRead(file, EntryFile::read);
-    QVERIFY(first && second);
-    QCOMPARE(first->text.get(), second->text.get());
-    QVERIFY(EntryFile::read(file)->text.get() != first->text.get());
+    QVERIFY(SharedTexts::instance().cost() > 0);
+    const auto third = SharedTexts::instance().findOrRead(file, EntryFile::read);
+    QVERIFY(first && second && third);
+    QVERIFY(first->text.get() != second->text.get());
+    QCOMPARE(third->text.get(), second->text.get());
+    QVERIFY(EntryFile::read(file)->text.get() != third->text.get());
 }
 
 void tst_SharedTexts::doesNotKeepAFileThatIsTooYoung()
 {
     const QByteArray file = QFile::encodeName(write(QStringLiteral("x"), "[Desktop Entry]\n"));
-    const auto first = SharedTexts::instance().findOrRead(file, EntryFile::read);
-    QVERIFY(first);
-    if (first->settled)
+    SharedTexts::instance().findOrRead(file, EntryFile::read);
+    const auto second = SharedTexts::instance().findOrRead(file, EntryFile::read);
+    QVERIFY(second);
+    if (second->settled)
         QSKIP("the machine was too slow to read the file within 50 ms");
     QCOMPARE(SharedTexts::instance().cost(), std::size_t(0));
 }
@@ -209,7 +214,8 @@ void tst_SharedTexts::doesNotKeepAFileFromTheFuture()
     ::clock_gettime(CLOCK_REALTIME, &now);
     const struct timespec times[] = {{now.tv_sec + 3600, 0}, {now.tv_sec + 3600, 0}};
     QCOMPARE(::utimensat(AT_FDCWD, file.constData(), times, 0), 0);
-    QVERIFY(!SharedTexts::instance().findOrRead(file, EntryFile::read)->settled);
+    for (int i = 0; i < 2; ++i)
+        QVERIFY(!SharedTexts::instance().findOrRead(file, EntryFile::read)->settled);
     QCOMPARE(SharedTexts::instance().cost(), std::size_t(0));
 }
 
@@ -226,7 +232,9 @@ void tst_SharedTexts::readsAnewWhatHasChanged()
 {
     QFETCH(QString, how);
     const QByteArray file = settled(QStringLiteral("x"), "[A]\n");
+    SharedTexts::instance().findOrRead(file, EntryFile::read);
     const auto first = SharedTexts::instance().findOrRead(file, EntryFile::read);
+    QVERIFY(SharedTexts::instance().cost() > 0);
     struct stat status;
     QCOMPARE(::stat(file.constData(), &status), 0);
     const struct timespec times[] = {status.st_atim, status.st_mtim};
@@ -286,6 +294,7 @@ void tst_SharedTexts::forgetsWhatIsSaved()
     const QByteArray file = settled(QStringLiteral("x"), "[Desktop Entry]\n");
     EntryDocument document;
     document.setPath(file);
+    QVERIFY(document.load());
     QVERIFY(document.load());
     QVERIFY(SharedTexts::instance().cost() > 0);
     document.setText("Desktop Entry", "Name", QStringLiteral("A"));

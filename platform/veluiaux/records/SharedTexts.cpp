@@ -3,6 +3,9 @@
 
 #include "SharedTexts.h"
 
+#include "TextsAhead.h"
+
+#include <functional>
 #include <sys/stat.h>
 
 namespace {
@@ -23,10 +26,20 @@ std::optional<FileText> SharedTexts::findOrRead(const QByteArray &path, Reader r
 {
     if (auto known = find(path))
         return known;
-    auto file = read(path);
-    if (file && file->settled)
+    auto file = TextsAhead::instance().take(path.toStdString());
+    if (!file)
+        file = read(path);
+    if (file && file->settled && isKnown(path))
         insert(path, *file);
     return file;
+}
+
+// Notes it, too. That two paths have one place now and then only costs one more reading.
+bool SharedTexts::isKnown(const QByteArray &path)
+{
+    const std::size_t hash = std::hash<std::string_view>()({path.constData(), std::size_t(path.size())}) | 1U;
+    const std::lock_guard<std::mutex> lock(m_mutex);
+    return std::exchange(m_seen[hash / 2 % m_seen.size()], hash) == hash;
 }
 
 std::optional<FileText> SharedTexts::find(const QByteArray &path)
@@ -82,6 +95,7 @@ void SharedTexts::clear()
     const std::lock_guard<std::mutex> lock(m_mutex);
     m_index.clear();
     m_items.clear();
+    m_seen = {};
     m_cost = 0;
 }
 

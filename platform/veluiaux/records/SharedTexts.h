@@ -8,6 +8,7 @@
 #include <QByteArray>
 #include <QHash>
 
+#include <array>
 #include <cstddef>
 #include <list>
 #include <mutex>
@@ -17,8 +18,9 @@
  * The texts of the files read last, so that records of one unchanged file share one.
  *
  * A text is given out while the file has the stamp it was read with, and only files whose
- * stamp was settled then are kept. Of the least recently used ones as many are forgotten as
- * it takes to stay within the limit. May be used from any thread.
+ * stamp was settled then are kept. That begins when a path is read for the second time: most
+ * entries of a menu are read once, for the name and the icon of a row. Of the least recently used ones as
+ * many are forgotten as it takes to stay within the limit. May be used from any thread.
  */
 class SharedTexts
 {
@@ -31,8 +33,8 @@ public:
 
     static SharedTexts &instance();
 
-    /// The text of \a path: the one that is known while the file is as it was, else what \a read
-    /// gives, which is kept for the next time if its stamp is settled.
+    /// The text of \a path: the one that is known while the file is as it was, or was read ahead,
+    /// else what \a read gives. From the second time on it is kept if its stamp is settled.
     std::optional<FileText> findOrRead(const QByteArray &path, Reader read);
     /// The text of \a path if it is known and the file still as it was.
     std::optional<FileText> find(const QByteArray &path);
@@ -53,10 +55,12 @@ private:
     };
     using Items = std::list<Item>; // the most recently used first
 
+    bool isKnown(const QByteArray &path);
     void forget(Items::iterator item);
 
     mutable std::mutex m_mutex;
     Items m_items;
     QHash<QByteArray, Items::iterator> m_index;
     std::size_t m_cost = 0;
+    std::array<std::size_t, 4096> m_seen{}; // hashes of paths that were read before
 };
