@@ -27,17 +27,19 @@ QString textOf(const QString &directory)
                    "This menu is empty. Press %1 for a new entry, or right-click here "
                    "for what else can be added.")
             .arg(newKey);
-    // As the button reads.
+    // As the menu reads.
     const QString build = QCoreApplication::translate("VelMenuView", "Default menu...");
     return (StartMenu::isAnyApplicationInstalled()
                 ? QCoreApplication::translate(
                     "VelMenuView",
-                    "This menu is empty. Press '%2' to fill it with the applications "
-                    "that are installed, or %1 for a new entry.")
+                    "This menu is empty. Right-click here and choose '%2' to fill it "
+                    "with the applications that are installed, or press %1 for a new "
+                    "entry.")
                 : QCoreApplication::translate(
                     "VelMenuView",
                     "This menu is empty, because no application was found that is installed. Once there "
-                    "is one, press '%2'. Until then, press %1 for an entry of your own."))
+                    "is one, right-click here and choose '%2'. Until then, press %1 for an entry of your "
+                    "own."))
         .arg(newKey, build);
 }
 

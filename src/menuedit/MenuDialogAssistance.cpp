@@ -7,6 +7,7 @@
 #include "MessageLine.h"
 #include "OnDisk.h"
 #include "OpenedMenus.h"
+#include "ToolBarExtension.h"
 #include "ToolBarFocus.h"
 #include "VelMenuView.h"
 #include "VelMenuViewPrivate.h"
@@ -32,6 +33,7 @@ MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout,
     , m_view(view)
     , m_isEditable(toolBar)
     , m_toolBarFocus(toolBar ? std::make_unique<ToolBarFocus>(toolBar, view) : nullptr)
+    , m_toolBarExtension(toolBar ? std::make_unique<ToolBarExtension>(toolBar) : nullptr)
     , m_filterBar(std::make_unique<MenuFilterBar>(view, dialog))
     , m_message(std::make_unique<MessageLine>(dialog))
 {

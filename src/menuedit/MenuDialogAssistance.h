@@ -9,6 +9,7 @@
 
 class MenuFilterBar;
 class MessageLine;
+class ToolBarExtension;
 class ToolBarFocus;
 class QAction;
 class QDialog;
@@ -49,6 +50,7 @@ private:
     VelMenuView *const m_view;
     const bool m_isEditable;
     std::unique_ptr<ToolBarFocus> m_toolBarFocus;
+    std::unique_ptr<ToolBarExtension> m_toolBarExtension;
     std::unique_ptr<MenuFilterBar> m_filterBar;
     std::unique_ptr<MessageLine> m_message;
 };

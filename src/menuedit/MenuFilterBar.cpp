@@ -5,17 +5,17 @@
 
 #include "VelMenuView.h"
 
+#include <QCheckBox>
 #include <QCoreApplication>
 #include <QHBoxLayout>
 #include <QKeyEvent>
 #include <QLineEdit>
-#include <QPushButton>
 
 MenuFilterBar::MenuFilterBar(VelMenuView *view, QWidget *parent)
     : QWidget(parent)
     , m_view(view)
     , m_line(new QLineEdit(this))
-    , m_hiddenButton(new QPushButton(QCoreApplication::translate("VelMenuDialog", "Show hidden"), this))
+    , m_hiddenButton(new QCheckBox(QCoreApplication::translate("VelMenuDialog", "Show hidden"), this))
 {
     setObjectName(QStringLiteral("filterBar"));
     m_line->setObjectName(QStringLiteral("filterEdit"));
@@ -24,8 +24,6 @@ MenuFilterBar::MenuFilterBar(VelMenuView *view, QWidget *parent)
     m_line->setAccessibleName(QCoreApplication::translate("VelMenuDialog", "Filter"));
     m_line->setClearButtonEnabled(true);
     m_hiddenButton->setObjectName(QStringLiteral("hiddenButton"));
-    m_hiddenButton->setCheckable(true);
-    m_hiddenButton->setAutoDefault(false);
     m_hiddenButton->setToolTip(
         QCoreApplication::translate("VelMenuDialog", "Also show the entries that the menu leaves out"));
 
@@ -37,7 +35,7 @@ MenuFilterBar::MenuFilterBar(VelMenuView *view, QWidget *parent)
     // Before the view has to say anything about it.
     connect(m_line, &QLineEdit::textChanged, this, &MenuFilterBar::textChanged);
     connect(m_line, &QLineEdit::textChanged, m_view, &VelMenuView::setFilter);
-    connect(m_hiddenButton, &QPushButton::toggled, m_view, &VelMenuView::setHiddenShown);
+    connect(m_hiddenButton, &QCheckBox::toggled, m_view, &VelMenuView::setHiddenShown);
     m_line->installEventFilter(this);
     m_view->installEventFilter(this);
 }

@@ -6,7 +6,7 @@
 #include <QWidget>
 
 class QLineEdit;
-class QPushButton;
+class QCheckBox;
 class VelMenuView;
 
 /**
@@ -44,5 +44,5 @@ private:
 
     VelMenuView *const m_view;
     QLineEdit *m_line;
-    QPushButton *m_hiddenButton;
+    QCheckBox *m_hiddenButton;
 };

@@ -299,14 +299,14 @@ void tst_MenuComfortByHand::tellsWhyTheStartMenuIsEmpty_data()
     QTest::addColumn<QByteArray>("keys"); // of the one application
     QTest::addColumn<QString>("text");
     const QString none = QStringLiteral("This menu is empty, because no application was found that is "
-                                        "installed. Once there is one, press 'Default menu...'. Until then, "
-                                        "press Ctrl+N for an entry of your own.");
+                                        "installed. Once there is one, right-click here and choose 'Default "
+                                        "menu...'. Until then, press Ctrl+N for an entry of your own.");
     QTest::newRow("no application") << QByteArray() << none;
     QTest::newRow("one that no menu shows") << QByteArray("Exec=true\nNoDisplay=true\n") << none;
     QTest::newRow("an application")
         << QByteArray("Exec=true\n")
-        << QStringLiteral("This menu is empty. Press 'Default menu...' to fill it with the applications that "
-                          "are installed, or Ctrl+N for a new entry.");
+        << QStringLiteral("This menu is empty. Right-click here and choose 'Default menu...' to fill it with "
+                          "the applications that are installed, or press Ctrl+N for a new entry.");
 }
 
 void tst_MenuComfortByHand::tellsWhyTheStartMenuIsEmpty()

@@ -12,6 +12,7 @@
 
 #include <QAccessible>
 #include <QAction>
+#include <QCheckBox>
 #include <QDialogButtonBox>
 #include <QLabel>
 #include <QLineEdit>
@@ -19,6 +20,7 @@
 #include <QPushButton>
 #include <QScopeGuard>
 #include <QSignalSpy>
+#include <QToolButton>
 #include <QVBoxLayout>
 
 #include <private/qguiapplication_p.h>
@@ -57,6 +59,7 @@ private Q_SLOTS:
     void tellsWhatTheViewTells();
     void tellsWhyTheMenuCannotBeChanged();
     void helpsWhoPicksToo();
+    void showsTheArrowOfTheToolBarInDarkColors();
     void takesBackWhatItTells();
     void takesBackTheDonePartOfWhatFailed_data();
     void takesBackTheDonePartOfWhatFailed();
@@ -137,7 +140,7 @@ void tst_MenuDialogAssistance::isReachedByTheTabKey()
     writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
     openAssisted(1);
     QTRY_VERIFY(view().hasFocus());
-    auto *hidden = dialog()->findChild<QPushButton *>(QStringLiteral("hiddenButton"));
+    auto *hidden = dialog()->findChild<QCheckBox *>(QStringLiteral("hiddenButton"));
     auto *close = dialog()->findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Close);
     XDoTool::press(QStringLiteral("shift+Tab"));
     QTRY_VERIFY(hidden->hasFocus());
@@ -197,7 +200,7 @@ void tst_MenuDialogAssistance::showsHiddenEntries()
     writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
     writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"), "Exec=true\nHidden=true\n");
     openAssisted(1);
-    auto *button = dialog()->findChild<QPushButton *>(QStringLiteral("hiddenButton"));
+    auto *button = dialog()->findChild<QCheckBox *>(QStringLiteral("hiddenButton"));
     QCOMPARE(button->text(), QStringLiteral("Show hidden"));
     QVERIFY(button->isCheckable() && !button->isChecked());
     XDoTool::click(button);
@@ -300,6 +303,30 @@ void tst_MenuDialogAssistance::helpsWhoPicksToo()
     QTRY_COMPARE(pickerView->selectedPath(), b);
     QVERIFY(picker.findChild<QDialogButtonBox *>()->button(QDialogButtonBox::Ok)->isEnabled());
     QVERIFY(picker.findChild<QLabel *>(QStringLiteral("messageLabel"))->text().isEmpty());
+}
+
+void tst_MenuDialogAssistance::showsTheArrowOfTheToolBarInDarkColors()
+{
+    openAssisted(0);
+    auto *arrow = dialog()->findChild<QToolButton *>(QStringLiteral("qt_toolbar_ext_button"));
+    QVERIFY(arrow);
+    const auto colors = [arrow] {
+        const QImage image = arrow->icon().pixmap(arrow->iconSize()).toImage();
+        QSet<QRgb> found;
+        for (int x = 0; x < image.width(); ++x) {
+            for (int y = 0; y < image.height(); ++y) {
+                if (image.pixelColor(x, y).alpha() > 0)
+                    found.insert(image.pixelColor(x, y).rgb());
+            }
+        }
+        return found;
+    };
+    for (const QColor &text : {QColor(Qt::white), QColor(Qt::black)}) {
+        QPalette palette = dialog()->palette();
+        palette.setColor(QPalette::ButtonText, text);
+        dialog()->setPalette(palette);
+        QTRY_COMPARE(colors(), QSet<QRgb>{text.rgb()});
+    }
 }
 
 void tst_MenuDialogAssistance::takesBackWhatItTells()
