@@ -15,6 +15,7 @@
 #include <QFile>
 
 #include <algorithm>
+#include <cerrno>
 
 namespace fs = std::filesystem;
 
@@ -138,7 +139,16 @@ bool MenuExecution::run(const Save &save)
     updateOrders();
     removeFolders();
     updateRootOrder();
+    errno = m_reason;
     return m_isDone;
+}
+
+// What is done is done; of what is not, the first reason is told.
+bool MenuExecution::noted(bool isDone)
+{
+    if (!isDone && m_reason == 0)
+        m_reason = errno;
+    return isDone;
 }
 
 void MenuExecution::removeLeftovers()
@@ -186,7 +196,8 @@ void MenuExecution::makeFolder(const std::string &name)
     for (const MenuStep *step : steps)
         names.append(decoded(nameOf(step->to.place)));
     const CategoryFolder folder(m_menu, name);
-    if (!folder.make(names))
+    errno = 0;
+    if (!noted(folder.make(names)))
         return; // and none of these steps can be done
     m_sources->folders[name] = folder.newDigest();
     m_folders.come.insert(name);
@@ -195,10 +206,12 @@ void MenuExecution::makeFolder(const std::string &name)
 
 bool MenuExecution::carryOut(const MenuStep &step)
 {
+    errno = 0;
     if (change(step)) {
         noteDone(step);
         return true;
     }
+    const int reason = errno;
     // It is the user's now, who may have changed it just at this moment; else it stays to be done.
     const bool isTouched =
         !step.from.place.empty() && fileDigest(m_menu / step.from.place) != step.from.digest;
@@ -206,7 +219,8 @@ bool MenuExecution::carryOut(const MenuStep &step)
         m_sources->entries.erase(step.id);
     else
         m_sources->entries[step.id] = {step.from, {}, false};
-    return isTouched;
+    errno = reason;
+    return noted(isTouched);
 }
 
 bool MenuExecution::change(const MenuStep &step) const
@@ -247,8 +261,9 @@ void MenuExecution::updateOrders()
         const auto isBefore = [&order](const QString &left, const QString &right) {
             return order.isBefore(left, right);
         };
-        m_isDone =
-            MenuOrder::update(folder, decoded(children.gone), decoded(children.come), isBefore) && m_isDone;
+        errno = 0;
+        m_isDone = noted(MenuOrder::update(folder, decoded(children.gone), decoded(children.come), isBefore))
+            && m_isDone;
     }
 }
 
@@ -274,6 +289,8 @@ void MenuExecution::updateRootOrder()
         (CategoryFolder(m_menu, name).exists() ? m_folders.come : m_folders.gone).insert(name);
     if (m_folders.gone.empty() && m_folders.come.empty())
         return;
-    m_isDone = MenuOrder::update(m_menu, decoded(m_folders.gone), decoded(m_folders.come), isCategoryBefore)
+    errno = 0;
+    m_isDone =
+        noted(MenuOrder::update(m_menu, decoded(m_folders.gone), decoded(m_folders.come), isCategoryBefore))
         && m_isDone;
 }

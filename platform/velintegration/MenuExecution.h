@@ -28,7 +28,7 @@ public:
 
     /// Whether there is anything to do.
     bool isNeeded() const;
-    /// Does it; false when something could not be done.
+    /// Does it; false when something could not be done, why is in errno then, or 0.
     bool run(const Save &save);
     /// Whether the menu is another one now.
     bool hasChanged() const { return m_hasChanged; }
@@ -40,7 +40,6 @@ private:
         std::set<std::string> come;
     };
 
-    void note(const MenuPlan &plan);
     void adoptFolders();
     void makeFolders();
     void makeFolder(const std::string &name);
@@ -51,6 +50,7 @@ private:
     void updateOrders();
     void removeFolders();
     void updateRootOrder();
+    bool noted(bool isDone);
 
     std::filesystem::path m_menu;
     const MenuPlan &m_plan;
@@ -59,5 +59,6 @@ private:
     std::map<std::string, Children> m_children; // by folder
     Children m_folders;
     bool m_isDone = true;
+    int m_reason = 0; // why not
     bool m_hasChanged = false;
 };

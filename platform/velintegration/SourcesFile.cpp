@@ -148,7 +148,9 @@ bool SourcesFile::write(const std::string &bytes)
     const std::string path = (m_path.parent_path() / ("." + m_path.filename().string() + ".new")).string();
     const int file = makeReplacement(path, bytes);
     if (file < 0 || rename(path.c_str(), m_path.c_str()) != 0) {
+        const int reason = errno;
         unlink(path.c_str());
+        errno = reason;
         if (file >= 0)
             close(file);
         return false;
@@ -171,6 +173,8 @@ int SourcesFile::makeReplacement(const std::string &path, const std::string &byt
     // As private as the one before.
     if (isWritten && fchmod(file, status.st_mode & (S_IRUSR | S_IWUSR | S_IRGRP | S_IROTH)) == 0)
         return file;
+    const int reason = errno;
     close(file);
+    errno = reason;
     return -1;
 }

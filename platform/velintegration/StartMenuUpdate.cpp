@@ -101,7 +101,7 @@ Result StartMenuUpdate::follow() const
 {
     SourcesFile file(m_menu);
     const ApplicationsLook look = ApplicationsLook::now();
-    errno = ENODATA;
+    errno = look.found.all.empty() ? ENODATA : 0;
     if (look.found.all.empty() || !file.lock())
         return Result::Failed;
     if (file.isAlone())
@@ -116,10 +116,12 @@ Result StartMenuUpdate::follow() const
     sources.stamps.clear();
     const Result result =
         carryOut(MenuPlan::of(memory, look.found.all, menu), look.found.all, &sources, &file);
+    const int reason = errno;
     if (result != Result::Failed)
         NewMenu::setStamps(m_menu, look, &sources);
     if (!remember(sources, &file))
         return Result::Failed;
+    errno = reason;
     return result == Result::Unchanged ? ended : result;
 }
 
@@ -145,5 +147,7 @@ Result StartMenuUpdate::carryOut(const MenuPlan &plan, const std::vector<MenuApp
 bool StartMenuUpdate::remember(const MenuSources &sources, SourcesFile *file)
 {
     const std::string text = sources.toText();
-    return text == file->read() || file->write(text);
+    const bool isThere = text == file->read();
+    errno = 0;
+    return isThere || file->write(text);
 }

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OrdinaryUser.h"
 #include "StartMenuUpdateTestCase.h"
 
 #include <QProcess>
@@ -19,6 +20,9 @@ private Q_SLOTS:
     void explainsItself();
     void refusesWhatItDoesNotKnow();
     void tellsThatNoApplicationIsInstalled();
+    void tellsWhyTheMenuCannotBeUpdated_data();
+    void tellsWhyTheMenuCannotBeUpdated();
+    void tellsOnceInAWatchWhatIsWrong();
     void updatesTheMenuOnce();
     void updatesAnotherMenu();
     void tellsTheWindowManagerOfAChange();
@@ -35,7 +39,7 @@ private Q_SLOTS:
 private:
     struct Outcome
     {
-        int status;
+        int status = -1;
         QByteArray out;
         QByteArray errors;
     };
@@ -98,8 +102,69 @@ void tst_vel_menusync::tellsThatNoApplicationIsInstalled()
     const Outcome outcome = run({});
     QCOMPARE(outcome.status, 1);
     QCOMPARE(outcome.errors.count('\n'), 1);
-    QVERIFY2(outcome.errors.contains("no application is installed"), outcome.errors.constData());
+    QCOMPARE(outcome.errors, QByteArray("vel-menusync: no application is installed\n"));
     QVERIFY(!QFile::exists(path(QStringLiteral("config"))));
+}
+
+void tst_vel_menusync::tellsWhyTheMenuCannotBeUpdated_data()
+{
+    QTest::addColumn<QString>("closed");
+    QTest::addColumn<bool>("hasMenu");
+    QTest::addColumn<QByteArray>("reason");
+    QTest::newRow("no new menu") << "config/vel" << false << QByteArray("Permission denied");
+    QTest::newRow("no memory") << "config/vel" << true << QByteArray("Permission denied");
+    QTest::newRow("no new entry") << "config/vel/startmenu/Game" << true << QByteArray("Permission denied");
+    QTest::newRow("no new folder") << "config/vel/startmenu" << true << QByteArray("Permission denied");
+    QTest::newRow("a file in the way") << "" << false << QByteArray("Not a directory");
+}
+
+void tst_vel_menusync::tellsWhyTheMenuCannotBeUpdated()
+{
+    QFETCH(QString, closed);
+    QFETCH(bool, hasMenu);
+    QFETCH(QByteArray, reason);
+    if (closed.isEmpty())
+        write(QStringLiteral("config/vel/startmenu"), "in the way");
+    install(QStringLiteral("a.desktop"), "Game;");
+    QDir().mkpath(path(QStringLiteral("config/vel")));
+    if (hasMenu)
+        QCOMPARE(run({}).status, 0);
+    install(QStringLiteral("b.desktop"), "Game;");
+    install(QStringLiteral("c.desktop"), "Office;");
+    Outcome outcome;
+    if (!closed.isEmpty())
+        QVERIFY(QFile::setPermissions(path(closed), QFile::ReadOwner | QFile::ExeOwner));
+    {
+        const OrdinaryUser user(folder());
+        outcome = run({});
+    }
+    if (!closed.isEmpty())
+        QVERIFY(QFile::setPermissions(path(closed), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner));
+    QCOMPARE(outcome.status, 1);
+    QCOMPARE(outcome.errors,
+             "vel-menusync: cannot update the start menu " + QFile::encodeName(menu()) + ": " + reason
+                 + '\n');
+}
+
+void tst_vel_menusync::tellsOnceInAWatchWhatIsWrong()
+{
+    QDir().mkpath(path(QStringLiteral("home/applications")));
+    QProcess program;
+    watch(program);
+    QByteArray errors;
+    const auto hasSaid = [&](const QByteArray &text) {
+        errors += program.readAllStandardError();
+        return errors == text;
+    };
+    const QByteArray text = "vel-menusync: no application is installed\n";
+    TRY_VERIFY(hasSaid(text));
+    write(QStringLiteral("home/applications/no-entry"), "x");
+    install(QStringLiteral("a.desktop"), "Game;");
+    TRY_VERIFY(shows("Game/a.desktop"));
+    uninstall(QStringLiteral("a.desktop"));
+    TRY_VERIFY(hasSaid(text + text));
+    program.terminate();
+    QVERIFY(program.waitForFinished(20000));
 }
 
 void tst_vel_menusync::updatesTheMenuOnce()

@@ -9,7 +9,9 @@
 #include <velintegration/startmenufollowing.h>
 #include <velintegration/wmcommand.h>
 
+#include <cerrno>
 #include <cstdio>
+#include <cstring>
 #include <string>
 
 #include <X11/Xlib.h>
@@ -40,26 +42,42 @@ void tellWindowManager(const std::string &menu)
         XCloseDisplay(display);
 }
 
-bool update(const std::string &menu, Look look)
+std::string reasonOf(int error, const std::string &menu)
 {
-    const Result result = VelStartMenu::update(menu.c_str(), nullptr, look);
-    if (result == Result::Changed)
-        tellWindowManager(menu);
-    return result != Result::Failed;
+    if (error == ENODATA)
+        return "no application is installed";
+    const std::string text = "cannot update the start menu " + menu;
+    return error == 0 ? text : text + ": " + std::strerror(error);
 }
 
-// What cannot be done now may be possible later, so it is tried again at the next change.
+// Why the menu could not be updated; empty when it was.
+std::string update(const std::string &menu, Look look)
+{
+    const Result result = VelStartMenu::update(menu.c_str(), nullptr, look);
+    if (result == Result::Failed)
+        return reasonOf(errno, menu);
+    if (result == Result::Changed)
+        tellWindowManager(menu);
+    return {};
+}
+
+// What cannot be done now may be possible later, so it is tried again at the next change; why, is said once.
 int watch(const std::string &menu)
 {
-    const auto follow = [&menu] { update(menu, Look::Files); };
+    std::string said;
+    const auto follow = [&menu, &said] {
+        const std::string reason = update(menu, Look::Files);
+        if (!reason.empty() && reason != said)
+            fail(reason);
+        said = reason;
+    };
     return MenuWatch(follow).run() ? 0 : fail("cannot watch the folders of the applications");
 }
 
 int updateOnce(const std::string &menu)
 {
-    return update(menu, Look::Folders)
-        ? 0
-        : fail("cannot update the start menu " + menu + ", or no application is installed");
+    const std::string reason = update(menu, Look::Folders);
+    return reason.empty() ? 0 : fail(reason);
 }
 
 } // namespace

@@ -55,6 +55,6 @@ VELINTEGRATION_EXPORT bool CreateStartMenu(const char *menuDir, const char *temp
  * @param menuDir the folder of the menu; see CreateStartMenu()
  * @param templateDir what is copied where there is no menu yet; may be null or empty
  * @return false when no application is installed, which changes nothing and for which errno is ENODATA,
- *         or not everything could be done
+ *         or not everything could be done; errno tells why then, 0 where no reason is known
  */
 VELINTEGRATION_EXPORT bool UpdateStartMenu(const char *menuDir, const char *templateDir);

@@ -26,7 +26,7 @@ enum class Look {
 
 /// What came of an update.
 enum class Result {
-    Failed, ///< not everything could be done, or no application was found
+    Failed, ///< not everything could be done, or no application was found; errno tells why
     Unchanged, ///< the menu was as it should be
     Changed ///< the menu has changed
 };
