@@ -15,7 +15,7 @@ constexpr Format Formats[] = {
     {"icewm", true, false, true, MenuFormat::icewm, MenuFormat::icewmText},
     {"json", false, false, false, MenuFormat::json, nullptr},
     {"jwm", true, false, false, MenuFormat::jwm, MenuFormat::jwmText},
-    {"labwc", true, false, false, MenuFormat::openbox, MenuFormat::openboxText},
+    {"labwc", true, false, false, MenuFormat::labwc, MenuFormat::openboxText},
     {"openbox", true, false, false, MenuFormat::openbox, MenuFormat::openboxText},
     {"rofi", true, false, false, MenuFormat::rofi, nullptr},
     {"text", false, false, false, MenuFormat::text, nullptr},

@@ -28,10 +28,13 @@ const Format *find(const QString &name);
 /// The names of all, in alphabetical order.
 QStringList names();
 
-/// A pipe menu of the Openbox window manager, which labwc reads as well; an item runs through vel-open.
+/// A pipe menu of the Openbox window manager; an item runs through vel-open.
 QByteArray openbox(const MenuItem &menu);
 /// The same with nothing in it but a text.
 QByteArray openboxText(const QString &text);
+
+/// The same for the window manager labwc, in whose labels an underscore is nothing but itself.
+QByteArray labwc(const MenuItem &menu);
 
 /// What stands between "begin" and "end" in a menu file of the Fluxbox window manager.
 QByteArray fluxbox(const MenuItem &menu);

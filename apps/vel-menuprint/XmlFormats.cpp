@@ -41,7 +41,10 @@ void writeIcon(QXmlStreamWriter *xml, const MenuItem &item)
         xml->writeAttribute(QStringLiteral("icon"), writable(item.icon));
 }
 
-void writeOpenbox(QXmlStreamWriter *xml, const QVector<MenuItem> &items)
+// What a name becomes as a label of a pipe menu.
+using LabelOf = QString (*)(const QString &name);
+
+void writePipeMenu(QXmlStreamWriter *xml, const QVector<MenuItem> &items, LabelOf labelOf)
 {
     for (const MenuItem &item : items) {
         if (item.kind == MenuItem::Separator) {
@@ -52,10 +55,10 @@ void writeOpenbox(QXmlStreamWriter *xml, const QVector<MenuItem> &items)
         xml->writeStartElement(isFolder ? QStringLiteral("menu") : QStringLiteral("item"));
         if (isFolder)
             xml->writeAttribute(QStringLiteral("id"), writable(item.path)); // unique, as Openbox asks for
-        xml->writeAttribute(QStringLiteral("label"), labelWithoutMark(item.name));
+        xml->writeAttribute(QStringLiteral("label"), labelOf(item.name));
         writeIcon(xml, item);
         if (isFolder) {
-            writeOpenbox(xml, item.children);
+            writePipeMenu(xml, item.children, labelOf);
         } else {
             xml->writeStartElement(QStringLiteral("action"));
             xml->writeAttribute(QStringLiteral("name"), QStringLiteral("Execute"));
@@ -99,12 +102,22 @@ QByteArray document(const QString &root, Write write)
     return out;
 }
 
+QByteArray pipeMenu(const MenuItem &menu, LabelOf labelOf)
+{
+    return document(QStringLiteral("openbox_pipe_menu"),
+                    [&menu, labelOf](QXmlStreamWriter *xml) { writePipeMenu(xml, menu.children, labelOf); });
+}
+
 } // namespace
 
 QByteArray MenuFormat::openbox(const MenuItem &menu)
 {
-    return document(QStringLiteral("openbox_pipe_menu"),
-                    [&menu](QXmlStreamWriter *xml) { writeOpenbox(xml, menu.children); });
+    return pipeMenu(menu, labelWithoutMark);
+}
+
+QByteArray MenuFormat::labwc(const MenuItem &menu)
+{
+    return pipeMenu(menu, label);
 }
 
 QByteArray MenuFormat::openboxText(const QString &text)

@@ -85,6 +85,7 @@ private Q_SLOTS:
     void printsAMenuForFluxbox();
     void printsAMenuForIcewm();
     void printsAMenuForJwm();
+    void doublesAnUnderscoreOnlyWhereItMarksALetter();
     void leavesOutPathsOfSeveralLines();
     void printsATextInThePlaceOfAMenu_data();
     void printsATextInThePlaceOfAMenu();
@@ -113,7 +114,7 @@ void tst_MenuFormat::knowsItsFormats()
     QCOMPARE(MenuFormat::names().join(QLatin1Char(' ')),
              QStringLiteral("dmenu fluxbox icewm json jwm labwc openbox rofi text"));
     QVERIFY(!MenuFormat::find(QStringLiteral("yaml")));
-    QVERIFY(MenuFormat::find(QStringLiteral("labwc"))->print == MenuFormat::openbox);
+    QVERIFY(MenuFormat::find(QStringLiteral("labwc"))->printText == MenuFormat::openboxText);
     for (const char *name : {"json", "text"})
         QVERIFY(!MenuFormat::find(QLatin1String(name))->isForStarting);
 }
@@ -319,6 +320,16 @@ void tst_MenuFormat::printsAMenuForJwm()
                           QStringLiteral("Program|A_b & <c>|/icons/a.png"),
                           QStringLiteral("vel-open --exec '/m/it'\"'\"'s $x \"y\" \\z}.desktop'"),
                           QStringLiteral("Separator||")}));
+}
+
+void tst_MenuFormat::doublesAnUnderscoreOnlyWhereItMarksALetter()
+{
+    const MenuItem menu = menuFolder(
+        QStringLiteral("menu"), {menuFolder(QStringLiteral("F_g"), {entry(QStringLiteral("A_b"), Quoted)})});
+    QByteArray openbox = MenuFormat::openbox(menu);
+    QVERIFY(openbox.contains("label=\"F__g\""));
+    QVERIFY(openbox.contains("label=\"A__b\""));
+    QCOMPARE(MenuFormat::labwc(menu), openbox.replace("__", "_"));
 }
 
 void tst_MenuFormat::leavesOutPathsOfSeveralLines()
