@@ -15,7 +15,8 @@ constexpr Settings AllSettings[] = {
      true},
     {"icewm", "", false},
     {"jwm", "", false},
-    {"labwc", "", false},
+    // labwc asks for a menu inside another each time, but for the root menu only when it is configured.
+    {"labwc", "labwc --reconfigure", false},
     {"openbox", "openbox --reconfigure", false},
 };
 

@@ -58,6 +58,7 @@ private Q_SLOTS:
     void leavesItsCommandsRunningWhenItEnds();
     void keepsTheChannelWhenOthersDestroyItsWindow();
     void keepsTheChannelWhenALossIsOnlySent();
+    void doesWhatAWindowManagerNeeds_data();
     void doesWhatAWindowManagerNeeds();
     void prefersTheCommandThatIsGiven();
     void preparesTheMenuOfFluxboxAtTheStart();
@@ -345,10 +346,18 @@ void tst_vel_wmbridge::provide(const char *name, const QString &commands)
     m_bridge.setProcessEnvironment(environment);
 }
 
+void tst_vel_wmbridge::doesWhatAWindowManagerNeeds_data()
+{
+    QTest::addColumn<QString>("manager");
+    QTest::newRow("labwc") << QStringLiteral("labwc");
+    QTest::newRow("openbox") << QStringLiteral("openbox");
+}
+
 void tst_vel_wmbridge::doesWhatAWindowManagerNeeds()
 {
-    provide("openbox", QStringLiteral("echo \"$@\" >>'%1'").arg(log()));
-    start({QStringLiteral("--for"), QStringLiteral("openbox")});
+    QFETCH(QString, manager);
+    provide(manager.toLatin1(), QStringLiteral("echo \"$@\" >>'%1'").arg(log()));
+    start({QStringLiteral("--for"), manager});
     QVERIFY(!QFile::exists(log()));
     QVERIFY(send("VELWM_UPDATE_STARTMENU\n"));
     QTRY_COMPARE_WITH_TIMEOUT(logged(), QByteArrayList{"--reconfigure"}, 20000);
