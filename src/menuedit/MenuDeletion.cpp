@@ -154,7 +154,7 @@ void MenuDeletion::putAway(const QStringList &paths, Outcome *outcome)
         return;
     outcome->isChanged = !gone.isEmpty();
     forget(gone);
-    outcome->isStep = m_history.add(recorder, deleted.text(), gone);
+    outcome->subject = m_history.add(recorder, deleted.text(), gone);
 }
 
 // What may not be taken from its folder is not asked about, nor what has gone by itself.
@@ -233,7 +233,7 @@ void MenuDeletion::tellWhatStays(const QStringList &paths, const Outcome &outcom
     if (!texts.isEmpty())
         m_voice.tell(texts.join(QLatin1Char('\n')),
                      outcome.complaints.isEmpty() ? MenuVoice::Warning : MenuVoice::Failure,
-                     m_view->currentIndex(), outcome.isStep);
+                     m_view->currentIndex(), outcome.subject);
 }
 
 QString MenuDeletion::canceledText(const QStringList &paths) const

@@ -3,13 +3,14 @@
 
 #pragma once
 
+#include "MenuVoice.h"
+
 #include <QObject>
 #include <QStringList>
 
 class MenuFind;
 class MenuHistory;
 class MenuSelection;
-class MenuVoice;
 class QTreeView;
 class ShownMenu;
 
@@ -43,7 +44,7 @@ private:
         QStringList complaints; ///< what cannot be deleted, and why
         bool isCanceled = false;
         bool isChanged = false;
-        bool isStep = false; ///< whether any of it can be taken back
+        MenuVoice::Subject subject = MenuVoice::Subject::Other; ///< of what is told in the end
     };
 
     void putAway(const QStringList &paths, Outcome *outcome);

@@ -46,10 +46,7 @@ MenuDialogAssistance::MenuDialogAssistance(QDialog *dialog, QVBoxLayout *layout,
         view->setFocus();
     m_message->setUndoAction(view->undoAction());
     connect(view, &VelMenuView::told, m_message.get(), [this](const QString &text, int kind) {
-        if (VelMenuViewPrivate::voiceOf(*m_view).isRest())
-            m_message->tellRest(text, kind);
-        else
-            m_message->tell(text, kind);
+        m_message->tell(text, kind, VelMenuViewPrivate::voiceOf(*m_view).subject());
     });
     connect(m_filterBar.get(), &MenuFilterBar::textChanged, m_message.get(), &MessageLine::clear);
     takeKeys();

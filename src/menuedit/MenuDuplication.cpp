@@ -132,13 +132,13 @@ void MenuDuplication::duplicate()
     QStringList targets;
     for (const FileTransfer::Item &item : items)
         targets.append(item.target);
-    const bool isStep =
+    const MenuVoice::Subject subject =
         m_history.add(recorder,
                       items.size() == 1 ? StepText(StepText::Kind::Duplicate, name)
                                         : StepText(StepText::Kind::DuplicateItems, QString(), items.size()),
                       targets);
     if (self && !complaints.isEmpty())
-        m_voice.tell(complaints.join(QLatin1Char('\n')), MenuVoice::Failure, QModelIndex(), isStep);
+        m_voice.tell(complaints.join(QLatin1Char('\n')), MenuVoice::Failure, QModelIndex(), subject);
     if (self)
         Q_EMIT changed();
 }

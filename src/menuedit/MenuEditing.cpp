@@ -103,13 +103,13 @@ bool MenuEditing::createNew(FreeName::Kind kind)
                                         "%1 could not be saved. Make sure that the folder %2 may be written "
                                         "and that the disk is not full, then try again.")
                 .arg(path, folder);
-    bool isStep = false;
+    MenuVoice::Subject subject = MenuVoice::Subject::Other;
     if (self)
-        isStep = m_history.add(recorder, StepText(StepText::Kind::Create, m_history.nameOf(path)), {path});
+        subject = m_history.add(recorder, StepText(StepText::Kind::Create, m_history.nameOf(path)), {path});
     if (self)
         Q_EMIT changed();
     if (self && !complaint.isEmpty())
-        m_voice.tell(complaint, MenuVoice::Failure, m_selection.shown(path), isStep);
+        m_voice.tell(complaint, MenuVoice::Failure, m_selection.shown(path), subject);
     return kept;
 }
 

@@ -157,17 +157,17 @@ void MenuHiding::finish(const std::unique_ptr<StepRecorder> &recorder, const QSt
 {
     using Kind = StepText::Kind;
     const QPointer<MenuHiding> self(this);
-    bool isStep = false;
+    MenuVoice::Subject subject = MenuVoice::Subject::Other;
     if (!done.isEmpty()) {
         m_find.clear();
-        isStep = m_history.add(recorder,
-                               done.size() == 1 ? StepText(isShown ? Kind::ShowAgain : Kind::Hide, name)
-                                                : StepText(isShown ? Kind::ShowItemsAgain : Kind::HideItems,
-                                                           QString(), done.size()),
-                               done);
+        subject = m_history.add(recorder,
+                                done.size() == 1 ? StepText(isShown ? Kind::ShowAgain : Kind::Hide, name)
+                                                 : StepText(isShown ? Kind::ShowItemsAgain : Kind::HideItems,
+                                                            QString(), done.size()),
+                                done);
         if (self)
             Q_EMIT changed();
     }
     if (self && !complaints.isEmpty())
-        m_voice.tell(FewLines::of(complaints), MenuVoice::Failure, QModelIndex(), isStep);
+        m_voice.tell(FewLines::of(complaints), MenuVoice::Failure, QModelIndex(), subject);
 }

@@ -109,15 +109,15 @@ std::unique_ptr<StepRecorder> MenuHistory::record() const
     return isOn() ? std::make_unique<StepRecorder>() : nullptr;
 }
 
-bool MenuHistory::add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text,
-                      const QStringList &items)
+MenuVoice::Subject MenuHistory::add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text,
+                                    const QStringList &items)
 {
     FileStep step = recorder && isOn() ? recorder->finish() : FileStep();
     if (step.isEmpty())
-        return false;
+        return MenuVoice::Subject::Other;
     m_stack.push(new StepCommand(std::move(step), text, items));
-    m_voice.tell(text.done(), MenuVoice::Note);
-    return true;
+    m_voice.tell(text.done(), MenuVoice::Note, QModelIndex(), MenuVoice::Subject::Step);
+    return MenuVoice::Subject::Rest;
 }
 
 QString MenuHistory::nameOf(const QString &path) const
@@ -179,7 +179,8 @@ void MenuHistory::finish(const StepCommand &command, bool isUndo)
     m_find.clear();
     Q_EMIT changed();
     if (self)
-        m_voice.tell(QCoreApplication::translate("MenuHistory", "Done: %1").arg(text), MenuVoice::Note);
+        m_voice.tell(QCoreApplication::translate("MenuHistory", "Done: %1").arg(text), MenuVoice::Note,
+                     QModelIndex(), isUndo ? MenuVoice::Subject::Other : MenuVoice::Subject::Step);
 }
 
 Refusal MenuHistory::follow(FileStep &step, bool isUndo) const

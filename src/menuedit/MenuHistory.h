@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "MenuVoice.h"
 #include "StepText.h"
 
 #include <QObject>
@@ -15,7 +16,6 @@
 class FileStep;
 class MenuFind;
 class MenuSelection;
-class MenuVoice;
 class QAction;
 class QShortcut;
 class QTreeView;
@@ -55,9 +55,10 @@ public:
      *
      * @param items the paths of what it was done to, where it was or is: what there is of them is
      *        selected when it was undone or done again
-     * @return whether there is such a step
+     * @return what else is told of the operation has this to do with the step
      */
-    bool add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text, const QStringList &items);
+    MenuVoice::Subject add(const std::unique_ptr<StepRecorder> &recorder, const StepText &text,
+                           const QStringList &items);
     /// The shown name of the item at \a path.
     QString nameOf(const QString &path) const;
 

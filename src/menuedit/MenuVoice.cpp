@@ -16,14 +16,14 @@ MenuVoice::MenuVoice(QAbstractItemView *view, std::function<bool()> isHeard)
 
 MenuVoice::~MenuVoice() = default;
 
-void MenuVoice::tell(const QString &text, Kind kind, const QModelIndex &at, bool isRest)
+void MenuVoice::tell(const QString &text, Kind kind, const QModelIndex &at, Subject subject)
 {
     const QPointer<MenuVoice> self(this);
-    m_isRest = isRest;
+    m_subject = subject;
     if (m_isHeard())
         Q_EMIT told(text, kind);
     else if (kind != Note)
         m_tip.show(text, at);
     if (self)
-        m_isRest = false;
+        m_subject = Subject::Other;
 }

@@ -30,6 +30,13 @@ public:
         Failure = 2 ///< Something was not done.
     };
 
+    /// What a text has to do with the step that was done last, which can be taken back.
+    enum class Subject {
+        Other, ///< nothing
+        Step, ///< It tells of that step.
+        Rest ///< It tells what was left of that step, of which was told before.
+    };
+
     /// For \a view; \a isHeard tells whether anybody listens to told().
     MenuVoice(QAbstractItemView *view, std::function<bool()> isHeard);
     ~MenuVoice() override;
@@ -40,13 +47,13 @@ public:
      * Whoever listens may delete the view.
      *
      * @param at the item of the view that it is about; invalid for none
-     * @param isRest whether it is what was not done of something whose other part was done, was told of
-     *        in a note, and can be taken back
+     * @param subject what the text has to do with what can be taken back
      */
-    void tell(const QString &text, Kind kind, const QModelIndex &at = QModelIndex(), bool isRest = false);
+    void tell(const QString &text, Kind kind, const QModelIndex &at = QModelIndex(),
+              Subject subject = Subject::Other);
 
-    /// Whether what is being told is the rest of something; who shows one text at a time keeps the note.
-    bool isRest() const { return m_isRest; }
+    /// What is being told has to do with it.
+    Subject subject() const { return m_subject; }
 
 Q_SIGNALS:
     void told(const QString &text, int kind);
@@ -54,5 +61,5 @@ Q_SIGNALS:
 private:
     const std::function<bool()> m_isHeard;
     ReadableTip m_tip;
-    bool m_isRest = false;
+    Subject m_subject = Subject::Other;
 };

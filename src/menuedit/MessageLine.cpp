@@ -34,6 +34,8 @@ MessageLine::MessageLine(QWidget *parent)
     m_label->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
     m_button->setObjectName(QStringLiteral("messageUndoButton"));
     m_button->setAutoDefault(false);
+    // A click leaves the keyboard where it is.
+    m_button->setFocusPolicy(Qt::TabFocus);
     // The tree must not move up and down with what is told.
     QSizePolicy policy = m_button->sizePolicy();
     policy.setRetainSizeWhenHidden(true);
@@ -53,25 +55,12 @@ MessageLine::MessageLine(QWidget *parent)
 
 MessageLine::~MessageLine() = default;
 
-void MessageLine::tell(const QString &text, int kind)
+void MessageLine::tell(const QString &text, int kind, MenuVoice::Subject subject)
 {
+    const bool isRest = subject == MenuVoice::Subject::Rest && m_isUndoable;
     m_isAtRest = false;
-    m_isUndoable = m_hasChanged && kind < Warning;
-    m_hasChanged = false;
-    say(text, kind);
-}
-
-void MessageLine::tellRest(const QString &text, int kind)
-{
-    if (m_isUndoable)
-        say(m_label->text() + QLatin1Char('\n') + text, kind);
-    else
-        tell(text, kind);
-}
-
-void MessageLine::say(const QString &text, int kind)
-{
-    show(text, kind);
+    m_isUndoable = isRest || subject == MenuVoice::Subject::Step;
+    show(isRest ? m_label->text() + QLatin1Char('\n') + text : text, kind);
     QAccessibleEvent event(m_label, QAccessible::Alert);
     QAccessible::updateAccessibility(&event);
 }
@@ -79,6 +68,7 @@ void MessageLine::say(const QString &text, int kind)
 void MessageLine::setTabOrderAfter(QWidget *previous)
 {
     setTabOrder(previous, m_button);
+    m_previous = previous;
 }
 
 void MessageLine::setRest(const QString &text, int kind)
@@ -115,16 +105,18 @@ void MessageLine::setUndoAction(QAction *action)
 {
     m_undo = action;
     if (action)
-        connect(action, &QAction::changed, this, [this] {
-            m_hasChanged = true;
-            updateButton();
-        });
+        connect(action, &QAction::changed, this, &MessageLine::updateButton);
     updateButton();
 }
 
 void MessageLine::updateButton()
 {
-    m_button->setVisible(m_undo && m_isUndoable);
-    m_button->setEnabled(m_undo && m_undo->isEnabled());
+    const bool isOffered = m_undo && m_isUndoable;
+    const bool isEnabled = m_undo && m_undo->isEnabled();
+    // Else the next one would have it, which closes the dialog.
+    if (m_button->hasFocus() && !(isOffered && isEnabled) && m_previous)
+        m_previous->setFocus(Qt::OtherFocusReason);
+    m_button->setVisible(isOffered);
+    m_button->setEnabled(isEnabled);
     m_button->setToolTip(m_undo ? m_undo->toolTip() : QString());
 }

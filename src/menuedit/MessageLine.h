@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "MenuVoice.h"
+
 #include <QPointer>
 #include <QWidget>
 
@@ -23,11 +25,10 @@ public:
     explicit MessageLine(QWidget *parent);
     ~MessageLine() override;
 
-    /// Tells \a text in plain text; \a kind as VelMenuView::told() has it.
-    void tell(const QString &text, int kind);
-    /// Tells \a text below the note that it shows, which can be taken back as before.
-    void tellRest(const QString &text, int kind);
-    /// Has the Tab key come by behind \a previous.
+    /// Tells \a text in plain text; \a kind as VelMenuView::told() has it. The rest of a step stands below
+    /// the note on it.
+    void tell(const QString &text, int kind, MenuVoice::Subject subject);
+    /// Has the Tab key come by behind \a previous, which takes the keyboard back when the button goes.
     void setTabOrderAfter(QWidget *previous);
 
     /// What the line says while there is nothing else to tell; may be empty.
@@ -35,22 +36,21 @@ public:
     /// Goes back to what it says at rest.
     void clear();
 
-    /// The action behind the button, null for none. The button stands beside a note that follows on
-    /// a change of the action, which is how one tells that there is something to take back.
+    /// The action behind the button, null for none. The button stands beside what tells of the step that the
+    /// action would take back.
     void setUndoAction(QAction *action);
 
 private:
-    void say(const QString &text, int kind);
     void show(const QString &text, int kind);
     void updateButton();
 
     QLabel *m_icon;
     QLabel *m_label;
     QPushButton *m_button;
+    QPointer<QWidget> m_previous;
     QPointer<QAction> m_undo;
     QString m_restText;
     int m_restKind = 0;
     bool m_isAtRest = true;
     bool m_isUndoable = false;
-    bool m_hasChanged = false; // the action, since something was told last
 };

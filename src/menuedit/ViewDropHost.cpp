@@ -109,9 +109,9 @@ public:
             m_recorder.reset();
         // Whoever hears of it may take the view away, and this with it.
         const QPointer<MenuHistory> history(&VelMenuViewPrivate::historyOf(*m_view));
-        const bool isStep = m_recorder && remember(result);
+        const MenuVoice::Subject subject = m_recorder ? remember(result) : MenuVoice::Subject::Other;
         if (history && !result.complaint.isEmpty())
-            tellAt(result.targets.value(0), result.complaint, isStep);
+            tellAt(result.targets.value(0), result.complaint, subject);
     }
 
 private:
@@ -141,7 +141,7 @@ private:
     }
 
     // Also what was done before something failed.
-    bool remember(const DropResult &result)
+    MenuVoice::Subject remember(const DropResult &result)
     {
         MenuHistory &history = VelMenuViewPrivate::historyOf(*m_view);
         QStringList paths = result.targets;
@@ -179,12 +179,12 @@ private:
     }
 
     // Tells without a window: the user goes on undisturbed, the item tells why nothing happened.
-    void tellAt(const QString &path, const QString &text, bool isRest) const
+    void tellAt(const QString &path, const QString &text, MenuVoice::Subject subject) const
     {
         QModelIndex shown;
         if (files() && !path.isEmpty() && QFileInfo::exists(path))
             shown = proxy()->mapFromSource(files()->index(path));
-        VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown, isRest);
+        VelMenuViewPrivate::voiceOf(*m_view).tell(text, MenuVoice::Failure, shown, subject);
     }
 
     VelMenuView *const m_view;

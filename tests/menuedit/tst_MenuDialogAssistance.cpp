@@ -346,6 +346,21 @@ void tst_MenuDialogAssistance::takesBackWhatItTells()
     XDoTool::click(button);
     QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AB"));
     QVERIFY(!button->isEnabled());
+    // A second click, out of habit, takes nothing else back.
+    view().slotUp();
+    view().slotDown();
+    QTRY_VERIFY(button->isVisible());
+    button->setFocus();
+    XDoTool::press(QStringLiteral("space"));
+    QTRY_VERIFY2(message()->text().startsWith(QLatin1String("Done: Undo ")), qPrintable(message()->text()));
+    QVERIFY(!button->isVisible());
+    QVERIFY(view().hasFocus());
+    QVERIFY(view().undoAction()->isEnabled());
+    view().redoAction()->trigger();
+    QVERIFY(button->isVisible());
+    view().undoAction()->trigger();
+    view().undoAction()->trigger();
+    QTRY_COMPARE(names(view(), menu()).join(QString()), QStringLiteral("AB"));
     // It does not offer to take back what it does not tell of.
     writeEntry(QStringLiteral("b.desktop"), QStringLiteral("R&D"));
     clickItem(menu() + QLatin1String("/b.desktop"));
