@@ -61,6 +61,7 @@ OpenedFolders::~OpenedFolders() = default;
 
 void OpenedFolders::watchFiles()
 {
+    m_items = 0;
     connect(&m_menu.files(), &QFileSystemModel::directoryLoaded, this, [this] {
         if (!m_waiting.isEmpty())
             m_turn.start();

@@ -118,13 +118,13 @@ void VelMenuViewPrivate::show()
     QObject::connect(&duplication, &MenuDuplication::changed, q, &VelMenuView::changed);
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::setActionsEnabled);
     QObject::connect(&history, &MenuHistory::changed, q, &VelMenuView::changed);
-    QObject::connect(&history, &MenuHistory::replaced, q, [this] { showAnew(); });
+    QObject::connect(&history, &MenuHistory::replaced, q, [this] { showReplaced(); });
     QObject::connect(&moving, &MenuMoving::changed, q, &VelMenuView::setActionsEnabled);
     QObject::connect(&moving, &MenuMoving::changed, q, &VelMenuView::changed);
     QObject::connect(&hiding, &MenuHiding::changed, q, &VelMenuView::changed);
     QObject::connect(&sorting, &MenuSorting::changed, q, &VelMenuView::changed);
     QObject::connect(&voice, &MenuVoice::told, q, &VelMenuView::told);
-    QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showAnew(); });
+    QObject::connect(&m_rootWatch, &RootWatch::replaced, q, [this] { showReplaced(); });
     connectSelection();
 }
 
@@ -162,6 +162,14 @@ void VelMenuViewPrivate::showAnew()
     showRoot();
     find.clear();
     q->setActionsEnabled();
+}
+
+// What was open in the menu that was here stays open in the one that came.
+void VelMenuViewPrivate::showReplaced()
+{
+    const QStringList opened = isAssisted ? openedFolders.opened() : QStringList();
+    showAnew();
+    openedFolders.open(opened);
 }
 
 void VelMenuViewPrivate::putSelected(Qt::DropAction action)
@@ -206,7 +214,7 @@ void VelMenuViewPrivate::recreate()
         return;
     if (rebuilding)
         rebuilding->finish();
-    showAnew();
+    showReplaced();
     Q_EMIT q->changed();
     if (view)
         history.add(recorder, StepText(StepText::Kind::Rebuild), {});

@@ -91,6 +91,7 @@ public:
     void show();
     /// Shows the menu directory after it was replaced.
     void showAnew();
+    void showReplaced();
     /// Whether the user has selected several items, of which none can be edited or run.
     bool hasSeveral() const { return severalRows.isOn() && selection.isSeveral(); }
     /// All rows that the user has selected, where that may be several.

@@ -44,6 +44,7 @@ private Q_SLOTS:
     void deletesALinkAndNotWhatItLeadsTo();
     void leavesTheDefaultMenuWhereNothingWasBuilt();
     void bringsTheMenuBackThatALinkLeadsTo();
+    void keepsFoldersOpenWhenTheMenuIsAnotherOne();
     void takesAMenuAwayThatWasTheFirst();
     void deletesSeveralInOneStep();
     void namesEveryStep_data();
@@ -390,6 +391,30 @@ void tst_VelMenuViewHistory::bringsTheMenuBackThatALinkLeadsTo()
     QTRY_COMPARE(names(view, startMenu()), QStringList{QStringLiteral("Old")});
     view.redoAction()->trigger();
     QTRY_COMPARE(names(view, startMenu()), QStringList{QStringLiteral("Games")});
+}
+
+void tst_VelMenuViewHistory::keepsFoldersOpenWhenTheMenuIsAnotherOne()
+{
+    write(QStringLiteral("apps/applications/p.desktop"),
+          entryText(QStringLiteral("Piano"), "Exec=true\nCategories=Game;\n"));
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("apps"))));
+    write(QStringLiteral("config/startmenu/Game/old.desktop"), entryText(QStringLiteral("Old")));
+    write(QStringLiteral("config/startmenu/Other/o.desktop"), entryText(QStringLiteral("O")));
+    const QString game = startMenu() + QStringLiteral("/Game");
+    VelMenuView view(QString(), -1, true);
+    view.setAssistance(true);
+    view.show();
+    QVERIFY(open(view, startMenu(), 2));
+    QVERIFY(open(view, game, 1));
+    rebuild(view);
+    QTRY_COMPARE(names(view, game), QStringList{QStringLiteral("Piano")});
+    QTRY_VERIFY(view.isExpanded(shown(view, game)));
+
+    view.undoAction()->trigger();
+
+    QTRY_COMPARE(names(view, game), QStringList{QStringLiteral("Old")});
+    QTRY_VERIFY(view.isExpanded(shown(view, game)));
+    QVERIFY(!view.isExpanded(shown(view, startMenu() + QStringLiteral("/Other"))));
 }
 
 void tst_VelMenuViewHistory::takesAMenuAwayThatWasTheFirst()
