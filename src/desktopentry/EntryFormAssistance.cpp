@@ -39,6 +39,7 @@ EntryFormAssistance::EntryFormAssistance(EntryFormHost &form)
 
 EntryFormAssistance::~EntryFormAssistance()
 {
+    releaseRows();
     // What other parts did is taken back first.
     qDeleteAll(findChildren<QObject *>(QString(), Qt::FindDirectChildrenOnly));
     m_text.reset();
@@ -81,6 +82,21 @@ void EntryFormAssistance::addBelow(const FormRow &row, QWidget *widget)
         beside ? TabOrder::lastOf({row.field, beside, slot}) : TabOrder::lastOf({row.field, slot});
     slot->add(widget);
     TabOrder::putBehind(last, widget);
+}
+
+void EntryFormAssistance::holdRows()
+{
+    m_form.formLayout()->holdRows();
+}
+
+void EntryFormAssistance::showAhead(const FormRow &row)
+{
+    m_form.formLayout()->showAhead(row.number);
+}
+
+void EntryFormAssistance::releaseRows()
+{
+    m_form.formLayout()->releaseRows();
 }
 
 QToolButton *EntryFormAssistance::addButton(const char *name)

@@ -47,6 +47,11 @@ public:
     /// The same for a widget, such as a sentence, under the field.
     void addBelow(const FormRow &row, QWidget *widget);
 
+    /// What is shown under rows does not move the others until releaseRows(); showAhead() paints it before.
+    void holdRows();
+    void showAhead(const FormRow &row);
+    void releaseRows();
+
     /// Gives a field another value as the user would, in a step of its own that can be taken back.
     void edit(const FormRow &row, const QVariant &value);
     /// Takes back what the user did in the form, and does it again.

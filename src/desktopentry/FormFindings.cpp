@@ -9,22 +9,19 @@
 
 #include <QApplication>
 #include <QCoreApplication>
+#include <QPointer>
 #include <QScrollArea>
 #include <QScrollBar>
 #include <QShortcut>
 #include <QWidget>
 
+#include <algorithm>
 #include <utility>
 
 namespace VelUI {
 
-namespace {
-
-const QLatin1String MainGroup("Desktop Entry");
-const QLatin1String ActionPrefix("Desktop Action ");
-
 // Where the focus is in the view of a form: what the user types in must not move away under his hands.
-class FocusPlace
+class FormFindings::FocusPlace
 {
 public:
     explicit FocusPlace(const QWidget *form)
@@ -41,7 +38,7 @@ public:
     void restore() const
     {
         QCoreApplication::sendPostedEvents(nullptr, QEvent::LayoutRequest);
-        if (!m_focused)
+        if (!m_focused || !m_area)
             return;
         QScrollBar *const bar = m_area->verticalScrollBar();
         bar->setValue(bar->value() + top() - m_top);
@@ -50,10 +47,15 @@ public:
 private:
     int top() const { return m_focused->mapTo(m_area->viewport(), QPoint()).y(); }
 
-    QScrollArea *m_area;
-    QWidget *m_focused;
+    QPointer<QScrollArea> m_area;
+    QPointer<QWidget> m_focused;
     int m_top = 0;
 };
+
+namespace {
+
+const QLatin1String MainGroup("Desktop Entry");
+const QLatin1String ActionPrefix("Desktop Action ");
 
 } // namespace
 
@@ -71,7 +73,9 @@ FormFindings::FormFindings(EntryFormAssistance *assistance, Form form)
     }
     // Several signals may tell of one edit.
     m_soon.setSingleShot(true);
+    m_roomSoon.setSingleShot(true);
     connect(&m_soon, &QTimer::timeout, this, &FormFindings::check);
+    connect(&m_roomSoon, &QTimer::timeout, this, &FormFindings::makeRoom);
     connect(assistance, &EntryFormAssistance::recordChanged, &m_soon, [this] { m_soon.start(0); });
     connect(&m_lookups, &CachedLookups::known, this, &FormFindings::check);
     // Whoever comes back may have brought what was missing.
@@ -95,15 +99,42 @@ void FormFindings::check()
     m_lookups.dropQuestions();
     const VelUIDesktopEntry record = m_assistance.record();
     const EntryFindings findings = EntryCheck::check(record, record.contents(), m_form.path(), m_lookups);
-    QVector<QVector<RowFindings::Said>> all(m_rows.size());
-    for (const EntryFinding &finding : findings) {
-        const int row = rowOf(finding);
-        all[row].append(said(finding, row));
+    QVector<QVector<const EntryFinding *>> all(m_rows.size());
+    for (const EntryFinding &finding : findings)
+        all[rowOf(finding)].append(&finding);
+    say(all);
+}
+
+// The sentences come first: moving and painting all rows below takes several times as long.
+void FormFindings::say(QVector<QVector<const EntryFinding *>> all)
+{
+    if (!m_place)
+        m_place = std::make_unique<FocusPlace>(m_form.widget);
+    m_assistance.holdRows();
+    for (int i = 0; i < m_rows.size(); ++i) {
+        sayUnder(i, &all[i]);
+        m_assistance.showAhead(m_assistance.rows().at(i));
     }
-    const FocusPlace place(m_form.widget);
-    for (int i = 0; i < m_rows.size(); ++i)
-        m_rows.at(i)->say(all.at(i), m_assistance.rows().at(i).field);
-    place.restore();
+    m_roomSoon.start(0);
+}
+
+void FormFindings::sayUnder(int row, QVector<const EntryFinding *> *all)
+{
+    std::stable_sort(all->begin(), all->end(),
+                     [](const EntryFinding *a, const EntryFinding *b) { return a->severity > b->severity; });
+    const int lines = all->size() > RowFindings::MostLines ? RowFindings::MostLines - 1 : all->size();
+    QVector<RowFindings::Said> worst;
+    for (int i = 0; i < lines; ++i)
+        worst.append(said(*all->at(i), row));
+    m_rows.at(row)->say(worst, all->size() - lines, m_assistance.rows().at(row).field);
+}
+
+void FormFindings::makeRoom()
+{
+    m_roomSoon.stop();
+    m_assistance.releaseRows();
+    if (const auto place = std::exchange(m_place, nullptr))
+        place->restore();
 }
 
 // A translation is shown in the row behind that of its key.
@@ -146,6 +177,7 @@ RowFindings::Said FormFindings::said(const EntryFinding &finding, int row) const
 
 void FormFindings::goOn(int step)
 {
+    makeRoom();
     const auto &rows = m_assistance.rows();
     int current = step > 0 ? -1 : rows.size();
     for (int i = 0; i < rows.size(); ++i) {

@@ -12,6 +12,7 @@
 #include <QVector>
 
 #include <functional>
+#include <memory>
 
 class QWidget;
 
@@ -43,7 +44,12 @@ public:
     ~FormFindings() override;
 
 private:
+    class FocusPlace;
+
     void check();
+    void say(QVector<QVector<const EntryFinding *>> all);
+    void sayUnder(int row, QVector<const EntryFinding *> *all);
+    void makeRoom();
     int rowOf(const EntryFinding &finding) const;
     RowFindings::Said said(const EntryFinding &finding, int row) const;
     void goOn(int step);
@@ -54,6 +60,8 @@ private:
     const Form m_form;
     CachedLookups m_lookups;
     QTimer m_soon;
+    QTimer m_roomSoon;
+    std::unique_ptr<FocusPlace> m_place; ///< null unless room is to be made
     QVector<RowFindings *> m_rows; ///< as the form has them
 };
 

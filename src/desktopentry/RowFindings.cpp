@@ -5,15 +5,11 @@
 
 #include <QLineEdit>
 
-#include <algorithm>
 #include <utility>
 
 namespace VelUI {
 
 namespace {
-
-// Files of another kind may have dozens of faults, of which the first tell enough.
-constexpr int MostLines = 4;
 
 EntryFinding summary(int left)
 {
@@ -47,26 +43,26 @@ RowFindings::~RowFindings()
     describe(nullptr);
 }
 
-void RowFindings::say(QVector<Said> all, QWidget *field)
+void RowFindings::say(QVector<Said> worst, int more, QWidget *field)
 {
-    std::stable_sort(all.begin(), all.end(),
-                     [](const Said &a, const Said &b) { return a.finding.severity > b.finding.severity; });
-    if (all.size() > MostLines) {
-        const EntryFinding rest = summary(all.size() - MostLines + 1);
-        all.resize(MostLines - 1);
-        all.append({rest, all.constLast().key, rest.sentence, false});
+    if (more > 0) {
+        const EntryFinding rest = summary(more);
+        worst.append({rest, worst.constLast().key, rest.sentence, false});
     }
     QStringList spoken;
-    for (int i = 0; i < all.size(); ++i) {
-        line(i)->say(all.at(i));
+    for (int i = 0; i < worst.size(); ++i) {
+        line(i)->say(worst.at(i));
         spoken.append(line(i)->spoken());
     }
-    for (int i = all.size(); i < m_lines.size(); ++i) {
+    for (int i = worst.size(); i < m_lines.size(); ++i) {
         if (m_lines.at(i))
             m_lines.at(i)->hide();
     }
-    m_spoken = spoken.join(QLatin1Char(' '));
-    describe(field);
+    const QString formerly = std::exchange(m_spoken, spoken.join(QLatin1Char(' ')));
+    // Whoever listens to the descriptions hears of changes alone.
+    if (m_spoken != formerly || field != m_field)
+        describe(field);
+    m_field = field;
 }
 
 const QWidget *RowFindings::lastLine() const

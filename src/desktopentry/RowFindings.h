@@ -21,12 +21,16 @@ class RowFindings : public QObject
 public:
     using Said = FindingLine::Said;
 
+    /// So many lines are shown at most: files of another kind may have thousands of faults, of which the
+    /// first tell enough.
+    static constexpr int MostLines = 4;
+
     /// \a addLine puts a line under the row.
     RowFindings(std::function<void(FindingLine *)> addLine, QObject *parent);
     ~RowFindings() override;
 
-    /// Says \a all, worst first, and has \a field describe itself with it.
-    void say(QVector<Said> all, QWidget *field);
+    /// Says \a worst, that there are \a more, and has \a field describe itself with it.
+    void say(QVector<Said> worst, int more, QWidget *field);
     bool isEmpty() const { return m_spoken.isEmpty(); }
     /// The last line that is shown; null when there is none.
     const QWidget *lastLine() const;
@@ -41,6 +45,7 @@ private:
     const std::function<void(FindingLine *)> m_addLine;
     QVector<QPointer<FindingLine>> m_lines;
     QString m_spoken;
+    QPointer<QWidget> m_field;
     struct Described
     {
         QPointer<QWidget> widget;

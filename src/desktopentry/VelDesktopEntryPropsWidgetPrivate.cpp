@@ -189,8 +189,13 @@ void VelDesktopEntryPropsWidgetPrivate::connectChanges()
 {
     const auto changed = &VelDesktopEntryPropsWidgetPrivate::tellEdit;
     const QWidget *const content = scrollArea->widget();
-    for (QLineEdit *line : content->findChildren<QLineEdit *>())
-        connect(line, &QLineEdit::textEdited, this, changed);
+    for (QLineEdit *line : content->findChildren<QLineEdit *>()) {
+        // Its editor tells of the new record below.
+        if (qobject_cast<PathEdit *>(line->parentWidget()))
+            connect(line, &QLineEdit::textEdited, q, &VelDesktopEntryPropsWidget::changed);
+        else
+            connect(line, &QLineEdit::textEdited, this, changed);
+    }
     for (IconEdit *edit : content->findChildren<IconEdit *>())
         connect(edit, &IconEdit::iconChanged, this, changed);
     for (QCheckBox *box : content->findChildren<QCheckBox *>())

@@ -5,6 +5,7 @@
 #include "TestCase.h"
 
 #include <desktopentry/FormLayout.h>
+#include <desktopentry/fields/RowSlot.h>
 
 #include <QAbstractButton>
 #include <QAccessible>
@@ -32,6 +33,8 @@ private Q_SLOTS:
     void givesEveryPartOfAFieldAName();
     void keepsTheNameThatAButtonHas();
     void leavesNoGapForHiddenRows();
+    void showsWhatComesUnderARowBeforeItMovesTheOthers_data();
+    void showsWhatComesUnderARowBeforeItMovesTheOthers();
 };
 
 void tst_FormLayout::addsTheColonToTheLabel()
@@ -234,6 +237,51 @@ void tst_FormLayout::leavesNoGapForHiddenRows()
         layout->hideRow(layout->addRow(QStringLiteral("Hidden"), new QLineEdit));
     layout->activate();
     QCOMPARE(form.sizeHint().height(), height);
+}
+
+void tst_FormLayout::showsWhatComesUnderARowBeforeItMovesTheOthers_data()
+{
+    QTest::addColumn<Qt::LayoutDirection>("direction");
+    QTest::newRow("left to right") << Qt::LeftToRight;
+    QTest::newRow("right to left") << Qt::RightToLeft;
+}
+
+void tst_FormLayout::showsWhatComesUnderARowBeforeItMovesTheOthers()
+{
+    QFETCH(Qt::LayoutDirection, direction);
+    QWidget form;
+    form.setLayoutDirection(direction);
+    form.resize(400, 300);
+    auto *layout = new FormLayout(&form);
+    const int row = layout->addRow(QStringLiteral("One"), new QLineEdit);
+    auto *next = new QLineEdit;
+    layout->addRow(QStringLiteral("Two"), next);
+    layout->setRowStretch(layout->rowCount(), 1);
+    layout->spread();
+    VelUI::RowSlot *slot = layout->belowRow(row);
+    auto *sentence = new QLabel(QStringLiteral("This is wrong."));
+    sentence->hide();
+    slot->add(sentence);
+    form.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&form));
+    const QRect former = next->geometry();
+
+    for (int time = 0; time < 2; ++time) {
+        layout->holdRows();
+        sentence->show();
+        layout->showAhead(row);
+        const QRect ahead = slot->geometry();
+        QVERIFY(sentence->isVisible());
+        QVERIFY(slot->autoFillBackground());
+        QCOMPARE(next->geometry(), former);
+        layout->releaseRows();
+        QCOMPARE(slot->geometry(), ahead);
+        QVERIFY(!slot->autoFillBackground());
+        QVERIFY(next->y() > former.y());
+        sentence->hide();
+        layout->activate();
+        QCOMPARE(next->geometry(), former);
+    }
 }
 
 VEL_TEST_MAIN(tst_FormLayout)

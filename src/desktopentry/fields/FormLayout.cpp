@@ -9,6 +9,7 @@
 #include <QAbstractButton>
 #include <QLabel>
 #include <QLineEdit>
+#include <QStyle>
 #include <QVector>
 
 #include <utility>
@@ -182,6 +183,34 @@ void FormLayout::pack()
     m_beside.clear();
     m_below.clear();
     moveRows(1);
+}
+
+void FormLayout::holdRows()
+{
+    setEnabled(false);
+}
+
+void FormLayout::showAhead(int row)
+{
+    RowSlot *const slot = m_below.value(row);
+    if (!slot || !slot->isVisible())
+        return;
+    const QRect field = cellRect(row * m_spacing, 1) | cellRect(row * m_spacing, 2);
+    const int height =
+        slot->hasHeightForWidth() ? slot->heightForWidth(field.width()) : slot->sizeHint().height();
+    const QRect place(field.left(), field.bottom() + 1 + verticalSpacing(), field.width(), height);
+    slot->cover(QStyle::visualRect(parentWidget()->layoutDirection(), parentWidget()->rect(), place));
+}
+
+void FormLayout::releaseRows()
+{
+    if (isEnabled())
+        return;
+    setEnabled(true);
+    for (RowSlot *slot : qAsConst(m_below))
+        slot->takePlace();
+    invalidate();
+    activate();
 }
 
 int FormLayout::rowOf(QWidget *field) const

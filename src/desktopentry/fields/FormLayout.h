@@ -58,6 +58,14 @@ public:
     /// The same behind the field; null where nothing was put there yet.
     RowSlot *usedBesideRow(int row) const { return m_beside.value(row); }
 
+    /// Has all rows stay where they are until releaseRows(), whatever is shown or hidden: moving them takes
+    /// longer than what is shown may wait.
+    void holdRows();
+    /// Paints what is under a row of held ones, at once and over what is still there.
+    void showAhead(int row);
+    /// Makes the room that is needed meanwhile.
+    void releaseRows();
+
 private:
     struct Cell
     {

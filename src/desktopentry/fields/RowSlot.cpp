@@ -32,6 +32,24 @@ void RowSlot::setRowVisible(bool visible)
     update();
 }
 
+void RowSlot::cover(const QRect &place)
+{
+    if (m_hasPlace && place == geometry())
+        return;
+    m_hasPlace = false;
+    setAutoFillBackground(true);
+    raise();
+    setGeometry(place);
+    m_layout->activate();
+    repaint();
+}
+
+void RowSlot::takePlace()
+{
+    setAutoFillBackground(false);
+    m_hasPlace = !isHidden();
+}
+
 bool RowSlot::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::ShowToParent || event->type() == QEvent::HideToParent)
@@ -52,6 +70,7 @@ void RowSlot::update()
     const bool hasShown = std::any_of(widgets.begin(), widgets.end(),
                                       [](const QWidget *widget) { return !widget->isHidden(); });
     setVisible(m_isRowVisible && hasShown);
+    m_hasPlace = m_hasPlace && !isHidden();
     if (hasShown == m_isFilled)
         return;
     m_isFilled = hasShown;

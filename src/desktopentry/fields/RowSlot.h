@@ -21,6 +21,10 @@ public:
     void add(QWidget *widget);
     /// Tells whether the row is shown.
     void setRowVisible(bool visible);
+    /// Paints itself at \a place at once, over whatever is there, unless that is its own place.
+    void cover(const QRect &place);
+    /// Tells that nothing else is where it is.
+    void takePlace();
 
     bool eventFilter(QObject *watched, QEvent *event) override;
 
@@ -37,6 +41,7 @@ private:
     QBoxLayout *const m_layout;
     bool m_isRowVisible = true;
     bool m_isFilled = false;
+    bool m_hasPlace = false;
 };
 
 } // namespace VelUI
