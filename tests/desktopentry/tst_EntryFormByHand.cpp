@@ -105,7 +105,7 @@ void tst_EntryFormByHand::makesAnEntryInThreeLanguages()
         read(file),
         QByteArray(
             "[Desktop "
-            "Entry]\nType=Application\nName[ja]=Japanese\nName=Shell\nName[de]=Muschel\nExec=/bin/sh\n"));
+            "Entry]\nType=Application\nName=Shell\nName[ja]=Japanese\nName[de]=Muschel\nExec=/bin/sh\n"));
 }
 
 void tst_EntryFormByHand::findsALanguageWithTheKeyboard()

@@ -179,6 +179,23 @@ void tst_VelUIDesktopEntryChanges::writesOnlyTheLinesOfChangedKeys_data()
     row("new variant behind the other variants", Header + "Name=A\nName[fr]=F\nIcon=i\n#c\n", local,
         Header + "Name=A\nName[fr]=F\nName[de]=Neu\nIcon=i\n#c\n");
     row("new variant without its key", Header + "Icon=i\n", local, Header + "Icon=i\nName[de]=Neu\n");
+    const auto translated = [](auto &record) {
+        record.setLocalName(QStringLiteral("Neu"));
+        record.setName(QStringLiteral("New"));
+    };
+    row("new variant set before its new key", Header + "Icon=i\n", translated,
+        Header + "Icon=i\nName=New\nName[de]=Neu\n");
+    row("new variant set before its new key in a new file", "", translated,
+        Header + "Name=New\nName[de]=Neu\n");
+    row("new key before its variants", Header + "Name[fr]=F\nIcon=i\nName[ja]=J\n", translated,
+        Header + "Name=New\nName[fr]=F\nIcon=i\nName[ja]=J\nName[de]=Neu\n");
+    row(
+        "new key before a variant that goes", Header + "Icon=i\n#c\nName[de]=A\nName[fr]=F\n",
+        [](auto &record) {
+            record.setName(QStringLiteral("New"));
+            record.setLocalName({});
+        },
+        Header + "Icon=i\n#c\nName=New\nName[fr]=F\n");
     row(
         "new variant and new key", Header + "Name=A\n",
         [](auto &record) {

@@ -29,7 +29,7 @@ void tst_VelUIDesktopEntryInheriting::inheritsOnlyWhatItLacks()
     QCOMPARE(changed(Header + "Name=A\nIcon=\nComment[de]=mine\n\n[X-Group]\nx=own\n",
                      [&model](auto &record) { record.inheritFrom(model); }),
              Header
-                 + "Name=A\nIcon=\nComment[de]=mine\nComment[fr]=\xFF\nType=Application\nComment=C\nKeywords="
+                 + "Name=A\nIcon=\nComment=C\nComment[de]=mine\nComment[fr]=\xFF\nType=Application\nKeywords="
                    "a;;b\nX-Own=\xFE\n"
                    "\n[X-Group]\nx=own\nz=1\n");
 

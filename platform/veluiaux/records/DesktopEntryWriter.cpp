@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <map>
+#include <optional>
 #include <string_view>
 #include <unordered_set>
 #include <utility>
@@ -41,7 +42,9 @@ struct NewKeys
         const auto [found, isNew] = blockOf.emplace(change.key, blocks.size());
         if (isNew)
             blocks.push_back({change.key, {}});
-        blocks[found->second].second.push_back(&change);
+        auto &block = blocks[found->second].second;
+        // Whatever was set first, the translations come behind what they translate.
+        block.insert(change.locale.empty() ? block.begin() : block.end(), &change);
     }
 };
 
@@ -84,6 +87,7 @@ private:
     void place(const Change &change);
     void removeKeys();
     void insertVariant(int group, const Change &change);
+    void insertKey(int group, const Change &change);
     void insertNewKeys();
     void insertNewGroups();
     std::size_t newGroupPlace(const std::string &name, bool *beforeOthers) const;
@@ -157,7 +161,7 @@ void Writer::place(const Change &change)
     else if (!change.locale.empty())
         insertVariant(group, change);
     else
-        m_newKeys[group].add(change);
+        insertKey(group, change);
 }
 
 // A key goes from all groups of that name, with all languages that go in one walk over its lines.
@@ -183,6 +187,19 @@ void Writer::insertVariant(int group, const Change &change)
                        [&after](const Text::Key &key) { after = std::max(after, std::size_t(key.lineEnd)); });
     if (after)
         m_splices.push_back({after, 0, Rank::Variant, true, keyLine(change, m_lines.lineEndAt(after))});
+    else
+        m_newKeys[group].add(change);
+}
+
+// Before its translations, if it has any.
+void Writer::insertKey(int group, const Change &change)
+{
+    std::optional<std::size_t> before;
+    m_text.forEachLine(group, change.key, [&before](const Text::Key &key) {
+        before = std::min(before.value_or(key.line), std::size_t(key.line));
+    });
+    if (before)
+        m_splices.push_back({*before, 0, Rank::Variant, true, keyLine(change, m_lines.lineEndAt(*before))});
     else
         m_newKeys[group].add(change);
 }
