@@ -28,8 +28,8 @@
 #include <QPoint>
 #include <QPointer>
 #include <QPushButton>
-#include <QScrollArea>
 #include <QScopedValueRollback>
+#include <QScrollArea>
 #include <QVBoxLayout>
 
 #include <optional>
@@ -67,6 +67,7 @@ public:
     void savePosition();
     void setNewType();
     void copy(VelUIDesktopEntry entry);
+    void copyTranslations(const VelUIDesktopEntry &entry);
     void addHistory();
     VelUIDesktopEntry entryToChange() const;
     VelUIDesktopEntry entryToSave() const;
@@ -210,9 +211,25 @@ void VelDesktopEntryEditDialogPrivate::copy(VelUIDesktopEntry entry)
     if (EntryPath::isRecordFile(path))
         entry.setType(wasDecided ? type : loaded.getType());
     const QScopedValueRollback<bool> copying(form().isCopying, true);
+    if (isAssisted)
+        copyTranslations(entry);
     props->loadFrom(entry);
     if (wasDecided && !chooser.isDecided())
         props->setType(type, chooser.allowedTypes());
+}
+
+// What the fields are emptied of in one language goes in the others, too.
+void VelDesktopEntryEditDialogPrivate::copyTranslations(const VelUIDesktopEntry &entry)
+{
+    const VelUIDesktopEntry former = entryToSave();
+    for (const VelUI::FormRow &row : form().formRows()) {
+        if (!row.isTranslation())
+            continue;
+        QStringList languages = former.getLanguages(row.key) + entry.getLanguages(row.key);
+        languages.removeDuplicates();
+        for (const QString &language : qAsConst(languages))
+            form().translations().set(row.key, language, Translations::value(entry, row.key, language));
+    }
 }
 
 // An entry may hold both lists; whoever goes over to the other one means it to count.

@@ -33,6 +33,8 @@ private Q_SLOTS:
     void survivesItsDeletionBehindThePicker();
     void passesItsAssistanceToThePicker();
     void takesACopyBack();
+    void copiesAllLanguages_data();
+    void copiesAllLanguages();
 
 private:
     static QString writeToMenu(const QString &name, const QByteArray &bytes);
@@ -214,6 +216,40 @@ void tst_VelDesktopEntryEditDialogCopying::takesACopyBack()
     QVERIFY(!dialog.isWindowModified());
     click(okButton(&dialog));
     QCOMPARE(read(file), plainApplication);
+}
+
+void tst_VelDesktopEntryEditDialogCopying::copiesAllLanguages_data()
+{
+    QTest::addColumn<bool>("isAssisted");
+    QTest::addColumn<bool>("isTakenBack");
+    QTest::addColumn<QByteArray>("keys");
+    const QByteArray former = "Name=Plain\nName[fr]=Simple\nName[sv]=Enkel\nComment[fr]=Rien\n";
+    QTest::newRow("with assistance")
+        << true << false
+        << QByteArray("Name=Copied\nName[fr]=Copie\nName[ja]=\xE5\x86\x99\nKeywords[fr]=k;\n");
+    QTest::newRow("taken back") << true << true << former;
+    QTest::newRow("without") << false << false << QByteArray(former).replace("Plain", "Copied");
+}
+
+void tst_VelDesktopEntryEditDialogCopying::copiesAllLanguages()
+{
+    QFETCH(bool, isAssisted);
+    QFETCH(bool, isTakenBack);
+    QFETCH(QByteArray, keys);
+    const QByteArray start = "[Desktop Entry]\nType=Application\nExec=true\n";
+    const QString source = writeToMenu(
+        QStringLiteral("other.desktop"),
+        start + "Name=Copied\nName[fr]=Copie\nName[ja]=\xE5\x86\x99\nKeywords[fr]=k;\nX-A[fr]=a\n");
+    const QString file = write(QStringLiteral("a.desktop"),
+                               start + "Name=Plain\nName[fr]=Simple\nName[sv]=Enkel\nComment[fr]=Rien\n");
+    VelDesktopEntryEditDialog dialog;
+    dialog.setAssistance(isAssisted);
+    QVERIFY(dialog.setDesktopEntryPath(file));
+    copyFrom(dialog, source);
+    if (isTakenBack)
+        click(child<QToolButton>(&dialog, "undoButton"));
+    click(okButton(&dialog));
+    QCOMPARE(read(file), start + keys);
 }
 
 VEL_TEST_MAIN(tst_VelDesktopEntryEditDialogCopying)
