@@ -1,0 +1,19 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+// Where a library finds what is installed with it, for a test that installs it in many places.
+#include "LibraryPlace.cpp"
+
+extern "C" {
+
+Q_DECL_EXPORT void placeOfProgram(const QString *name, QString *found)
+{
+    *found = LibraryPlace::program(*name);
+}
+
+Q_DECL_EXPORT void placeOfCatalogs(QString *found)
+{
+    *found = LibraryPlace::catalogs();
+}
+
+} // extern "C"
