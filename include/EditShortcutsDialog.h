@@ -49,6 +49,8 @@ class ShortcutsModel;
  *
  * For the GUI thread alone.
  *
+ * \image html shortcuts-dialog.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT EditShortcutsDialog : public QDialog

@@ -28,6 +28,8 @@
  *
  * For the GUI thread alone.
  *
+ * \image html gallery-shortcuts.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT IShortcutObject : public QObject

@@ -26,6 +26,8 @@ class ShortcutsModel;
  *
  * A plain value; find() is for the GUI thread alone.
  *
+ * \image html shortcut-clash.png
+ *
  * \since 1.0
  */
 struct VELUIEXTRA_EXPORT ShortcutClash

@@ -28,6 +28,8 @@ class ShortcutsModel;
  *
  * The functions keep no state and open no window. They are to be called on the GUI thread.
  *
+ * \image html shortcut-schemes.png
+ *
  * \since 1.0
  */
 namespace ShortcutScheme {

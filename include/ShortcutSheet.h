@@ -23,6 +23,8 @@ class ShortcutsModel;
  *
  * The functions keep no state, change nothing and cannot fail. They are to be called on the GUI thread.
  *
+ * \image html shortcut-sheet.png
+ *
  * \since 1.0
  */
 namespace ShortcutSheet {

@@ -47,6 +47,8 @@ class QShortcut;
  *
  * For the GUI thread alone.
  *
+ * \image html gallery-shortcuts.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT ShortcutsModel : public QAbstractItemModel

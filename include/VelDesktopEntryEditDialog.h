@@ -30,11 +30,14 @@ class VelDesktopEntryEditDialogPrivate;
  *
  * For the GUI thread alone.
  *
+ * \image html vel-entryedit.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelDesktopEntryEditDialog : public QDialog
 {
     Q_OBJECT
+    /// See setAssistance().
     Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:

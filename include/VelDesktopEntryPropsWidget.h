@@ -30,6 +30,8 @@ class VelUIDesktopEntry;
  *
  * For the GUI thread alone.
  *
+ * \image html gallery-desktop-entry-form.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelDesktopEntryPropsWidget : public QWidget

@@ -21,6 +21,8 @@ class QKeySequence;
  * called on the GUI thread of an application that runs under X11; elsewhere the usual
  * assignment of the modifiers is assumed.
  *
+ * \image html gallery-key-names.png
+ *
  * \since 1.0
  */
 namespace VelKeyServer {

@@ -37,11 +37,14 @@ class VelMenuDialogPrivate;
  *
  * For the GUI thread alone.
  *
+ * \image html vel-menuedit.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelMenuDialog : public QDialog
 {
     Q_OBJECT
+    /// See setAssistance().
     Q_PROPERTY(bool assistance READ assistance WRITE setAssistance)
 
 public:

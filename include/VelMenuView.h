@@ -39,6 +39,8 @@ class VelMenuViewPrivate;
  *
  * For the GUI thread alone.
  *
+ * \image html gallery-menu-view.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelMenuView : public QTreeView

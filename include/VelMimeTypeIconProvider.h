@@ -29,6 +29,8 @@ class VelUIDesktopEntry;
  * Every call looks at the file as it is now, so an icon is never older than its file. The
  * icons returned look up the theme when they are painted. For the GUI thread alone.
  *
+ * \image html gallery-file-icons.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelMimeTypeIconProvider : public QFileIconProvider

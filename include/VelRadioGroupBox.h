@@ -40,6 +40,8 @@ class VelRadioGroupBoxPrivate;
  *
  * For the GUI thread alone.
  *
+ * \image html gallery-radio-group-box.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelRadioGroupBox : public QGroupBox

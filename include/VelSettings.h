@@ -52,6 +52,8 @@ class QSettings;
  *
  * For the GUI thread alone. All objects of a process on one file see each other's changes.
  *
+ * \image html gallery-settings.png
+ *
  * \since 1.0
  */
 class VELUIEXTRA_EXPORT VelSettings

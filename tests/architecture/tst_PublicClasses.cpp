@@ -4,6 +4,7 @@
 #include "SourceFiles.h"
 #include "TestCase.h"
 
+#include <QFile>
 #include <QRegularExpression>
 
 // What the documentation of every public class and namespace says: since when it is there, and what
@@ -15,6 +16,7 @@ class tst_PublicClasses : public TestCase
 private Q_SLOTS:
     void sayTheirVersionAndThread_data();
     void sayTheirVersionAndThread();
+    void haveAPictureInTheReference();
 };
 
 void tst_PublicClasses::sayTheirVersionAndThread_data()
@@ -44,6 +46,19 @@ void tst_PublicClasses::sayTheirVersionAndThread()
     QVERIFY2(documentation.contains(QRegularExpression(QStringLiteral("\\\\since [0-9]+\\.[0-9]+\\n"))),
              "no \\since");
     QVERIFY2(documentation.contains(QRegularExpression(QStringLiteral("\\bthreads?\\b"))), "no thread");
+}
+
+void tst_PublicClasses::haveAPictureInTheReference()
+{
+    static const QRegularExpression image(QStringLiteral("\\\\image html (\\S+)"));
+    const QStringList headers = SourceFiles::below(QStringLiteral("include"));
+    QVERIFY(headers.size() > 10);
+    for (const QString &header : headers) {
+        const QString picture = image.match(SourceFiles::textOf(header)).captured(1);
+        QVERIFY2(!picture.isEmpty(), qPrintable(header));
+        QVERIFY2(QFile::exists(SourceFiles::absolute(QStringLiteral("docs/pictures/") + picture)),
+                 qPrintable(picture));
+    }
 }
 
 VEL_TEST_GUILESS_MAIN(tst_PublicClasses)

@@ -36,6 +36,7 @@ enum class Result {
  *
  * @param menuDir the folder of the menu
  * @param templateDir what is copied where there is no menu; may be null or empty
+ * @param look how closely to look
  */
 VELINTEGRATION_EXPORT Result update(const char *menuDir, const char *templateDir, Look look);
 
