@@ -3,10 +3,12 @@
 
 #include "MenuDrop.h"
 
+#include "FileLinks.h"
 #include "FileProgress.h"
 #include "FolderOrder.h"
 #include "FolderWatch.h"
 #include "KeptThing.h"
+#include "MeantRow.h"
 #include "OnDisk.h"
 #include "Refusal.h"
 #include "ReplacedThings.h"
@@ -40,28 +42,6 @@ void removeAll(const QStringList &files)
     for (const QString &file : files)
         QFile::remove(file);
 }
-
-/// The row that is meant, whatever comes and goes.
-class MeantRow
-{
-public:
-    MeantRow(const QFileSystemModel &model, int row, const QModelIndex &folder)
-        : m_row(row)
-        , m_isLast(row == model.rowCount(folder))
-        , m_following(row >= 0 && !m_isLast ? model.index(row, 0, folder) : QModelIndex())
-    {
-    }
-
-    int in(const QFileSystemModel &model, const QModelIndex &folder) const
-    {
-        return m_row == -1 ? -1 : m_isLast ? model.rowCount(folder) : m_following.row();
-    }
-
-private:
-    const int m_row;
-    const bool m_isLast;
-    const QPersistentModelIndex m_following;
-};
 
 } // namespace
 
@@ -174,7 +154,7 @@ std::optional<DropResult> MenuDrop::carryOver()
         return refused(notSaved(failed, m_folder));
     }
     const QPointer<QFileSystemModel> model(&m_model);
-    const FileTransfer::Result result = m_request.action == Qt::LinkAction ? link() : transfer();
+    const FileTransfer::Result result = transfer();
     if (!result.succeeded()) {
         removeAll(written);
         return refused(result);
@@ -224,31 +204,16 @@ QString MenuDrop::writeEntries(QStringList *made) const
 
 FileTransfer::Result MenuDrop::transfer()
 {
+    const bool isLink = m_request.action == Qt::LinkAction;
     QVector<FileTransfer::Item> items;
     for (const DropItem &item : qAsConst(m_items)) {
-        if (item.isFile())
+        if (item.isFile() && !(isLink && item.isHere))
             items.append({item.source, item.target});
     }
+    if (isLink)
+        return FileLinks::make(items);
     const std::unique_ptr<FileProgress> progress = m_host.follow(m_request.action);
     return FileTransfer::transfer(items, transferAction(m_request.action), *progress);
-}
-
-// All or nothing, as with copies.
-FileTransfer::Result MenuDrop::link()
-{
-    QStringList made;
-    for (const DropItem &item : qAsConst(m_items)) {
-        QFile source(item.source);
-        if (item.isHere || !item.isFile())
-            continue;
-        if (source.link(item.target)) {
-            made.append(item.target);
-            continue;
-        }
-        removeAll(made);
-        return {FileTransfer::Failure::Failed, item.source, source.errorString()};
-    }
-    return {};
 }
 
 // The folders among them are not to be watched meanwhile.

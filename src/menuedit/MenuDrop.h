@@ -58,7 +58,6 @@ private:
     bool makeRoom(ReplacedThings &replaced, QString *occupied) const;
     QString writeEntries(QStringList *made) const;
     FileTransfer::Result transfer();
-    FileTransfer::Result link();
     QStringList leavingPaths() const;
     bool isListed() const;
     std::optional<QStringList> order() const;
