@@ -24,6 +24,8 @@
 #include <cstdio>
 #include <ctime>
 #include <functional>
+#include <map>
+#include <string>
 #include <vector>
 
 namespace {
@@ -164,6 +166,67 @@ bool measureFilter(const char *title, const QString &menu)
     return report("longest freeze", freezes, MostFreeze) && isFirstSoon && isSoon;
 }
 
+/// Says how long each of several things takes that are done one after the other.
+class Course
+{
+public:
+    explicit Course(std::map<std::string, std::vector<double>> *times)
+        : m_times(times)
+    {
+    }
+
+    // Until the window answers again; what comes in the background after that counts as a freeze.
+    void measure(const char *what, const std::function<void()> &deed)
+    {
+        FreezeMeter meter;
+        deed();
+        QCoreApplication::processEvents();
+        settle(1000);
+        (*m_times)[what].push_back(meter.longest());
+    }
+
+private:
+    std::map<std::string, std::vector<double>> *const m_times;
+};
+
+// All that a filter finds is selected: what is done to it, and what is typed meanwhile.
+void useSeveral(VelMenuView *view, Course *course)
+{
+    course->measure("filter", [&] { view->setFilter(QStringLiteral("entry 1")); });
+    view->expandAll();
+    settle(1500);
+    course->measure("select all", [&] { view->selectAll(); });
+    course->measure("a key more", [&] { view->setFilter(QStringLiteral("entry 12")); });
+    course->measure("a key less", [&] { view->setFilter(QStringLiteral("entry 1")); });
+    course->measure("select all again", [&] { view->selectAll(); });
+    course->measure("copy", [&] { view->slotCopy(); });
+    course->measure("cut", [&] { view->slotCut(); });
+    course->measure("down", [&] { view->slotDown(); });
+    course->measure("filter taken away", [&] { view->setFilter(QString()); });
+    course->measure("one selected",
+                    [&] { view->setCurrentIndex(view->model()->index(0, 0, view->rootIndex())); });
+}
+
+// Deleting goes by one item after the other, which the user sees; it is not part of this.
+bool measureSeveral(const char *title, const QString &menu)
+{
+    std::printf("%s\n", title);
+    std::map<std::string, std::vector<double>> times;
+    for (int round = 0; round < Rounds; ++round) {
+        VelMenuView view(menu, -1, true);
+        view.setAssistance(true);
+        view.resize(400, 480);
+        view.show();
+        settle(1500);
+        Course course(&times);
+        useSeveral(&view, &course);
+    }
+    bool kept = true;
+    for (const auto &[what, freezes] : times)
+        kept = report(("longest freeze: " + what).c_str(), freezes, MostFreeze) && kept;
+    return kept;
+}
+
 } // namespace
 
 int main(int argc, char **argv)
@@ -194,5 +257,11 @@ int main(int argc, char **argv)
 
     kept = measureFilter("filter of 5,000 entries in 100 folders", files.nested(100, 50)) && kept;
     kept = measureFilter("filter of 5,000 entries in one folder", files.flat(5000, false)) && kept;
+    kept = measureSeveral("filter and all that it finds selected, of 5,000 in 100 folders",
+                          files.nested(100, 50))
+        && kept;
+    kept = measureSeveral("filter and all that it finds selected, of 5,000 in one folder",
+                          files.flat(5000, false))
+        && kept;
     return kept ? 0 : 1;
 }
