@@ -29,6 +29,9 @@ namespace {
 // Few icons are for one language only: nobody misses the others.
 constexpr QLatin1String IconKey("Icon");
 
+// More than there are translators for; the list would take long.
+constexpr int MostLanguages = 500;
+
 QString ownCode()
 {
     return QString::fromStdString(velLanguageCode());
@@ -119,7 +122,7 @@ LanguageBar::Coverage LanguageBar::coverage() const
     coverage.shown = m_rows.language();
     const QStringList keys = m_rows.keys();
     for (const QString &key : keys) {
-        coverage.languages.insert(key, entry.getLanguages(key));
+        coverage.languages.insert(key, entry.getLanguages(key).mid(0, MostLanguages));
         coverage.inForce.insert(key, entry.getLanguageInForce(key));
         if (!isEmpty(Translations::baseValue(entry, key)))
             coverage.texts.append(key);

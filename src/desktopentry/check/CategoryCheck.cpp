@@ -7,6 +7,7 @@
 #include "RegisteredCategories.h"
 
 #include <QCoreApplication>
+#include <QSet>
 
 #include <algorithm>
 
@@ -42,7 +43,7 @@ void checkUnknown(const QByteArray &item, const CheckedValue &value)
     value.add(
         EntryProblem::UnknownCategory, EntryFinding::Error,
         Text::tr("There is no registered category '%1'; one of your own has to begin with 'X-'.").arg(name),
-        Text::tr("Change it to '%1'").arg(better), ItemRepair::replaced(value.key, item, {better}));
+        Text::tr("Change it to '%1'").arg(better), ItemRepair::replaced(value, item, {better}));
 }
 
 bool hasAll(const QStringList &wanted, const QStringList &items)
@@ -91,7 +92,8 @@ void checkRelated(const Category &category, const QStringList &items, const Chec
                                     : Text::tr("The category '%1' goes with one of these: %2.");
     value.add(EntryProblem::MissingRelatedCategory, isMain ? EntryFinding::Error : EntryFinding::Hint,
               sentence.arg(category.name, listed(category.related)),
-              Text::tr("Add '%1'").arg(added.join(QLatin1String("', '"))), items + added);
+              Text::tr("Add '%1'").arg(added.join(QLatin1String("', '"))),
+              value.isLong ? QStringList() : items + added);
 }
 
 void checkKnown(const Category &category, const QByteArray &item, const QStringList &items,
@@ -101,12 +103,12 @@ void checkKnown(const Category &category, const QByteArray &item, const QStringL
     if (category.kind == Kind::Deprecated)
         value.add(EntryProblem::DeprecatedCategory, EntryFinding::Warning,
                   Text::tr("The category '%1' is out of use.").arg(category.name), remove,
-                  ItemRepair::replaced(value.key, item, {}));
+                  ItemRepair::replaced(value, item, {}));
     else if (category.kind == Kind::Reserved && !EntryText::key(value.group, "OnlyShowIn"))
         value.add(EntryProblem::ReservedCategory, EntryFinding::Error,
                   Text::tr("The category '%1' is only for entries that list desktops in 'Only show in'.")
                       .arg(category.name),
-                  remove, ItemRepair::replaced(value.key, item, {}));
+                  remove, ItemRepair::replaced(value, item, {}));
     else
         checkRelated(category, items, value);
 }
@@ -144,18 +146,20 @@ void CategoryCheck::check(const CheckedValue &value)
         return;
     const QByteArrayList written = EntryText::items(value.key.value);
     QStringList items;
+    QSet<QByteArray> seen;
     for (const QByteArray &item : written)
         items.append(EntryText::text(item));
     for (int i = 0; i < written.size(); ++i) {
         const Category *category = RegisteredCategories::find(items.at(i));
-        if (ItemRepair::isRepeated(written, i))
+        if (seen.contains(written.at(i)))
             value.add(EntryProblem::RepeatedItem, EntryFinding::Warning,
                       Text::tr("'%1' stands more than once.").arg(items.at(i)), Text::tr("Keep the first"),
-                      ItemRepair::replaced(value.key, written.at(i), {items.at(i)}));
+                      ItemRepair::replaced(value, written.at(i), {items.at(i)}));
         else if (category)
             checkKnown(*category, written.at(i), items, value);
         else if (!RegisteredCategories::isExtension(items.at(i)))
             checkUnknown(written.at(i), value);
+        seen.insert(written.at(i));
     }
     items.removeDuplicates();
     checkMain(items, value);

@@ -3,10 +3,18 @@
 
 #include "CheckedEntry.h"
 
+namespace {
+
+constexpr int LongestValue = 128 * 1024; // the system passes no longer argument on
+constexpr int MostItems = 500;
+
+} // namespace
+
 CheckedValue::CheckedValue(const EntryText::Group &inGroup, const EntryText::Key &ofKey,
                            EntryFindings *findings)
     : group(inGroup)
     , key(ofKey)
+    , isLong(ofKey.value.size() > LongestValue || ofKey.value.count(';') > MostItems)
     , m_findings(findings)
 {
 }
@@ -33,5 +41,6 @@ void CheckedValue::add(EntryProblem problem, Severity severity, const QString &s
 // A record changes the last of several lines and leaves the others alone.
 bool CheckedValue::canBeRepaired() const
 {
-    return isMain() && group.count == 1 && key.locale.isEmpty() && EntryText::count(group, key) == 1;
+    return !isLong && isMain() && group.count == 1 && key.locale.isEmpty()
+        && EntryText::count(group, key) == 1;
 }

@@ -31,6 +31,9 @@ public:
 
     const EntryText::Group &group;
     const EntryText::Key &key;
+    /// Whether nobody has one so long: to look for a repair of each part would take too long, so none is
+    /// offered.
+    const bool isLong;
 
     /// Whether it is one of the entry itself, not of an action.
     bool isMain() const;

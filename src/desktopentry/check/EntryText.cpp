@@ -50,7 +50,8 @@ EntryText::Key keyOf(const QByteArray &written, const QByteArray &value)
     if (bracket >= 0) {
         key.name = written.left(bracket);
         key.locale = written.mid(bracket + 1, written.size() - bracket - 2);
-        key.isReadable = written.endsWith(']') && !key.locale.isEmpty()
+        // Behind another bracket there is no language for them.
+        key.isReadable = written.endsWith(']') && !key.locale.isEmpty() && key.locale.back() != '['
             && std::all_of(key.locale.cbegin(), key.locale.cend() - 1, isOfLocale);
         key.isWellFormed = key.isReadable && isOfLocale(key.locale.back());
     }
@@ -117,11 +118,11 @@ bool EntryText::readGroup(const QByteArray &line)
     if (header != line)
         m_faults.append({Fault::TrailingBlank, line});
     const QByteArray name = header.mid(1, header.size() - 2);
-    const auto found = std::find_if(m_groups.cbegin(), m_groups.cend(),
-                                    [&name](const Group &group) { return group.name == name; });
-    m_current = int(found - m_groups.cbegin());
-    if (found == m_groups.cend())
+    m_current = m_places.value(name, m_groups.size());
+    if (m_current == m_groups.size()) {
+        m_places.insert(name, m_current);
         m_groups.append({name, 0, {}, {}});
+    }
     ++m_groups[m_current].count;
     return true;
 }
@@ -149,9 +150,8 @@ void EntryText::add(Key key)
 
 const EntryText::Group *EntryText::group(const QByteArray &name) const
 {
-    const auto found = std::find_if(m_groups.cbegin(), m_groups.cend(),
-                                    [&name](const Group &group) { return group.name == name; });
-    return found == m_groups.cend() ? nullptr : &*found;
+    const auto found = m_places.constFind(name);
+    return found == m_places.constEnd() ? nullptr : &m_groups.at(*found);
 }
 
 const EntryText::Group *EntryText::mainGroup() const

@@ -74,5 +74,6 @@ private:
     bool m_isEmpty;
     int m_current = -1;
     QVector<Group> m_groups;
+    QHash<QByteArray, int> m_places; ///< of the groups
     QVector<Fault> m_faults;
 };

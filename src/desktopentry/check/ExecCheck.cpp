@@ -19,9 +19,17 @@ class Text
     Q_DECLARE_TR_FUNCTIONS(EntryCheck)
 };
 
+constexpr int LongestPath = 4096;
+
 bool isWindowManagerCommand(const QString &exec)
 {
     return exec.startsWith(QLatin1String("VELWM_"));
+}
+
+// What a repair begins with; nothing where there is none.
+QString repairable(const CheckedValue &value)
+{
+    return value.isLong ? QString() : value.text();
 }
 
 QString quotingSentence(const Fault &fault)
@@ -40,7 +48,7 @@ QString quotingSentence(const Fault &fault)
 
 void addQuoting(const Fault &fault, const CheckedValue &value)
 {
-    const QString exec = value.text();
+    const QString exec = repairable(value);
     const auto severity =
         fault.problem == EntryProblem::ReservedCharacter && fault.character == QLatin1Char('\\')
         ? EntryFinding::Warning
@@ -60,7 +68,7 @@ void addQuoting(const Fault &fault, const CheckedValue &value)
 
 void addUnknownCode(const Fault &fault, const CheckedValue &value)
 {
-    const QString repaired = ExecRewriting::withPlainPercents(value.text());
+    const QString repaired = ExecRewriting::withPlainPercents(repairable(value));
     const QString label = Text::tr("Write '%' as '%%'");
     if (fault.problem == EntryProblem::IncompleteFieldCode)
         value.add(fault.problem, EntryFinding::Error,
@@ -72,7 +80,7 @@ void addUnknownCode(const Fault &fault, const CheckedValue &value)
 
 void addKnownCode(const Fault &fault, const CheckedValue &value)
 {
-    const QString exec = value.text();
+    const QString exec = repairable(value);
     const QString remove = Text::tr("Remove it");
     switch (fault.problem) {
     case EntryProblem::DeprecatedFieldCode:
@@ -119,6 +127,8 @@ int lengthOfProgram(const QString &exec, const QString &folder, const EntryLooku
          blank = exec.indexOf(QLatin1Char(' '), blank + 1)) {
         const int next = exec.indexOf(QLatin1Char(' '), blank + 1);
         const int end = next < 0 ? exec.size() : next;
+        if (end > LongestPath)
+            break;
         const Answer answer = lookups.program(exec.left(end), folder);
         *isKnown = *isKnown && answer != Answer::Unknown;
         if (answer == Answer::Yes)

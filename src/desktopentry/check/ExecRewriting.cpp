@@ -198,13 +198,15 @@ QString ExecRewriting::throughShell(const QString &exec)
 
 QString ExecRewriting::withPlainPercents(const QString &exec)
 {
-    QString result = exec;
-    int added = 0;
+    QString result;
+    int kept = 0;
     forEachCode(exec, [&](int at, QChar code) {
-        if (code.isNull() || !isOneOf("%fFuUickdDnNvm", code))
-            result.insert(at + added++, QLatin1Char('%'));
+        if (!code.isNull() && isOneOf("%fFuUickdDnNvm", code))
+            return;
+        result += exec.mid(kept, at - kept) + QLatin1Char('%');
+        kept = at;
     });
-    return result;
+    return result + exec.mid(kept);
 }
 
 QString ExecRewriting::withoutCodes(const QString &exec, const QString &codes, const QString &once)

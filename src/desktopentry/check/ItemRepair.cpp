@@ -3,10 +3,12 @@
 
 #include "ItemRepair.h"
 
-QStringList ItemRepair::replaced(const EntryText::Key &key, const QByteArray &item, const QStringList &items)
+QStringList ItemRepair::replaced(const CheckedValue &value, const QByteArray &item, const QStringList &items)
 {
     QStringList result;
-    for (const QByteArray &old : EntryText::items(key.value)) {
+    if (value.isLong)
+        return result;
+    for (const QByteArray &old : EntryText::items(value.key.value)) {
         const QStringList now = old == item ? items : QStringList(EntryText::text(old));
         for (const QString &one : now) {
             if (!one.isEmpty() && (old != item || !result.contains(one)))
@@ -24,9 +26,4 @@ QString ItemRepair::meant(const QByteArray &item, const QStringList &names)
             return name;
     }
     return {};
-}
-
-bool ItemRepair::isRepeated(const QByteArrayList &items, int index)
-{
-    return items.indexOf(items.at(index)) < index;
 }

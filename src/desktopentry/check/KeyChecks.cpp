@@ -94,9 +94,10 @@ bool hasOwnKeys(const QByteArray &type)
 const EntryText::Key *typeOf(const CheckedEntry &entry, const EntryText::Group &group)
 {
     const EntryText::Key *type = EntryText::key(group, "Type");
-    for (const EntryText::Group &other : entry.text.groups()) {
-        if (!type && KeyChecks::isOfStandard(other) && !isAction(other))
-            type = EntryText::key(other, "Type");
+    for (const char *name : {"Desktop Entry", "KDE Desktop Entry"}) {
+        const EntryText::Group *other = entry.text.group(name);
+        if (!type && other)
+            type = EntryText::key(*other, "Type");
     }
     return type;
 }

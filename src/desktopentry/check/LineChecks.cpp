@@ -7,6 +7,7 @@
 
 #include <QCoreApplication>
 #include <QFileInfo>
+#include <QSet>
 
 #include <algorithm>
 
@@ -30,6 +31,10 @@ public:
         : m_entry(entry)
         , m_findings(findings)
     {
+        const auto *main = m_entry.text.mainGroup();
+        const auto *actions = main ? EntryText::key(*main, "Actions") : nullptr;
+        const QByteArrayList ids = actions ? EntryText::items(actions->value) : QByteArrayList();
+        m_actions = QSet<QByteArray>(ids.begin(), ids.end());
     }
 
     void check()
@@ -130,9 +135,7 @@ private:
                 Text::tr("The id '%1' of an action may only have letters A to Z, digits and '-'.")
                     .arg(QString::fromUtf8(id)),
                 group.name);
-        const auto *main = m_entry.text.mainGroup();
-        const auto *actions = main ? EntryText::key(*main, "Actions") : nullptr;
-        if (!actions || !EntryText::items(actions->value).contains(id) || id.isEmpty())
+        if (!m_actions.contains(id) || id.isEmpty())
             add(EntryProblem::GroupWithoutAction,
                 Text::tr("The action '%1' is described, but 'Actions' does not name it.")
                     .arg(QString::fromUtf8(id)),
@@ -141,6 +144,7 @@ private:
 
     const CheckedEntry &m_entry;
     EntryFindings *const m_findings;
+    QSet<QByteArray> m_actions; ///< that the entry names
 };
 
 } // namespace

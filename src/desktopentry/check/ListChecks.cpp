@@ -8,6 +8,7 @@
 #include <frame/DesktopNames.h>
 
 #include <QCoreApplication>
+#include <QSet>
 
 #include <algorithm>
 #include <cstring>
@@ -26,14 +27,16 @@ void forEachItem(const CheckedValue &value, Check check)
     if (value.key.value.isEmpty())
         return;
     const QByteArrayList items = EntryText::items(value.key.value);
-    for (int i = 0; i < items.size(); ++i) {
-        const QString text = EntryText::text(items.at(i));
-        if (ItemRepair::isRepeated(items, i))
+    QSet<QByteArray> seen;
+    for (const QByteArray &item : items) {
+        const QString text = EntryText::text(item);
+        if (seen.contains(item))
             value.add(EntryProblem::RepeatedItem, EntryFinding::Warning,
                       Text::tr("'%1' stands more than once.").arg(text), Text::tr("Keep the first"),
-                      ItemRepair::replaced(value.key, items.at(i), {text}));
+                      ItemRepair::replaced(value, item, {text}));
         else
-            check(items.at(i));
+            check(item);
+        seen.insert(item);
     }
 }
 
@@ -90,7 +93,7 @@ void checkMimeType(const QByteArray &item, const CheckedEntry &entry, const Chec
         value.add(EntryProblem::MalformedMimeType, EntryFinding::Error, sentence,
                   meant.isEmpty() ? Text::tr("Remove it")
                                   : Text::tr("Change it to '%1'").arg(meant.join(QLatin1String("', '"))),
-                  ItemRepair::replaced(value.key, item, meant));
+                  ItemRepair::replaced(value, item, meant));
         return;
     }
     const QByteArray media = item.left(item.indexOf('/'));
@@ -138,8 +141,7 @@ void ListChecks::checkDesktops(const CheckedValue &value)
             value.add(EntryProblem::UnknownDesktop, EntryFinding::Error, sentence);
         else
             value.add(EntryProblem::UnknownDesktop, EntryFinding::Error, sentence,
-                      Text::tr("Change it to '%1'").arg(meant),
-                      ItemRepair::replaced(value.key, item, {meant}));
+                      Text::tr("Change it to '%1'").arg(meant), ItemRepair::replaced(value, item, {meant}));
     });
 }
 
