@@ -3,6 +3,7 @@
 
 #include "FormFindings.h"
 
+#include "EditActionsWidget.h"
 #include "EntryFormAssistance.h"
 #include "FieldEdit.h"
 #include "check/EntryCheck.h"
@@ -169,7 +170,7 @@ RowFindings::Said FormFindings::said(const EntryFinding &finding, int row) const
         ? finding.sentence
         : tr("%1: %2", "a key or an action of an entry, and what is wrong with it")
               .arg(about, finding.sentence);
-    const bool canRepair = finding.repair && finding.repair->key == shown.key && shown.field->isEnabled()
+    const bool canRepair = finding.repair && rowOf(*finding.repair) == &shown && shown.field->isEnabled()
         && !m_form.isReadOnly();
     const QString key = finding.key.isEmpty() ? QStringLiteral("File") : finding.key;
     return {finding, isOfAction ? shown.key : key, sentence, canRepair};
@@ -208,12 +209,23 @@ void FormFindings::bringIntoView(int row) const
     area->ensureWidgetVisible(m_assistance.rows().at(row).field);
 }
 
+const FormRow *FormFindings::rowOf(const EntryRepair &repair) const
+{
+    return m_assistance.row(repair.action.isEmpty() ? repair.key : QStringLiteral("Actions"));
+}
+
 void FormFindings::repair(const EntryRepair &repair)
 {
-    const FormRow *row = m_assistance.row(repair.key);
+    const FormRow *row = rowOf(repair);
     if (!row)
         return;
-    m_assistance.edit(*row, repair.value);
+    if (repair.action.isEmpty()) {
+        m_assistance.edit(*row, repair.value);
+    } else {
+        VelUIDesktopEntry entry = m_assistance.record();
+        repair.applyTo(&entry);
+        m_assistance.edit(*row, QVariant::fromValue(entry.getActions()));
+    }
     FieldEdit::focus(row->field);
 }
 

@@ -51,6 +51,7 @@ private:
     void sayUnder(int row, QVector<const EntryFinding *> *all);
     void makeRoom();
     int rowOf(const EntryFinding &finding) const;
+    const FormRow *rowOf(const EntryRepair &repair) const;
     RowFindings::Said said(const EntryFinding &finding, int row) const;
     void goOn(int step);
     void bringIntoView(int row) const;

@@ -71,6 +71,8 @@ private Q_SLOTS:
     void leavesUnrepairedWhatARecordCannotReach_data();
     void leavesUnrepairedWhatARecordCannotReach();
     void saysEverySentenceInFull();
+    void looksThroughTheLargestEntries_data();
+    void looksThroughTheLargestEntries();
 
 private:
     EntryFindings check(const QByteArray &bytes, const QString &name = QStringLiteral("entry.desktop"));
@@ -165,6 +167,8 @@ void tst_EntryCheck::finds_data()
     row("malformed language", Application + "Name[d e]=x\n", P::MalformedKey, error, "Name");
     row("unknown key", Application + "Own=x\n", P::UnknownKey, error, "Own");
     row("key twice", Application + "Exec=run\n", P::RepeatedKey, error, "Exec");
+    row("language of brackets", Application + "Comment=x\nComment[t[]=x\n", P::MalformedKey, error,
+        "Comment");
     row("not translatable", Application + "Exec[de]=run\n", P::NotTranslatable, error, "Exec");
     row("translation alone", Application + "Comment[de]=x\n", P::NoPlainValue, error, "Comment");
     row("no name", "[Desktop Entry]\nType=Application\nExec=run\n", P::MissingKey, error, "Name");
@@ -314,7 +318,11 @@ void tst_EntryCheck::repairs_data()
     row("MimeType=nonsense;text/plain;", P::MalformedMimeType, "MimeType=text/plain;");
     row("OnlyShowIn=gnome;", P::UnknownDesktop, "OnlyShowIn=GNOME;");
     row("URL=x:y", P::KeyOfOtherType, "");
-    row("Comment[de]=x", P::NoPlainValue, "Comment[de]=x\nComment=x");
+    row("Actions=new;\n\n[Desktop Action new]\nName=x\nIcon=a.png\nExec=run", P::IconSuffix,
+        "Actions=new;\n\n[Desktop Action new]\nName=x\nIcon=a\nExec=run");
+    row("Actions=new;\n\n[Desktop Action new]\nName=x\nName[fr]=y\nExec=run %x", P::UnknownFieldCode,
+        "Actions=new;\n\n[Desktop Action new]\nName=x\nName[fr]=y\nExec=run %%x");
+    row("Comment[de]=x", P::NoPlainValue, "Comment=x\nComment[de]=x");
 }
 
 void tst_EntryCheck::repairs()
@@ -349,8 +357,10 @@ void tst_EntryCheck::leavesUnrepairedWhatARecordCannotReach_data()
     QTest::newRow("key twice") << Application + "Icon=a.png\nIcon=b.png\n";
     QTest::newRow("group twice") << Application + "Icon=a.png\n[Desktop Entry]\nComment=x\n";
     QTest::newRow("translation") << Application + "Icon=known\nIcon[de]=a.png\n";
-    QTest::newRow("action") << Application
-            + "Actions=new;\n[Desktop Action new]\nName=x\nIcon=a.png\nExec=run\n";
+    QTest::newRow("action that is not named")
+        << Application + "Actions=old;\n[Desktop Action new]\nName=x\nIcon=a.png\nExec=run\n";
+    QTest::newRow("action twice") << Application
+            + "Actions=new;\n[Desktop Action new]\nName=x\nIcon=a.png\nExec=run\n[Desktop Action new]\n";
     QTest::newRow("half a group") << QByteArray(
         "[Desktop Entry]\nType=Application\nName=x\nExec=run\n[half\nIcon=a.png\n");
     QTest::newRow("empty item") << Application + "Categories=Game;;\n";
@@ -377,6 +387,38 @@ void tst_EntryCheck::saysEverySentenceInFull()
                  qPrintable(finding.sentence));
         QVERIFY2(!finding.sentence.contains(QLatin1String("%1")), qPrintable(finding.sentence));
     }
+}
+
+void tst_EntryCheck::looksThroughTheLargestEntries_data()
+{
+    QTest::addColumn<QByteArray>("start");
+    QTest::addColumn<QByteArray>("before");
+    QTest::addColumn<QByteArray>("behind");
+    QByteArray actions = Application + "Actions=";
+    for (int i = 0; i < 60000; ++i)
+        actions += QByteArray::number(i, 36) + ';';
+    QTest::newRow("groups") << Application << QByteArray("[") << QByteArray("]\n");
+    QTest::newRow("groups without a type") << QByteArray() << QByteArray("[") << QByteArray("]\nName=a\n");
+    QTest::newRow("actions") << actions + '\n' << QByteArray("[Desktop Action ") << QByteArray("]\n");
+    QTest::newRow("list") << Application + "Categories=" << QByteArray() << QByteArray(";");
+    QTest::newRow("field codes") << Application + "Exec=run " << QByteArray("%x ") << QByteArray(" ");
+    QTest::newRow("blanks in a path") << Application + "Exec=/run " << QByteArray("/") << QByteArray(" ");
+}
+
+// Whatever takes the square of their size does not come to an end here.
+void tst_EntryCheck::looksThroughTheLargestEntries()
+{
+    QFETCH(QByteArray, start);
+    QFETCH(QByteArray, before);
+    QFETCH(QByteArray, behind);
+    constexpr int largest = 1024 * 1024;
+    QByteArray bytes = start;
+    for (int i = 0; bytes.size() < largest - 100; ++i)
+        bytes += before + QByteArray::number(i, 36) + behind;
+    const EntryFindings findings = check(bytes + '\n');
+    QVERIFY(!findings.isEmpty());
+    for (const EntryFinding &finding : findings)
+        QVERIFY2(!finding.repair, qPrintable(finding.sentence));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_EntryCheck)

@@ -269,7 +269,12 @@ void tst_FormFindings::saysUnderTheActionsWhatAnActionIsAbout()
                               QStringList(QStringLiteral("new: There is no field code '%x'.")), Patience);
     auto *actions = child<QLineEdit>(dialog.get(), "actionListShow");
     QVERIFY(actions->accessibleDescription().contains(QStringLiteral("'%x'")));
-    QVERIFY(!fixButton(dialog.get(), "Actions"));
+    XDoTool::click(fixButton(dialog.get(), "Actions"));
+    QTRY_VERIFY_WITH_TIMEOUT(said(dialog.get(), "Actions").isEmpty(), Patience);
+    XDoTool::click(okButton(dialog.get()));
+    QTRY_VERIFY_WITH_TIMEOUT(!dialog->isVisible(), Patience);
+    QCOMPARE(read(path(QStringLiteral("entry.desktop"))),
+             Good + "Actions=new;\n\n[Desktop Action new]\nName=New\nExec=true %%x\n");
 }
 
 void tst_FormFindings::saysUnderTheLastRowWhatNoRowIsAbout()

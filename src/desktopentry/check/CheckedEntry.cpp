@@ -35,12 +35,19 @@ void CheckedValue::add(EntryProblem problem, Severity severity, const QString &s
 {
     add(problem, severity, sentence);
     if (canBeRepaired())
-        m_findings->last().repair = EntryRepair{repair, QString::fromUtf8(key.name), value};
+        m_findings->last().repair = EntryRepair{repair, QString::fromUtf8(key.name), value, action()};
+}
+
+// The id of the action that the value belongs to; empty where it belongs to none.
+QString CheckedValue::action() const
+{
+    const QByteArray prefix = QByteArrayLiteral("Desktop Action ");
+    return group.name.startsWith(prefix) ? QString::fromUtf8(group.name.mid(prefix.size())) : QString();
 }
 
 // A record changes the last of several lines and leaves the others alone.
 bool CheckedValue::canBeRepaired() const
 {
-    return !isLong && isMain() && group.count == 1 && key.locale.isEmpty()
+    return !isLong && (isMain() || !action().isEmpty()) && group.count == 1 && key.locale.isEmpty()
         && EntryText::count(group, key) == 1;
 }

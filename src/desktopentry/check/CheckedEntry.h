@@ -48,6 +48,7 @@ public:
 
 private:
     bool canBeRepaired() const;
+    QString action() const;
 
     EntryFindings *const m_findings;
 };

@@ -5,6 +5,7 @@
 
 #include <QHash>
 
+#include <algorithm>
 #include <functional>
 
 namespace {
@@ -14,6 +15,12 @@ struct Access
 {
     std::function<QVariant(const VelUIDesktopEntry &)> get;
     std::function<void(VelUIDesktopEntry *, const QVariant &)> set;
+};
+
+struct ActionAccess
+{
+    QString (VelUIDesktopAction::*get)() const;
+    void (VelUIDesktopAction::*set)(const QString &);
 };
 
 template <typename Value, typename Get, typename Set>
@@ -49,6 +56,17 @@ const QHash<QString, Access> &keys()
     return all;
 }
 
+const QHash<QString, ActionAccess> &actionKeys()
+{
+    using Action = VelUIDesktopAction;
+    static const QHash<QString, ActionAccess> all = {
+        {QStringLiteral("Name"), {&Action::getName, &Action::setName}},
+        {QStringLiteral("Icon"), {&Action::getIcon, &Action::setIcon}},
+        {QStringLiteral("Exec"), {&Action::getExec, &Action::setExec}},
+    };
+    return all;
+}
+
 #undef VEL_TEXT
 #undef VEL_FLAG
 #undef VEL_LIST
@@ -57,13 +75,43 @@ const QHash<QString, Access> &keys()
 
 void EntryRepair::applyTo(VelUIDesktopEntry *entry) const
 {
+    if (!action.isEmpty()) {
+        applyToAction(entry);
+        return;
+    }
     const auto found = keys().constFind(key);
     if (found != keys().constEnd())
         found->set(entry, value);
 }
 
+void EntryRepair::applyToAction(VelUIDesktopEntry *entry) const
+{
+    const auto found = actionKeys().constFind(key);
+    if (found == actionKeys().constEnd())
+        return;
+    QList<VelUIDesktopAction> actions = entry->getActions();
+    for (VelUIDesktopAction &one : actions) {
+        if (one.getId() == action)
+            (one.*found->set)(value.toString());
+    }
+    entry->setActions(actions);
+}
+
 bool EntryRepair::changes(const VelUIDesktopEntry &entry) const
 {
+    if (!action.isEmpty())
+        return changesAction(entry);
     const auto found = keys().constFind(key);
     return found != keys().constEnd() && found->get(entry) != value;
+}
+
+bool EntryRepair::changesAction(const VelUIDesktopEntry &entry) const
+{
+    const auto found = actionKeys().constFind(key);
+    if (found == actionKeys().constEnd())
+        return false;
+    const QList<VelUIDesktopAction> actions = entry.getActions();
+    return std::any_of(actions.cbegin(), actions.cend(), [&](const VelUIDesktopAction &one) {
+        return one.getId() == action && (one.*found->get)() != value.toString();
+    });
 }
