@@ -28,51 +28,6 @@ namespace {
 
 constexpr int LongestHistory = 1000;
 
-bool areEqual(const QVector<QVariant> &left, const QVector<QVariant> &right)
-{
-    return std::equal(left.begin(), left.end(), right.begin(), right.end(), FieldEdit::areEqual);
-}
-
-bool haveSameFrame(const FormState &left, const FormState &right)
-{
-    return left.type == right.type && left.isTypeDecided == right.isTypeDecided
-        && left.isOnlyShowIn == right.isOnlyShowIn;
-}
-
-bool areEqual(const FormState &left, const FormState &right)
-{
-    return haveSameFrame(left, right) && areEqual(left.own, right.own)
-        && left.translations == right.translations;
-}
-
-// Whether all that differs are texts, of which one key press made the others.
-bool isTyped(const FormState &before, const FormState &after)
-{
-    if (!haveSameFrame(before, after) || before.language != after.language)
-        return false;
-    for (int i = 0; i < after.shown.size(); ++i) {
-        if (FieldEdit::areEqual(before.shown.at(i), after.shown.at(i)))
-            continue;
-        if (after.shown.at(i).userType() != QMetaType::QString
-            || !TextChange(before.shown.at(i).toString(), after.shown.at(i).toString()).isTyped())
-            return false;
-    }
-    return true;
-}
-
-bool continues(const FormState &before, const FormState &between, const FormState &after)
-{
-    for (int i = 0; i < after.shown.size(); ++i) {
-        const QString texts[] = {before.shown.at(i).toString(), between.shown.at(i).toString(),
-                                 after.shown.at(i).toString()};
-        if ((texts[0] == texts[1]) != (texts[1] == texts[2]))
-            return false;
-        if (texts[0] != texts[1] && !TextChange(texts[1], texts[2]).continues(TextChange(texts[0], texts[1])))
-            return false;
-    }
-    return true;
-}
-
 QLineEdit *lineOf(QWidget *field)
 {
     auto *line = qobject_cast<QLineEdit *>(field);
@@ -89,7 +44,7 @@ public:
         , m_history(history)
         , m_before(before)
         , m_after(after)
-        , m_isTyped(isTyped(before, after))
+        , m_isTyped(after.isTypedAfter(before))
     {
     }
 
@@ -108,7 +63,7 @@ public:
     bool mergeWith(const QUndoCommand *command) override
     {
         const auto *next = static_cast<const Step *>(command);
-        if (m_history.m_beginsStep || !continues(m_before, m_after, next->m_after))
+        if (m_history.m_beginsStep || !next->m_after.continues(m_before, m_after))
             return false;
         m_after = next->m_after;
         return true;
@@ -284,7 +239,7 @@ void FormHistory::look()
     if (m_isRestoring)
         return;
     const FormState now = state();
-    if (areEqual(m_last, now))
+    if (m_last.isEqualTo(now))
         return;
     const FormState former = std::exchange(m_last, now);
     m_stack.push(new Step(*this, former, now));

@@ -3,10 +3,12 @@
 
 #include <VelDesktopEntryEditDialog.h>
 
+#include "EntryCopy.h"
 #include "EntryFormAssistance.h"
 #include "EntryTypeRules.h"
 #include "FieldEdit.h"
 #include "FormHistory.h"
+#include "UnsuitableEntry.h"
 #include "VelDesktopEntryPropsWidgetPrivate.h"
 #include "fields/ShowInChoice.h"
 
@@ -14,10 +16,8 @@
 #include <VelMenuDialog.h>
 #include <frame/DesktopEntryRecord.h>
 #include <frame/DialogSize.h>
-#include <frame/EntryPath.h>
 #include <frame/GuardedDialog.h>
 #include <frame/MessageBox.h>
-#include <frame/Unsuitable.h>
 #include <velcore/dirs.h>
 #include <velintegration/desktopitems.h>
 
@@ -28,7 +28,6 @@
 #include <QPoint>
 #include <QPointer>
 #include <QPushButton>
-#include <QScopedValueRollback>
 #include <QScrollArea>
 #include <QVBoxLayout>
 
@@ -66,8 +65,6 @@ public:
     bool inheritFrom(const QString &pattern, VelUIDesktopEntry *entry);
     void savePosition();
     void setNewType();
-    void copy(VelUIDesktopEntry entry);
-    void copyTranslations(const VelUIDesktopEntry &entry);
     void addHistory();
     VelUIDesktopEntry entryToChange() const;
     VelUIDesktopEntry entryToSave() const;
@@ -75,9 +72,6 @@ public:
     VelDesktopEntryPropsWidgetPrivate &form() const { return VelDesktopEntryPropsWidgetPrivate::of(*props); }
 
     void focusField(const QString &key);
-
-    static QString unsuitableText(VelUIDesktopEntry::SuitableError error);
-    static QString fieldMeant(VelUIDesktopEntry::SuitableError error, const VelUIDesktopEntry &entry);
 
     VelDesktopEntryEditDialog *const q;
     QPointer<VelDesktopEntryPropsWidget> props;
@@ -114,29 +108,10 @@ bool VelDesktopEntryEditDialogPrivate::checkSuitable(const VelUIDesktopEntry &en
     if (entry.isSuitable(&error))
         return true;
     const QPointer<VelDesktopEntryEditDialog> self(q);
-    warn(unsuitableText(error));
+    warn(UnsuitableEntry::text(error));
     if (self && isAssisted && props)
-        focusField(fieldMeant(error, entry));
+        focusField(UnsuitableEntry::fieldMeant(error, entry));
     return false;
-}
-
-// The key whose value makes the entry unsuitable.
-QString VelDesktopEntryEditDialogPrivate::fieldMeant(VelUIDesktopEntry::SuitableError error,
-                                                     const VelUIDesktopEntry &entry)
-{
-    switch (error) {
-    case Unsuitable::TryExecMissing:
-    case Unsuitable::TryExecNotInPath:
-        return QStringLiteral("TryExec");
-    case Unsuitable::UrlMissing:
-        return QStringLiteral("URL");
-    default:
-        break;
-    }
-    if (!EntryTypeRules::choices({}).contains(entry.getType()))
-        return QStringLiteral("Type");
-    const bool isCommand = error > 0 || (!entry.getExec().isEmpty() && !entry.getName().isEmpty());
-    return isCommand ? QStringLiteral("Exec") : QStringLiteral("Name");
 }
 
 void VelDesktopEntryEditDialogPrivate::focusField(const QString &key)
@@ -146,25 +121,6 @@ void VelDesktopEntryEditDialogPrivate::focusField(const QString &key)
         return;
     VelUI::FieldEdit::focus(row->field);
     form().scrollArea->ensureWidgetVisible(row->field);
-}
-
-QString VelDesktopEntryEditDialogPrivate::unsuitableText(VelUIDesktopEntry::SuitableError error)
-{
-    switch (error) {
-    case Unsuitable::NoExec:
-        return tr("no executable");
-    case Unsuitable::ProgramMissing:
-    case Unsuitable::ProgramNotExecutable:
-    case Unsuitable::ProgramNotInPath:
-        return tr("can't find executable");
-    case Unsuitable::TryExecMissing:
-    case Unsuitable::TryExecNotInPath:
-        return tr("can't find try executable");
-    case Unsuitable::UrlMissing:
-        return tr("can't find URL");
-    default:
-        return tr("wrong/incomplete desktop entry");
-    }
 }
 
 // Gives the entry what it lacks; false when the dialog was deleted behind a message.
@@ -199,37 +155,6 @@ void VelDesktopEntryEditDialogPrivate::setNewType()
 {
     const EntryTypeRules::NewEntry types = EntryTypeRules::newEntryAt(path);
     props->setType(types.type.isEmpty() ? form().typeChooser.type() : types.type, types.allowed);
-}
-
-// A folder stays one, whatever is copied to its record; a new entry, too, keeps its type where what
-// is copied has none of ours.
-void VelDesktopEntryEditDialogPrivate::copy(VelUIDesktopEntry entry)
-{
-    const VelUI::TypeChooser &chooser = form().typeChooser;
-    const QString type = chooser.type();
-    const bool wasDecided = chooser.isDecided();
-    if (EntryPath::isRecordFile(path))
-        entry.setType(wasDecided ? type : loaded.getType());
-    const QScopedValueRollback<bool> copying(form().isCopying, true);
-    if (isAssisted)
-        copyTranslations(entry);
-    props->loadFrom(entry);
-    if (wasDecided && !chooser.isDecided())
-        props->setType(type, chooser.allowedTypes());
-}
-
-// What the fields are emptied of in one language goes in the others, too.
-void VelDesktopEntryEditDialogPrivate::copyTranslations(const VelUIDesktopEntry &entry)
-{
-    const VelUIDesktopEntry former = entryToSave();
-    for (const VelUI::FormRow &row : form().formRows()) {
-        if (!row.isTranslation())
-            continue;
-        QStringList languages = former.getLanguages(row.key) + entry.getLanguages(row.key);
-        languages.removeDuplicates();
-        for (const QString &language : qAsConst(languages))
-            form().translations().set(row.key, language, Translations::value(entry, row.key, language));
-    }
 }
 
 // An entry may hold both lists; whoever goes over to the other one means it to count.
@@ -399,7 +324,7 @@ void VelDesktopEntryEditDialog::copyFrom()
     VelUIDesktopEntry entry(source);
     if (!entry.load())
         return;
-    d->copy(entry);
+    VelUI::EntryCopy(d->form()).take(entry, d->loaded);
     d->markModified();
 }
 
