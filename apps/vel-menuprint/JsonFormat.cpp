@@ -4,7 +4,9 @@
 #include "MenuFormat.h"
 
 #include "MenuTree.h"
+#include "OpenCommand.h"
 
+#include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
@@ -53,6 +55,7 @@ QJsonArray actionsOf(const MenuItemDetails &details)
     for (const MenuItemAction &action : details.actions) {
         Members members({{QStringLiteral("id"), action.id}, {QStringLiteral("name"), action.name}});
         members.add("icon", action.icon);
+        members.add("iconFile", action.iconFile);
         members.add("exec", action.exec);
         actions.append(members.object());
     }
@@ -82,9 +85,15 @@ QJsonObject objectOf(const MenuItem &item)
     Members members({{QStringLiteral("kind"), kinds[item.kind]},
                      {QStringLiteral("name"), item.name},
                      {QStringLiteral("path"), item.path}});
+    if (item.kind == MenuItem::Entry)
+        members.add("id", QFileInfo(item.path).fileName());
     members.add("icon", item.icon);
+    members.add("iconFile", item.iconFile);
     members.add("exec", item.exec);
+    if (item.kind == MenuItem::Entry || item.kind == MenuItem::File)
+        members.add("command", OpenCommand::of(item.path));
     members.add("unlisted", !item.isListed);
+    members.add("whyUnlisted", item.whyUnlisted);
     addDetails(&members, item.details);
     QJsonObject object = members.object();
     if (item.kind == MenuItem::Folder) {

@@ -42,3 +42,15 @@ MenuItem ListedMenu::of(const MenuItem &menu, const IconFile &iconFile)
     }
     return listed;
 }
+
+void ListedMenu::addIconFiles(MenuItem *menu, const IconFile &iconFile)
+{
+    const auto fileOf = [&iconFile](const QString &icon) {
+        return icon.isEmpty() ? QString() : iconFile(icon);
+    };
+    menu->iconFile = fileOf(menu->icon);
+    for (MenuItemAction &action : menu->details.actions)
+        action.iconFile = fileOf(action.icon);
+    for (MenuItem &child : menu->children)
+        addIconFiles(&child, iconFile);
+}

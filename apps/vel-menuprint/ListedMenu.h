@@ -9,7 +9,7 @@
 
 struct MenuItem;
 
-/// A menu as a window manager or a launcher is to have it: for starting programs, not for editing.
+/// A menu as a window manager or a launcher is to have it.
 namespace ListedMenu {
 
 /// Gives the file of the icon of that name; empty for none.
@@ -22,5 +22,8 @@ using IconFile = std::function<QString(const QString &name)>;
  * @param iconFile replaces the name of every icon; where there is none, the items keep no icon
  */
 MenuItem of(const MenuItem &menu, const IconFile &iconFile);
+
+/// Adds to \a menu as it is the files of all icons.
+void addIconFiles(MenuItem *menu, const IconFile &iconFile);
 
 } // namespace ListedMenu

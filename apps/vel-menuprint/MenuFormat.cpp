@@ -10,15 +10,15 @@ namespace {
 using MenuFormat::Format;
 
 constexpr Format Formats[] = {
-    {"dmenu", true, false, false, MenuFormat::dmenu, nullptr},
-    {"fluxbox", true, true, true, MenuFormat::fluxbox, MenuFormat::fluxboxText},
-    {"icewm", true, false, true, MenuFormat::icewm, MenuFormat::icewmText},
-    {"json", false, false, false, MenuFormat::json, nullptr},
-    {"jwm", true, false, false, MenuFormat::jwm, MenuFormat::jwmText},
-    {"labwc", true, false, false, MenuFormat::labwc, MenuFormat::openboxText},
-    {"openbox", true, false, false, MenuFormat::openbox, MenuFormat::openboxText},
-    {"rofi", true, false, false, MenuFormat::rofi, nullptr},
-    {"text", false, false, false, MenuFormat::text, nullptr},
+    {"dmenu", true, false, false, false, MenuFormat::dmenu, nullptr},
+    {"fluxbox", true, true, false, true, MenuFormat::fluxbox, MenuFormat::fluxboxText},
+    {"icewm", true, false, false, true, MenuFormat::icewm, MenuFormat::icewmText},
+    {"json", false, false, true, false, MenuFormat::json, nullptr},
+    {"jwm", true, false, false, false, MenuFormat::jwm, MenuFormat::jwmText},
+    {"labwc", true, false, false, false, MenuFormat::labwc, MenuFormat::openboxText},
+    {"openbox", true, false, false, false, MenuFormat::openbox, MenuFormat::openboxText},
+    {"rofi", true, false, false, false, MenuFormat::rofi, nullptr},
+    {"text", false, false, false, false, MenuFormat::text, nullptr},
 };
 
 } // namespace

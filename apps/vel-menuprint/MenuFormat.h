@@ -17,6 +17,7 @@ struct Format
     const char *name;
     bool isForStarting; ///< gets a ListedMenu with the files of the icons, not the menu as it is edited
     bool hasPicturesOnly; ///< the icons have to be PNG or XPM pictures
+    bool hasIconFiles; ///< gets the files of the icons beside their names
     bool hasLines; ///< a path with a line feed cannot be written
     QByteArray (*print)(const MenuItem &menu);
     QByteArray (*printText)(

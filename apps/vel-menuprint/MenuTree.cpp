@@ -81,8 +81,27 @@ MenuItemDetails detailsOf(const VelUIDesktopEntry &record)
     const QList<VelUIDesktopAction> actions = record.getActions();
     for (const VelUIDesktopAction &action : actions)
         details.actions.append({action.getId(), firstOf(action.getLocalName(), action.getName()),
-                                action.getIcon(), action.getExec()});
+                                action.getIcon(), action.getExec(), QString()});
     return details;
+}
+
+QString wordFor(EntryState::Kind state)
+{
+    switch (state) {
+    case EntryState::Kind::NotDisplayed:
+        return QStringLiteral("notDisplayed");
+    case EntryState::Kind::NotInstalled:
+        return QStringLiteral("notInstalled");
+    case EntryState::Kind::Malformed:
+        return QStringLiteral("malformed");
+    case EntryState::Kind::Nameless:
+        return QStringLiteral("nameless");
+    case EntryState::Kind::Shown:
+    case EntryState::Kind::Deleted: // these two are not in the menu at all
+    case EntryState::Kind::ForOtherDesktops:
+        break;
+    }
+    return {};
 }
 
 MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
@@ -94,7 +113,9 @@ MenuItem entry(const QFileInfo &info, const VelUIDesktopEntry &record)
     item.exec = record.getExec();
     item.kind = item.exec == QLatin1String("VELWM_SEPARATOR") ? MenuItem::Separator : MenuItem::Entry;
     item.details = detailsOf(record);
-    item.isListed = EntryState::of(record) == EntryState::Kind::Shown;
+    const EntryState::Kind state = EntryState::of(record);
+    item.isListed = state == EntryState::Kind::Shown;
+    item.whyUnlisted = wordFor(state);
     return item;
 }
 

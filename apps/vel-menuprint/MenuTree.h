@@ -14,6 +14,7 @@ struct MenuItemAction
     QString name;
     QString icon;
     QString exec;
+    QString iconFile; ///< where it was looked for, empty else
 };
 
 /// What else an entry tells of itself, in the user's language; what it does not tell is empty.
@@ -47,8 +48,10 @@ struct MenuItem
     QString name; ///< the name shown
     QString path; ///< absolute
     QString icon; ///< the name of the icon or its path; may be empty
+    QString iconFile; ///< where it was looked for, empty else
     QString exec; ///< the command of an entry, with its field codes
     bool isListed = true; ///< whether a menu for starting programs shows it, apart from its children
+    QString whyUnlisted; ///< a word for programs: notDisplayed, notInstalled, malformed, nameless
     MenuItemDetails details; ///< of an entry
     QVector<MenuItem> children; ///< of a folder
 };

@@ -160,12 +160,17 @@ MenuItem readMenu(const QFileInfo &directory)
 // As the format wants it.
 MenuItem prepared(const MenuItem &menu, const MenuFormat::Format &format, const Options &options)
 {
-    if (!format.isForStarting)
+    if (!format.isForStarting && !format.hasIconFiles)
         return menu;
     IconFiles::setTheme(options.iconTheme.isEmpty() ? IconFiles::userTheme() : options.iconTheme);
-    return ListedMenu::of(menu, [&](const QString &name) {
+    const auto iconFile = [&](const QString &name) {
         return IconFiles::find(name, options.iconSize, format.hasPicturesOnly);
-    });
+    };
+    if (format.isForStarting)
+        return ListedMenu::of(menu, iconFile);
+    MenuItem whole = menu;
+    ListedMenu::addIconFiles(&whole, iconFile);
+    return whole;
 }
 
 void tellOfLongPaths(const MenuItem &menu)

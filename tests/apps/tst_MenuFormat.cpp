@@ -90,6 +90,8 @@ private Q_SLOTS:
     void printsATextInThePlaceOfAMenu_data();
     void printsATextInThePlaceOfAMenu();
     void printsJsonWithAllThatAnEntryTells();
+    void tellsInJsonWhyAnEntryIsUnlisted_data();
+    void tellsInJsonWhyAnEntryIsUnlisted();
     void quotesACommandForTheShell();
 
 private:
@@ -377,13 +379,44 @@ void tst_MenuFormat::printsJsonWithAllThatAnEntryTells()
     const QJsonObject found =
         QJsonDocument::fromJson(json).object().value(QLatin1String("children")).toArray().at(0).toObject();
     const QByteArray expected = R"({"kind": "entry", "name": "A", "icon": "i", "exec": "true",
-        "unlisted": true, "genericName": "G", "comment": "C", "keywords": ["k", "l"],
+        "id": "a.desktop", "unlisted": true, "whyUnlisted": "notDisplayed", "genericName": "G", "comment": "C", "keywords": ["k", "l"],
         "categories": ["Utility"], "mimeTypes": ["text/plain"], "tryExec": "sh",
         "workingDirectory": "/tmp", "terminal": true, "startupNotify": true, "startupWMClass": "W",
         "actions": [{"id": "new", "name": "N", "icon": "n", "exec": "new"}]})";
     QJsonObject wanted = QJsonDocument::fromJson(expected).object();
     wanted.insert(QStringLiteral("path"), path(QStringLiteral("menu/a.desktop")));
+    wanted.insert(QStringLiteral("command"),
+                  QStringLiteral("vel-open --exec '%1'").arg(path(QStringLiteral("menu/a.desktop"))));
     QCOMPARE(found, wanted);
+}
+
+void tst_MenuFormat::tellsInJsonWhyAnEntryIsUnlisted_data()
+{
+    QTest::addColumn<QByteArray>("contents");
+    QTest::addColumn<bool>("isThere");
+    QTest::newRow("") << desktopEntry("A") << true;
+    QTest::newRow("notDisplayed") << desktopEntry("A", "NoDisplay=true\n") << true;
+    QTest::newRow("notInstalled") << desktopEntry("A", "TryExec=/nowhere/at/all\n") << true;
+    QTest::newRow("malformed") << QByteArray("no entry at all\n") << true;
+    QTest::newRow("nameless") << QByteArray("[Desktop Entry]\nType=Application\nExec=true\n") << true;
+    QTest::newRow("deleted") << desktopEntry("A", "Hidden=true\n") << false;
+    QTest::newRow("other desktop") << desktopEntry("A", "OnlyShowIn=Nowhere;\n") << false;
+}
+
+void tst_MenuFormat::tellsInJsonWhyAnEntryIsUnlisted()
+{
+    QFETCH(QByteArray, contents);
+    QFETCH(bool, isThere);
+    write(QStringLiteral("menu/a.desktop"), contents);
+    const QByteArray json = MenuFormat::json(MenuTree::read(path(QStringLiteral("menu"))));
+    const QJsonArray found =
+        QJsonDocument::fromJson(json).object().value(QLatin1String("children")).toArray();
+    QCOMPARE(found.size(), int(isThere));
+    const QString word = QString::fromLatin1(QTest::currentDataTag());
+    if (isThere) {
+        QCOMPARE(found.at(0).toObject().value(QLatin1String("whyUnlisted")).toString(), word);
+        QCOMPARE(found.at(0).toObject().contains(QLatin1String("unlisted")), !word.isEmpty());
+    }
 }
 
 void tst_MenuFormat::quotesACommandForTheShell()

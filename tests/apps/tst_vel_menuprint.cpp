@@ -441,7 +441,9 @@ void tst_vel_menuprint::tellsNoControlCharacterOfAPath()
 
 void tst_vel_menuprint::printsJson()
 {
-    const QString file = write(QStringLiteral("menu/a.desktop"), entry("Ä \"B\"", "Icon=x\n"));
+    const QString picture = write(QStringLiteral("x.png"), "x");
+    const QString file =
+        write(QStringLiteral("menu/a.desktop"), entry("Ä \"B\"", "Icon=" + picture.toUtf8() + '\n'));
     write(QStringLiteral("menu/notes.txt"), "text");
 
     const Result result =
@@ -454,8 +456,11 @@ void tst_vel_menuprint::printsJson()
     const QJsonObject expected{{QStringLiteral("kind"), QStringLiteral("entry")},
                                {QStringLiteral("name"), QStringLiteral("Ä \"B\"")},
                                {QStringLiteral("path"), file},
-                               {QStringLiteral("icon"), QStringLiteral("x")},
-                               {QStringLiteral("exec"), QStringLiteral("true")}};
+                               {QStringLiteral("id"), QStringLiteral("a.desktop")},
+                               {QStringLiteral("icon"), picture},
+                               {QStringLiteral("iconFile"), picture},
+                               {QStringLiteral("exec"), QStringLiteral("true")},
+                               {QStringLiteral("command"), QStringLiteral("vel-open --exec '%1'").arg(file)}};
     QVERIFY(children.contains(expected));
     QVERIFY(!children.at(1).toObject().contains(QLatin1String("exec"))
             || !children.at(0).toObject().contains(QLatin1String("exec")));
