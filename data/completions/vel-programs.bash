@@ -23,12 +23,15 @@ _vel_programs()
             options='--watch --help --version'
             files=-d
             ;;
-        vel-open) options='--exec --trust' ;;
+        vel-open) options='--exec --trust --help --version' ;;
         vel-wmbridge)
             options='--startmenu --toolbar --shortcut --other --for --replace --help --version'
             files=
             ;;
-        vel-wmfunc) files= ;;
+        vel-wmfunc)
+            options='--help --version'
+            files=
+            ;;
     esac
     case $program$before in
         vel-menuprint--format)

@@ -20,7 +20,14 @@ namespace {
 
 constexpr char Usage[] = "usage: vel-menusync [--watch] [MENU]\n"
                          "Has the start menu follow the applications that are installed, once or, with\n"
-                         "--watch, whenever they change. Another menu directory may be given.\n";
+                         "--watch, whenever they change. Another menu directory may be given.\n"
+                         "\n"
+                         "  --watch    Go on until the program is told to end.\n"
+                         "  --help     Explain the options.\n"
+                         "  --version  Print the version.\n"
+                         "\n"
+                         "The exit status is 0 when the menu is up to date, 1 when something could not be\n"
+                         "done or no application is installed, 2 when the arguments are wrong.\n";
 
 using VelStartMenu::Look;
 using VelStartMenu::Result;

@@ -38,7 +38,15 @@ constexpr char Usage[] = "usage: vel-open --exec PATH\n"
                          "Runs a desktop entry, or opens a file or folder.\n"
                          "\n"
                          "An entry that belongs to another user than you and root and is not executable\n"
-                         "is run with --trust only, unless it lies in $XDG_DATA_HOME or $XDG_DATA_DIRS.\n";
+                         "is run with --trust only, unless it lies in $XDG_DATA_HOME or $XDG_DATA_DIRS.\n"
+                         "\n"
+                         "  --exec PATH  Run or open this.\n"
+                         "  --trust      Run the entry whoever it belongs to.\n"
+                         "  --help       Explain the options.\n"
+                         "  --version    Print the version.\n"
+                         "\n"
+                         "The exit status is 0 when it was started, 1 when it was not, 2 when the arguments\n"
+                         "are wrong.\n";
 constexpr std::chrono::milliseconds LongestWait(1600);
 constexpr char Success = '+';
 

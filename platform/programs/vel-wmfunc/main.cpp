@@ -13,7 +13,13 @@
 namespace {
 
 constexpr char Usage[] = "usage: vel-wmfunc WORDS...\n"
-                         "Sends the words, joined by blanks, to the window manager.\n";
+                         "Sends the words, joined by blanks, to the window manager.\n"
+                         "\n"
+                         "  --help     Explain the program.\n"
+                         "  --version  Print the version.\n"
+                         "\n"
+                         "The exit status is 0 when the window manager was told, 1 when it was not, 2 when\n"
+                         "there is no command.\n";
 
 int fail(const char *reason)
 {
