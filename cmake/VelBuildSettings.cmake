@@ -62,7 +62,9 @@ endif()
 # vel_compile_settings(<target>): the warnings and definitions of our own code.
 function(vel_compile_settings target)
     target_compile_options(${target} PRIVATE
-        -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wconversion
+        -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual
+        # The sizes of Qt 6 have 64 bits, and ours are those of both: a build with Qt 5 tells.
+        $<IF:$<EQUAL:${VEL_QT_MAJOR},5>,-Wconversion,-Wno-conversion>
         $<$<CXX_COMPILER_ID:GNU>:-Wsuggest-override>
         # Every qCDebug trips over this one in clang 14.
         $<$<CXX_COMPILER_ID:Clang>:-Wno-gnu-zero-variadic-macro-arguments>
@@ -75,7 +77,9 @@ function(vel_compile_settings target)
         QT_NO_FOREACH
         QT_NO_NARROWING_CONVERSIONS_IN_CONNECT
         QT_STRICT_ITERATORS
-        QT_DISABLE_DEPRECATED_BEFORE=0x050F00)
+        QT_DISABLE_DEPRECATED_BEFORE=0x050F00
+        # What the oldest Qt 6 has no other name for is no matter for a warning of a later one.
+        $<$<EQUAL:${VEL_QT_MAJOR},6>:QT_DEPRECATED_WARNINGS_SINCE=0x060400>)
 endfunction()
 
 # vel_link_settings(<target>): a shared library has to name all that it needs.

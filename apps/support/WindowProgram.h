@@ -35,7 +35,9 @@ int runWithWindows(int &argc, char **argv, const QString &name, int wrongUsage, 
         if (status != 0)
             return status;
     }
-    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+#if QT_VERSION_MAJOR < 6
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps); // as it is always in Qt 6
+#endif
     QGuiApplication::setDesktopFileName(name);
     return runAs<QApplication>(argc, argv, wrongUsage, parse, [run](const auto &options) {
         findOwnIcons();

@@ -42,7 +42,7 @@ QWidget *createPage(const GalleryContext &, QWidget *parent)
         qt->setText(VelKeyServer::KeyStringXToQt(name));
         global->setText(sequence.isEmpty() ? QString() : VelKeyServer::checkForGlobalShortcut(sequence));
     });
-    keys->setKeySequence(QKeySequence(Qt::CTRL + Qt::ALT + Qt::Key_F2));
+    keys->setKeySequence(QKeySequence(Qt::CTRL | Qt::ALT | Qt::Key_F2));
     return page;
 }
 

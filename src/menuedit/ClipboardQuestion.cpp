@@ -6,7 +6,6 @@
 #include <QClipboard>
 #include <QCoreApplication>
 #include <QGuiApplication>
-#include <QX11Info>
 
 #include <algorithm>
 #include <vector>
@@ -23,7 +22,7 @@ constexpr int SentByAnybody = 0x7f; // what is left of the type of an event with
 
 Atom atom(const char *name)
 {
-    return XInternAtom(QX11Info::display(), name, False);
+    return XInternAtom(QtMajor::x11Display(), name, False);
 }
 
 QByteArrayList namesOf(std::vector<Atom> atoms)
@@ -31,7 +30,7 @@ QByteArrayList namesOf(std::vector<Atom> atoms)
     atoms.erase(std::remove(atoms.begin(), atoms.end(), Atom(None)), atoms.end());
     QByteArrayList result;
     std::vector<char *> names(atoms.size(), nullptr);
-    if (atoms.empty() || !XGetAtomNames(QX11Info::display(), atoms.data(), int(atoms.size()), names.data()))
+    if (atoms.empty() || !XGetAtomNames(QtMajor::x11Display(), atoms.data(), int(atoms.size()), names.data()))
         return result;
     for (char *name : names) {
         result.append(name);
@@ -55,8 +54,8 @@ ClipboardQuestion::~ClipboardQuestion()
 
 bool ClipboardQuestion::isNeeded()
 {
-    return QX11Info::isPlatformX11() && !QGuiApplication::clipboard()->ownsClipboard()
-        && XGetSelectionOwner(QX11Info::display(), atom("CLIPBOARD")) != None;
+    return QtMajor::x11Display() && !QGuiApplication::clipboard()->ownsClipboard()
+        && XGetSelectionOwner(QtMajor::x11Display(), atom("CLIPBOARD")) != None;
 }
 
 void ClipboardQuestion::askForTypes()
@@ -76,7 +75,7 @@ void ClipboardQuestion::askForData(const QByteArray &type)
 void ClipboardQuestion::ask(const char *type)
 {
     takeBack();
-    Display *const display = QX11Info::display();
+    Display *const display = QtMajor::x11Display();
     m_window = XCreateSimpleWindow(display, DefaultRootWindow(display), -1, -1, 1, 1, 0, 0, 0);
     XConvertSelection(display, atom("CLIPBOARD"), atom(type), atom("_VEL_CLIPBOARD"), m_window, CurrentTime);
     XFlush(display);
@@ -85,9 +84,9 @@ void ClipboardQuestion::ask(const char *type)
 void ClipboardQuestion::takeBack()
 {
     // Without an application there is no display any more.
-    if (m_window != 0 && QX11Info::display()) {
-        XDestroyWindow(QX11Info::display(), m_window);
-        XFlush(QX11Info::display());
+    if (m_window != 0 && QtMajor::x11Display()) {
+        XDestroyWindow(QtMajor::x11Display(), m_window);
+        XFlush(QtMajor::x11Display());
     }
     m_window = 0;
 }
@@ -100,7 +99,7 @@ QByteArrayList ClipboardQuestion::offeredTypes() const
     unsigned long left = 0;
     unsigned char *data = nullptr;
     std::vector<Atom> atoms;
-    if (XGetWindowProperty(QX11Info::display(), m_window, atom("_VEL_CLIPBOARD"), 0, MostTypes, False,
+    if (XGetWindowProperty(QtMajor::x11Display(), m_window, atom("_VEL_CLIPBOARD"), 0, MostTypes, False,
                            AnyPropertyType, &type, &format, &count, &left, &data)
             == Success
         && format == 32) {
@@ -112,7 +111,8 @@ QByteArrayList ClipboardQuestion::offeredTypes() const
     return namesOf(atoms);
 }
 
-bool ClipboardQuestion::nativeEventFilter(const QByteArray &eventType, void *message, long *result)
+bool ClipboardQuestion::nativeEventFilter(const QByteArray &eventType, void *message,
+                                          QtMajor::NativeResult *result)
 {
     Q_UNUSED(result)
     if (m_window == 0 || eventType != "xcb_generic_event_t")

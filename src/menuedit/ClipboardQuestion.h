@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <frame/QtMajor.h>
+
 #include <QAbstractNativeEventFilter>
 #include <QByteArrayList>
 #include <QObject>
@@ -39,7 +41,8 @@ Q_SIGNALS:
 private:
     void ask(const char *type);
     QByteArrayList offeredTypes() const;
-    bool nativeEventFilter(const QByteArray &eventType, void *message, long *result) override;
+    bool nativeEventFilter(const QByteArray &eventType, void *message,
+                           QtMajor::NativeResult *result) override;
 
     // The window that is to have the answer; none without a question.
     unsigned long m_window = 0;

@@ -3,6 +3,8 @@
 
 #include "DragOpening.h"
 
+#include <frame/QtMajor.h>
+
 #include <QDragMoveEvent>
 #include <QTreeView>
 
@@ -35,7 +37,7 @@ bool DragOpening::eventFilter(QObject *watched, QEvent *event)
 {
     Q_UNUSED(watched)
     if (event->type() == QEvent::DragMove)
-        rest(m_view->indexAt(static_cast<QDragMoveEvent *>(event)->pos()));
+        rest(m_view->indexAt(QtMajor::positionOf(*static_cast<QDragMoveEvent *>(event))));
     else if (event->type() == QEvent::DragLeave || event->type() == QEvent::Drop)
         rest(QModelIndex());
     return false;

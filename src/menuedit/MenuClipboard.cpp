@@ -154,9 +154,9 @@ QByteArray ItemData::bytesOf(const QString &mimeType) const
     return bytes;
 }
 
-QVariant ItemData::retrieveData(const QString &mimeType, QVariant::Type type) const
+QVariant ItemData::retrieveData(const QString &mimeType, QtMajor::MimeType type) const
 {
-    if (mimeType == copyFormat() && type == QVariant::List) {
+    if (mimeType == copyFormat() && QtMajor::isList(type)) {
         QVariantList urls;
         for (const QString &path : m_paths)
             urls.append(QUrl::fromLocalFile(path));

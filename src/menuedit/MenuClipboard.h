@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <frame/QtMajor.h>
+
 #include <QByteArrayList>
 #include <QList>
 #include <QMimeData>
@@ -47,7 +49,7 @@ public:
     bool hasFormat(const QString &mimeType) const override;
 
 protected:
-    QVariant retrieveData(const QString &mimeType, QVariant::Type type) const override;
+    QVariant retrieveData(const QString &mimeType, QtMajor::MimeType type) const override;
 
 private:
     QByteArray bytesOf(const QString &mimeType) const;

@@ -3,9 +3,9 @@
 
 #include "MenuUpdateCommand.h"
 
-#include <velcore/dirs.h>
+#include <frame/QtMajor.h>
 
-#include <QX11Info>
+#include <velcore/dirs.h>
 
 #include <velintegration/wmcommand.h>
 
@@ -15,12 +15,6 @@
 namespace {
 
 constexpr VelDir Kinds[] = {VelDir::StartMenu, VelDir::Desktop, VelDir::ToolBar};
-
-// Other platforms have a display, too: that of Wayland is no connection of Xlib's.
-Display *x11Display()
-{
-    return QX11Info::isPlatformX11() ? QX11Info::display() : nullptr;
-}
 
 } // namespace
 
@@ -49,7 +43,7 @@ QByteArray MenuUpdateCommand::forKind(int kind)
 
 bool MenuUpdateCommand::isHeard()
 {
-    Display *const display = x11Display();
+    Display *const display = QtMajor::x11Display();
     if (!display)
         return false;
     const std::string selection = VelWmCommand::selectionName(DefaultScreen(display));
@@ -58,5 +52,5 @@ bool MenuUpdateCommand::isHeard()
 
 bool MenuUpdateCommand::send(const QByteArray &command)
 {
-    return SendCommandToWM(x11Display(), command.constData());
+    return SendCommandToWM(QtMajor::x11Display(), command.constData());
 }

@@ -88,6 +88,6 @@ void OpenedMenus::keep(const QString &directory, const QStringList &folders)
                 menus.end());
     if (!folders.isEmpty())
         menus.prepend({wanted, folders});
-    menus.resize(std::min(menus.size(), MostMenus));
+    menus.resize(std::min(int(menus.size()), MostMenus));
     write(settings, menus);
 }

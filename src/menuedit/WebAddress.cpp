@@ -8,7 +8,6 @@
 #include <frame/DesktopEntryRecord.h>
 
 #include <QStringList>
-#include <QTextCodec>
 
 #include <algorithm>
 
@@ -26,8 +25,9 @@ bool isMail(const QUrl &url)
 // mark says another.
 QString decoded(const QByteArray &text)
 {
-    QString result =
-        text.contains('\0') ? QTextCodec::codecForName("UTF-16")->toUnicode(text) : QString::fromUtf8(text);
+    const auto *units = reinterpret_cast<const char16_t *>(text.constData());
+    QString result = text.contains('\0') ? QString::fromUtf16(units, text.size() / int(sizeof *units))
+                                         : QString::fromUtf8(text);
     return result.remove(QChar(QChar::Null));
 }
 

@@ -5,8 +5,9 @@
 
 #include "LineBreaks.h"
 
+#include <frame/QtMajor.h>
+
 #include <QFileDevice>
-#include <QTextCodec>
 
 #include <algorithm>
 #include <cstdio>
@@ -165,14 +166,6 @@ bool isAscii(const char *bytes, int size)
     return !(all & Q_UINT64_C(0x8080808080808080));
 }
 
-// Whether the encoding of the locale is UTF-8: ASCII bytes stand for themselves there, whatever
-// comes before, and texts can be converted together.
-bool isUtf8()
-{
-    constexpr int Utf8 = 106; // IANA's number
-    return QTextCodec::codecForLocale()->mibEnum() == Utf8;
-}
-
 // Reads one line, without its end. Its text ends at the first NUL byte.
 void readBytes(const char *begin, const char *end, bool asciiAsIs, MapFiller &map)
 {
@@ -237,7 +230,8 @@ bool read(QIODevice &device, QSettings::SettingsMap &map)
         return false;
 
     MapFiller filler(map);
-    const bool asciiAsIs = isUtf8();
+    // In UTF-8, ASCII bytes stand for themselves, whatever comes before.
+    const bool asciiAsIs = QtMajor::isLocaleUtf8();
     const char *line = bytes.constData();
     const char *const end = line + bytes.size();
     while (line != end) {
@@ -261,7 +255,7 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
         return false;
     }
     // Some encodings begin or end every text with marks: there each line is converted by itself.
-    const bool allAtOnce = isUtf8();
+    const bool allAtOnce = QtMajor::isLocaleUtf8();
     QByteArray bytes;
     QString lines;
     const auto section = map.constFind(sectionKey());

@@ -6,9 +6,10 @@
 #include "EmptiedSettings.h"
 #include "SettingsFile.h"
 
+#include <frame/QtMajor.h>
+
 #include <QFileInfo>
 #include <QSettings>
-#include <QTextCodec>
 
 #include <cstdio>
 
@@ -34,7 +35,7 @@ void registerFormat()
 std::unique_ptr<QSettings> openSettings(const QString &path)
 {
     auto settings = std::make_unique<QSettings>(path, themeRcFormat);
-    settings->setIniCodec(QTextCodec::codecForLocale());
+    QtMajor::setLocaleEncoding(*settings);
     return settings;
 }
 

@@ -3,6 +3,8 @@
 
 #include "ClashLine.h"
 
+#include <frame/QtMajor.h>
+
 #include <QAccessibleWidget>
 #include <QHBoxLayout>
 #include <QLabel>
@@ -51,8 +53,8 @@ ClashLine::ClashLine(Content content, QWidget *parent)
     const int size = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
     const QStyle::StandardPixmap which =
         m_content.isSerious ? QStyle::SP_MessageBoxWarning : QStyle::SP_MessageBoxInformation;
-    icon->setPixmap(
-        style()->standardIcon(which, nullptr, this).pixmap(window()->windowHandle(), {size, size}));
+    const QIcon standardIcon = style()->standardIcon(which, nullptr, this);
+    icon->setPixmap(QtMajor::pixmapFor(*this, standardIcon, {size, size}));
     layout->addWidget(icon);
 
     auto *label = new QLabel(m_content.text, this);

@@ -7,6 +7,8 @@
 #include "KeySymbols.h"
 #include "QuotedText.h"
 
+#include <frame/QtMajor.h>
+
 #include <cstring>
 
 namespace {
@@ -62,10 +64,11 @@ KeyMatcher::KeyMatcher(const QKeySequence &wanted)
 {
     if (wanted.count() != 1)
         return;
-    m_wantedKey = wanted[0] & ~int(Qt::KeyboardModifierMask);
+    m_wantedKey = QtMajor::chord(wanted, 0) & ~int(Qt::KeyboardModifierMask);
     for (unsigned int mask = 0; mask <= KeyNames::AllModifiers; ++mask) {
         if ((mask & ~KeyNames::AllModifiers) == 0)
-            m_wantedMasks[mask] = KeySymbols::modifiersOf(mask) == (wanted[0] & ModifiersButKeypad);
+            m_wantedMasks[mask] =
+                KeySymbols::modifiersOf(mask) == (QtMajor::chord(wanted, 0) & ModifiersButKeypad);
     }
 }
 
@@ -86,7 +89,7 @@ std::optional<bool> KeyMatcher::decideByParts(const Parts &parts) const
     // Without a comma it is one key at most.
     if (m_wanted.count() != 1 || !m_wantedMasks[parts.mask])
         return false;
-    const bool isOnKeypad = m_wanted[0] & int(Qt::KeypadModifier);
+    const bool isOnKeypad = QtMajor::chord(m_wanted, 0) & int(Qt::KeypadModifier);
     if (parts.keyLength == 1 && isLetterOrDigit(*parts.key))
         return !isOnKeypad && m_wantedKey == (*parts.key >= 'a' ? *parts.key - 'a' + 'A' : *parts.key);
     if (*parts.key == 'F' && (parts.keyLength == 2 || parts.keyLength == 3) && parts.key[1] >= '1'
@@ -107,7 +110,7 @@ std::optional<bool> KeyMatcher::decideByCode(const Parts &parts) const
     const std::optional<int> code = KeyNames::codeFromKeyString(QByteArray(parts.key, int(parts.keyLength)));
     if (!code || !KeyNames::roundTrips(*code))
         return std::nullopt;
-    return m_wanted[0] == (*code | KeySymbols::modifiersOf(parts.mask));
+    return QtMajor::chord(m_wanted, 0) == (*code | KeySymbols::modifiersOf(parts.mask));
 }
 
 bool KeyMatcher::matchesText(std::string_view fileKey) const

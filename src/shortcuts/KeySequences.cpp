@@ -5,6 +5,8 @@
 
 #include "KeyNames.h"
 
+#include <frame/QtMajor.h>
+
 namespace {
 
 // Almost every key is one of these, and parsing takes its time. Other names may stand for another
@@ -21,7 +23,7 @@ bool hasOneName(int code)
 bool KeySequences::isKnown(const QKeySequence &sequence)
 {
     for (int i = 0; i < sequence.count(); ++i) {
-        if ((sequence[uint(i)] & ~int(Qt::KeyboardModifierMask)) == Qt::Key_unknown)
+        if ((QtMajor::chord(sequence, i) & ~int(Qt::KeyboardModifierMask)) == Qt::Key_unknown)
             return false;
     }
     return true;
@@ -40,7 +42,7 @@ QKeySequence KeySequences::fromSavedText(const QString &text)
 
 bool KeySequences::survivesSaving(const QKeySequence &sequence)
 {
-    if (sequence.isEmpty() || (sequence.count() == 1 && hasOneName(sequence[0])))
+    if (sequence.isEmpty() || (sequence.count() == 1 && hasOneName(QtMajor::chord(sequence, 0))))
         return true;
     const QString text = sequence.toString(QKeySequence::PortableText);
     return fromText(text, QKeySequence::PortableText) == sequence && fromSavedText(text) == sequence;

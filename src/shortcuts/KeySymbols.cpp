@@ -3,8 +3,9 @@
 
 #include "KeySymbols.h"
 
+#include <frame/QtMajor.h>
+
 #include <QHash>
-#include <QX11Info>
 
 #include <KKeyServer>
 
@@ -32,10 +33,40 @@ constexpr unsigned int LastOfKeypad = 0xffbf;
 
 using Keys = QHash<unsigned int, int>; // by symbol
 
+#if QT_VERSION_MAJOR >= 6
+bool symbolOfKey(int code, int *symbol)
+{
+    const QList<int> symbols = KKeyServer::keyQtToSymXs(code);
+    if (!symbols.isEmpty())
+        *symbol = symbols.first();
+    return !symbols.isEmpty();
+}
+
+bool keyOfSymbol(unsigned int symbol, int *key)
+{
+    return KKeyServer::symXModXToKeyQt(symbol, 0, key);
+}
+#else
+bool symbolOfKey(int code, int *symbol)
+{
+    return KKeyServer::keyQtToSymX(code, symbol);
+}
+
+// Deprecated because other layouts need the modifiers too; a key string is independent of the layout,
+// it names the key symbol.
+bool keyOfSymbol(unsigned int symbol, int *key)
+{
+    QT_WARNING_PUSH
+    QT_WARNING_DISABLE_DEPRECATED
+    return KKeyServer::symXToKeyQt(symbol, key);
+    QT_WARNING_POP
+}
+#endif
+
 void addKey(int code, Keys *keys)
 {
     int symbol = 0;
-    if (KKeyServer::keyQtToSymX(code, &symbol) && unsigned(symbol) >= FirstOfFunctionKeys
+    if (symbolOfKey(code, &symbol) && unsigned(symbol) >= FirstOfFunctionKeys
         && !keys->contains(unsigned(symbol)))
         keys->insert(unsigned(symbol), code);
 }
@@ -44,8 +75,7 @@ void addKeyOfKeypad(int key, Keys *keys)
 {
     int symbol = 0;
     const int code = key | int(Qt::KeypadModifier);
-    if (KKeyServer::keyQtToSymX(code, &symbol) && unsigned(symbol) >= FirstOfKeypad
-        && unsigned(symbol) <= LastOfKeypad)
+    if (symbolOfKey(code, &symbol) && unsigned(symbol) >= FirstOfKeypad && unsigned(symbol) <= LastOfKeypad)
         keys->insert(unsigned(symbol), code);
 }
 
@@ -77,7 +107,7 @@ std::optional<int> usualKeyOf(unsigned int symbol)
 
 bool maskOf(int code, unsigned int *mask)
 {
-    if (QX11Info::isPlatformX11())
+    if (QtMajor::x11Display())
         return KKeyServer::keyQtToModX(code, mask);
     for (const Modifier &each : UsualModifiers) {
         if (code & each.modifier)
@@ -91,28 +121,22 @@ bool maskOf(int code, unsigned int *mask)
 std::optional<KeySymbols::Symbol> KeySymbols::ofKey(int code)
 {
     Symbol symbol;
-    const bool isKnown = KKeyServer::keyQtToSymX(code, &symbol.symbol) && maskOf(code, &symbol.mask);
+    const bool isKnown = symbolOfKey(code, &symbol.symbol) && maskOf(code, &symbol.mask);
     return isKnown ? std::optional<Symbol>(symbol) : std::nullopt;
 }
 
-// KKeyServer's function is deprecated because other layouts need the modifiers too; a key string is
-// independent of the layout, it names the key symbol.
 std::optional<int> KeySymbols::keyOf(unsigned int symbol)
 {
-    if (!QX11Info::isPlatformX11())
+    if (!QtMajor::x11Display())
         return usualKeyOf(symbol);
     int key = 0;
-    QT_WARNING_PUSH
-    QT_WARNING_DISABLE_DEPRECATED
-    const bool isKnown = KKeyServer::symXToKeyQt(symbol, &key);
-    QT_WARNING_POP
-    return isKnown ? std::optional<int>(key) : std::nullopt;
+    return keyOfSymbol(symbol, &key) ? std::optional<int>(key) : std::nullopt;
 }
 
 int KeySymbols::modifiersOf(unsigned int mask)
 {
     int modifiers = 0;
-    if (QX11Info::isPlatformX11())
+    if (QtMajor::x11Display())
         KKeyServer::modXToQt(mask, &modifiers);
     else
         for (const Modifier &each : UsualModifiers)

@@ -3,63 +3,37 @@
 
 #include "KeyboardLayout.h"
 
-#include <KKeyServer>
+#include "KeySymbols.h"
+
+#include <frame/QtMajor.h>
 
 #include <QChar>
-#include <QTextCodec>
-#include <QX11Info>
 
-#include <array>
 #include <memory>
 
 #include <X11/XKBlib.h>
+#include <xkbcommon/xkbcommon.h>
 
 namespace {
 
 // Where Qt's keys without a character begin.
 constexpr int FirstNamedKey = 0x01000000;
-// Key symbols of any character of Unicode.
-constexpr KeySym FirstUnicodeSymbol = 0x01000100;
-constexpr KeySym LastUnicodeSymbol = 0x0110ffff;
+
+// The character that a symbol stands for; 0 for none, as keys of the keypad have.
+uint characterOf(KeySym symbol)
+{
+    constexpr KeySym FirstFunction = 0xfd00;
+    constexpr KeySym LastFunction = 0xffff;
+    if (symbol >= FirstFunction && symbol <= LastFunction)
+        return 0;
+    return xkb_keysym_to_utf32(xkb_keysym_t(symbol));
+}
 
 struct MapDeleter
 {
     void operator()(XkbDescPtr map) const { XkbFreeKeyboard(map, XkbAllComponentsMask, True); }
 };
 using Map = std::unique_ptr<XkbDescRec, MapDeleter>;
-
-// The older symbols of a script have a block each, and below it the byte of an older encoding.
-const char *encodingOf(unsigned int block)
-{
-    static constexpr std::array<const char *, 14> encodings = {
-        nullptr,      "ISO-8859-2", "ISO-8859-3", "ISO-8859-4", nullptr, "ISO-8859-6", "KOI8-U",
-        "ISO-8859-7", nullptr,      nullptr,      nullptr,      nullptr, "ISO-8859-8", "TIS-620"};
-    constexpr unsigned int Latin9 = 0x13;
-    if (block == Latin9)
-        return "ISO-8859-15";
-    return block < encodings.size() ? encodings.at(block) : nullptr;
-}
-
-// The character that a key symbol stands for; 0 for none.
-uint characterOf(KeySym symbol)
-{
-    constexpr unsigned int Kana = 4;
-    constexpr unsigned int Currency = 0x20;
-    constexpr uint KanaOffset = 0xff61 - 0xa1;
-    if (symbol >= FirstUnicodeSymbol && symbol <= LastUnicodeSymbol)
-        return uint(symbol - 0x01000000);
-    if (symbol > 0xffff)
-        return 0;
-    const auto byte = char(symbol & 0xff);
-    const auto block = unsigned(symbol >> 8);
-    if (block == 0 || block == Currency)
-        return uint(symbol);
-    if (block == Kana)
-        return uint(symbol & 0xff) + KanaOffset;
-    const char *encoding = encodingOf(block);
-    const QTextCodec *codec = encoding ? QTextCodec::codecForName(encoding) : nullptr;
-    return codec ? codec->toUnicode(&byte, 1).at(0).unicode() : 0;
-}
 
 // A key of the X server has a few groups, which users know as layouts.
 class Layout
@@ -117,8 +91,9 @@ bool producesCharacter(const Layout &layout, uint character)
 
 bool producesNamedKey(const Layout &layout, int chord)
 {
-    int wanted = 0;
-    if (!KKeyServer::keyQtToSymX(chord, &wanted) || wanted == 0)
+    const std::optional<KeySymbols::Symbol> key = KeySymbols::ofKey(chord);
+    const int wanted = key ? key->symbol : 0;
+    if (wanted == 0)
         return true;
     return layout.has(true, [wanted](KeySym symbol) { return symbol == KeySym(wanted); });
 }
@@ -128,9 +103,10 @@ bool producesNamedKey(const Layout &layout, int chord)
 bool KeyboardLayout::produces(int chord)
 {
     const int key = chord & ~int(Qt::KeyboardModifierMask);
-    if (!QX11Info::isPlatformX11() || key == Qt::Key_unknown)
+    Display *const display = QtMajor::x11Display();
+    if (!display || key == Qt::Key_unknown)
         return true;
-    const Layout layout(QX11Info::display());
+    const Layout layout(display);
     if (!layout.isKnown())
         return true;
     const bool isOnKeypad = chord & int(Qt::KeypadModifier);

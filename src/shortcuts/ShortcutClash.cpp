@@ -14,6 +14,8 @@
 #include "VelKeyServer.h"
 #include "WindowMnemonics.h"
 
+#include <frame/QtMajor.h>
+
 #include <QCoreApplication>
 
 #include <algorithm>
@@ -141,11 +143,12 @@ Clashes withTyping(int chord)
 Clashes withLayout(const QKeySequence &key)
 {
     for (int i = 0; i < key.count(); ++i) {
-        if (KeyboardLayout::produces(key[uint(i)]))
+        if (KeyboardLayout::produces(QtMajor::chord(key, i)))
             continue;
         const QString text =
             QCoreApplication::translate("ShortcutClash", "The current keyboard layout cannot produce '%1'.");
-        return {{ShortcutClash::NotOnLayout, text.arg(shown(QKeySequence(key[uint(i)]))), QString()}};
+        return {
+            {ShortcutClash::NotOnLayout, text.arg(shown(QKeySequence(QtMajor::chord(key, i)))), QString()}};
     }
     return {};
 }
@@ -157,7 +160,8 @@ QVector<ShortcutClash> ShortcutClash::find(const ShortcutsModel &model, const QS
 {
     if (key.isEmpty() || !KeySequences::isKnown(key))
         return {};
-    const QKeySequence chord(key[0]);
+    const QKeySequence chord(QtMajor::chord(key, 0));
     return withModel(model, name, key) + (window ? withMnemonics(*window, chord) : Clashes())
-        + withStandardKeys(chord) + withGlobalKeys(key) + withTyping(key[0]) + withLayout(key);
+        + withStandardKeys(chord) + withGlobalKeys(key) + withTyping(QtMajor::chord(key, 0))
+        + withLayout(key);
 }

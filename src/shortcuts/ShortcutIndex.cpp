@@ -9,6 +9,8 @@
 #include "ShortcutRows.h"
 #include "ShortcutsModel.h"
 
+#include <frame/QtMajor.h>
+
 namespace {
 
 // Between texts that no word may span.
@@ -108,7 +110,7 @@ QString ShortcutIndex::textOf(const QKeySequence &key)
     QString portable;
     QString native;
     for (int i = 0; i < key.count(); ++i) {
-        const int chord = key[uint(i)];
+        const int chord = QtMajor::chord(key, i);
         ChordText &text = m_chords[chord];
         if (text.portable.isNull())
             text = {ShortcutFilter::folded(QKeySequence(chord).toString(QKeySequence::PortableText)),

@@ -9,6 +9,8 @@
 #include "ShownKeys.h"
 #include "TextWidth.h"
 
+#include <frame/QtMajor.h>
+
 #include <QTimer>
 
 #include <algorithm>
@@ -136,7 +138,7 @@ int ShortcutsTreeView::sizeHintForColumn(int column) const
     if (!shortcuts)
         return QTreeView::sizeHintForColumn(column);
     ensurePolished();
-    const QStyleOptionViewItem option = viewOptions();
+    const QStyleOptionViewItem option = QtMajor::itemOption(*this);
     int width = 0;
     const auto items = widestItems(*shortcuts, column);
     for (const QModelIndex &index : items) {

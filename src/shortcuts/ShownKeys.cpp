@@ -6,6 +6,8 @@
 #include "FurtherKeys.h"
 #include "ShortcutChange.h"
 
+#include <frame/QtMajor.h>
+
 namespace {
 
 int lengthOfKey(int key)
@@ -20,7 +22,7 @@ int lengthOf(const QKeySequence &keys)
 {
     int length = 0;
     for (int i = 0; i < keys.count(); ++i) {
-        const int chord = keys[uint(i)];
+        const int chord = QtMajor::chord(keys, i);
         length += lengthOfKey(chord & ~int(Qt::KeyboardModifierMask)) + 2;
         length += (chord & int(Qt::CTRL) ? 5 : 0) + (chord & int(Qt::ALT) ? 4 : 0)
             + (chord & int(Qt::SHIFT) ? 6 : 0) + (chord & int(Qt::META) ? 5 : 0);

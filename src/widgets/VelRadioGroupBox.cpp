@@ -8,6 +8,8 @@
 #include "RadioGroupBoxAccessible.h"
 #include "RadioGroupBoxPainter.h"
 
+#include <frame/QtMajor.h>
+
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
@@ -160,7 +162,7 @@ bool VelRadioGroupBox::event(QEvent *event)
 
 void VelRadioGroupBox::mousePressEvent(QMouseEvent *event)
 {
-    if (event->button() != Qt::LeftButton || !hitButtonOrLabel(wholePixels(event->localPos()))) {
+    if (event->button() != Qt::LeftButton || !hitButtonOrLabel(wholePixels(QtMajor::positionOf(*event)))) {
         event->ignore();
         return;
     }
@@ -174,7 +176,7 @@ void VelRadioGroupBox::mouseMoveEvent(QMouseEvent *event)
         event->ignore();
         return;
     }
-    const bool hit = hitButtonOrLabel(wholePixels(event->localPos()));
+    const bool hit = hitButtonOrLabel(wholePixels(QtMajor::positionOf(*event)));
     if (hit != d->pressed) {
         d->pressed = hit;
         repaint();
@@ -191,7 +193,7 @@ void VelRadioGroupBox::mouseReleaseEvent(QMouseEvent *event)
         return;
     }
     d->pressed = false;
-    if (!hitButtonOrLabel(wholePixels(event->localPos()))) {
+    if (!hitButtonOrLabel(wholePixels(QtMajor::positionOf(*event)))) {
         event->ignore();
         return;
     }

@@ -176,7 +176,7 @@ QVector<Complaints> Validator::check(const QVector<Sample> &samples, const QStri
     QVector<Complaints> all(samples.size());
     for (int first = 0; first < samples.size(); first += FilesAtOnce) {
         QStringList places;
-        for (int i = first; i < qMin(first + FilesAtOnce, samples.size()); ++i) {
+        for (int i = first; i < qMin(first + FilesAtOnce, int(samples.size())); ++i) {
             places.append(placeOf(i, samples.at(i)));
             QDir(folder).mkpath(places.constLast().section(QLatin1Char('/'), 0, 0));
             QFile file(folder + QLatin1Char('/') + places.constLast());

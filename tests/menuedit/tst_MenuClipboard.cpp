@@ -3,6 +3,7 @@
 
 #include "TestCase.h"
 
+#include <frame/QtMajor.h>
 #include <menuedit/MenuClipboard.h>
 
 #include <QDir>
@@ -61,10 +62,10 @@ public:
     bool hasFormat(const QString &format) const override { return m_bytes.contains(format); }
 
 protected:
-    QVariant retrieveData(const QString &format, QVariant::Type type) const override
+    QVariant retrieveData(const QString &format, QtMajor::MimeType type) const override
     {
         const QByteArray bytes = m_bytes.value(format);
-        if (type != QVariant::List)
+        if (!QtMajor::isList(type))
             return bytes;
         QVariantList urls;
         const QList<QByteArray> lines = bytes.split('\n');

@@ -160,7 +160,7 @@ QString tst_MenuFaults::kill(const QVector<MenuMirror> &states, qint64 delay)
     const int steps = int(editor.readAllStandardOutput().count("done "));
     MenuMirror found = MenuMirror::ofDisk(menu());
     const QString fault =
-        faultBetween(states.at(steps), states.at(std::min(steps + 1, states.size() - 1)), found);
+        faultBetween(states.at(steps), states.at(std::min(steps + 1, int(states.size()) - 1)), found);
     return fault.isEmpty() ? fault : QStringLiteral("after %1 steps, %2").arg(steps).arg(fault);
 }
 

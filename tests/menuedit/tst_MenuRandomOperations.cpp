@@ -174,7 +174,7 @@ void tst_MenuRandomOperations::moveByOne()
     const QString name = MenuMirror::nameOf(path);
     QStringList rows = m_rows.value(folder);
     const int row = rows.indexOf(name);
-    const int to = isUp ? std::max(row - 1, 0) : std::min(row + 1, rows.size() - 1);
+    const int to = isUp ? std::max(row - 1, 0) : std::min(row + 1, int(rows.size()) - 1);
     if (isUp)
         m_view->slotUp();
     else

@@ -185,7 +185,7 @@ void tst_ThemeFiles::takesTheFilesThatQtTakesFromInstalledThemes()
     }
     names.removeDuplicates();
     names.sort();
-    const int step = qMax(1, names.size() / 40);
+    const int step = qMax(1, int(names.size()) / 40);
     for (int i = 0; i < names.size(); i += step) {
         for (const QString &name : {names.at(i), names.at(i) + QStringLiteral("-more")}) {
             const QIcon icon = QIcon::fromTheme(name);

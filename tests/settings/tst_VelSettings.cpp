@@ -126,9 +126,9 @@ void tst_VelSettings::readsTypedValues()
     QVERIFY(settings.isParsed());
     QCOMPARE(settings.value(s("SectionName")), QVariant(s("Main")));
     QCOMPARE(settings.value(s("flag")), QVariant(true));
-    QCOMPARE(int(settings.value(s("flag")).type()), int(QVariant::Bool));
+    QCOMPARE(settings.value(s("flag")).userType(), int(QMetaType::Bool));
     QCOMPARE(settings.value(s("size")), QVariant(7));
-    QCOMPARE(int(settings.value(s("size")).type()), int(QVariant::Int));
+    QCOMPARE(settings.value(s("size")).userType(), int(QMetaType::Int));
     QCOMPARE(settings.value(s("path")), QVariant(s("one = two")));
     QCOMPARE(settings.value(s("quoted")), QVariant(s("a b")));
     QCOMPARE(settings.value(s("Flag")), QVariant()); // keys are case-sensitive

@@ -3,9 +3,8 @@
 
 #include "TestCase.h"
 
+#include <frame/QtMajor.h>
 #include <shortcuts/KeyboardLayout.h>
-
-#include <QX11Info>
 
 // Without X11; tst_ShortcutClash sets layouts of the X server.
 class tst_KeyboardLayout : public TestCase
@@ -18,7 +17,7 @@ private Q_SLOTS:
 
 void tst_KeyboardLayout::letsEveryKeyPassWithoutX11()
 {
-    QVERIFY(!QX11Info::isPlatformX11());
+    QVERIFY(!QtMajor::x11Display());
     for (const int chord :
          {int(Qt::CTRL | Qt::Key_J), int(Qt::CTRL) | 0x416, int(Qt::Key_F35), int(Qt::Key_unknown)})
         QVERIFY(KeyboardLayout::produces(chord));

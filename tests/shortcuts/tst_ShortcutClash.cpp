@@ -15,8 +15,8 @@
 #include <QPushButton>
 #include <QTabBar>
 #include <VelRadioGroupBox.h>
+#include <frame/QtMajor.h>
 
-#include <QX11Info>
 #include <X11/XKBlib.h>
 
 class tst_ShortcutClash : public ShortcutsModelTestCase
@@ -387,10 +387,10 @@ void tst_ShortcutClash::findsLatinLettersInAnyLayoutOfTheUser()
     setLayout(str("ru,us"));
     QVERIFY(find("Ctrl+J").isEmpty());
     QVERIFY(find("Ctrl+Ж").isEmpty());
-    XkbLockGroup(QX11Info::display(), XkbUseCoreKbd, 1);
+    XkbLockGroup(QtMajor::x11Display(), XkbUseCoreKbd, 1);
     QVERIFY(find("Ctrl+J").isEmpty());
     QCOMPARE(texts(find("Ctrl+Ж"), ShortcutClash::NotOnLayout).size(), 1);
-    XkbLockGroup(QX11Info::display(), XkbUseCoreKbd, 0);
+    XkbLockGroup(QtMajor::x11Display(), XkbUseCoreKbd, 0);
 }
 
 void tst_ShortcutClash::ordersClashesByKind()

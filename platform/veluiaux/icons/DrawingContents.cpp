@@ -15,7 +15,7 @@
 namespace {
 
 // Without regard to namespaces, as the reader of drawings has it.
-bool isNamed(const QStringRef &qualifiedName, QLatin1String name)
+bool isNamed(QStringView qualifiedName, QLatin1String name)
 {
     return qualifiedName == name
         || (qualifiedName.endsWith(name) && qualifiedName.chopped(name.size()).endsWith(QLatin1Char(':')));
@@ -54,8 +54,7 @@ bool isSafeElement(const QXmlStreamReader &xml, PictureLimits::Sum *sum)
         return true;
     for (const QXmlStreamAttribute &attribute : xml.attributes()) {
         const QString name = attribute.qualifiedName().toString();
-        if (isNamed(QStringRef(&name), QLatin1String("href"))
-            && !isSafeReference(attribute.value().toString(), sum))
+        if (isNamed(name, QLatin1String("href")) && !isSafeReference(attribute.value().toString(), sum))
             return false;
     }
     return true;

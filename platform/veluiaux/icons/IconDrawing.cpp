@@ -4,6 +4,7 @@
 #include "IconDrawing.h"
 
 #include "EmblemLayout.h"
+#include "QtMajor.h"
 
 #include <QBuffer>
 #include <QGuiApplication>
@@ -16,7 +17,7 @@ namespace {
 /// The pixel ratio at which QIcon::pixmap() makes its pixmaps.
 qreal ratioOfQt()
 {
-    return QCoreApplication::testAttribute(Qt::AA_UseHighDpiPixmaps) ? qGuiApp->devicePixelRatio() : 1.0;
+    return QtMajor::hasHighDpiPixmaps() ? qGuiApp->devicePixelRatio() : 1.0;
 }
 
 QPixmap fitted(const QPixmap &pixmap, const QSize &pixels, IconDrawing::Fit fit)

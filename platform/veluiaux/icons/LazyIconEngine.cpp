@@ -161,12 +161,12 @@ bool LazyIconEngine::isEmpty() const
     return empty;
 }
 
-QList<QSize> LazyIconEngine::availableSizes(QIcon::Mode mode, QIcon::State state) const
+QList<QSize> LazyIconEngine::availableSizes(QIcon::Mode mode, QIcon::State state) VEL_ICON_ENGINE_CONST
 {
     return base().availableSizes(mode, state);
 }
 
-QString LazyIconEngine::iconName() const
+QString LazyIconEngine::iconName() VEL_ICON_ENGINE_CONST
 {
     return base().name();
 }

@@ -5,6 +5,7 @@
 
 #include "IconDrawing.h"
 #include "IconLookup.h"
+#include "QtMajor.h"
 
 #include <QIcon>
 #include <QIconEngine>
@@ -30,8 +31,8 @@ public:
     QPixmap pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state) override;
     QString key() const override;
     QIconEngine *clone() const override;
-    QList<QSize> availableSizes(QIcon::Mode mode, QIcon::State state) const override;
-    QString iconName() const override;
+    QList<QSize> availableSizes(QIcon::Mode mode, QIcon::State state) VEL_ICON_ENGINE_CONST override;
+    QString iconName() VEL_ICON_ENGINE_CONST override;
     void virtual_hook(int id, void *data) override;
 
 protected:

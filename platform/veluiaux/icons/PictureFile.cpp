@@ -87,7 +87,7 @@ QString variant(const QString &path, int ratio)
     int place = path.lastIndexOf(QLatin1Char('.'));
     if (place < 0)
         place = path.size();
-    else if (path.leftRef(place).endsWith(QLatin1String(".9")))
+    else if (QStringView(path).left(place).endsWith(QLatin1String(".9")))
         place -= 2;
     return QString(path).insert(place, QStringLiteral("@%1x").arg(ratio));
 }

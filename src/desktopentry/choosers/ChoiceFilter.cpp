@@ -46,7 +46,7 @@ int ChoiceFilter::rank(int row) const
     const QString &text = m_model->searched(row);
     if (m_beginning.isEmpty() || !text.startsWith(m_beginning))
         return 2;
-    return text.midRef(m_beginning.size(), 1) == QLatin1String("\n") ? 0 : 1;
+    return QStringView(text).mid(m_beginning.size(), 1) == QLatin1String("\n") ? 0 : 1;
 }
 
 // A box that is checked now moves nothing under the user's hands.
