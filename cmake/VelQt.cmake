@@ -7,6 +7,7 @@
 #   VEL_QT_MAJOR   5 or 6
 #   VEL_QT         Qt5 or Qt6, the prefix of Qt's own targets: ${VEL_QT}::Widgets
 #   VEL_QT_SUFFIX  what ends the names of libraries that use Qt: nothing, or -qt6
+#   VEL_OTHER_QT_SUFFIX  the same of the other major
 #   VEL_PACKAGE    the CMake package of the library: VelUIExtra or VelUIExtraQt6
 
 # A program that has found its Qt already decides; else 5 where both are there.
@@ -30,10 +31,12 @@ set_property(CACHE VEL_QT_MAJOR PROPERTY STRINGS 5 6)
 if(VEL_QT_MAJOR STREQUAL "5")
     set(VEL_QT_VERSION 5.15)
     set(VEL_QT_SUFFIX "")
+    set(VEL_OTHER_QT_SUFFIX "-qt6")
     set(VEL_PACKAGE VelUIExtra)
 elseif(VEL_QT_MAJOR STREQUAL "6")
     set(VEL_QT_VERSION 6.4)
     set(VEL_QT_SUFFIX "-qt6")
+    set(VEL_OTHER_QT_SUFFIX "")
     set(VEL_PACKAGE VelUIExtraQt6)
 else()
     message(FATAL_ERROR "VEL_QT_MAJOR is \"${VEL_QT_MAJOR}\", it has to be 5 or 6")
