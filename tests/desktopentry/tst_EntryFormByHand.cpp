@@ -11,6 +11,7 @@
 #include <QFile>
 #include <QLabel>
 #include <QToolButton>
+#include <QTreeView>
 
 using namespace FormDriving;
 
@@ -23,6 +24,7 @@ private Q_SLOTS:
     void init();
     void cleanup();
     void makesAnEntryInThreeLanguages();
+    void makesAnEntryForAProgramWithABlankInItsPath();
     void findsALanguageWithTheKeyboard();
     void undoesInTheTextBesideTheForm();
 
@@ -36,6 +38,47 @@ private:
         QVERIFY(dialog.setDesktopEntryPath(path, true));
         dialog.show();
         dialog.activateWindow();
+        QVERIFY(QTest::qWaitForWindowActive(&dialog, Patience));
+    }
+    // The field is in view: takes what stands first in its chooser when \a keys were typed.
+    static void chooseFirst(QWidget *field, const QString &keys)
+    {
+        ModalDriver modal;
+        modal.handle([keys](QWidget *window) {
+            QVERIFY(QTest::qWaitForWindowActive(window, Patience));
+            auto *view = child<QTreeView>(window, "choiceView");
+            const int all = view->model()->rowCount();
+            XDoTool::run(QStringLiteral("key ") + keys);
+            QTRY_VERIFY_WITH_TIMEOUT(view->model()->rowCount() > 0 && view->model()->rowCount() != all,
+                                     Patience);
+            XDoTool::run(QStringLiteral("key Down space"));
+            QTRY_COMPARE_WITH_TIMEOUT(view->model()->index(0, 0).data(Qt::CheckStateRole).toInt(),
+                                      int(Qt::Checked), Patience);
+            XDoTool::click(okButton(window));
+            QTRY_VERIFY_WITH_TIMEOUT(!window->isVisible(), Patience);
+        });
+        const QString former = field->findChild<QLineEdit *>()->text();
+        XDoTool::click(field->findChild<QLineEdit *>());
+        QTRY_VERIFY_WITH_TIMEOUT(field->findChild<QLineEdit *>()->hasFocus(), Patience);
+        XDoTool::run(QStringLiteral("key alt+Down"));
+        QTRY_VERIFY_WITH_TIMEOUT(field->findChild<QLineEdit *>()->text() != former, Patience);
+        QVERIFY(modal.finished());
+    }
+    static void addLanguage(QWidget &dialog, const QString &language)
+    {
+        ModalDriver modal;
+        modal.handle([language](QWidget *window) {
+            QVERIFY(QTest::qWaitForWindowActive(window, Patience));
+            type(language);
+            QTRY_VERIFY_WITH_TIMEOUT(okButton(window)->isEnabled(), Patience);
+            QCOMPARE(child<QComboBox>(window, "newLanguageBox")->currentText(), language);
+            XDoTool::click(okButton(window));
+        });
+        // What the box offers to complete.
+        modal.handle([](QWidget *popup) { popup->hide(); });
+        XDoTool::click(child<QToolButton>(&dialog, "newLanguageButton"));
+        QTRY_COMPARE_WITH_TIMEOUT(languages(dialog)->currentData().toString(), language, Patience);
+        QVERIFY(modal.finished());
         QVERIFY(QTest::qWaitForWindowActive(&dialog, Patience));
     }
     static QComboBox *languages(const QWidget &dialog) { return child<QComboBox>(&dialog, "languageBox"); }
@@ -73,20 +116,7 @@ void tst_EntryFormByHand::makesAnEntryInThreeLanguages()
     type(QStringLiteral("Muschel"));
     QTRY_COMPARE_WITH_TIMEOUT(line(&dialog, "localNameEdit")->text(), QStringLiteral("Muschel"), Patience);
 
-    ModalDriver modal;
-    modal.handle([](QWidget *window) {
-        QVERIFY(QTest::qWaitForWindowActive(window, Patience));
-        type(QStringLiteral("ja"));
-        QTRY_VERIFY_WITH_TIMEOUT(okButton(window)->isEnabled(), Patience);
-        QCOMPARE(child<QComboBox>(window, "newLanguageBox")->currentText(), QStringLiteral("ja"));
-        XDoTool::click(okButton(window));
-    });
-    // What the box offers to complete.
-    modal.handle([](QWidget *popup) { popup->hide(); });
-    XDoTool::click(child<QToolButton>(&dialog, "newLanguageButton"));
-    QTRY_COMPARE_WITH_TIMEOUT(languages(dialog)->currentData().toString(), QStringLiteral("ja"), Patience);
-    QVERIFY(modal.finished());
-    QVERIFY(QTest::qWaitForWindowActive(&dialog, Patience));
+    addLanguage(dialog, QStringLiteral("ja"));
     XDoTool::click(line(&dialog, "otherNameEdit"));
     type(QStringLiteral("Japanese"));
     QTRY_COMPARE_WITH_TIMEOUT(line(&dialog, "otherNameEdit")->text(), QStringLiteral("Japanese"), Patience);
@@ -106,6 +136,58 @@ void tst_EntryFormByHand::makesAnEntryInThreeLanguages()
         QByteArray(
             "[Desktop "
             "Entry]\nType=Application\nName=Shell\nName[ja]=Japanese\nName[de]=Muschel\nExec=/bin/sh\n"));
+}
+
+void tst_EntryFormByHand::makesAnEntryForAProgramWithABlankInItsPath()
+{
+    const QString program = write(QStringLiteral("My Programs/paint"), "#!/bin/sh\n");
+    QFile::setPermissions(program, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    VelDesktopEntryEditDialog dialog;
+    dialog.resize(760, 960);
+    const QString file = path(QStringLiteral("new.desktop"));
+    open(dialog, file);
+    type(QStringLiteral("Paint"));
+    QTRY_COMPARE_WITH_TIMEOUT(line(&dialog, "nameEdit")->text(), QStringLiteral("Paint"), Patience);
+
+    auto *exec = child<QLineEdit>(child<QWidget>(&dialog, "execEdit"), "lineEdit");
+    XDoTool::click(exec);
+    const QStringList words = program.split(QLatin1Char(' '));
+    type(words.constFirst());
+    XDoTool::press(QStringLiteral("space"));
+    type(words.constLast());
+    QTRY_COMPARE_WITH_TIMEOUT(exec->text(), program, Patience);
+    QTRY_VERIFY_WITH_TIMEOUT(dialog.findChild<QLabel *>(QStringLiteral("check_Exec")), Patience);
+    auto *sentence = child<QLabel>(&dialog, "check_Exec");
+    QTRY_COMPARE_WITH_TIMEOUT(
+        sentence->text(), QStringLiteral("The path of the program has a blank: it has to stand in quotes."),
+        Patience);
+    auto *fix = child<QPushButton>(sentence->parentWidget(), "fixButton");
+    QTRY_VERIFY_WITH_TIMEOUT(!fix->visibleRegion().isEmpty(), Patience);
+    XDoTool::click(fix);
+    const QString quoted = QLatin1Char('"') + program + QLatin1Char('"');
+    QTRY_COMPARE_WITH_TIMEOUT(exec->text(), quoted, Patience);
+    QTRY_VERIFY_WITH_TIMEOUT(!sentence->isVisible(), Patience);
+
+    chooseFirst(child<QWidget>(&dialog, "categoriesEdit"), QStringLiteral("G r a p h i c s"));
+    chooseFirst(child<QWidget>(&dialog, "categoriesEdit"), QStringLiteral("2 D G r a p h i c s"));
+    chooseFirst(child<QWidget>(&dialog, "mimeTypeEdit"), QStringLiteral("i m a g e slash p n g"));
+
+    XDoTool::click(line(&dialog, "localNameEdit"));
+    XDoTool::press(QStringLiteral("ctrl+a"));
+    type(QStringLiteral("Malen"));
+    QTRY_COMPARE_WITH_TIMEOUT(line(&dialog, "localNameEdit")->text(), QStringLiteral("Malen"), Patience);
+    addLanguage(dialog, QStringLiteral("ja"));
+    XDoTool::click(line(&dialog, "otherNameEdit"));
+    type(QStringLiteral("Japanese"));
+    QTRY_COMPARE_WITH_TIMEOUT(line(&dialog, "otherNameEdit")->text(), QStringLiteral("Japanese"), Patience);
+    XDoTool::click(child<QToolButton>(&dialog, "tryButton"));
+    QTRY_COMPARE_WITH_TIMEOUT(child<QLabel>(&dialog, "tryLabel")->text(),
+                              QStringLiteral("The entry was started (exit status 0)."), Patience);
+    XDoTool::click(okButton(&dialog));
+    QTRY_VERIFY_WITH_TIMEOUT(!dialog.isVisible(), Patience);
+    QCOMPARE(read(file),
+             "[Desktop Entry]\nType=Application\nName=Paint\nName[ja]=Japanese\nName[de]=Malen\nExec="
+                 + quoted.toUtf8() + "\nMimeType=image/png;\nCategories=Graphics;2DGraphics;\n");
 }
 
 void tst_EntryFormByHand::findsALanguageWithTheKeyboard()
