@@ -7,10 +7,13 @@
 #include <velintegration/desktopitems.h>
 
 #include <QDir>
+#include <QScopeGuard>
 
 #include <csignal>
 #include <thread>
 
+#include <fcntl.h>
+#include <sys/file.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/xattr.h>
@@ -236,6 +239,20 @@ private Q_SLOTS:
         first.join();
         second.join();
         QCOMPARE(read(file()).count('\n'), 100);
+    }
+
+    // Nobody may keep the desktop waiting; without a limit this would not come back.
+    void savesThoughTheFolderStaysLocked()
+    {
+        QVERIFY(SaveDesktopItemPosition("a.desktop", 1, 2));
+        const int folder = open(QFile::encodeName(path(QStringLiteral("config"))).constData(),
+                                O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+        QVERIFY(folder >= 0);
+        const auto closing = qScopeGuard([folder] { close(folder); });
+        QCOMPARE(flock(folder, LOCK_EX), 0);
+        QVERIFY(SaveDesktopItemPosition("b.desktop", 3, 4));
+        QCOMPARE(position("a.desktop"), QPoint(1, 2));
+        QCOMPARE(position("b.desktop"), QPoint(3, 4));
     }
 };
 
