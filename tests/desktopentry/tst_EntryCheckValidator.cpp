@@ -272,8 +272,8 @@ QString tst_EntryCheckValidator::faultOf(const Repaired &repair, const Sample &s
 {
     const QByteArray key = repair.finding.key.toUtf8();
     QByteArray before = sample.bytes;
-    // A new line behind the last one gives that the end that it lacks.
-    if (!before.endsWith('\n') && repair.after.bytes.startsWith(before + '\n'))
+    // A new line behind the last one gives that the end that it lacks; what goes leaves a whole line before.
+    if (!before.endsWith('\n') && repair.after.bytes.endsWith('\n'))
         before.append('\n');
     for (const QByteArray &line :
          linesOnlyIn(repair.after.bytes, before) + linesOnlyIn(before, repair.after.bytes)) {

@@ -99,8 +99,10 @@ void tst_ExecRewriting::quotesWordsOfACommand_data()
                                    << "a  \"b c\" %f";
     QTest::newRow("single quotes") << "sh -c 'echo \"$x\"'"
                                    << "sh -c \"echo \\\"\\$x\\\"\"";
-    QTest::newRow("open quote") << "a \"b c" << "a \"b c\"";
-    QTest::newRow("needless quote") << "a \"b" << "a b";
+    QTest::newRow("open quote") << "a \"b c"
+                                << "a \"b c\"";
+    QTest::newRow("needless quote") << "a \"b"
+                                    << "a b";
     QTest::newRow("backslash") << "/opt/My\\ App/run %f"
                                << "\"/opt/My App/run\" %f";
     QTest::newRow("address") << "a http://x?a=b&c"
@@ -109,6 +111,10 @@ void tst_ExecRewriting::quotesWordsOfACommand_data()
                           << "/home/me/bin/a /home/me \"a~\"";
     QTest::newRow("apostrophe") << "a don't"
                                 << "a \"don't\"";
+    QTest::newRow("percent before the quote") << "a \"b 5%"
+                                              << "a \"b 5%%\"";
+    QTest::newRow("two of them") << "a \"b 5%%"
+                                 << "a \"b 5%%\"";
     QTest::newRow("unprotected in quotes") << "a \"5$\""
                                            << "a \"5\\$\"";
     QTest::newRow("unknown escape in quotes") << "a \"\\b\""

@@ -106,6 +106,14 @@ private:
     Word m_word;
 };
 
+bool endsInSinglePercent(const QString &text)
+{
+    int count = 0;
+    while (count < text.size() && text.at(text.size() - 1 - count) == QLatin1Char('%'))
+        ++count;
+    return count % 2 == 1;
+}
+
 // Walks over the field codes; calls visit(position, letter) with where a "%" stands.
 template <typename Visit>
 void forEachCode(const QString &exec, Visit visit)
@@ -165,6 +173,9 @@ QString ExecRewriting::quoted(const QString &text)
             inside += QLatin1Char('\\');
         inside += c;
     }
+    // With a single one the quote behind it would be taken for a field code.
+    if (endsInSinglePercent(text))
+        inside += QLatin1Char('%');
     return isPlain ? text : QLatin1Char('"') + inside + QLatin1Char('"');
 }
 
