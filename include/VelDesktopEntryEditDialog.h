@@ -57,7 +57,8 @@ public:
      * Switches on what goes beyond the plain dialog: what is wrong with the entry is said under its
      * rows, values are chosen from lists, every language of the entry is shown, everything is taken
      * back and done again, and the entry is tried and its file looked at before it is saved. Off, as
-     * it is at first, the dialog has nothing of that. It is passed on to the menu that "Copy from..." opens.
+     * it is at first, the dialog has nothing of that. It is passed on to the menu that "Copy from..." opens,
+     * and that menu is brought up to date with the applications that are installed before.
      *
      * @param assistance whether the dialog is to help
      */

@@ -20,9 +20,11 @@
 #include <frame/MessageBox.h>
 #include <velcore/dirs.h>
 #include <velintegration/desktopitems.h>
+#include <velintegration/startmenu.h>
 
 #include <QCoreApplication>
 #include <QDialogButtonBox>
+#include <QFile>
 #include <QFileInfo>
 #include <QMessageBox>
 #include <QPoint>
@@ -314,7 +316,10 @@ void VelDesktopEntryEditDialog::copyFrom()
 {
     if (!d->props)
         return;
-    GuardedDialog<VelMenuDialog> picker(standardDirectory(VelDir::StartMenu), -1, false, false, this);
+    const QString menu = standardDirectory(VelDir::StartMenu);
+    if (assistance())
+        UpdateStartMenu(QFile::encodeName(menu).constData(), nullptr); // a new home has none yet
+    GuardedDialog<VelMenuDialog> picker(menu, -1, false, false, this);
     picker->setAssistance(assistance());
     if (!picker.run())
         return;

@@ -12,6 +12,7 @@
 #include <velcore/dirs.h>
 
 #include <QDir>
+#include <QDirIterator>
 #include <QPointer>
 #include <QToolButton>
 
@@ -32,6 +33,8 @@ private Q_SLOTS:
     void copiesNothingWhenThePickerIsCanceled();
     void survivesItsDeletionBehindThePicker();
     void passesItsAssistanceToThePicker();
+    void offersTheApplicationsOfANewHome_data();
+    void offersTheApplicationsOfANewHome();
     void takesACopyBack();
     void copiesAllLanguages_data();
     void copiesAllLanguages();
@@ -199,6 +202,33 @@ void tst_VelDesktopEntryEditDialogCopying::passesItsAssistanceToThePicker()
         click(child<QPushButton>(&dialog, "copyButton"));
         QVERIFY(modal.finished());
     }
+}
+
+void tst_VelDesktopEntryEditDialogCopying::offersTheApplicationsOfANewHome_data()
+{
+    QTest::addColumn<bool>("hasAssistance");
+    QTest::newRow("plain") << false;
+    QTest::newRow("with assistance") << true;
+}
+
+void tst_VelDesktopEntryEditDialogCopying::offersTheApplicationsOfANewHome()
+{
+    QFETCH(bool, hasAssistance);
+    const QString menu = QString::fromStdString(GetVelDir(VelDir::StartMenu));
+    QDir(menu).removeRecursively();
+    QFile::remove(menu + QStringLiteral(".sources"));
+    write(QStringLiteral("share/applications/full.desktop"), EntrySamples::fullApplication());
+    const QByteArray dataDirs = qgetenv("XDG_DATA_DIRS");
+    qputenv("XDG_DATA_DIRS", QFile::encodeName(path(QStringLiteral("share"))));
+    VelDesktopEntryEditDialog dialog;
+    dialog.setAssistance(hasAssistance);
+    QVERIFY(dialog.setDesktopEntryPath(path(QStringLiteral("new.desktop")), true));
+    copyFrom(dialog, QString());
+    qputenv("XDG_DATA_DIRS", dataDirs);
+    QDirIterator found(menu, {QStringLiteral("full.desktop")}, QDir::Files, QDirIterator::Subdirectories);
+    QCOMPARE(found.hasNext(), hasAssistance);
+    QDir(menu).removeRecursively();
+    QFile::remove(menu + QStringLiteral(".sources"));
 }
 
 void tst_VelDesktopEntryEditDialogCopying::takesACopyBack()
