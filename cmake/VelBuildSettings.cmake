@@ -4,9 +4,21 @@
 # Options and the settings that all of our own targets share. Within another project only the
 # libraries are built, and nothing of that project's changes: what is set here ends with this folder.
 
+# Shared unless somebody says otherwise; what another project leaves open stays open there.
+if(PROJECT_IS_TOP_LEVEL)
+    option(BUILD_SHARED_LIBS "Build shared libraries; else static ones, without the tests and the plugin" ON)
+endif()
+if(DEFINED BUILD_SHARED_LIBS AND NOT BUILD_SHARED_LIBS)
+    set(VEL_LIBRARY_TYPE STATIC)
+    set(with_shared_libraries OFF)
+else()
+    set(VEL_LIBRARY_TYPE SHARED)
+    set(with_shared_libraries ${PROJECT_IS_TOP_LEVEL})
+endif()
+
 option(VEL_BUILD_APPS "Build the programs" ${PROJECT_IS_TOP_LEVEL})
-option(VEL_BUILD_DESIGNER "Build the plugin for Qt Designer" ${PROJECT_IS_TOP_LEVEL})
-option(VEL_BUILD_TESTS "Build the tests" ${PROJECT_IS_TOP_LEVEL})
+option(VEL_BUILD_DESIGNER "Build the plugin for Qt Designer" ${with_shared_libraries})
+option(VEL_BUILD_TESTS "Build the tests" ${with_shared_libraries})
 option(VEL_BUILD_BENCHMARKS "Build the benchmarks" OFF)
 option(VEL_BUILD_FUZZERS "Build the fuzz targets, with clang; the preset \"fuzz\" has the settings for that" OFF)
 option(VEL_WARNINGS_AS_ERRORS "Stop at a compiler warning" OFF)
@@ -23,6 +35,10 @@ endif()
 
 if(VEL_BUILD_TESTS AND NOT (VEL_BUILD_APPS AND VEL_BUILD_DESIGNER))
     message(FATAL_ERROR "VEL_BUILD_TESTS needs VEL_BUILD_APPS and VEL_BUILD_DESIGNER")
+endif()
+# A plugin with a library of its own would not know the widgets of the program that loads it.
+if(VEL_BUILD_DESIGNER AND VEL_LIBRARY_TYPE STREQUAL "STATIC")
+    message(FATAL_ERROR "VEL_BUILD_DESIGNER needs shared libraries, BUILD_SHARED_LIBS is off")
 endif()
 
 # Another project decides by itself about a compiler cache.

@@ -53,6 +53,11 @@ macro(vel_add_translations)
     cmake_language(CALL qt${VEL_QT_MAJOR}_add_translation ${ARGN})
 endmacro()
 
+# vel_add_resources(<variable> <file>): compiles a list of resources; <variable> names the result.
+macro(vel_add_resources)
+    cmake_language(CALL qt${VEL_QT_MAJOR}_add_resources ${ARGN})
+endmacro()
+
 vel_find_qt(Core Gui Widgets DBus)
 if(VEL_QT_MAJOR STREQUAL "5")
     vel_find_qt(X11Extras)

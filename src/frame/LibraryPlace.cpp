@@ -3,6 +3,7 @@
 
 #include "LibraryPlace.h"
 
+#include <QCoreApplication>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -10,13 +11,33 @@
 
 #include <dlfcn.h>
 
-namespace {
+#ifdef VELUIEXTRA_STATIC_DEFINE
 
-const char ofThisLibrary = 0;
+// The catalogs are in the program that the library became a part of. Outside of all namespaces, as
+// Qt asks for it.
+static void provideCatalogs()
+{
+    Q_INIT_RESOURCE(veluiextra_catalogs);
+}
+
+QString LibraryPlace::catalogs()
+{
+    provideCatalogs();
+    return QStringLiteral(":/vel/translations");
+}
+
+static QString programs()
+{
+    return QCoreApplication::applicationDirPath();
+}
+
+#else
+
+static const char ofThisLibrary = 0;
 
 // The path \a relative to the library's folder. Links are followed first: where /lib is a link, what
 // belongs to the library lies beside the folder that it leads to.
-QString beside(const char *relative)
+static QString beside(const char *relative)
 {
     Dl_info info;
     if (!dladdr(&ofThisLibrary, &info) || !info.dli_fname)
@@ -27,18 +48,23 @@ QString beside(const char *relative)
     return QDir::cleanPath(QFileInfo(library).path() + QLatin1Char('/') + QFile::decodeName(relative));
 }
 
-} // namespace
-
 QString LibraryPlace::catalogs()
 {
     return beside(VEL_CATALOGS_FROM_LIBRARY);
 }
 
+static QString programs()
+{
+    return beside(VEL_PROGRAMS_FROM_LIBRARY);
+}
+
+#endif
+
 QString LibraryPlace::program(const QString &name)
 {
     if (!QStandardPaths::findExecutable(name).isEmpty())
         return name;
-    const QString folder = beside(VEL_PROGRAMS_FROM_LIBRARY);
+    const QString folder = programs();
     const QString installed = folder.isEmpty() ? QString() : QStandardPaths::findExecutable(name, {folder});
     return installed.isEmpty() ? name : installed;
 }

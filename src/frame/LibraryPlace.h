@@ -7,7 +7,7 @@
 
 /**
  * What is installed with the library, found from where the library itself lies: what was installed
- * together may be moved together.
+ * together may be moved together. A static library lies in its program, and has its catalogs there.
  */
 namespace LibraryPlace {
 

@@ -49,3 +49,11 @@ void installCatalog()
 Q_COREAPP_STARTUP_FUNCTION(installCatalog)
 
 } // namespace
+
+#ifdef VELUIEXTRA_STATIC_DEFINE
+// What a host of the static library has the linker look for, so that this file comes with it.
+extern "C" {
+extern const char veluiextra_catalog;
+const char veluiextra_catalog = 0;
+}
+#endif
