@@ -3,13 +3,26 @@
 
 #include "EntryWindow.h"
 
+#include <velintegration/help.h>
+
 #include <QCloseEvent>
+#include <QDialogButtonBox>
 #include <QKeyEvent>
 #include <QMessageBox>
 
 EntryWindow::EntryWindow(const QString &file)
     : m_file(file)
 {
+    // The dialog's own help says what an entry is; the page of the program has more.
+    auto *box = findChild<QDialogButtonBox *>();
+    disconnect(box, &QDialogButtonBox::helpRequested, this, nullptr);
+    connect(box, &QDialogButtonBox::helpRequested, this, &EntryWindow::showHelp);
+}
+
+void EntryWindow::showHelp()
+{
+    if (!velHelpShow("vel-entryedit"))
+        QMetaObject::invokeMethod(this, "helpSlot");
 }
 
 void EntryWindow::keyPressEvent(QKeyEvent *event)

@@ -24,6 +24,7 @@ protected:
     void closeEvent(QCloseEvent *event) override;
 
 private:
+    void showHelp();
     bool mayEnd();
 
     const QString m_file;

@@ -7,8 +7,11 @@
 
 #include <support/WindowProgram.h>
 
+#include <velintegration/help.h>
+
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QShortcut>
 
 #include <algorithm>
 
@@ -89,6 +92,8 @@ int run(const Options &options, const QStringList &arguments)
     GalleryWindow window(pages, options.context);
     if (!options.page.isEmpty())
         window.showPage(options.page);
+    QObject::connect(new QShortcut(QKeySequence(Qt::Key_F1), &window), &QShortcut::activated, &window,
+                     [] { velHelpShow("vel-gallery"); });
     window.fitToScreen();
     window.show();
     return QApplication::exec();

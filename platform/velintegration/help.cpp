@@ -4,6 +4,7 @@
 #include <velintegration/help.h>
 
 #include <velcore/dirs.h>
+#include <velcore/language.h>
 
 #include <QDir>
 #include <QFile>
@@ -19,17 +20,21 @@ bool leadsOutside(const QString &page)
     return page.split(QLatin1Char('/')).contains(QStringLiteral(".."));
 }
 
-// The first of the help folders that has the page; empty when none has.
+// The first of the help folders that has the page, in the user's language first; empty when none has.
 QString pagePath(const QString &page)
 {
+    const QString language = QString::fromStdString(velLanguageCode());
     QStringList folders = {QFile::decodeName(velInstalledDataDir().c_str())};
     const QString data = QFile::decodeName(qgetenv("VEL_DATA_DIR"));
     if (QDir::isAbsolutePath(data))
         folders.prepend(data);
     for (const QString &folder : qAsConst(folders)) {
-        const QFileInfo file(folder + QLatin1String("/doc/") + page + QLatin1String(".html"));
-        if (file.isFile())
-            return file.absoluteFilePath();
+        for (const QString &pages :
+             {QLatin1String("/doc/") + language + QLatin1Char('/'), QStringLiteral("/doc/")}) {
+            const QFileInfo file(folder + pages + page + QLatin1String(".html"));
+            if (file.isFile())
+                return file.absoluteFilePath();
+        }
     }
     return {};
 }

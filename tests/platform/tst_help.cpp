@@ -99,6 +99,26 @@ private Q_SLOTS:
         QTRY_COMPARE(opened(), QByteArray(VEL_SOURCE_DIR "/data/doc/index.html|"));
     }
 
+    void prefersThePageInTheLanguageOfTheUser()
+    {
+        const QString english = write(QStringLiteral("data/doc/index.html"), "<p>");
+        const QString german = write(QStringLiteral("data/doc/de/index.html"), "<p>");
+        const QString alone = write(QStringLiteral("data/doc/alone.html"), "<p>");
+        const auto opensWith = [this](const char *locale, const char *page) {
+            QFile::remove(path(QStringLiteral("opened")));
+            qputenv("LC_ALL", locale);
+            const bool isShown = velHelpShow(page);
+            qunsetenv("LC_ALL");
+            return isShown;
+        };
+        QVERIFY(opensWith("de_AT.UTF-8", ""));
+        QTRY_COMPARE(opened(), QFile::encodeName(german) + '|');
+        QVERIFY(opensWith("fr_FR.UTF-8", ""));
+        QTRY_COMPARE(opened(), QFile::encodeName(english) + '|');
+        QVERIFY(opensWith("de_DE.UTF-8", "alone"));
+        QTRY_COMPARE(opened(), QFile::encodeName(alone) + '|');
+    }
+
     void opensThePageOfThatName()
     {
         write(QStringLiteral("data/doc/index.html"), "<p>");

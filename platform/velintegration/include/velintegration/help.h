@@ -10,8 +10,9 @@
 /**
  * Opens a page of the desktop's help in the user's browser.
  *
- * The page is "doc/<page>.html" below VEL_DATA_DIR, else below the installed data of the
- * desktop. A VEL_DATA_DIR that holds no absolute path counts as not set. The browser is started
+ * The page is "doc/<language>/<page>.html" in the user's language (see velLanguageCode()), else
+ * "doc/<page>.html", below VEL_DATA_DIR, else below the installed data of the desktop. A
+ * VEL_DATA_DIR that holds no absolute path counts as not set. The browser is started
  * by xdg-open and not waited for.
  *
  * @param page the page's name without suffix; empty for "index". A name that leads out of the
