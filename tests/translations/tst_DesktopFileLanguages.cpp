@@ -3,6 +3,7 @@
 
 #include "TestCase.h"
 
+#include <QImage>
 #include <QProcess>
 #include <QStandardPaths>
 #include <QXmlStreamReader>
@@ -12,6 +13,13 @@ namespace {
 QStringList languages()
 {
     return QStringLiteral("de es fr it ja pl pt_BR ru tr uk zh_CN").split(QLatin1Char(' '));
+}
+
+// The name, the summary, the one paragraph of the description, and the line under the picture.
+QStringList metadataTexts()
+{
+    return {QStringLiteral("name"), QStringLiteral("summary"), QStringLiteral("p"),
+            QStringLiteral("caption")};
 }
 
 } // namespace
@@ -26,6 +34,8 @@ private Q_SLOTS:
     void areAllInTheDesktopFile();
     void areAllInTheMetadata_data() { addPrograms(); }
     void areAllInTheMetadata();
+    void showAPictureThatIsThere_data() { addPrograms(); }
+    void showAPictureThatIsThere();
     void leaveTheDesktopFileValid_data() { addPrograms(); }
     void leaveTheDesktopFileValid();
     void leaveTheMetadataValid_data() { addPrograms(); }
@@ -75,17 +85,34 @@ void tst_DesktopFileLanguages::areAllInTheMetadata()
             continue;
         const QString language = xml.attributes().value(QLatin1String("xml:lang")).toString();
         const QString element = xml.name().toString();
-        if (element == QLatin1String("name") || element == QLatin1String("summary")) {
+        if (metadataTexts().contains(element)) {
             if (!language.isEmpty())
                 seen[element].append(language);
             QVERIFY(!xml.readElementText().isEmpty());
         }
     }
     QVERIFY2(!xml.hasError(), qPrintable(xml.errorString()));
-    for (const QString &element : {QStringLiteral("name"), QStringLiteral("summary")}) {
+    for (const QString &element : metadataTexts()) {
         seen[element].sort();
         QCOMPARE(seen[element], languages());
     }
+}
+
+void tst_DesktopFileLanguages::showAPictureThatIsThere()
+{
+    QFETCH(QString, metadata);
+    QXmlStreamReader xml(read(metadata));
+    int pictures = 0;
+    while (!xml.atEnd()) {
+        if (xml.readNext() != QXmlStreamReader::StartElement || xml.name() != QLatin1String("image"))
+            continue;
+        const QSize size(xml.attributes().value(QLatin1String("width")).toInt(),
+                         xml.attributes().value(QLatin1String("height")).toInt());
+        const QString name = xml.readElementText().section(QLatin1Char('/'), -1);
+        QCOMPARE(QImage(QStringLiteral(VEL_SOURCE_DIR "/docs/pictures/") + name).size(), size);
+        ++pictures;
+    }
+    QCOMPARE(pictures, 1);
 }
 
 void tst_DesktopFileLanguages::runValidator(const QString &program, const QStringList &arguments)
@@ -111,9 +138,9 @@ void tst_DesktopFileLanguages::leaveTheDesktopFileValid()
 void tst_DesktopFileLanguages::leaveTheMetadataValid()
 {
     QFETCH(QString, metadata);
-    runValidator(
-        QStringLiteral("appstreamcli"),
-        {QStringLiteral("validate"), QStringLiteral("--no-net"), QStringLiteral("--no-color"), metadata});
+    runValidator(QStringLiteral("appstreamcli"),
+                 {QStringLiteral("validate"), QStringLiteral("--no-net"), QStringLiteral("--no-color"),
+                  QStringLiteral("--pedantic"), metadata});
 }
 
 VEL_TEST_GUILESS_MAIN(tst_DesktopFileLanguages)
