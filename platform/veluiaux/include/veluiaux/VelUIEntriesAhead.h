@@ -19,6 +19,8 @@
  * is no thread while nothing is to be read.
  *
  * Objects of this class may live in any thread, each in one.
+ *
+ * \since 1.0
  */
 class VELUIAUX_EXPORT VelUIEntriesAhead
 {
