@@ -56,7 +56,11 @@ MenuHistory::MenuHistory(QTreeView *view, const ShownMenu &menu, MenuSelection &
     connect(&m_stack, &QUndoStack::indexChanged, this, &MenuHistory::updateActions);
 }
 
-MenuHistory::~MenuHistory() = default;
+// The stack tells of its end when the actions are gone already.
+MenuHistory::~MenuHistory()
+{
+    m_stack.disconnect(this);
+}
 
 void MenuHistory::setOn(bool on)
 {
