@@ -40,6 +40,19 @@ bool FileIdentity::operator==(const FileIdentity &other) const
         && m_modified == other.m_modified && m_changed == other.m_changed;
 }
 
+quint64 FileIdentity::mark() const
+{
+    quint64 mark = 0;
+    for (const quint64 part : {m_device, m_inode, quint64(m_size), quint64(m_modified), quint64(m_changed)}) {
+        // Every bit of the one changes half of those of the other.
+        mark += part + 0x9e3779b97f4a7c15U;
+        mark = (mark ^ (mark >> 30U)) * 0xbf58476d1ce4e5b9U;
+        mark = (mark ^ (mark >> 27U)) * 0x94d049bb133111ebU;
+        mark ^= mark >> 31U;
+    }
+    return mark;
+}
+
 bool FileIdentity::isSettled() const
 {
     timespec now = {};

@@ -18,6 +18,9 @@ public:
 
     bool operator==(const FileIdentity &other) const;
 
+    /// A number that another identity has by a chance of one in 2^64 only, where thousands are kept.
+    quint64 mark() const;
+
     bool isRegularFile() const { return m_isRegularFile; }
     /// Whether the last change is long enough ago that another would have another time.
     bool isSettled() const;

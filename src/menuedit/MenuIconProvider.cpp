@@ -31,6 +31,11 @@ public:
         if (!m_cache)
             return VelMimeTypeIconProvider::icon(info);
         const QString path = rowPathOf(info);
+        // It has no row that an icon would stand in.
+        if (EntryPath::isRecordFile(path)) {
+            m_cache->noteListed(path, QIcon());
+            return QIcon();
+        }
         const bool isEntry = EntryPath::isEntry(path) && !info.isSymLink() && info.isFile();
         const QIcon icon = isEntry ? entryIcon(path) : VelMimeTypeIconProvider::icon(info);
         m_cache->noteListed(path, icon);
@@ -40,6 +45,8 @@ public:
     // The file model asks for the icon and at once for the type.
     QString type(const QFileInfo &info) const override
     {
+        if (m_cache && EntryPath::isRecordFile(rowPathOf(info)))
+            return QStringLiteral("application/x-desktop");
         const QString regularFile = std::exchange(m_regularFile, QString());
         const QString name = !regularFile.isEmpty() && regularFile == rowPathOf(info)
             ? regularFileType(info)
@@ -72,10 +79,24 @@ private:
         const VelUIDesktopEntry entry(path);
         if (!m_cache->display(path))
             m_cache->prefetch(path, RowCache::Display::of(entry));
-        const QIcon icon = desktopEntryIcon(entry, {});
+        const QIcon icon = sharedIcon(entry);
         // A dot file has no row with which its icon would be forgotten.
         if (identity.isSettled() && !isDotFile(path))
             m_cache->setIcon(path, identity, icon);
+        return icon;
+    }
+
+    // Most rows of a folder have one of few icons.
+    QIcon sharedIcon(const VelUIDesktopEntry &entry) const
+    {
+        const QString name = entry.getIcon();
+        if (name.isEmpty())
+            return desktopEntryIcon(entry, {});
+        const std::optional<QIcon> known = m_cache->sharedIcon(name);
+        if (known)
+            return *known;
+        const QIcon icon = desktopEntryIcon(entry, {});
+        m_cache->shareIcon(name, icon);
         return icon;
     }
 

@@ -17,23 +17,58 @@ RowCache::Display RowCache::Display::of(const VelUIDesktopEntry &entry)
 
 RowCache::RowCache()
 {
-    m_prefetchEnd.setSingleShot(true);
-    connect(&m_prefetchEnd, &QTimer::timeout, this, [this] { m_prefetched.clear(); });
+    m_turn.setSingleShot(true);
+    connect(&m_turn, &QTimer::timeout, this, [this] {
+        m_prefetched.clear();
+        m_sharedIcons.clear();
+    });
 }
 
 RowCache::~RowCache() = default;
 
+// Null where nothing of the folder is known. Rows are asked for folder by folder.
+RowCache::Folder *RowCache::folderOf(const QString &path) const
+{
+    const int end = path.lastIndexOf(QLatin1Char('/')) + 1;
+    if (m_last && m_lastFolder.size() == end && path.startsWith(m_lastFolder))
+        return m_last;
+    const QString folder = path.left(end);
+    auto &folders = const_cast<RowCache *>(this)->m_folders;
+    const auto known = folders.find(folder);
+    if (known == folders.end())
+        return nullptr;
+    m_lastFolder = folder;
+    m_last = &*known;
+    return m_last;
+}
+
+const RowCache::Row *RowCache::find(const QString &path) const
+{
+    const Folder *const folder = folderOf(path);
+    if (!folder)
+        return nullptr;
+    const auto row = folder->constFind(path);
+    return row != folder->constEnd() ? &*row : nullptr;
+}
+
+RowCache::Row &RowCache::make(const QString &path)
+{
+    if (!folderOf(path))
+        m_folders.insert(path.left(path.lastIndexOf(QLatin1Char('/')) + 1), Folder());
+    return (*folderOf(path))[path];
+}
+
 std::optional<RowCache::Display> RowCache::display(const QString &path) const
 {
-    const auto row = m_rows.constFind(path);
-    if (row == m_rows.constEnd() || !row->isNamed)
+    const Row *const row = find(path);
+    if (!row || !row->isNamed)
         return std::nullopt;
     return Display{row->name, row->isHidden, row->state};
 }
 
 void RowCache::setDisplay(const QString &path, const Display &display)
 {
-    Row &row = m_rows[path];
+    Row &row = make(path);
     row.name = display.name;
     row.isNamed = true;
     row.isHidden = row.isHidden || display.isHidden;
@@ -42,9 +77,14 @@ void RowCache::setDisplay(const QString &path, const Display &display)
 
 void RowCache::prefetch(const QString &path, const Display &display)
 {
-    if (!m_prefetchEnd.isActive())
-        m_prefetchEnd.start(0);
+    forgetAtTheNextTurn();
     m_prefetched.insert(path, display);
+}
+
+void RowCache::forgetAtTheNextTurn()
+{
+    if (!m_turn.isActive())
+        m_turn.start(0);
 }
 
 std::optional<RowCache::Display> RowCache::takePrefetched(const QString &path)
@@ -59,15 +99,30 @@ std::optional<RowCache::Display> RowCache::takePrefetched(const QString &path)
 
 std::optional<QIcon> RowCache::icon(const QString &path, const FileIdentity &identity) const
 {
-    const auto row = m_rows.constFind(path);
-    return row != m_rows.constEnd() && row->identity == identity ? row->icon : std::nullopt;
+    const Row *const row = find(path);
+    if (!row || !row->hasIcon || row->mark != identity.mark())
+        return std::nullopt;
+    return row->icon;
 }
 
 void RowCache::setIcon(const QString &path, const FileIdentity &identity, const QIcon &icon)
 {
-    Row &row = m_rows[path];
-    row.identity = identity;
+    Row &row = make(path);
+    row.mark = identity.mark();
     row.icon = icon;
+    row.hasIcon = true;
+}
+
+std::optional<QIcon> RowCache::sharedIcon(const QString &name) const
+{
+    const auto icon = m_sharedIcons.constFind(name);
+    return icon != m_sharedIcons.constEnd() ? std::optional<QIcon>(*icon) : std::nullopt;
+}
+
+void RowCache::shareIcon(const QString &name, const QIcon &icon)
+{
+    forgetAtTheNextTurn();
+    m_sharedIcons.insert(name, icon);
 }
 
 void RowCache::setEditedIcon(const QString &path, const QIcon &icon)
@@ -92,7 +147,8 @@ void RowCache::noteListed(const QString &path, const QIcon &icon)
 
 void RowCache::forget(const QString &path)
 {
-    m_rows.remove(path);
+    if (Folder *const folder = folderOf(path))
+        folder->remove(path);
     m_prefetched.remove(path);
     m_editedIcons.remove(path);
     m_plainFolders.remove(EntryPath::describedBy(path));
@@ -102,8 +158,9 @@ void RowCache::forgetTree(const QString &path)
 {
     forget(path);
     const QString below = path + QLatin1Char('/');
-    for (auto row = m_rows.lowerBound(below); row != m_rows.end() && row.key().startsWith(below);)
-        row = m_rows.erase(row);
+    m_last = nullptr;
+    for (auto it = m_folders.lowerBound(below); it != m_folders.end() && it.key().startsWith(below);)
+        it = m_folders.erase(it);
     for (auto icon = m_editedIcons.begin(); icon != m_editedIcons.end();)
         icon = icon.key().startsWith(below) ? m_editedIcons.erase(icon) : std::next(icon);
     for (auto folder = m_plainFolders.begin(); folder != m_plainFolders.end();)

@@ -58,6 +58,11 @@ public:
     std::optional<QIcon> icon(const QString &path, const FileIdentity &identity) const;
     void setIcon(const QString &path, const FileIdentity &identity, const QIcon &icon);
 
+    /// The icon that a row just got for the icon name \a name; rows that come together share it.
+    std::optional<QIcon> sharedIcon(const QString &name) const;
+    /// Keeps it no longer than until the event loop turns: it is as new as the rows are.
+    void shareIcon(const QString &name, const QIcon &icon);
+
     /// Remembers the \a icon of a row that was edited here: the file model keeps the one it has.
     void setEditedIcon(const QString &path, const QIcon &icon);
     void forgetEditedIcon(const QString &path) { m_editedIcons.remove(path); }
@@ -79,19 +84,32 @@ public:
     void forgetTree(const QString &path);
 
 private:
+    void forgetAtTheNextTurn();
+
     struct Row
     {
         QString name;
+        QIcon icon;
+        quint64 mark = 0; // of the entry that the icon was made of
+        EntryState::Kind state = EntryState::Kind::Shown;
         bool isNamed = false;
         bool isHidden = false;
-        EntryState::Kind state = EntryState::Kind::Shown;
-        FileIdentity identity; // of the entry that the icon was made of
-        std::optional<QIcon> icon;
+        bool hasIcon = false;
     };
 
-    QMap<QString, Row> m_rows;
+    using Folder = QHash<QString, Row>; // by the paths of the rows
+
+    Folder *folderOf(const QString &path) const;
+    const Row *find(const QString &path) const;
+    Row &make(const QString &path);
+
+    // By the paths of the folders: a folder that goes takes with it what stands below.
+    QMap<QString, Folder> m_folders;
+    mutable QString m_lastFolder; // of the path that was asked for last, with its "/"
+    mutable Folder *m_last = nullptr;
     QHash<QString, Display> m_prefetched;
+    QHash<QString, QIcon> m_sharedIcons; // by the names of the icons
     QHash<QString, QIcon> m_editedIcons;
     QSet<QString> m_plainFolders;
-    QTimer m_prefetchEnd;
+    QTimer m_turn;
 };

@@ -27,6 +27,9 @@ void tst_FileIdentity::isThatOfTheSameFileOnly()
     QVERIFY(FileIdentity(file) == FileIdentity(file));
     QVERIFY(!(FileIdentity(file) == FileIdentity(other)));
     QVERIFY(!(FileIdentity(file) == FileIdentity()));
+    QVERIFY(FileIdentity(file).mark() == FileIdentity(file).mark());
+    QVERIFY(FileIdentity(file).mark() != FileIdentity(other).mark());
+    QVERIFY(FileIdentity(file).mark() != FileIdentity().mark());
     QVERIFY(FileIdentity(path(QStringLiteral("missing"))) == FileIdentity());
 }
 
@@ -38,6 +41,7 @@ void tst_FileIdentity::seesAChange()
     write(QStringLiteral("a"), "bb");
 
     QVERIFY(!(FileIdentity(file) == before));
+    QVERIFY(FileIdentity(file).mark() != before.mark());
 }
 
 void tst_FileIdentity::seesThatAFileWasReplaced()
@@ -51,6 +55,7 @@ void tst_FileIdentity::seesThatAFileWasReplaced()
     QVERIFY(other.commit());
 
     QVERIFY(!(FileIdentity(file) == before));
+    QVERIFY(FileIdentity(file).mark() != before.mark());
 }
 
 void tst_FileIdentity::tellsRegularFiles()

@@ -17,6 +17,7 @@ private Q_SLOTS:
     void dropsWhatWasPrefetchedWhenTheEventLoopTurns();
     void givesWhatWasPrefetchedOnce();
     void givesAnIconOnlyOfTheSameFile();
+    void sharesAnIconUntilTheEventLoopTurns();
     void takesTheListedIconOfAnEditedRow();
     void learnsThatAFolderHasARecordFile();
     void forgetsOneRow();
@@ -111,6 +112,17 @@ void tst_RowCache::givesAnIconOnlyOfTheSameFile()
     write(QStringLiteral("a.desktop"), "another");
     QVERIFY(!cache.icon(file, FileIdentity(file)));
     QVERIFY(cache.icon(file, before));
+}
+
+void tst_RowCache::sharesAnIconUntilTheEventLoopTurns()
+{
+    RowCache cache;
+    const QIcon shared = icon();
+    QVERIFY(!cache.sharedIcon(QStringLiteral("editor")));
+    cache.shareIcon(QStringLiteral("editor"), shared);
+    QCOMPARE(cache.sharedIcon(QStringLiteral("editor"))->cacheKey(), shared.cacheKey());
+    QVERIFY(!cache.sharedIcon(QStringLiteral("edit")));
+    QTRY_VERIFY(!cache.sharedIcon(QStringLiteral("editor")));
 }
 
 void tst_RowCache::takesTheListedIconOfAnEditedRow()
