@@ -9,6 +9,7 @@
 #include "FolderWatch.h"
 #include "MenuDrop.h"
 #include "MenuIconProvider.h"
+#include "ReadingAhead.h"
 #include "RowLook.h"
 
 #include <frame/DesktopEntryRecord.h>
@@ -48,12 +49,16 @@ VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *view, QObj
     , m_watch(new FolderWatch(this))
     , m_cache(std::make_unique<RowCache>())
     , m_icons(new MenuIconProvider(m_cache.get(), QCoreApplication::instance()))
+    , m_ahead(std::make_unique<ReadingAhead>())
 {
     setIconProvider(m_icons->provider());
     connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);
     connect(this, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuModel::beginRemoval);
     connect(this, &QAbstractItemModel::rowsRemoved, this, &VelMenuModel::endRemoval);
     connect(this, &QFileSystemModel::fileRenamed, this, [this] { m_wasRenamed = true; });
+    // It comes behind the last of the rows.
+    connect(this, &QFileSystemModel::directoryLoaded, this,
+            [this](const QString &path) { m_ahead->end(path); });
     setRootPath(rootDir);
 }
 
@@ -94,6 +99,14 @@ QVariant VelMenuModel::data(const QModelIndex &index, int role) const
 Qt::ItemFlags VelMenuModel::flags(const QModelIndex &index) const
 {
     return QFileSystemModel::flags(index) & ~Qt::ItemIsEditable;
+}
+
+// A folder that has rows is only watched again.
+void VelMenuModel::fetchMore(const QModelIndex &parent)
+{
+    if (canFetchMore(parent) && rowCount(parent) == 0)
+        m_ahead->begin(filePath(parent));
+    QFileSystemModel::fetchMore(parent);
 }
 
 // What the base class sorts with is also what takes rows away that no longer pass its filters.

@@ -16,6 +16,7 @@
 class FolderWatch;
 class MenuDropHost;
 class MenuIconProvider;
+class ReadingAhead;
 class VelMenuView;
 struct DropResult;
 
@@ -45,6 +46,7 @@ public:
     bool dropMimeData(const QMimeData *data, Qt::DropAction action, int row, int column,
                       const QModelIndex &parent) override;
     Qt::ItemFlags flags(const QModelIndex &index) const override;
+    void fetchMore(const QModelIndex &parent) override;
     void sort(int column, Qt::SortOrder order = Qt::AscendingOrder) override;
 
     /// The menu directory, clean and absolute, with a "/" at the end if it was given with one;
@@ -120,4 +122,5 @@ private:
     bool m_isOrderLost = false;
     // The base class forgets to tell the files in a renamed folder where they are now.
     bool m_wasRenamed = false;
+    std::unique_ptr<ReadingAhead> m_ahead;
 };
