@@ -55,6 +55,11 @@ VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *view, QObj
     connect(this, &QAbstractItemModel::dataChanged, this, &VelMenuModel::completeDataChanged);
     connect(this, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuModel::beginRemoval);
     connect(this, &QAbstractItemModel::rowsRemoved, this, &VelMenuModel::endRemoval);
+    for (const auto change :
+         {&QAbstractItemModel::rowsAboutToBeInserted, &QAbstractItemModel::rowsAboutToBeRemoved})
+        connect(this, change, this, &VelMenuModel::releaseRows);
+    connect(this, &QAbstractItemModel::layoutAboutToBeChanged, this, &VelMenuModel::releaseRows);
+    connect(this, &QAbstractItemModel::modelAboutToBeReset, this, &VelMenuModel::releaseRows);
     connect(this, &QFileSystemModel::fileRenamed, this, [this] { m_wasRenamed = true; });
     // It comes behind the last of the rows.
     connect(this, &QFileSystemModel::directoryLoaded, this,
@@ -72,7 +77,27 @@ VelMenuModel::~VelMenuModel()
 // an index for it, nobody would hear of changed rows.
 QModelIndex VelMenuModel::index(int row, int column, const QModelIndex &parent) const
 {
-    return QFileSystemModel::index(row, column > 0 && column < BaseColumns ? 0 : column, parent);
+    const int ownColumn = column > 0 && column < BaseColumns ? 0 : column;
+    const bool isHeld = row >= 0 && row < m_heldRows.size() && ownColumn == 0 && parent == m_heldFolder;
+    if (!isHeld)
+        return QFileSystemModel::index(row, ownColumn, parent);
+    QModelIndex &known = m_heldRows[row];
+    if (!known.isValid())
+        known = QFileSystemModel::index(row, ownColumn, parent);
+    return known;
+}
+
+// The base class finds the row of a number by its name; a sort asks for each row very often.
+void VelMenuModel::holdRows(const QModelIndex &folder)
+{
+    m_heldFolder = folder;
+    m_heldRows = QVector<QModelIndex>(rowCount(folder));
+}
+
+void VelMenuModel::releaseRows()
+{
+    m_heldFolder = QModelIndex();
+    m_heldRows.clear();
 }
 
 int VelMenuModel::columnCount(const QModelIndex &parent) const

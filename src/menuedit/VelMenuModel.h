@@ -10,6 +10,7 @@
 #include <QSet>
 #include <QString>
 #include <QStringList>
+#include <QVector>
 
 #include <memory>
 
@@ -48,6 +49,10 @@ public:
     Qt::ItemFlags flags(const QModelIndex &index) const override;
     void fetchMore(const QModelIndex &parent) override;
     void sort(int column, Qt::SortOrder order = Qt::AscendingOrder) override;
+
+    /// No row of \a folder comes, goes or moves until releaseRows(): each is looked up once then.
+    void holdRows(const QModelIndex &folder);
+    void releaseRows();
 
     /// The menu directory, clean and absolute, with a "/" at the end if it was given with one;
     /// empty if none was given.
@@ -123,4 +128,6 @@ private:
     // The base class forgets to tell the files in a renamed folder where they are now.
     bool m_wasRenamed = false;
     std::unique_ptr<ReadingAhead> m_ahead;
+    QModelIndex m_heldFolder;
+    mutable QVector<QModelIndex> m_heldRows; // those that were looked up
 };

@@ -109,6 +109,7 @@ void VelMenuProxyModel::watch(QAbstractItemModel *model)
 {
     connect(model, &QAbstractItemModel::dataChanged, this, &VelMenuProxyModel::dropRows);
     connect(model, &QAbstractItemModel::rowsAboutToBeInserted, this, &VelMenuProxyModel::beginManyRows);
+    connect(model, &QAbstractItemModel::rowsInserted, m_files, &VelMenuModel::holdRows);
     connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &VelMenuProxyModel::dropFolders);
     connect(model, &QAbstractItemModel::rowsRemoved, this, &VelMenuProxyModel::dropAll);
     connect(model, &QAbstractItemModel::modelAboutToBeReset, this, &VelMenuProxyModel::dropAll);
@@ -258,7 +259,20 @@ bool VelMenuProxyModel::isInMenu(const QString &path) const
     return path.startsWith(m_menuDirectory) || path.endsWith(QLatin1String("/autostart"));
 }
 
+// A sort asks for each row very often. That of another folder may have the place of its number.
 VelMenuProxyModel::Row &VelMenuProxyModel::rowOf(const QModelIndex &index) const
+{
+    const auto place = std::size_t(index.row());
+    if (place < m_rowsByNumber.size() && m_rowsByNumber[place].first == index.internalId())
+        return *m_rowsByNumber[place].second;
+    Row &row = findRow(index);
+    if (place >= m_rowsByNumber.size())
+        m_rowsByNumber.resize(place + place / 2 + 1);
+    m_rowsByNumber[place] = {index.internalId(), &row};
+    return row;
+}
+
+VelMenuProxyModel::Row &VelMenuProxyModel::findRow(const QModelIndex &index) const
 {
     const auto known = m_rows.find(index.internalId());
     if (known != m_rows.end())
@@ -320,6 +334,7 @@ const QString &VelMenuProxyModel::displayNameOf(Row &row, const QModelIndex &ind
 
 void VelMenuProxyModel::dropRows(const QModelIndex &topLeft, const QModelIndex &bottomRight)
 {
+    m_rowsByNumber.clear();
     for (int row = topLeft.row(); row <= bottomRight.row(); ++row)
         m_rows.erase(topLeft.sibling(row, 0).internalId());
 }
@@ -327,6 +342,7 @@ void VelMenuProxyModel::dropRows(const QModelIndex &topLeft, const QModelIndex &
 // An empty name is read from disk whenever it is asked for; within one sort it must not change.
 void VelMenuProxyModel::dropUnnamedRows()
 {
+    m_rowsByNumber.clear();
     for (auto it = m_rows.begin(); it != m_rows.end();)
         it = it->second.displayName && it->second.displayName->isEmpty() ? m_rows.erase(it) : std::next(it);
 }
@@ -346,6 +362,7 @@ void VelMenuProxyModel::dropFolders(const QModelIndex &parent, int first, int la
 
 void VelMenuProxyModel::dropAll()
 {
+    m_rowsByNumber.clear();
     m_rows.clear();
     m_folders.clear();
 }
@@ -362,8 +379,9 @@ void VelMenuProxyModel::beginManyRows(const QModelIndex &parent, int first, int 
 
 void VelMenuProxyModel::endManyRows()
 {
-    if (!m_isTakingMany)
-        return;
-    m_isTakingMany = false;
-    setDynamicSortFilter(true);
+    if (m_isTakingMany) {
+        m_isTakingMany = false;
+        setDynamicSortFilter(true);
+    }
+    m_files->releaseRows();
 }

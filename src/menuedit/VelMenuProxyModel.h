@@ -18,6 +18,8 @@
 #include <memory>
 #include <optional>
 #include <unordered_map>
+#include <utility>
+#include <vector>
 
 class VelMenuModel;
 
@@ -91,6 +93,7 @@ private:
     void readOrder(Folder &folder) const;
     bool isInMenu(const QString &path) const;
     Row &rowOf(const QModelIndex &index) const;
+    Row &findRow(const QModelIndex &index) const;
     Folder &folderOf(const QModelIndex &index) const;
     QStringList sortOrderOf(const QString &folderPath) const;
     qint64 modifiedOf(Row &row, const QModelIndex &index) const;
@@ -109,4 +112,5 @@ private:
     mutable bool m_needsFileOrder = false;
     mutable std::unordered_map<quintptr, Folder> m_folders;
     mutable std::unordered_map<quintptr, Row> m_rows;
+    mutable std::vector<std::pair<quintptr, Row *>> m_rowsByNumber; // some of them, with their ids
 };

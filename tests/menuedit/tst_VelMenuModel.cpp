@@ -24,6 +24,7 @@ private Q_SLOTS:
     void livesWithOddFiles();
     void survivesAFolderThatVanishes();
     void leavesRemovingRowsToNobody();
+    void holdsItsRowsUntilTheyChange();
 };
 
 void tst_VelMenuModel::hasOneColumnAndNamesThatAreNotEdited()
@@ -155,6 +156,37 @@ void tst_VelMenuModel::leavesRemovingRowsToNobody()
     QVERIFY(!m_model->removeRow(0, m_model->index(folder())));
 
     QCOMPARE(read(file), QByteArray("a"));
+}
+
+void tst_VelMenuModel::holdsItsRowsUntilTheyChange()
+{
+    for (const char *name : {"b", "d", "f"})
+        write(QLatin1String(name), "x");
+    write(QStringLiteral("z/y"), "x");
+    m_model = modelOf(folder(), 4);
+    const QModelIndex root = m_model->index(folder());
+    const auto names = [&] {
+        QStringList found;
+        for (int row = 0; row < m_model->rowCount(root); ++row)
+            found.append(m_model->fileName(m_model->index(row, 0, root)));
+        found.sort();
+        return found;
+    };
+    const QStringList before = names();
+    m_model->holdRows(root);
+    for (int round = 0; round < 2; ++round) {
+        QCOMPARE(names(), before);
+        QCOMPARE(m_model->index(0, 2, root), m_model->index(0, 0, root));
+        QVERIFY(!m_model->index(4, 0, root).isValid());
+        QVERIFY(!m_model->index(-1, 0, root).isValid());
+        QVERIFY(!m_model->index(0, 7, root).isValid());
+        QVERIFY(m_model->index(0, 0).isValid() && m_model->index(0, 0) != m_model->index(0, 0, root));
+    }
+    write(QStringLiteral("a"), "x");
+    QVERIFY(QFile::remove(path(QStringLiteral("d"))));
+    QTRY_COMPARE(
+        names(),
+        (QStringList{QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("f"), QStringLiteral("z")}));
 }
 
 VEL_TEST_MAIN(tst_VelMenuModel)
