@@ -1,12 +1,15 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "IconPixels.h"
 #include "IconThemeFolder.h"
 #include "TestCase.h"
 
 #include <veluiaux/VelIcon.h>
 
+#include <QDir>
 #include <QImage>
+#include <QLoggingCategory>
 #include <QPainter>
 
 /// Icons in an application on a screen of two pixels for one, with AA_UseHighDpiPixmaps.
@@ -22,6 +25,8 @@ private Q_SLOTS:
     void paintsOnADeviceOfAnotherRatio();
     void tellsTheSizesThatQtTells();
     void looksAtTheFileForTheScreen();
+    void drawsEveryPixelAsQtDoes_data();
+    void drawsEveryPixelAsQtDoes();
 
 private:
     QIcon icon() const
@@ -108,6 +113,28 @@ void tst_VelIconScaled::looksAtTheFileForTheScreen()
     };
     QCOMPARE(shown("good"), QColor(Qt::green));
     QCOMPARE(shown("large"), QColor(Qt::yellow));
+}
+
+void tst_VelIconScaled::drawsEveryPixelAsQtDoes_data()
+{
+    QTest::addColumn<QString>("theme");
+    for (const char *theme : {"breeze", "Adwaita", "hicolor", "sizes"})
+        QTest::newRow(theme) << QString::fromLatin1(theme);
+}
+
+void tst_VelIconScaled::drawsEveryPixelAsQtDoes()
+{
+    QFETCH(QString, theme);
+    const QString installed = QStringLiteral("/usr/share/icons");
+    const QString own = folder() + QLatin1Char('/') + theme;
+    const QString place = QDir(own).exists() ? own : installed + QLatin1Char('/') + theme;
+    if (!QDir(place).exists())
+        QSKIP("this theme is not installed");
+    // Not every drawing and picture is a good one.
+    QLoggingCategory::setFilterRules(QStringLiteral("qt.svg=false\ndefault.warning=false"));
+    QIcon::setThemeSearchPaths({folder(), installed});
+    QIcon::setThemeName(theme);
+    QCOMPARE(IconPixels::firstDifference(IconPixels::namesIn(place)), QString());
 }
 
 int main(int argc, char **argv)
