@@ -5,6 +5,7 @@
 // meanwhile. The answer of a search is the time that the user waits; a key and a freeze are
 // processor time, so that what else runs on the machine does not count. Needs a display.
 
+#include "FreezeMeter.h"
 #include "MenuFiles.h"
 
 #include <VelMenuView.h>
@@ -22,7 +23,6 @@
 
 #include <algorithm>
 #include <cstdio>
-#include <ctime>
 #include <functional>
 #include <map>
 #include <string>
@@ -35,47 +35,10 @@ constexpr double MostFreeze = 200;
 constexpr double MostKey = 50;
 constexpr int Rounds = 7;
 
-// Of this thread alone: what else runs on the machine does not count.
-double processorMilliseconds()
-{
-    timespec time = {};
-    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &time);
-    return double(time.tv_sec) * 1e3 + double(time.tv_nsec) / 1e6;
-}
-
 double milliseconds(const QElapsedTimer &timer)
 {
     return double(timer.nsecsElapsed()) / 1e6;
 }
-
-/// Notes the longest work, in processor time, between two turns of the event loop.
-class FreezeMeter
-{
-public:
-    FreezeMeter()
-    {
-        QObject::connect(&m_ticks, &QTimer::timeout, &m_ticks, [this] { tick(); });
-        m_ticks.start(0);
-    }
-
-    double longest()
-    {
-        tick();
-        return m_longest;
-    }
-
-private:
-    void tick()
-    {
-        const double now = processorMilliseconds();
-        m_longest = std::max(m_longest, now - m_since);
-        m_since = now;
-    }
-
-    QTimer m_ticks;
-    double m_since = processorMilliseconds();
-    double m_longest = 0;
-};
 
 void settle(int forMilliseconds)
 {
@@ -152,11 +115,11 @@ bool measureFilter(const char *title, const QString &menu)
         const QString text = QStringLiteral("entry 123");
         FreezeMeter meter;
         for (int length = 1; length <= 2 * text.size(); ++length) {
-            const double before = processorMilliseconds();
+            const double before = FreezeMeter::processorMilliseconds();
             view.setFilter(text.left(length <= text.size() ? length : 2 * text.size() - length));
             // Until it is painted, too.
             QCoreApplication::processEvents();
-            (length == 1 ? first : keys).push_back(processorMilliseconds() - before);
+            (length == 1 ? first : keys).push_back(FreezeMeter::processorMilliseconds() - before);
             settle(length == 1 ? 1500 : 100);
         }
         freezes.push_back(meter.longest());

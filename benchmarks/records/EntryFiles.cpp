@@ -102,3 +102,8 @@ void EntryFiles::settle()
 {
     ::usleep(60000);
 }
+
+void EntryFiles::settleForLong()
+{
+    ::usleep(1100000);
+}

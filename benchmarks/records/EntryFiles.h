@@ -37,6 +37,8 @@ public:
 
     /// Waits until all files are old enough, whatever was just done to them.
     static void settle();
+    /// Waits until all files are older than a second, as those are that a user edits.
+    static void settleForLong();
 
 private:
     void write(const QByteArray &bytes);
