@@ -66,8 +66,8 @@ CustomWidgetInfo radioGroupBox()
         QStringLiteral(":/veluiextra-designer/icons/radiogroupbox.png"),
         QStringLiteral("Group box whose title is a radio button"),
         QStringLiteral(
-            "The boxes under one parent exclude one another: of those whose property \"checked\" is set in a "
-            "form, the last one counts, as with setChecked() in code."),
+            "The boxes under one parent exclude one another. A box that is alone cannot be checked: set "
+            "\"checked\" for the last box of the form, or call setChecked() after setupUi()."),
         sizeOf(200, 120)
             + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
         QStringLiteral("QGroupBox"),

@@ -20,9 +20,8 @@ class VelRadioGroupBoxPrivate;
  * belong to it. The user cannot uncheck a box, only choose another one. A box that is alone
  * below its parent can never be checked.
  *
- * A new box is unchecked: a form checks the one that applies once all of them exist. A form that
- * uic or QUiLoader builds checks its box while it makes the others; that counts, too, when the others
- * follow before the program waits for events again.
+ * A new box is unchecked: a form checks the one that applies once all of them exist. So a form
+ * that uic compiles can check its last box only; another one is checked after setupUi().
  *
  * \code
  * auto *form = new QWidget;

@@ -3,7 +3,6 @@
 
 #include <VelRadioGroupBox.h>
 
-#include "EarlyChecks.h"
 #include "IdleMnemonic.h"
 #include "RadioGroupBoxAccessible.h"
 #include "RadioGroupBoxPainter.h"
@@ -107,12 +106,10 @@ void VelRadioGroupBox::init()
         if (on)
             uncheckOthers(*this);
     });
-    EarlyChecks::fulfill(*this);
 }
 
 void VelRadioGroupBox::setChecked(bool on)
 {
-    EarlyChecks::forget(*this);
     if (!on) {
         const QPointer<VelRadioGroupBox> self(this);
         QGroupBox::setChecked(false);
@@ -120,12 +117,9 @@ void VelRadioGroupBox::setChecked(bool on)
             repaint();
         return;
     }
-    if (!parent())
+    // Without a parent there is no group.
+    if (groupOf(*this).size() < 2)
         return;
-    if (groupOf(*this).size() < 2) {
-        EarlyChecks::note(this);
-        return;
-    }
     const QPointer<VelRadioGroupBox> self(this);
     uncheckOthers(*this);
     if (self)
@@ -155,8 +149,6 @@ bool VelRadioGroupBox::event(QEvent *event)
         d->pressed = false;
         update();
     }
-    if (event->type() == QEvent::ParentChange)
-        EarlyChecks::fulfill(*this);
     return QWidget::event(event); // NOLINT(bugprone-parent-virtual-call)
 }
 
