@@ -89,10 +89,11 @@ void tst_ExportedSymbols::areOursAlone_data()
                                        "Vel(Settings|KeyServer|Menu\\w+|MimeTypeIconProvider|Desktop\\w+"
                                        "|RadioGroupBox)|IShortcutObject|Shortcut\\w+|EditShortcutsDialog");
 #ifdef VEL_CORE
-    QTest::newRow("velcore") << QStringLiteral(VEL_CORE)
-                             << QStringLiteral("Vel|GetVelDir|velLanguageCode|velSessionConfigSuffix");
-    QTest::newRow("veluiaux") << QStringLiteral(VEL_AUX)
-                              << QStringLiteral("Vel(Icon|IconTheme|Trash|UIDesktopAction|UIDesktopEntry)");
+    QTest::newRow("velcore")
+        << QStringLiteral(VEL_CORE)
+        << QStringLiteral("Vel|GetVelDir|velInstalledDataDir|velLanguageCode|velSessionConfigSuffix");
+    QTest::newRow("veluiaux") << QStringLiteral(
+        VEL_AUX) << QStringLiteral("Vel(Icon|IconTheme|Trash|UIDesktopAction|UIDesktopEntry|UIEntriesAhead)");
     QTest::newRow("velintegration")
         << QStringLiteral(VEL_INTEGRATION)
         << QStringLiteral("VelStartMenu|VelWmCommand|WmCommandReceiver|CreateStartMenu|UpdateStartMenu|"
