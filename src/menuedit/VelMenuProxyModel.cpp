@@ -262,6 +262,8 @@ bool VelMenuProxyModel::isInMenu(const QString &path) const
 // A sort asks for each row very often. That of another folder may have the place of its number.
 VelMenuProxyModel::Row &VelMenuProxyModel::rowOf(const QModelIndex &index) const
 {
+    if (!index.isValid())
+        return findRow(index);
     const auto place = std::size_t(index.row());
     if (place < m_rowsByNumber.size() && m_rowsByNumber[place].first == index.internalId())
         return *m_rowsByNumber[place].second;
