@@ -6,6 +6,7 @@
 #include "MenuNames.h"
 
 #include <DesktopEntryValue.h>
+#include <RecordFile.h>
 
 #include <algorithm>
 
@@ -64,5 +65,5 @@ QByteArray menuDirectoryEntry(const MenuCategory &category, const QStringList &s
 
 std::filesystem::path menuFolderRecord(const std::filesystem::path &folder)
 {
-    return folder / ".directory";
+    return folder / RecordFile;
 }

@@ -5,6 +5,8 @@
 
 #include "EntryFile.h"
 
+#include <RecordFile.h>
+
 #include <dirent.h>
 #include <sys/stat.h>
 
@@ -36,7 +38,6 @@ public:
 namespace {
 
 constexpr std::string_view EntrySuffix = ".desktop";
-constexpr char RecordFile[] = "/.directory";
 
 bool isEntry(std::string_view name)
 {
@@ -47,7 +48,7 @@ bool isEntry(std::string_view name)
 // which it is asked for.
 std::vector<std::string> filesOf(const std::string &folder)
 {
-    std::vector<std::string> files{folder + RecordFile};
+    std::vector<std::string> files{folder + '/' + RecordFile};
     const std::unique_ptr<DIR, int (*)(DIR *)> directory(::opendir(folder.c_str()), &::closedir);
     if (!directory)
         return {};
@@ -56,7 +57,7 @@ std::vector<std::string> filesOf(const std::string &folder)
         if (isEntry(name))
             files.push_back(folder + '/' + item->d_name);
         else if (item->d_type == DT_DIR && name.front() != '.')
-            files.push_back(folder + '/' + item->d_name + RecordFile);
+            files.push_back(folder + '/' + item->d_name + '/' + RecordFile);
         if (files.size() >= TextsAhead::MostFiles)
             break;
     }
