@@ -60,20 +60,19 @@ CustomWidgetInfo menuView()
 
 CustomWidgetInfo radioGroupBox()
 {
-    return {
-        QStringLiteral("VelRadioGroupBox"),
-        QStringLiteral("VelRadioGroupBox.h"),
-        QStringLiteral(":/veluiextra-designer/icons/radiogroupbox.png"),
-        QStringLiteral("Group box whose title is a radio button"),
-        QStringLiteral(
-            "The boxes under one parent exclude one another. A box that is alone cannot be checked: set "
-            "\"checked\" for the last box of the form, or call setChecked() after setupUi()."),
-        sizeOf(200, 120)
-            + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
-        QStringLiteral("QGroupBox"),
-        QString(),
-        true,
-        create<VelRadioGroupBox>};
+    return {QStringLiteral("VelRadioGroupBox"),
+            QStringLiteral("VelRadioGroupBox.h"),
+            QStringLiteral(":/veluiextra-designer/icons/radiogroupbox.png"),
+            QStringLiteral("Group box whose title is a radio button"),
+            QStringLiteral(
+                "The boxes under one parent exclude one another. A box that is alone cannot be checked: set "
+                "\"checked\" for the last box of the form, or call setChecked() after setupUi()."),
+            sizeOf(200, 120)
+                + QStringLiteral("<property name=\"title\"><string>RadioGroupBox</string></property>"),
+            QStringLiteral("QGroupBox"),
+            QString(),
+            true,
+            create<VelRadioGroupBox>};
 }
 
 CustomWidgetInfo entryProperties()
