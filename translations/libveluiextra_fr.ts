@@ -165,27 +165,27 @@
     <name>EntryCheck</name>
     <message>
         <source>The condition &apos;%1&apos; needs a file.</source>
-        <translation>La condition « %1 » a besoin d&apos;un fichier.</translation>
+        <translation>La condition «&#xa0;%1&#xa0;» a besoin d&apos;un fichier.</translation>
     </message>
     <message>
         <source>The file of the condition &apos;%1&apos; is one in the folder of settings, without &apos;/&apos; before it.</source>
-        <translation>Le fichier de la condition « %1 » se trouve dans le dossier de configuration et s&apos;écrit sans « / » devant.</translation>
+        <translation>Le fichier de la condition «&#xa0;%1&#xa0;» se trouve dans le dossier de configuration et s&apos;écrit sans «&#xa0;/&#xa0;» devant.</translation>
     </message>
     <message>
         <source>The condition &apos;%1&apos; needs a key.</source>
-        <translation>La condition « %1 » a besoin d&apos;une clé.</translation>
+        <translation>La condition «&#xa0;%1&#xa0;» a besoin d&apos;une clé.</translation>
     </message>
     <message>
         <source>The condition &apos;%1&apos; needs &apos;if-session&apos; or &apos;unless-session&apos; and a session.</source>
-        <translation>La condition « %1 » a besoin de « if-session » ou « unless-session » et d&apos;une session.</translation>
+        <translation>La condition «&#xa0;%1&#xa0;» a besoin de «&#xa0;if-session&#xa0;» ou «&#xa0;unless-session&#xa0;» et d&apos;une session.</translation>
     </message>
     <message>
         <source>The condition &apos;%1&apos; needs a schema and a key.</source>
-        <translation>La condition « %1 » a besoin d&apos;un schéma et d&apos;une clé.</translation>
+        <translation>La condition «&#xa0;%1&#xa0;» a besoin d&apos;un schéma et d&apos;une clé.</translation>
     </message>
     <message>
         <source>There is no condition &apos;%1&apos;.</source>
-        <translation>La condition « %1 » n&apos;existe pas.</translation>
+        <translation>La condition «&#xa0;%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>A category is empty.</source>
@@ -193,23 +193,23 @@
     </message>
     <message>
         <source>There is no registered category &apos;%1&apos;; one of your own has to begin with &apos;X-&apos;.</source>
-        <translation>Il n&apos;y a pas de catégorie enregistrée « %1 » ; une catégorie personnelle doit commencer par « X- ».</translation>
+        <translation>Il n&apos;y a pas de catégorie enregistrée «&#xa0;%1&#xa0;»&#xa0;; une catégorie personnelle doit commencer par «&#xa0;X-&#xa0;».</translation>
     </message>
     <message>
         <source>Change it to &apos;%1&apos;</source>
-        <translation>Changer en « %1 »</translation>
+        <translation>Changer en «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>The category &apos;%1&apos; also needs: %2.</source>
-        <translation>La catégorie « %1 » demande aussi : %2.</translation>
+        <translation>La catégorie «&#xa0;%1&#xa0;» demande aussi&#xa0;: %2.</translation>
     </message>
     <message>
         <source>The category &apos;%1&apos; goes with one of these: %2.</source>
-        <translation>La catégorie « %1 » va avec l&apos;une de celles-ci : %2.</translation>
+        <translation>La catégorie «&#xa0;%1&#xa0;» va avec l&apos;une de celles-ci&#xa0;: %2.</translation>
     </message>
     <message>
         <source>Add &apos;%1&apos;</source>
-        <translation>Ajouter « %1 »</translation>
+        <translation>Ajouter «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>Remove it</source>
@@ -217,23 +217,23 @@
     </message>
     <message>
         <source>The category &apos;%1&apos; is out of use.</source>
-        <translation>La catégorie « %1 » n&apos;est plus utilisée.</translation>
+        <translation>La catégorie «&#xa0;%1&#xa0;» n&apos;est plus utilisée.</translation>
     </message>
     <message>
         <source>The category &apos;%1&apos; is only for entries that list desktops in &apos;Only show in&apos;.</source>
-        <translation>La catégorie « %1 » est réservée aux entrées qui indiquent des environnements dans « Afficher uniquement dans ».</translation>
+        <translation>La catégorie «&#xa0;%1&#xa0;» est réservée aux entrées qui indiquent des environnements dans «&#xa0;Afficher uniquement dans&#xa0;».</translation>
     </message>
     <message>
         <source>No main category is among them, so menus may not know where to show the entry.</source>
-        <translation>Aucune n&apos;est une catégorie principale : les menus risquent de ne pas savoir où afficher l&apos;entrée.</translation>
+        <translation>Aucune n&apos;est une catégorie principale&#xa0;: les menus risquent de ne pas savoir où afficher l&apos;entrée.</translation>
     </message>
     <message>
         <source>Several main categories are among them, so the entry may be shown more than once.</source>
-        <translation>Plusieurs sont des catégories principales : l&apos;entrée risque d&apos;apparaître plus d&apos;une fois.</translation>
+        <translation>Plusieurs sont des catégories principales&#xa0;: l&apos;entrée risque d&apos;apparaître plus d&apos;une fois.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; stands more than once.</source>
-        <translation>« %1 » figure plus d&apos;une fois.</translation>
+        <translation>«&#xa0;%1&#xa0;» figure plus d&apos;une fois.</translation>
     </message>
     <message>
         <source>Keep the first</source>
@@ -253,7 +253,7 @@
     </message>
     <message>
         <source>In quotes, a backslash has to stand before &apos;%1&apos;.</source>
-        <translation>Entre guillemets, « %1 » doit être précédé d&apos;une barre oblique inverse.</translation>
+        <translation>Entre guillemets, «&#xa0;%1&#xa0;» doit être précédé d&apos;une barre oblique inverse.</translation>
     </message>
     <message>
         <source>The command ends in a single backslash, which stands for nothing.</source>
@@ -261,7 +261,7 @@
     </message>
     <message>
         <source>&apos;%1&apos; has to stand in double quotes.</source>
-        <translation>« %1 » doit être entre guillemets doubles.</translation>
+        <translation>«&#xa0;%1&#xa0;» doit être entre guillemets doubles.</translation>
     </message>
     <message>
         <source>Close the quote</source>
@@ -277,39 +277,39 @@
     </message>
     <message>
         <source>Write &apos;%&apos; as &apos;%%&apos;</source>
-        <translation>Écrire « % » sous la forme « %% »</translation>
+        <translation>Écrire «&#xa0;%&#xa0;» sous la forme «&#xa0;%%&#xa0;»</translation>
     </message>
     <message>
         <source>A field code is not complete: &apos;%&apos; ends the command.</source>
-        <translation>Un code de champ est incomplet : « % » termine la commande.</translation>
+        <translation>Un code de champ est incomplet&#xa0;: «&#xa0;%&#xa0;» termine la commande.</translation>
     </message>
     <message>
         <source>There is no field code &apos;%%1&apos;.</source>
-        <translation>Le code de champ « %%1 » n&apos;existe pas.</translation>
+        <translation>Le code de champ «&#xa0;%%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>The field code &apos;%%1&apos; is out of use; nothing is put in its place.</source>
-        <translation>Le code de champ « %%1 » n&apos;est plus utilisé ; rien ne prend sa place.</translation>
+        <translation>Le code de champ «&#xa0;%%1&#xa0;» n&apos;est plus utilisé&#xa0;; rien ne prend sa place.</translation>
     </message>
     <message>
         <source>Only one of &apos;%f&apos;, &apos;%F&apos;, &apos;%u&apos; and &apos;%U&apos; may stand in a command, and once.</source>
-        <translation>Une commande ne peut contenir qu&apos;un seul des codes « %f », « %F », « %u » et « %U », et une seule fois.</translation>
+        <translation>Une commande ne peut contenir qu&apos;un seul des codes «&#xa0;%f&#xa0;», «&#xa0;%F&#xa0;», «&#xa0;%u&#xa0;» et «&#xa0;%U&#xa0;», et une seule fois.</translation>
     </message>
     <message>
         <source>The field code &apos;%%1&apos; stands more than once.</source>
-        <translation>Le code de champ « %%1 » figure plus d&apos;une fois.</translation>
+        <translation>Le code de champ «&#xa0;%%1&#xa0;» figure plus d&apos;une fois.</translation>
     </message>
     <message>
         <source>The field code &apos;%%1&apos; has to be an argument of its own, not in quotes.</source>
-        <translation>Le code de champ « %%1 » doit être un argument à part, sans guillemets.</translation>
+        <translation>Le code de champ «&#xa0;%%1&#xa0;» doit être un argument à part, sans guillemets.</translation>
     </message>
     <message>
         <source>The path of the program has a blank: it has to stand in quotes.</source>
-        <translation>Le chemin du programme contient un espace : il doit être entre guillemets.</translation>
+        <translation>Le chemin du programme contient un espace&#xa0;: il doit être entre guillemets.</translation>
     </message>
     <message>
         <source>There is no program &apos;%1&apos;.</source>
-        <translation>Le programme « %1 » n&apos;existe pas.</translation>
+        <translation>Le programme «&#xa0;%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>The command has to begin with a program.</source>
@@ -317,7 +317,7 @@
     </message>
     <message>
         <source>&apos;Try exec&apos; takes the program alone, without quotes and arguments.</source>
-        <translation>« Commande de test » n&apos;accepte que le programme, sans guillemets ni arguments.</translation>
+        <translation>«&#xa0;Commande de test&#xa0;» n&apos;accepte que le programme, sans guillemets ni arguments.</translation>
     </message>
     <message>
         <source>Keep the program</source>
@@ -325,43 +325,43 @@
     </message>
     <message>
         <source>There is no program &apos;%1&apos;, so the entry is not shown.</source>
-        <translation>Le programme « %1 » n&apos;existe pas, l&apos;entrée n&apos;est donc pas affichée.</translation>
+        <translation>Le programme «&#xa0;%1&#xa0;» n&apos;existe pas, l&apos;entrée n&apos;est donc pas affichée.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is missing.</source>
-        <translation>« %1 » manque.</translation>
+        <translation>«&#xa0;%1&#xa0;» manque.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; has translations only, and nothing for all other languages.</source>
-        <translation>« %1 » n&apos;a que des traductions, et rien pour toutes les autres langues.</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;a que des traductions, et rien pour toutes les autres langues.</translation>
     </message>
     <message>
         <source>Take &apos;%1&apos;</source>
-        <translation>Prendre « %1 »</translation>
+        <translation>Prendre «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is only for entries of the type &apos;%2&apos;.</source>
-        <translation>« %1 » est réservé aux entrées de type « %2 ».</translation>
+        <translation>«&#xa0;%1&#xa0;» est réservé aux entrées de type «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is out of use here.</source>
-        <translation>« %1 » n&apos;est plus utilisé ici.</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est plus utilisé ici.</translation>
     </message>
     <message>
         <source>No key can be called &apos;%1&apos;.</source>
-        <translation>Aucune clé ne peut s&apos;appeler « %1 ».</translation>
+        <translation>Aucune clé ne peut s&apos;appeler «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>There is no key &apos;%1&apos; here; one of your own has to begin with &apos;X-&apos;.</source>
-        <translation>La clé « %1 » n&apos;existe pas ici ; une clé personnelle doit commencer par « X- ».</translation>
+        <translation>La clé «&#xa0;%1&#xa0;» n&apos;existe pas ici&#xa0;; une clé personnelle doit commencer par «&#xa0;X-&#xa0;».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; cannot be translated.</source>
-        <translation>« %1 » ne peut pas être traduit.</translation>
+        <translation>«&#xa0;%1&#xa0;» ne peut pas être traduit.</translation>
     </message>
     <message>
         <source>&apos;Only show in&apos; and &apos;Not show in&apos; exclude each other.</source>
-        <translation>« Afficher uniquement dans » et « Ne pas afficher dans » s&apos;excluent.</translation>
+        <translation>«&#xa0;Afficher uniquement dans&#xa0;» et «&#xa0;Ne pas afficher dans&#xa0;» s&apos;excluent.</translation>
     </message>
     <message>
         <source>The file is empty.</source>
@@ -369,11 +369,11 @@
     </message>
     <message>
         <source>The first group of the file is not &apos;[Desktop Entry]&apos;.</source>
-        <translation>Le premier groupe du fichier n&apos;est pas « [Desktop Entry] ».</translation>
+        <translation>Le premier groupe du fichier n&apos;est pas «&#xa0;[Desktop Entry]&#xa0;».</translation>
     </message>
     <message>
         <source>The name of the file has to end in &apos;.%1&apos;.</source>
-        <translation>Le nom du fichier doit se terminer par « .%1 ».</translation>
+        <translation>Le nom du fichier doit se terminer par «&#xa0;.%1&#xa0;».</translation>
     </message>
     <message>
         <source>Lines of the file end in a carriage return.</source>
@@ -381,67 +381,67 @@
     </message>
     <message>
         <source>A line of the file says nothing: %1</source>
-        <translation>Une ligne du fichier ne dit rien : %1</translation>
+        <translation>Une ligne du fichier ne dit rien&#xa0;: %1</translation>
     </message>
     <message>
         <source>A line of the file stands before all groups: %1</source>
-        <translation>Une ligne du fichier se trouve avant tous les groupes : %1</translation>
+        <translation>Une ligne du fichier se trouve avant tous les groupes&#xa0;: %1</translation>
     </message>
     <message>
         <source>A line of the file begins with a blank: %1</source>
-        <translation>Une ligne du fichier commence par un espace : %1</translation>
+        <translation>Une ligne du fichier commence par un espace&#xa0;: %1</translation>
     </message>
     <message>
         <source>A blank stands behind a group: %1</source>
-        <translation>Un groupe est suivi d&apos;un espace : %1</translation>
+        <translation>Un groupe est suivi d&apos;un espace&#xa0;: %1</translation>
     </message>
     <message>
         <source>The group &apos;%1&apos; stands more than once.</source>
-        <translation>Le groupe « %1 » figure plus d&apos;une fois.</translation>
+        <translation>Le groupe «&#xa0;%1&#xa0;» figure plus d&apos;une fois.</translation>
     </message>
     <message>
         <source>No group can be called &apos;%1&apos;.</source>
-        <translation>Aucun groupe ne peut s&apos;appeler « %1 ».</translation>
+        <translation>Aucun groupe ne peut s&apos;appeler «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>The group &apos;%1&apos; is out of use.</source>
-        <translation>Le groupe « %1 » n&apos;est plus utilisé.</translation>
+        <translation>Le groupe «&#xa0;%1&#xa0;» n&apos;est plus utilisé.</translation>
     </message>
     <message>
         <source>There is no group &apos;%1&apos;; one of your own has to begin with &apos;X-&apos;.</source>
-        <translation>Le groupe « %1 » n&apos;existe pas ; un groupe personnel doit commencer par « X- ».</translation>
+        <translation>Le groupe «&#xa0;%1&#xa0;» n&apos;existe pas&#xa0;; un groupe personnel doit commencer par «&#xa0;X-&#xa0;».</translation>
     </message>
     <message>
         <source>The id &apos;%1&apos; of an action may only have letters A to Z, digits and &apos;-&apos;.</source>
-        <translation>L&apos;identifiant « %1 » d&apos;une action ne peut contenir que des lettres de A à Z, des chiffres et « - ».</translation>
+        <translation>L&apos;identifiant «&#xa0;%1&#xa0;» d&apos;une action ne peut contenir que des lettres de A à Z, des chiffres et «&#xa0;-&#xa0;».</translation>
     </message>
     <message>
         <source>The action &apos;%1&apos; is described, but &apos;Actions&apos; does not name it.</source>
-        <translation>L&apos;action « %1 » est décrite, mais « Actions » ne la mentionne pas.</translation>
+        <translation>L&apos;action «&#xa0;%1&#xa0;» est décrite, mais «&#xa0;Actions&#xa0;» ne la mentionne pas.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has no &apos;/&apos;.</source>
-        <translation>« %1 » n&apos;est pas un type MIME : il n&apos;a pas de « / ».</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est pas un type MIME&#xa0;: il n&apos;a pas de «&#xa0;/&#xa0;».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: nothing stands behind the &apos;/&apos;.</source>
-        <translation>« %1 » n&apos;est pas un type MIME : rien ne suit le « / ».</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est pas un type MIME&#xa0;: rien ne suit le «&#xa0;/&#xa0;».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: there is no kind &apos;%2&apos;.</source>
-        <translation>« %1 » n&apos;est pas un type MIME : la famille « %2 » n&apos;existe pas.</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est pas un type MIME&#xa0;: la famille «&#xa0;%2&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>&apos;%1&apos; is no MIME type: it has a character that none has.</source>
-        <translation>« %1 » n&apos;est pas un type MIME : il contient un caractère interdit.</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est pas un type MIME&#xa0;: il contient un caractère interdit.</translation>
     </message>
     <message>
         <source>MIME types like &apos;%1&apos; are not used for files.</source>
-        <translation>Les types MIME comme « %1 » ne s&apos;utilisent pas pour des fichiers.</translation>
+        <translation>Les types MIME comme «&#xa0;%1&#xa0;» ne s&apos;utilisent pas pour des fichiers.</translation>
     </message>
     <message>
         <source>This computer does not know the MIME type &apos;%1&apos;.</source>
-        <translation>Cet ordinateur ne connaît pas le type MIME « %1 ».</translation>
+        <translation>Cet ordinateur ne connaît pas le type MIME «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>An action has no id.</source>
@@ -449,15 +449,15 @@
     </message>
     <message>
         <source>Nothing says what the action &apos;%1&apos; is.</source>
-        <translation>Rien ne dit ce qu&apos;est l&apos;action « %1 ».</translation>
+        <translation>Rien ne dit ce qu&apos;est l&apos;action «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>There is no registered desktop &apos;%1&apos;; others have to begin with &apos;X-&apos;.</source>
-        <translation>Il n&apos;y a pas d&apos;environnement enregistré « %1 » ; les autres doivent commencer par « X- ».</translation>
+        <translation>Il n&apos;y a pas d&apos;environnement enregistré «&#xa0;%1&#xa0;»&#xa0;; les autres doivent commencer par «&#xa0;X-&#xa0;».</translation>
     </message>
     <message>
         <source>In your language the entry is shown as &apos;%1&apos;.</source>
-        <translation>Dans votre langue, l&apos;entrée s&apos;affiche sous le nom « %1 ».</translation>
+        <translation>Dans votre langue, l&apos;entrée s&apos;affiche sous le nom «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>The comment says no more than the name.</source>
@@ -469,19 +469,19 @@
     </message>
     <message>
         <source>&apos;%1&apos; is out of use here; it has to be &apos;true&apos; or &apos;false&apos;.</source>
-        <translation>« %1 » n&apos;est plus utilisé ici ; ce doit être « true » ou « false ».</translation>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est plus utilisé ici&#xa0;; ce doit être «&#xa0;true&#xa0;» ou «&#xa0;false&#xa0;».</translation>
     </message>
     <message>
         <source>&apos;%1&apos; has to be &apos;true&apos; or &apos;false&apos;.</source>
-        <translation>« %1 » doit être « true » ou « false ».</translation>
+        <translation>«&#xa0;%1&#xa0;» doit être «&#xa0;true&#xa0;» ou «&#xa0;false&#xa0;».</translation>
     </message>
     <message>
         <source>Change it to &apos;true&apos;</source>
-        <translation>Changer en « true »</translation>
+        <translation>Changer en «&#xa0;true&#xa0;»</translation>
     </message>
     <message>
         <source>The name of an icon has no suffix like &apos;%1&apos;.</source>
-        <translation>Le nom d&apos;une icône n&apos;a pas d&apos;extension comme « %1 ».</translation>
+        <translation>Le nom d&apos;une icône n&apos;a pas d&apos;extension comme «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>Remove the suffix</source>
@@ -489,7 +489,7 @@
     </message>
     <message>
         <source>No icon theme has an icon &apos;%1&apos;.</source>
-        <translation>Aucun thème d&apos;icônes n&apos;a d&apos;icône « %1 ».</translation>
+        <translation>Aucun thème d&apos;icônes n&apos;a d&apos;icône «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>Write the folder in full</source>
@@ -497,7 +497,7 @@
     </message>
     <message>
         <source>The address does not say how to reach it, as &apos;https:&apos; and &apos;file:&apos; do.</source>
-        <translation>L&apos;adresse ne dit pas comment l&apos;atteindre, comme le font « https: » et « file: ».</translation>
+        <translation>L&apos;adresse ne dit pas comment l&apos;atteindre, comme le font «&#xa0;https:&#xa0;» et «&#xa0;file:&#xa0;».</translation>
     </message>
     <message>
         <source>The text is not encoded in UTF-8.</source>
@@ -509,7 +509,7 @@
     </message>
     <message>
         <source>The type has to be &apos;Application&apos;, &apos;Link&apos; or &apos;Directory&apos;, not &apos;%1&apos;.</source>
-        <translation>Le type doit être « Application », « Link » ou « Directory », pas « %1 ».</translation>
+        <translation>Le type doit être «&#xa0;Application&#xa0;», «&#xa0;Link&#xa0;» ou «&#xa0;Directory&#xa0;», pas «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
@@ -517,35 +517,35 @@
     </message>
     <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
-        <translation>La version « %1 » du standard n&apos;existe pas.</translation>
+        <translation>La version «&#xa0;%1&#xa0;» du standard n&apos;existe pas.</translation>
     </message>
     <message>
         <source>There is no encoding &apos;%1&apos;.</source>
-        <translation>Le codage « %1 » n&apos;existe pas.</translation>
+        <translation>Le codage «&#xa0;%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>There is no picture &apos;%1&apos;.</source>
-        <translation>L&apos;image « %1 » n&apos;existe pas.</translation>
+        <translation>L&apos;image «&#xa0;%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>An icon has a name or a path that begins with &apos;/&apos;.</source>
-        <translation>Une icône a un nom, ou un chemin qui commence par « / ».</translation>
+        <translation>Une icône a un nom, ou un chemin qui commence par «&#xa0;/&#xa0;».</translation>
     </message>
     <message>
         <source>The path of a folder begins with &apos;/&apos;.</source>
-        <translation>Le chemin d&apos;un dossier commence par « / ».</translation>
+        <translation>Le chemin d&apos;un dossier commence par «&#xa0;/&#xa0;».</translation>
     </message>
     <message>
         <source>There is no folder &apos;%1&apos;.</source>
-        <translation>Le dossier « %1 » n&apos;existe pas.</translation>
+        <translation>Le dossier «&#xa0;%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>There is no file &apos;%1&apos;.</source>
-        <translation>Le fichier « %1 » n&apos;existe pas.</translation>
+        <translation>Le fichier «&#xa0;%1&#xa0;» n&apos;existe pas.</translation>
     </message>
     <message>
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
-        <translation>D-Bus ne peut pas démarrer « %1 » : il faut un fichier dont le nom ressemble à « org.example.Program.desktop ».</translation>
+        <translation>D-Bus ne peut pas démarrer «&#xa0;%1&#xa0;»&#xa0;: il faut un fichier dont le nom ressemble à «&#xa0;org.example.Program.desktop&#xa0;».</translation>
     </message>
 </context>
 <context>
@@ -586,7 +586,7 @@
     </message>
     <message>
         <source>The icon that menus show: a name from the icon theme, or the full path of a picture.</source>
-        <translation>L&apos;icône affichée par les menus : un nom du thème d&apos;icônes ou le chemin complet d&apos;une image.</translation>
+        <translation>L&apos;icône affichée par les menus&#xa0;: un nom du thème d&apos;icônes ou le chemin complet d&apos;une image.</translation>
     </message>
     <message>
         <source>The command that starts the program, with codes such as %f for the files that it opens.</source>
@@ -602,7 +602,7 @@
     </message>
     <message>
         <source>A program that has to be installed; without it menus leave the entry out.</source>
-        <translation>Un programme qui doit être installé ; sans lui, les menus omettent l&apos;entrée.</translation>
+        <translation>Un programme qui doit être installé&#xa0;; sans lui, les menus omettent l&apos;entrée.</translation>
     </message>
     <message>
         <source>The address that the entry opens.</source>
@@ -610,7 +610,7 @@
     </message>
     <message>
         <source>What kind of program it is, such as: Web browser.</source>
-        <translation>Le genre de programme, par exemple : Navigateur web.</translation>
+        <translation>Le genre de programme, par exemple&#xa0;: Navigateur web.</translation>
     </message>
     <message>
         <source>A sentence about the program, which menus show as a tip.</source>
@@ -626,7 +626,7 @@
     </message>
     <message>
         <source>The desktop environments that alone show the entry; none means all.</source>
-        <translation>Les seuls environnements de bureau qui affichent l&apos;entrée ; si aucun n&apos;est indiqué, tous l&apos;affichent.</translation>
+        <translation>Les seuls environnements de bureau qui affichent l&apos;entrée&#xa0;; si aucun n&apos;est indiqué, tous l&apos;affichent.</translation>
     </message>
     <message>
         <source>The desktop environments that do not show the entry.</source>
@@ -654,7 +654,7 @@
     </message>
     <message>
         <source>Further things that the program can be started for, such as: New window.</source>
-        <translation>D&apos;autres usages pour lesquels le programme peut être démarré, par exemple : Nouvelle fenêtre.</translation>
+        <translation>D&apos;autres usages pour lesquels le programme peut être démarré, par exemple&#xa0;: Nouvelle fenêtre.</translation>
     </message>
     <message>
         <source>The version of the standard for entries that this one follows.</source>
@@ -691,7 +691,7 @@
     <message>
         <source>%1 Texts of their own have: %2.</source>
         <comment>%1 is a sentence, %2 a list of languages</comment>
-        <translation>%1 Ont leurs propres textes : %2.</translation>
+        <translation>%1 Ont leurs propres textes&#xa0;: %2.</translation>
     </message>
 </context>
 <context>
@@ -720,22 +720,22 @@
     </message>
     <message>
         <source>The deletion was canceled. Still there, in whole or in part: %1.</source>
-        <translation>La suppression a été interrompue. Toujours là, en tout ou en partie : %1.</translation>
+        <translation>La suppression a été interrompue. Toujours là, en tout ou en partie&#xa0;: %1.</translation>
     </message>
 </context>
 <context>
     <name>MenuDrop</name>
     <message>
         <source>The folder &apos;%1&apos; already has &apos;%2&apos;. Keep both gives the new one another file name, Replace puts the old one into the trash, Skip leaves the new one where it is; Cancel leaves everything as it is.</source>
-        <translation>Le dossier « %1 » contient déjà « %2 ». Conserver les deux donne au nouveau un autre nom de fichier, Remplacer met l&apos;ancien à la corbeille, Ignorer laisse le nouveau où il est ; Annuler laisse tout tel quel.</translation>
+        <translation>Le dossier «&#xa0;%1&#xa0;» contient déjà «&#xa0;%2&#xa0;». Conserver les deux donne au nouveau un autre nom de fichier, Remplacer met l&apos;ancien à la corbeille, Ignorer laisse le nouveau où il est&#xa0;; Annuler laisse tout tel quel.</translation>
     </message>
     <message>
         <source>The folder &apos;%1&apos; already has &apos;%2&apos;, which the new one comes from. Keep both gives the new one another file name, Skip leaves it where it is; Cancel leaves everything as it is.</source>
-        <translation>Le dossier « %1 » contient déjà « %2 », dont le nouveau provient. Conserver les deux donne au nouveau un autre nom de fichier, Ignorer le laisse où il est ; Annuler laisse tout tel quel.</translation>
+        <translation>Le dossier «&#xa0;%1&#xa0;» contient déjà «&#xa0;%2&#xa0;», dont le nouveau provient. Conserver les deux donne au nouveau un autre nom de fichier, Ignorer le laisse où il est&#xa0;; Annuler laisse tout tel quel.</translation>
     </message>
     <message>
         <source>Another one that comes to the folder &apos;%1&apos; has the same file name as &apos;%2&apos;. Keep both gives this one another file name, Skip leaves it where it is; Cancel leaves everything as it is.</source>
-        <translation>Un autre élément destiné au dossier « %1 » a le même nom de fichier que « %2 ». Conserver les deux donne à celui-ci un autre nom de fichier, Ignorer le laisse où il est ; Annuler laisse tout tel quel.</translation>
+        <translation>Un autre élément destiné au dossier «&#xa0;%1&#xa0;» a le même nom de fichier que «&#xa0;%2&#xa0;». Conserver les deux donne à celui-ci un autre nom de fichier, Ignorer le laisse où il est&#xa0;; Annuler laisse tout tel quel.</translation>
     </message>
     <message>
         <source>Name already taken</source>
@@ -1075,8 +1075,8 @@
     <message numerus="yes">
         <source>%n items are hidden: the menu no longer shows them.</source>
         <translation>
-            <numerusform>%n élément est masqué : le menu ne l&apos;affiche plus.</numerusform>
-            <numerusform>%n éléments sont masqués : le menu ne les affiche plus.</numerusform>
+            <numerusform>%n élément est masqué&#xa0;: le menu ne l&apos;affiche plus.</numerusform>
+            <numerusform>%n éléments sont masqués&#xa0;: le menu ne les affiche plus.</numerusform>
         </translation>
     </message>
     <message numerus="yes">
@@ -1194,7 +1194,7 @@
     </message>
     <message>
         <source>Can&apos;t link %1: %2</source>
-        <translation>Impossible de créer un lien vers %1 : %2</translation>
+        <translation>Impossible de créer un lien vers %1&#xa0;: %2</translation>
     </message>
 </context>
 <context>
@@ -1689,7 +1689,7 @@ Choisissez un autre dossier ou un autre nom, puis réessayez.</translation>
     </message>
     <message>
         <source>The file %1 is not a desktop entry: it has no group [Desktop Entry].</source>
-        <translation>Le fichier %1 n&apos;est pas une entrée de bureau : il n&apos;a pas de groupe [Desktop Entry].</translation>
+        <translation>Le fichier %1 n&apos;est pas une entrée de bureau&#xa0;: il n&apos;a pas de groupe [Desktop Entry].</translation>
     </message>
 </context>
 <context>
@@ -2156,7 +2156,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>The folder %1 was not opened: %2.</source>
-        <translation>Le dossier %1 n&apos;a pas été ouvert : %2.</translation>
+        <translation>Le dossier %1 n&apos;a pas été ouvert&#xa0;: %2.</translation>
     </message>
     <message>
         <source>New &amp;folder</source>
@@ -2240,7 +2240,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>The default menu could not be built in %1: %2. The menu was left as it is.</source>
-        <translation>Le menu par défaut n&apos;a pas pu être construit dans %1 : %2. Le menu est resté tel quel.</translation>
+        <translation>Le menu par défaut n&apos;a pas pu être construit dans %1&#xa0;: %2. Le menu est resté tel quel.</translation>
     </message>
     <message>
         <source>%1 is no file on this computer. Nothing was moved or copied.</source>
@@ -2248,7 +2248,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>%1 was not started: %2.</source>
-        <translation>%1 n&apos;a pas été démarré : %2.</translation>
+        <translation>%1 n&apos;a pas été démarré&#xa0;: %2.</translation>
     </message>
 </context>
 <context>
@@ -2298,7 +2298,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>Only beside &quot;Only show in&quot;</source>
-        <translation>Seulement avec « Afficher uniquement dans »</translation>
+        <translation>Seulement avec «&#xa0;Afficher uniquement dans&#xa0;»</translation>
     </message>
     <message>
         <source>Deprecated</source>
@@ -2962,19 +2962,19 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <name>VelUI::EditActionsDialog</name>
     <message>
         <source>An action has no id. It can have &quot;%1&quot;.</source>
-        <translation>Une action n&apos;a pas d&apos;identifiant. Elle peut avoir « %1 ».</translation>
+        <translation>Une action n&apos;a pas d&apos;identifiant. Elle peut avoir «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>Two actions have the id &quot;%1&quot;. The second one can have &quot;%2&quot;.</source>
-        <translation>Deux actions ont l&apos;identifiant « %1 ». La seconde peut avoir « %2 ».</translation>
+        <translation>Deux actions ont l&apos;identifiant «&#xa0;%1&#xa0;». La seconde peut avoir «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>No entry can hold the id &quot;%1&quot;. It can be &quot;%2&quot;.</source>
-        <translation>Aucune entrée ne peut contenir l&apos;identifiant « %1 ». Ce peut être « %2 ».</translation>
+        <translation>Aucune entrée ne peut contenir l&apos;identifiant «&#xa0;%1&#xa0;». Ce peut être «&#xa0;%2&#xa0;».</translation>
     </message>
     <message>
         <source>The id &quot;%1&quot; should have only A to Z, a to z, 0 to 9 and &quot;-&quot; in it, as &quot;%2&quot; has.</source>
-        <translation>L&apos;identifiant « %1 » ne devrait contenir que A à Z, a à z, 0 à 9 et « - », comme « %2 ».</translation>
+        <translation>L&apos;identifiant «&#xa0;%1&#xa0;» ne devrait contenir que A à Z, a à z, 0 à 9 et «&#xa0;-&#xa0;», comme «&#xa0;%2&#xa0;».</translation>
     </message>
     <message numerus="yes">
         <source>%n more id(s) should be changed.</source>
@@ -2985,7 +2985,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>Use &quot;%1&quot;</source>
-        <translation>Utiliser « %1 »</translation>
+        <translation>Utiliser «&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>Use the proposed ids</source>
@@ -3012,7 +3012,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <name>VelUI::EditStringsDialog</name>
     <message>
         <source>The &quot;;&quot; in &quot;%1&quot; does not separate items, it becomes part of one item.</source>
-        <translation>Le « ; » dans « %1 » ne sépare pas d&apos;éléments, il devient une partie d&apos;un élément.</translation>
+        <translation>Le «&#xa0;;&#xa0;» dans «&#xa0;%1&#xa0;» ne sépare pas d&apos;éléments, il devient une partie d&apos;un élément.</translation>
     </message>
     <message numerus="yes">
         <source>Make %n item(s) of it</source>
@@ -3065,7 +3065,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>≠ changed lines: %1, + new lines: %2, removed lines: %3</source>
-        <translation>≠ lignes modifiées : %1, + nouvelles lignes : %2, lignes retirées : %3</translation>
+        <translation>≠ lignes modifiées&#xa0;: %1, + nouvelles lignes&#xa0;: %2, lignes retirées&#xa0;: %3</translation>
     </message>
 </context>
 <context>
@@ -3105,35 +3105,35 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <name>VelUI::FieldCodes</name>
     <message>
         <source>%f: one file; for several files the program is started several times</source>
-        <translation>%f : un fichier ; pour plusieurs fichiers, le programme est démarré plusieurs fois</translation>
+        <translation>%f&#xa0;: un fichier&#xa0;; pour plusieurs fichiers, le programme est démarré plusieurs fois</translation>
     </message>
     <message>
         <source>%F: all files, each as a word of its own</source>
-        <translation>%F : tous les fichiers, chacun comme un mot à part</translation>
+        <translation>%F&#xa0;: tous les fichiers, chacun comme un mot à part</translation>
     </message>
     <message>
         <source>%u: one address (URL) or file; for several the program is started several times</source>
-        <translation>%u : une adresse (URL) ou un fichier ; pour plusieurs, le programme est démarré plusieurs fois</translation>
+        <translation>%u&#xa0;: une adresse (URL) ou un fichier&#xa0;; pour plusieurs, le programme est démarré plusieurs fois</translation>
     </message>
     <message>
         <source>%U: all addresses (URLs) or files, each as a word of its own</source>
-        <translation>%U : toutes les adresses (URL) ou tous les fichiers, chacun comme un mot à part</translation>
+        <translation>%U&#xa0;: toutes les adresses (URL) ou tous les fichiers, chacun comme un mot à part</translation>
     </message>
     <message>
         <source>%i: --icon and the icon of this entry, if it has one</source>
-        <translation>%i : --icon et l&apos;icône de cette entrée, si elle en a une</translation>
+        <translation>%i&#xa0;: --icon et l&apos;icône de cette entrée, si elle en a une</translation>
     </message>
     <message>
         <source>%c: the name of this entry, translated</source>
-        <translation>%c : le nom de cette entrée, traduit</translation>
+        <translation>%c&#xa0;: le nom de cette entrée, traduit</translation>
     </message>
     <message>
         <source>%k: where the file of this entry lies</source>
-        <translation>%k : l&apos;emplacement du fichier de cette entrée</translation>
+        <translation>%k&#xa0;: l&apos;emplacement du fichier de cette entrée</translation>
     </message>
     <message>
         <source>%%: a percent sign</source>
-        <translation>%% : un signe pour cent</translation>
+        <translation>%%&#xa0;: un signe pour cent</translation>
     </message>
 </context>
 <context>
@@ -3145,12 +3145,12 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <message>
         <source>Fix: %1</source>
         <comment>on a button; %1 is what it does</comment>
-        <translation>Corriger : %1</translation>
+        <translation>Corriger&#xa0;: %1</translation>
     </message>
     <message>
         <source>%1: %2</source>
         <comment>how bad something is, and what it is</comment>
-        <translation>%1 : %2</translation>
+        <translation>%1&#xa0;: %2</translation>
     </message>
     <message>
         <source>Error</source>
@@ -3170,7 +3170,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <message>
         <source>%1: %2</source>
         <comment>a key or an action of an entry, and what is wrong with it</comment>
-        <translation>%1 : %2</translation>
+        <translation>%1&#xa0;: %2</translation>
     </message>
 </context>
 <context>
@@ -3204,7 +3204,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     <name>VelUI::LanguageBar</name>
     <message>
         <source>&amp;Language:</source>
-        <translation>&amp;Langue :</translation>
+        <translation>&amp;Langue&#xa0;:</translation>
     </message>
     <message>
         <source>Language</source>
@@ -3224,19 +3224,19 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>%1 (%2), yours: %3 of %4 texts</source>
-        <translation>%1 (%2), la vôtre : %3 textes sur %4</translation>
+        <translation>%1 (%2), la vôtre&#xa0;: %3 textes sur %4</translation>
     </message>
     <message>
         <source>%1 (%2), yours: no text yet</source>
-        <translation>%1 (%2), la vôtre : encore aucun texte</translation>
+        <translation>%1 (%2), la vôtre&#xa0;: encore aucun texte</translation>
     </message>
     <message>
         <source>%1 (%2): %3 of %4 texts</source>
-        <translation>%1 (%2) : %3 textes sur %4</translation>
+        <translation>%1 (%2)&#xa0;: %3 textes sur %4</translation>
     </message>
     <message>
         <source>%1 (%2): no text yet</source>
-        <translation>%1 (%2) : encore aucun texte</translation>
+        <translation>%1 (%2)&#xa0;: encore aucun texte</translation>
     </message>
 </context>
 <context>
@@ -3247,7 +3247,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>&amp;Language or its code, such as pt_BR:</source>
-        <translation>&amp;Langue ou son code, par exemple pt_BR :</translation>
+        <translation>&amp;Langue ou son code, par exemple pt_BR&#xa0;:</translation>
     </message>
     <message>
         <source>Language or its code</source>
@@ -3260,7 +3260,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>No language has such a code: it is like de, pt_BR or sr@latin.</source>
-        <translation>Aucune langue n&apos;a un tel code : il ressemble à de, pt_BR ou sr@latin.</translation>
+        <translation>Aucune langue n&apos;a un tel code&#xa0;: il ressemble à de, pt_BR ou sr@latin.</translation>
     </message>
     <message>
         <source>The code %1 is well-formed, but no language of this name is known.</source>
@@ -3356,7 +3356,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>The program vel-open, which runs entries, could not be started: %1</source>
-        <translation>Le programme vel-open, qui exécute les entrées, n&apos;a pas pu être démarré : %1</translation>
+        <translation>Le programme vel-open, qui exécute les entrées, n&apos;a pas pu être démarré&#xa0;: %1</translation>
     </message>
     <message>
         <source>The trial was stopped.</source>
@@ -3368,7 +3368,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>The entry was started (exit status 0): %1</source>
-        <translation>L&apos;entrée a été démarrée (code de sortie 0) : %1</translation>
+        <translation>L&apos;entrée a été démarrée (code de sortie 0)&#xa0;: %1</translation>
     </message>
     <message>
         <source>The entry could not be started (exit status %1).</source>
@@ -3376,7 +3376,7 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>The entry could not be started (exit status %1): %2</source>
-        <translation>L&apos;entrée n&apos;a pas pu être démarrée (code de sortie %1) : %2</translation>
+        <translation>L&apos;entrée n&apos;a pas pu être démarrée (code de sortie %1)&#xa0;: %2</translation>
     </message>
 </context>
 </TS>

@@ -369,7 +369,7 @@
         <source>The entry %1 was changed.
 Save the changes?</source>
         <translation>L&apos;entrée %1 a été modifiée.
-Voulez-vous enregistrer les modifications ?</translation>
+Voulez-vous enregistrer les modifications&#xa0;?</translation>
     </message>
 </context>
 <context>
@@ -619,15 +619,15 @@ et une troisième
     </message>
     <message>
         <source>cannot open %1: there is no such file, --create makes a new entry</source>
-        <translation>impossible d&apos;ouvrir %1 : ce fichier n&apos;existe pas, --create crée une nouvelle entrée</translation>
+        <translation>impossible d&apos;ouvrir %1&#xa0;: ce fichier n&apos;existe pas, --create crée une nouvelle entrée</translation>
     </message>
     <message>
         <source>cannot open %1: it is no regular file</source>
-        <translation>impossible d&apos;ouvrir %1 : ce n&apos;est pas un fichier ordinaire</translation>
+        <translation>impossible d&apos;ouvrir %1&#xa0;: ce n&apos;est pas un fichier ordinaire</translation>
     </message>
     <message>
         <source>cannot open %1: %2</source>
-        <translation>impossible d&apos;ouvrir %1 : %2</translation>
+        <translation>impossible d&apos;ouvrir %1&#xa0;: %2</translation>
     </message>
 </context>
 <context>
@@ -760,11 +760,11 @@ et une troisième
     </message>
     <message>
         <source>What to print: %1. The default is text.</source>
-        <translation>Ce qui est affiché : %1. La valeur par défaut est text.</translation>
+        <translation>Ce qui est affiché&#xa0;: %1. La valeur par défaut est text.</translation>
     </message>
     <message>
         <source>The icon theme to take the files of icons from; the user&apos;s own when none is given.</source>
-        <translation>Le thème d&apos;icônes d&apos;où viennent les fichiers des icônes ; celui de l&apos;utilisateur si aucun n&apos;est indiqué.</translation>
+        <translation>Le thème d&apos;icônes d&apos;où viennent les fichiers des icônes&#xa0;; celui de l&apos;utilisateur si aucun n&apos;est indiqué.</translation>
     </message>
     <message>
         <source>The edge of the icons in pixels, 24 by default.</source>
@@ -780,11 +780,11 @@ et une troisième
     </message>
     <message>
         <source>The start menu is empty: no application is installed.</source>
-        <translation>Le menu de démarrage est vide : aucune application n&apos;est installée.</translation>
+        <translation>Le menu de démarrage est vide&#xa0;: aucune application n&apos;est installée.</translation>
     </message>
     <message>
         <source>The start menu %1 cannot be made: %2</source>
-        <translation>Le menu de démarrage %1 ne peut pas être créé : %2</translation>
+        <translation>Le menu de démarrage %1 ne peut pas être créé&#xa0;: %2</translation>
     </message>
     <message>
         <source>%1 is left out, as the line end in its name cannot be written in this format. Rename it.</source>
@@ -792,15 +792,15 @@ et une troisième
     </message>
     <message>
         <source>The start menu is empty: nothing in %1 is shown.</source>
-        <translation>Le menu de démarrage est vide : rien dans %1 n&apos;est affiché.</translation>
+        <translation>Le menu de démarrage est vide&#xa0;: rien dans %1 n&apos;est affiché.</translation>
     </message>
     <message>
         <source>cannot run vel-open: %1</source>
-        <translation>impossible d&apos;exécuter vel-open : %1</translation>
+        <translation>impossible d&apos;exécuter vel-open&#xa0;: %1</translation>
     </message>
     <message>
         <source>There is no &quot;%1&quot; in the menu.</source>
-        <translation>Il n&apos;y a pas de « %1 » dans le menu.</translation>
+        <translation>Il n&apos;y a pas de «&#xa0;%1&#xa0;» dans le menu.</translation>
     </message>
 </context>
 <context>
@@ -847,11 +847,11 @@ et une troisième
     </message>
     <message>
         <source>unknown window manager: %1 (known are %2)</source>
-        <translation>gestionnaire de fenêtres inconnu : %1 (sont connus %2)</translation>
+        <translation>gestionnaire de fenêtres inconnu&#xa0;: %1 (sont connus %2)</translation>
     </message>
     <message>
         <source>Do what this window manager needs to show the start menu as it is: %1.</source>
-        <translation>Faire ce dont ce gestionnaire de fenêtres a besoin pour afficher le menu de démarrage tel qu&apos;il est : %1.</translation>
+        <translation>Faire ce dont ce gestionnaire de fenêtres a besoin pour afficher le menu de démarrage tel qu&apos;il est&#xa0;: %1.</translation>
     </message>
 </context>
 </TS>
