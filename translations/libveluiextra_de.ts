@@ -2250,6 +2250,14 @@ gehen verloren. Sind Sie sicher?</translation>
         <source>%1 was not started: %2.</source>
         <translation>%1 wurde nicht gestartet: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Dieses Menü ist leer. Klicken Sie hier mit der rechten Maustaste und wählen Sie „%2“, um es mit den installierten Anwendungen zu füllen, oder drücken Sie %1 für einen neuen Eintrag.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Dieses Menü ist leer, weil keine installierte Anwendung gefunden wurde. Sobald es eine gibt, klicken Sie hier mit der rechten Maustaste und wählen Sie „%2“. Bis dahin drücken Sie %1 für einen eigenen Eintrag.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2250,6 +2250,14 @@ anteriores. ¿Está seguro?</translation>
         <source>%1 was not started: %2.</source>
         <translation>No se ha iniciado %1: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Este menú está vacío. Haga clic aquí con el botón derecho y elija «%2» para llenarlo con las aplicaciones instaladas, o pulse %1 para una entrada nueva.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Este menú está vacío, porque no se ha encontrado ninguna aplicación instalada. Cuando haya alguna, haga clic aquí con el botón derecho y elija «%2». Mientras tanto, pulse %1 para una entrada propia.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2250,6 +2250,14 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
         <source>%1 was not started: %2.</source>
         <translation>%1 n&apos;a pas été démarré&#xa0;: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Ce menu est vide. Faites ici un clic droit et choisissez « %2 » pour le remplir avec les applications installées, ou appuyez sur %1 pour une nouvelle entrée.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Ce menu est vide, car aucune application installée n&apos;a été trouvée. Dès qu&apos;il y en aura une, faites ici un clic droit et choisissez « %2 ». D&apos;ici là, appuyez sur %1 pour une entrée à vous.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2250,6 +2250,14 @@ andranno persi. Sei sicuro?</translation>
         <source>%1 was not started: %2.</source>
         <translation>%1 non è stato avviato: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Questo menu è vuoto. Fai clic qui con il tasto destro e scegli «%2» per riempirlo con le applicazioni installate, o premi %1 per una nuova voce.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Questo menu è vuoto, perché non è stata trovata nessuna applicazione installata. Quando ce ne sarà una, fai clic qui con il tasto destro e scegli «%2». Fino ad allora, premi %1 per una voce tua.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2220,6 +2220,14 @@ will be lost. Are you sure?</source>
         <source>%1 was not started: %2.</source>
         <translation>%1 を起動できませんでした: %2。</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>このメニューは空です。ここを右クリックして「%2」を選ぶと、インストールされているアプリケーションが追加されます。%1 を押すと新しいエントリを作成できます。</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>インストールされているアプリケーションが見つからなかったため、このメニューは空です。インストールしたら、ここを右クリックして「%2」を選んでください。それまでは、%1 を押すと独自のエントリを作成できます。</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

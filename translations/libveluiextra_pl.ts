@@ -2280,6 +2280,14 @@ zostaną utracone. Czy na pewno?</translation>
         <source>%1 was not started: %2.</source>
         <translation>Nie uruchomiono %1: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>To menu jest puste. Kliknij tu prawym przyciskiem i wybierz „%2”, aby wypełnić je zainstalowanymi programami, lub naciśnij %1, aby dodać nowy wpis.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>To menu jest puste, bo nie znaleziono żadnego zainstalowanego programu. Gdy jakiś się pojawi, kliknij tu prawym przyciskiem i wybierz „%2”. Do tego czasu naciśnij %1, aby dodać własny wpis.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

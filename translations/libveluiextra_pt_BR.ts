@@ -2250,6 +2250,14 @@ serão perdidos. Tem certeza?</translation>
         <source>%1 was not started: %2.</source>
         <translation>%1 não foi iniciado: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Este menu está vazio. Clique aqui com o botão direito e escolha &quot;%2&quot; para preenchê-lo com os aplicativos instalados, ou pressione %1 para uma nova entrada.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Este menu está vazio, porque nenhum aplicativo instalado foi encontrado. Quando houver um, clique aqui com o botão direito e escolha &quot;%2&quot;. Até lá, pressione %1 para uma entrada sua.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2280,6 +2280,14 @@ will be lost. Are you sure?</source>
         <source>%1 was not started: %2.</source>
         <translation>Не удалось запустить %1: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Это меню пусто. Щёлкните здесь правой кнопкой и выберите «%2», чтобы заполнить его установленными приложениями, или нажмите %1, чтобы создать запись.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Это меню пусто: не найдено ни одного установленного приложения. Когда оно появится, щёлкните здесь правой кнопкой и выберите «%2». А пока нажмите %1, чтобы создать собственную запись.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2220,6 +2220,14 @@ kaybolacak. Emin misiniz?</translation>
         <source>%1 was not started: %2.</source>
         <translation>%1 başlatılmadı: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Bu menü boş. Kurulu uygulamalarla doldurmak için burada sağ tıklayıp &apos;%2&apos; seçeneğini seçin veya yeni girdi için %1 tuşuna basın.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Bu menü boş, çünkü kurulu bir uygulama bulunamadı. Bir uygulama kurulunca burada sağ tıklayıp &apos;%2&apos; seçeneğini seçin. O zamana kadar kendi girdiniz için %1 tuşuna basın.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

@@ -2280,6 +2280,14 @@ will be lost. Are you sure?</source>
         <source>%1 was not started: %2.</source>
         <translation>Не вдалося запустити %1: %2.</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>Це меню порожнє. Клацніть тут правою кнопкою і виберіть «%2», щоб заповнити його встановленими програмами, або натисніть %1, щоб створити запис.</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>Це меню порожнє: не знайдено жодної встановленої програми. Коли вона з&apos;явиться, клацніть тут правою кнопкою і виберіть «%2». А поки натисніть %1, щоб створити власний запис.</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>

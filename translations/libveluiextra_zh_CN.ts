@@ -2220,6 +2220,14 @@ will be lost. Are you sure?</source>
         <source>%1 was not started: %2.</source>
         <translation>未启动 %1：%2。</translation>
     </message>
+    <message>
+        <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
+        <translation>此菜单为空。在此处单击右键并选择“%2”，用已安装的应用程序填充菜单，或按 %1 新建条目。</translation>
+    </message>
+    <message>
+        <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
+        <translation>此菜单为空，因为没有找到已安装的应用程序。安装之后，请在此处单击右键并选择“%2”。在此之前，可以按 %1 新建自己的条目。</translation>
+    </message>
 </context>
 <context>
     <name>VelUI::ActionPropsDialog</name>
