@@ -217,11 +217,7 @@ void FileManager::pickInDropMenu(Qt::DropAction action)
             return !menu.isEmpty();
         },
         Patience));
-    // Copy, move, link, cancel, and a line before the last.
-    const int entryHeight = geometry(menu, "HEIGHT") * 10 / 43;
-    const int row = action == Qt::CopyAction ? 0 : 1;
-    XDoTool::run(QStringLiteral("mousemove --window %1 %2 %3 sleep 0.1 click 1")
-                     .arg(QString::fromLatin1(menu))
-                     .arg(geometry(menu, "WIDTH") / 2)
-                     .arg(entryHeight * row + entryHeight / 2));
+    // Copy, move, link and cancel. The version of Debian 13 closes the menu at a click and does nothing.
+    XDoTool::press(action == Qt::CopyAction ? QStringLiteral("Down Return")
+                                            : QStringLiteral("Down Down Return"));
 }
