@@ -7,6 +7,7 @@
 #include <QFile>
 #include <QProcess>
 #include <QRegularExpression>
+#include <QTemporaryDir>
 
 #include <algorithm>
 
@@ -77,8 +78,10 @@ constexpr Meaning Meanings[] = {
     {"for key \"(?<key>Exec)\" in group .*contains a deprecated field code",
      EntryProblem::DeprecatedFieldCode},
     {"for key \"(?<key>Exec)\" in group .*may contain at most one", EntryProblem::SeveralFileCodes},
-    {"for key \"(?<key>.*)\" in group .*contains (action )?\".*\" more than once",
+    {"for key \"(?<key>.*)\" in group .*contains (action |interface )?\".*\" more than once",
      EntryProblem::RepeatedItem},
+    {"for key \"(?<key>Implements)\" in group .*contains an invalid interface name",
+     EntryProblem::InvalidInterface},
     {"for key \"(?<key>OnlyShowIn|NotShowIn)\" in group .*contains an unregistered value",
      EntryProblem::UnknownDesktop},
     {"^only one of \"OnlyShowIn\" and \"NotShowIn\"", EntryProblem::BothShowInLists},
@@ -157,16 +160,35 @@ QByteArray outputFor(const QStringList &places, const QString &folder)
     return process.waitForFinished(300000) ? process.readAll() : QByteArray();
 }
 
+// Version 0.28 takes the semicolon that ends a list of interfaces for the begin of one more without a name.
+bool isAboutTheEndOfAList(const QString &text)
+{
+    static const QRegularExpression complaint(
+        QStringLiteral("^value \"(?<list>.*)\" for key \"Implements\" in group .*interface name \"\"$"));
+    const QString list = complaint.match(text).captured(QStringLiteral("list"));
+    const QChar semicolon = QLatin1Char(';');
+    return list.endsWith(semicolon) && list != semicolon && !list.startsWith(semicolon)
+        && !list.contains(QLatin1String(";;"));
+}
+
 void read(const QByteArray &output, QVector<Complaints> *all)
 {
     static const QRegularExpression line(QStringLiteral("^(\\d{6})/[^:]*: (error|warning|hint): (.*)$"),
                                          QRegularExpression::DotMatchesEverythingOption);
     for (const QByteArray &bytes : output.split('\n')) {
         const QRegularExpressionMatch match = line.match(QString::fromUtf8(bytes));
-        if (match.hasMatch())
+        if (match.hasMatch() && !isAboutTheEndOfAList(match.captured(3)))
             (*all)[match.captured(1).toInt()].append(
                 meaningOf(severityOf(match.captured(2)), match.captured(3)));
     }
+}
+
+// Version 0.26 does not.
+bool looksForInterfaces()
+{
+    const QTemporaryDir folder;
+    const QByteArray entry = "[Desktop Entry]\nType=Application\nName=A\nExec=true\nImplements=a\n";
+    return !Validator::check({{QStringLiteral("a.desktop"), entry}}, folder.path()).value(0).isEmpty();
 }
 
 } // namespace
@@ -192,6 +214,9 @@ QVector<Complaints> Validator::check(const QVector<Sample> &samples, const QStri
 
 bool Validator::looksFor(EntryProblem problem)
 {
+    static const bool seesInterfaces = looksForInterfaces();
+    if (problem == EntryProblem::InvalidInterface)
+        return seesInterfaces;
     return std::any_of(std::begin(Meanings), std::end(Meanings),
                        [problem](const Meaning &meaning) { return meaning.problem == problem; });
 }

@@ -221,6 +221,10 @@ void tst_EntryCheck::finds_data()
     row("malformed MIME type", Application + "MimeType=text;\n", P::MalformedMimeType, error, "MimeType");
     row("odd MIME type", Application + "MimeType=x-own/thing;\n", P::OddMimeType, warning, "MimeType");
     row("unknown MIME type", Application + "MimeType=text/nobody;\n", P::UnknownMimeType, hint, "MimeType");
+    for (const char *name : {"a", ".a.b", "a..b", "a.b.", "a-b.c", "a.9b", "a.b;;c.d", "a.b c"})
+        row(name, Application + "Implements=" + name + ";\n", P::InvalidInterface, error, "Implements");
+    row("long interface", Application + "Implements=a." + QByteArray(254, 'b') + '\n', P::InvalidInterface,
+        error, "Implements");
     row("unknown category", Application + "Categories=Game;Fun;\n", P::UnknownCategory, error, "Categories");
     row("old category", Application + "Categories=Game;Application;\n", P::DeprecatedCategory, warning,
         "Categories");

@@ -47,6 +47,7 @@ const QHash<QByteArray, Check> &checks()
         {"OnlyShowIn", alone<ListChecks::checkDesktops>},
         {"NotShowIn", alone<ListChecks::checkDesktops>},
         {"MimeType", ListChecks::checkMimeTypes},
+        {"Implements", alone<ListChecks::checkInterfaces>},
         {"Categories", alone<CategoryCheck::check>},
         {"Actions", ListChecks::checkActions},
         {"DBusActivatable", ValueChecks::checkBusActivation},

@@ -75,6 +75,7 @@ enum class EntryProblem {
     MalformedMimeType,
     OddMimeType,
     UnknownMimeType,
+    InvalidInterface,
     UnknownCategory,
     DeprecatedCategory,
     ReservedCategory,

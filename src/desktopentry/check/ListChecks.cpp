@@ -8,6 +8,7 @@
 #include <frame/DesktopNames.h>
 
 #include <QCoreApplication>
+#include <QRegularExpression>
 #include <QSet>
 
 #include <algorithm>
@@ -107,6 +108,14 @@ void checkMimeType(const QByteArray &item, const CheckedEntry &entry, const Chec
                   Text::tr("This computer does not know the MIME type '%1'.").arg(EntryText::text(item)));
 }
 
+// As D-Bus has them.
+bool isInterface(const QByteArray &name)
+{
+    static const QRegularExpression pattern(
+        QStringLiteral("\\A[A-Za-z_][A-Za-z0-9_]*(\\.[A-Za-z_][A-Za-z0-9_]*)+\\z"));
+    return name.size() <= 255 && pattern.match(QString::fromLatin1(name)).hasMatch();
+}
+
 bool isOfActionId(char c)
 {
     return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '-';
@@ -148,6 +157,16 @@ void ListChecks::checkDesktops(const CheckedValue &value)
 void ListChecks::checkMimeTypes(const CheckedEntry &entry, const CheckedValue &value)
 {
     forEachItem(value, [&](const QByteArray &item) { checkMimeType(item, entry, value); });
+}
+
+void ListChecks::checkInterfaces(const CheckedValue &value)
+{
+    forEachItem(value, [&value](const QByteArray &item) {
+        if (!isInterface(item))
+            value.add(EntryProblem::InvalidInterface, EntryFinding::Error,
+                      Text::tr("'%1' is no name of an interface; such names are like 'org.example.Viewer'.")
+                          .arg(EntryText::text(item)));
+    });
 }
 
 void ListChecks::checkActions(const CheckedEntry &entry, const CheckedValue &value)

@@ -10,6 +10,7 @@ namespace ListChecks {
 
 void checkDesktops(const CheckedValue &value);
 void checkMimeTypes(const CheckedEntry &entry, const CheckedValue &value);
+void checkInterfaces(const CheckedValue &value);
 void checkActions(const CheckedEntry &entry, const CheckedValue &value);
 
 } // namespace ListChecks
