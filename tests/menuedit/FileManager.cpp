@@ -153,10 +153,10 @@ bool FileManager::activate()
         Patience);
 }
 
-// The item lies on a background of one color.
+// The item lies on a background of one color; the middle of a folder may be of one color, too.
 bool FileManager::showsItem() const
 {
-    const int side = 40;
+    const int side = 96;
     const QImage picture = QGuiApplication::primaryScreen()
                                ->grabWindow(m_window.toULongLong(), ItemPlace.x() - side / 2,
                                             ItemPlace.y() - side / 2, side, side)
