@@ -61,9 +61,9 @@ QPointF positionOf(const QMouseEvent &event)
     return event.position();
 }
 
-QPoint positionOf(const QDropEvent &event)
+QPointF positionOf(const QDropEvent &event)
 {
-    return event.position().toPoint();
+    return event.position();
 }
 
 _XDisplay *x11Display()
@@ -96,9 +96,9 @@ QPointF positionOf(const QMouseEvent &event)
     return event.localPos();
 }
 
-QPoint positionOf(const QDropEvent &event)
+QPointF positionOf(const QDropEvent &event)
 {
-    return event.pos();
+    return event.posF();
 }
 
 // Other platforms have a display, too: that of Wayland is no connection of Xlib's.

@@ -6,7 +6,7 @@
 #include <QKeySequence>
 #include <QMetaType>
 #include <QPixmap>
-#include <QPoint>
+#include <QPointF>
 #include <QStyleOptionViewItem>
 #include <QVariant>
 
@@ -51,7 +51,7 @@ QPixmap pixmapFor(const QWidget &widget, const QIcon &icon, const QSize &size);
 /// Where the pointer is, with respect to the widget that gets the \a event.
 QPointF positionOf(const QMouseEvent &event);
 /// Where that which is dragged is, with respect to the same.
-QPoint positionOf(const QDropEvent &event);
+QPointF positionOf(const QDropEvent &event);
 
 /// The connection to the X server; null where the application is shown in another way.
 _XDisplay *x11Display();

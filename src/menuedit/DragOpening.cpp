@@ -37,7 +37,7 @@ bool DragOpening::eventFilter(QObject *watched, QEvent *event)
 {
     Q_UNUSED(watched)
     if (event->type() == QEvent::DragMove)
-        rest(m_view->indexAt(QtMajor::positionOf(*static_cast<QDragMoveEvent *>(event))));
+        rest(m_view->indexAt(QtMajor::positionOf(*static_cast<QDragMoveEvent *>(event)).toPoint()));
     else if (event->type() == QEvent::DragLeave || event->type() == QEvent::Drop)
         rest(QModelIndex());
     return false;

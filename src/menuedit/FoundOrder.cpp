@@ -20,7 +20,7 @@ namespace {
 
 QString folderOf(const QString &path)
 {
-    return path.left(std::max(path.lastIndexOf(QLatin1Char('/')), 1));
+    return path.left(std::max(int(path.lastIndexOf(QLatin1Char('/'))), 1));
 }
 
 QString fileNameOf(const QString &path)

@@ -12,6 +12,8 @@
 #include "VelMenuProxyModel.h"
 #include "VelMenuViewPrivate.h"
 
+#include <frame/QtMajor.h>
+
 #include <QContextMenuEvent>
 #include <QDropEvent>
 #include <QKeyEvent>
@@ -286,8 +288,8 @@ void VelMenuView::dropEvent(QDropEvent *event)
     const QPointer<VelMenuView> self(this);
     Qt::DropAction action = d->isAssisted ? ItemTransfer::actionForAddresses(*event) : Qt::IgnoreAction;
     if (action == Qt::IgnoreAction)
-        action = ItemTransfer::askForDropAction(this, viewport()->mapToGlobal(event->posF().toPoint()),
-                                                event->possibleActions());
+        action = ItemTransfer::askForDropAction(
+            this, viewport()->mapToGlobal(QtMajor::positionOf(*event).toPoint()), event->possibleActions());
     if (!self)
         return;
     event->setDropAction(action);

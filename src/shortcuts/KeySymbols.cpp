@@ -41,25 +41,10 @@ bool symbolOfKey(int code, int *symbol)
         *symbol = symbols.first();
     return !symbols.isEmpty();
 }
-
-bool keyOfSymbol(unsigned int symbol, int *key)
-{
-    return KKeyServer::symXModXToKeyQt(symbol, 0, key);
-}
 #else
 bool symbolOfKey(int code, int *symbol)
 {
     return KKeyServer::keyQtToSymX(code, symbol);
-}
-
-// Deprecated because other layouts need the modifiers too; a key string is independent of the layout,
-// it names the key symbol.
-bool keyOfSymbol(unsigned int symbol, int *key)
-{
-    QT_WARNING_PUSH
-    QT_WARNING_DISABLE_DEPRECATED
-    return KKeyServer::symXToKeyQt(symbol, key);
-    QT_WARNING_POP
 }
 #endif
 
@@ -130,7 +115,7 @@ std::optional<int> KeySymbols::keyOf(unsigned int symbol)
     if (!QtMajor::x11Display())
         return usualKeyOf(symbol);
     int key = 0;
-    return keyOfSymbol(symbol, &key) ? std::optional<int>(key) : std::nullopt;
+    return KKeyServer::symXModXToKeyQt(symbol, 0, &key) ? std::optional<int>(key) : std::nullopt;
 }
 
 int KeySymbols::modifiersOf(unsigned int mask)

@@ -42,10 +42,7 @@ void tst_KeySymbols::knowsEverySymbolAsOnX11()
             continue;
         ++named;
         int key = 0;
-        QT_WARNING_PUSH
-        QT_WARNING_DISABLE_DEPRECATED
-        const bool isKnown = KKeyServer::symXToKeyQt(symbol, &key);
-        QT_WARNING_POP
+        const bool isKnown = KKeyServer::symXModXToKeyQt(symbol, 0, &key);
         const std::optional<int> ours = KeySymbols::keyOf(symbol);
         QVERIFY2(isKnown == ours.has_value() && (!isKnown || key == *ours), XKeysymToString(symbol));
     }
