@@ -8,6 +8,8 @@
 #include "VelMenuView.h"
 #include "XDoTool.h"
 
+#include <frame/QtMajor.h>
+
 #include <QAction>
 #include <QClipboard>
 #include <QCursor>
@@ -48,7 +50,7 @@ public:
     bool eventFilter(QObject *object, QEvent *event) override
     {
         if (event->type() == QEvent::DragMove)
-            m_last = static_cast<QDropEvent *>(event)->posF().toPoint();
+            m_last = QtMajor::positionOf(*static_cast<QDropEvent *>(event)).toPoint();
         return QObject::eventFilter(object, event);
     }
 
