@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus no puede iniciar «%1»: hace falta un archivo con un nombre como «org.example.Program.desktop».</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>«%1» no es el nombre de una interfaz; esos nombres son como «org.example.Viewer».</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>

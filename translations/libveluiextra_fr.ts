@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus ne peut pas démarrer «&#xa0;%1&#xa0;»&#xa0;: il faut un fichier dont le nom ressemble à «&#xa0;org.example.Program.desktop&#xa0;».</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>«&#xa0;%1&#xa0;» n&apos;est pas un nom d&apos;interface&#xa0;; de tels noms ressemblent à «&#xa0;org.example.Viewer&#xa0;».</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>
@@ -2252,11 +2256,11 @@ seront perdus. Voulez-vous vraiment continuer&#xa0;?</translation>
     </message>
     <message>
         <source>This menu is empty. Right-click here and choose &apos;%2&apos; to fill it with the applications that are installed, or press %1 for a new entry.</source>
-        <translation>Ce menu est vide. Faites ici un clic droit et choisissez « %2 » pour le remplir avec les applications installées, ou appuyez sur %1 pour une nouvelle entrée.</translation>
+        <translation>Ce menu est vide. Faites ici un clic droit et choisissez «&#xa0;%2&#xa0;» pour le remplir avec les applications installées, ou appuyez sur %1 pour une nouvelle entrée.</translation>
     </message>
     <message>
         <source>This menu is empty, because no application was found that is installed. Once there is one, right-click here and choose &apos;%2&apos;. Until then, press %1 for an entry of your own.</source>
-        <translation>Ce menu est vide, car aucune application installée n&apos;a été trouvée. Dès qu&apos;il y en aura une, faites ici un clic droit et choisissez « %2 ». D&apos;ici là, appuyez sur %1 pour une entrée à vous.</translation>
+        <translation>Ce menu est vide, car aucune application installée n&apos;a été trouvée. Dès qu&apos;il y en aura une, faites ici un clic droit et choisissez «&#xa0;%2&#xa0;». D&apos;ici là, appuyez sur %1 pour une entrée à vous.</translation>
     </message>
 </context>
 <context>

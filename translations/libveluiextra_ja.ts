@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus は「%1」を起動できません: 「org.example.Program.desktop」のような名前のファイルが必要です。</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>「%1」はインターフェースの名前ではありません。「org.example.Viewer」のような名前にしてください。</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>

@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>O D-Bus não consegue iniciar &quot;%1&quot;: é preciso um arquivo com um nome como &quot;org.example.Program.desktop&quot;.</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>&quot;%1&quot; não é o nome de uma interface; esses nomes são como &quot;org.example.Viewer&quot;.</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>

@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus не может запустить «%1»: нужен файл с именем вида «org.example.Program.desktop».</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>«%1» — не имя интерфейса; такие имена выглядят как «org.example.Viewer».</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>

@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus &apos;%1&apos; girdisini başlatamaz: &apos;org.example.Program.desktop&apos; gibi bir adı olan bir dosya gerekiyor.</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>&apos;%1&apos; bir arayüz adı değil; böyle adlar &apos;org.example.Viewer&apos; gibidir.</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>

@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus не може запустити «%1»: потрібен файл з назвою на зразок «org.example.Program.desktop».</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>«%1» — не назва інтерфейсу; такі назви мають вигляд «org.example.Viewer».</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>

@@ -547,6 +547,10 @@
         <source>D-Bus cannot start &apos;%1&apos;: a file of a name like &apos;org.example.Program.desktop&apos; is needed.</source>
         <translation>D-Bus 无法启动“%1”：需要名称类似“org.example.Program.desktop”的文件。</translation>
     </message>
+    <message>
+        <source>&apos;%1&apos; is no name of an interface; such names are like &apos;org.example.Viewer&apos;.</source>
+        <translation>“%1”不是接口名称；接口名称形如“org.example.Viewer”。</translation>
+    </message>
 </context>
 <context>
     <name>EntryTrial</name>
