@@ -16,6 +16,7 @@
 #include <QStyle>
 #include <QStyleOptionGroupBox>
 
+#include <algorithm>
 #include <cmath>
 
 class VelRadioGroupBoxPrivate
@@ -62,14 +63,19 @@ QVector<QPointer<VelRadioGroupBox>> groupOf(const VelRadioGroupBox &box)
     return {found.begin(), found.end()};
 }
 
-void uncheckOthers(const VelRadioGroupBox &box)
+void uncheckOthers(const VelRadioGroupBox &box, const QVector<QPointer<VelRadioGroupBox>> &group)
 {
     const VelRadioGroupBox *const self = &box;
-    const QVector<QPointer<VelRadioGroupBox>> group = groupOf(box);
     for (const QPointer<VelRadioGroupBox> &other : group) {
-        if (other && other != self && other->isChecked())
+        if (other && other != self)
             other->setChecked(false);
     }
+}
+
+bool hasOtherChecked(const VelRadioGroupBox &box, const QVector<QPointer<VelRadioGroupBox>> &group)
+{
+    return std::any_of(group.begin(), group.end(),
+                       [&box](const auto &other) { return other != &box && other->isChecked(); });
 }
 
 bool isPressKey(const QKeyEvent *event)
@@ -103,8 +109,9 @@ void VelRadioGroupBox::init()
     setChecked(false);
     // The property "checked" goes past setChecked(), to the base.
     connect(this, &QGroupBox::toggled, this, [this](bool on) {
-        if (on)
-            uncheckOthers(*this);
+        const QVector<QPointer<VelRadioGroupBox>> group = groupOf(*this);
+        if (on && hasOtherChecked(*this, group))
+            uncheckOthers(*this, group);
     });
 }
 
@@ -118,10 +125,11 @@ void VelRadioGroupBox::setChecked(bool on)
         return;
     }
     // Without a parent there is no group.
-    if (groupOf(*this).size() < 2)
+    const QVector<QPointer<VelRadioGroupBox>> group = groupOf(*this);
+    if (group.size() < 2)
         return;
     const QPointer<VelRadioGroupBox> self(this);
-    uncheckOthers(*this);
+    uncheckOthers(*this, group);
     if (self)
         QGroupBox::setChecked(true);
     if (self)
