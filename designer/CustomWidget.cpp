@@ -62,5 +62,5 @@ QString CustomWidget::domXml() const
                           "<header>%5</header><propertyspecifications>%6</propertyspecifications>"
                           "</customwidget></customwidgets></ui>")
         .arg(m_info.className, objectName, m_info.properties, m_info.base, m_info.header,
-             m_info.specifications);
+             m_info.hints);
 }

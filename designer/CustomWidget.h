@@ -19,7 +19,7 @@ struct CustomWidgetInfo
     /// The class that Designer takes the properties of when the plugin is not there.
     QString base;
     /// What Designer knows of single properties, as the inside of <propertyspecifications>.
-    QString specifications;
+    QString hints;
     bool isContainer;
     QWidget *(*create)(QWidget *parent);
 };
