@@ -5,7 +5,7 @@
 #
 # The shared library exports these classes (or namespaces) and functions and nothing else: templates of
 # other libraries, which the compiler instantiates here, stay inside. What is exported carries the
-# version <NAME>_<major>, so that two majors of the library, or of Qt, can live in one process.
+# version <NAME>_<major>, so that two majors of the library can live in one process.
 function(vel_export_only target)
     cmake_parse_arguments(ARG "" "" "CLASSES;FUNCTIONS" ${ARGN})
     # The sanitizers export what they check types by.
