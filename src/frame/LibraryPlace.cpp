@@ -53,9 +53,16 @@ QString LibraryPlace::catalogs()
     return beside(VEL_CATALOGS_FROM_LIBRARY);
 }
 
+// Where nothing is installed, a build say, there are no pictures, and PATH alone says which programs are
+// the desktop's.
+static bool isInstalled()
+{
+    return QFileInfo(LibraryPlace::catalogs() + QLatin1String("/../pixmaps")).isDir();
+}
+
 static QString programs()
 {
-    return beside(VEL_PROGRAMS_FROM_LIBRARY);
+    return isInstalled() ? beside(VEL_PROGRAMS_FROM_LIBRARY) : QString();
 }
 
 #endif

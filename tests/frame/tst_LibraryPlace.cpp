@@ -21,6 +21,7 @@ private Q_SLOTS:
     void startsAProgramFromTheLibrarysPrefixElse();
     void leavesAFileAloneThatCannotBeRun();
     void keepsTheNameOfAProgramThatIsNowhere();
+    void startsNothingFromABuild();
     void seesTheCatalogsOfTheLibrarysPrefix();
     void followsALinkToTheLibrary();
 
@@ -57,6 +58,8 @@ void tst_LibraryPlace::install(const QString &link)
     const QString file = path(QStringLiteral("prefix/lib/libplace.so"));
     QVERIFY(QDir().mkpath(QFileInfo(file).path()));
     QVERIFY(QFile::copy(QStringLiteral(VEL_PLACE_LIBRARY), file));
+    QVERIFY(QDir().mkpath(path(QStringLiteral("prefix/share/translations"))));
+    QVERIFY(QDir().mkpath(path(QStringLiteral("prefix/share/pixmaps"))));
     if (!link.isEmpty()) {
         QVERIFY(QDir().mkpath(QFileInfo(link).path()));
         QVERIFY(QFile::link(file, link));
@@ -114,6 +117,14 @@ void tst_LibraryPlace::leavesAFileAloneThatCannotBeRun()
 void tst_LibraryPlace::keepsTheNameOfAProgramThatIsNowhere()
 {
     install();
+    QCOMPARE(program(), QStringLiteral("vel-open"));
+}
+
+void tst_LibraryPlace::startsNothingFromABuild()
+{
+    addProgram(QStringLiteral("prefix/bin/vel-open"));
+    install();
+    QVERIFY(QDir().rmdir(path(QStringLiteral("prefix/share/pixmaps"))));
     QCOMPARE(program(), QStringLiteral("vel-open"));
 }
 
