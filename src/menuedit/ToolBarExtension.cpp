@@ -3,12 +3,13 @@
 
 #include "ToolBarExtension.h"
 
+#include <frame/QtMajor.h>
+
 #include <QEvent>
 #include <QPainter>
 #include <QStyle>
 #include <QToolBar>
 #include <QToolButton>
-#include <QWindow>
 
 namespace {
 
@@ -38,7 +39,7 @@ void ToolBarExtension::paint()
 {
     const QSize size(m_button->style()->pixelMetric(QStyle::PM_ToolBarExtensionExtent, nullptr, m_button),
                      m_button->style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, m_button));
-    QPixmap arrow = arrowOf(m_button).pixmap(m_button->window()->windowHandle(), size);
+    QPixmap arrow = QtMajor::pixmapFor(*m_button, arrowOf(m_button), size);
     if (arrow.isNull())
         return;
     QPainter painter(&arrow);
