@@ -101,7 +101,11 @@ protected:
      * Fills \a option with what the style has to know, the held-down radio button included.
      * @param option the option to fill; the caller's, not null.
      */
+#if QT_VERSION_MAJOR >= 6
+    void initStyleOption(QStyleOptionGroupBox *option) const override;
+#else
     void initStyleOption(QStyleOptionGroupBox *option) const;
+#endif
 
     /**
      * Tells whether \a point lies on the radio button or on the title.

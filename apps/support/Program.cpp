@@ -3,12 +3,12 @@
 
 #include "Program.h"
 
+#include "QtMajor.h"
 #include "TerminalText.h"
 
 #include <QCommandLineParser>
 #include <QCoreApplication>
 #include <QDir>
-#include <QLibraryInfo>
 #include <QLocale>
 #include <QTranslator>
 
@@ -62,7 +62,7 @@ void Program::describe(const QString &name)
 void Program::loadCatalogs()
 {
     // The buttons of message boxes and what the command line's parser says.
-    loadCatalog(QStringLiteral("qtbase"), QLibraryInfo::location(QLibraryInfo::TranslationsPath));
+    loadCatalog(QStringLiteral("qtbase"), QtMajor::translationsPath());
 
     const QString name = QStringLiteral("veluiextra-tools");
     if (!loadCatalog(name, besideProgram(QStringLiteral(VEL_DATA_FROM_PROGRAM "/translations"))))

@@ -3,6 +3,8 @@
 
 #include "FindingLine.h"
 
+#include <frame/QtMajor.h>
+
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QLabel>
@@ -61,7 +63,7 @@ void FindingLine::showIcon()
         QStyle::SP_MessageBoxInformation, QStyle::SP_MessageBoxWarning, QStyle::SP_MessageBoxCritical};
     const int size = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
     const QIcon icon = style()->standardIcon(icons[m_severity], nullptr, this);
-    m_icon->setPixmap(icon.pixmap(window()->windowHandle(), {size, size}));
+    m_icon->setPixmap(QtMajor::pixmapFor(*this, icon, {size, size}));
     m_icon->setAccessibleName(severityName());
     // Beside the icon, whatever the direction of the text is.
     m_text->setAlignment((isRightToLeft() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute

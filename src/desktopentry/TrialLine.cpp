@@ -5,6 +5,8 @@
 
 #include "EntryTypeRules.h"
 
+#include <frame/QtMajor.h>
+
 #include <QAbstractButton>
 #include <QAccessible>
 #include <QBoxLayout>
@@ -66,10 +68,11 @@ void TrialLine::showState()
 void TrialLine::tell(const EntryTrial::Result &result)
 {
     const bool isGood = result.outcome == EntryTrial::Result::Ended && result.status == 0;
-    const QStyle::StandardPixmap icon = isGood ? QStyle::SP_DialogApplyButton : QStyle::SP_MessageBoxWarning;
+    const QStyle::StandardPixmap picture =
+        isGood ? QStyle::SP_DialogApplyButton : QStyle::SP_MessageBoxWarning;
     const int size = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
-    m_icon->setPixmap(
-        style()->standardIcon(icon, nullptr, this).pixmap(window()->windowHandle(), QSize(size, size)));
+    const QIcon icon = style()->standardIcon(picture, nullptr, this);
+    m_icon->setPixmap(QtMajor::pixmapFor(*this, icon, {size, size}));
     m_text->setText(textOf(result));
     show();
     showState();

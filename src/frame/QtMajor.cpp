@@ -51,6 +51,11 @@ int chord(const QKeySequence &keys, int index)
     return keys[uint(index)].toCombined();
 }
 
+QAbstractItemDelegate *delegateOf(const QAbstractItemView &view, const QModelIndex &index)
+{
+    return view.itemDelegateForIndex(index);
+}
+
 QPixmap pixmapFor(const QWidget &widget, const QIcon &icon, const QSize &size)
 {
     return icon.pixmap(size, widget.devicePixelRatioF());
@@ -84,6 +89,11 @@ void setLocaleEncoding(QSettings &) { }
 int chord(const QKeySequence &keys, int index)
 {
     return keys[uint(index)];
+}
+
+QAbstractItemDelegate *delegateOf(const QAbstractItemView &view, const QModelIndex &index)
+{
+    return view.itemDelegate(index);
 }
 
 QPixmap pixmapFor(const QWidget &widget, const QIcon &icon, const QSize &size)

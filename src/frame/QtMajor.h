@@ -10,9 +10,11 @@
 #include <QStyleOptionViewItem>
 #include <QVariant>
 
+class QAbstractItemDelegate;
 class QAbstractItemView;
 class QDropEvent;
 class QIcon;
+class QModelIndex;
 class QMouseEvent;
 class QSettings;
 class QWidget;
@@ -44,6 +46,9 @@ int chord(const QKeySequence &keys, int index);
 
 /// What the items of a \a view are drawn with.
 QStyleOptionViewItem itemOption(const QAbstractItemView &view);
+
+/// What draws the item at \a index of a \a view; the view's.
+QAbstractItemDelegate *delegateOf(const QAbstractItemView &view, const QModelIndex &index);
 
 /// The pixmap of an \a icon for a \a widget, as sharp as the screen that shows it.
 QPixmap pixmapFor(const QWidget &widget, const QIcon &icon, const QSize &size);

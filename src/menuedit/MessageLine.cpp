@@ -3,6 +3,8 @@
 
 #include "MessageLine.h"
 
+#include <frame/QtMajor.h>
+
 #include <QAccessible>
 #include <QAction>
 #include <QCoreApplication>
@@ -94,8 +96,8 @@ void MessageLine::show(const QString &text, int kind)
     const QStyle::StandardPixmap picture =
         kind >= Failure ? QStyle::SP_MessageBoxCritical : QStyle::SP_MessageBoxWarning;
     const int size = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
-    m_icon->setPixmap(
-        style()->standardIcon(picture, nullptr, this).pixmap(window()->windowHandle(), {size, size}));
+    const QIcon icon = style()->standardIcon(picture, nullptr, this);
+    m_icon->setPixmap(QtMajor::pixmapFor(*this, icon, {size, size}));
     m_icon->setAccessibleName(kind >= Failure ? QCoreApplication::translate("VelMenuDialog", "Error")
                                               : QCoreApplication::translate("VelMenuDialog", "Warning"));
     updateButton();

@@ -33,7 +33,7 @@ QString printable(const QString &text)
 {
     QString clean;
     const QVector<uint> characters = text.simplified().toUcs4();
-    for (const uint character : characters) {
+    for (const char32_t character : characters) {
         if (QChar::category(character) != QChar::Other_Control && !QChar::isNonCharacter(character))
             clean += QString::fromUcs4(&character, 1);
     }

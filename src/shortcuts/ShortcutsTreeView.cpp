@@ -143,7 +143,7 @@ int ShortcutsTreeView::sizeHintForColumn(int column) const
     const auto items = widestItems(*shortcuts, column);
     for (const QModelIndex &index : items) {
         const int indent = column == 0 ? indentationOf(index) : 0;
-        width = qMax(width, itemDelegate(index)->sizeHint(option, index).width() + indent);
+        width = qMax(width, QtMajor::delegateOf(*this, index)->sizeHint(option, index).width() + indent);
     }
     return width;
 }

@@ -3,6 +3,8 @@
 
 #include "ListMessage.h"
 
+#include <frame/QtMajor.h>
+
 #include <QAccessible>
 #include <QApplication>
 #include <QGridLayout>
@@ -31,9 +33,8 @@ ListMessage::ListMessage(QWidget *parent)
     , m_repair(new QPushButton(this))
 {
     const int size = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
-    m_icon->setPixmap(style()
-                          ->standardIcon(QStyle::SP_MessageBoxWarning, nullptr, this)
-                          .pixmap(window()->windowHandle(), QSize(size, size)));
+    const QIcon icon = style()->standardIcon(QStyle::SP_MessageBoxWarning, nullptr, this);
+    m_icon->setPixmap(QtMajor::pixmapFor(*this, icon, {size, size}));
     m_text->setObjectName(QStringLiteral("messageLabel"));
     m_text->setTextFormat(Qt::PlainText);
     m_text->setWordWrap(true);
