@@ -11,7 +11,7 @@
 
 #include <QBuffer>
 #include <QRandomGenerator>
-#include <QRegExp>
+#include <QRegularExpression>
 
 using Map = QSettings::SettingsMap;
 
@@ -24,22 +24,21 @@ int rounds()
     return isNumber && number > 0 ? number : 20000;
 }
 
-bool matches(const QRegExp &pattern, const QString &value)
+QRegularExpression whole(const QString &pattern)
 {
-    QRegExp copy(pattern);
-    return copy.exactMatch(value);
+    return QRegularExpression(QRegularExpression::anchoredPattern(pattern));
 }
 
 QVariant plainValue(const QString &value)
 {
-    static const QRegExp upper(QStringLiteral("^(True|False)$"));
-    static const QRegExp lower(QStringLiteral("^(true|false)$"));
-    static const QRegExp digits(QStringLiteral("^[0-9]+$"));
-    if (matches(upper, value))
+    static const QRegularExpression upper = whole(QStringLiteral("(True|False)"));
+    static const QRegularExpression lower = whole(QStringLiteral("(true|false)"));
+    static const QRegularExpression digits = whole(QStringLiteral("[0-9]+"));
+    if (upper.match(value).hasMatch())
         return value.contains(QLatin1String("True"));
-    if (matches(lower, value))
+    if (lower.match(value).hasMatch())
         return value.contains(QLatin1String("true"));
-    if (matches(digits, value)) {
+    if (digits.match(value).hasMatch()) {
         bool fits = false;
         const qulonglong number = value.toULongLong(&fits);
         return fits && number <= 2147483647 ? int(number) : 0;

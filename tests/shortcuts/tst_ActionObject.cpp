@@ -5,7 +5,7 @@
 
 #include <shortcuts/ActionObject.h>
 
-#include <QRegExp>
+#include <QRegularExpression>
 #include <QSignalSpy>
 #include <QWidget>
 
@@ -106,7 +106,7 @@ void tst_ActionObject::leavesTheMnemonicMarksOut()
     QAction action(text, nullptr);
     const ActionObject object(QStringLiteral("n"), &action, QStringLiteral("g"));
     QTEST(object.text(), "shown");
-    QCOMPARE(object.text(), QString(text).remove(QRegExp(QStringLiteral("&(?!&)"))));
+    QCOMPARE(object.text(), QString(text).remove(QRegularExpression(QStringLiteral("&(?!&)"))));
 }
 
 void tst_ActionObject::showsTheActionAsItIsNow()
