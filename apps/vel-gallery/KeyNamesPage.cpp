@@ -4,6 +4,7 @@
 #include "GalleryPage.h"
 
 #include <VelKeyServer.h>
+#include <support/QtMajor.h>
 
 #include <QCoreApplication>
 #include <QFormLayout>
@@ -37,7 +38,8 @@ QWidget *createPage(const GalleryContext &, QWidget *parent)
     QLabel *global = addRow(layout, PageTexts::tr("Global action with these keys:"));
 
     QObject::connect(keys, &QKeySequenceEdit::keySequenceChanged, page, [=](const QKeySequence &sequence) {
-        const QString name = sequence.isEmpty() ? QString() : VelKeyServer::KeyQtToKeyStringX(sequence[0]);
+        const QString name =
+            sequence.isEmpty() ? QString() : VelKeyServer::KeyQtToKeyStringX(QtMajor::chord(sequence, 0));
         x11->setText(name);
         qt->setText(VelKeyServer::KeyStringXToQt(name));
         global->setText(sequence.isEmpty() ? QString() : VelKeyServer::checkForGlobalShortcut(sequence));

@@ -91,7 +91,7 @@ void tst_DesktopEntryFormCorpus::initTestCase()
         }
         count += m_samples.size() > before;
     }
-    qInfo("%d entries of %d packages", m_samples.size(), count);
+    qInfo("%d entries of %d packages", int(m_samples.size()), count);
     if (count < enoughPackages)
         QSKIP("too few packages with desktop entries are installed");
 }

@@ -3,6 +3,7 @@
 
 #include "ActionSamples.h"
 #include "FormDriving.h"
+#include "QtMajor.h"
 #include "TestCase.h"
 
 #include <desktopentry/ActionPropsDialog.h>
@@ -57,10 +58,10 @@ void tst_EditActionsWidget::looksLikeTheListOfStrings()
 
 void tst_EditActionsWidget::knowsActionsAsAMetaType()
 {
-    const int type = qMetaTypeId<VelUIDesktopAction>();
-    QCOMPARE(QMetaType::typeName(type), "VelUIDesktopAction");
-    const QMetaType::TypeFlags flags = QMetaType::typeFlags(type);
-    QVERIFY(flags & QMetaType::MovableType);
+    const QMetaType type(qMetaTypeId<VelUIDesktopAction>());
+    QCOMPARE(type.name(), QByteArray("VelUIDesktopAction"));
+    const auto flags = type.flags();
+    QVERIFY(flags & VelTest::RelocatableType);
     QVERIFY(flags & QMetaType::NeedsConstruction);
     QVERIFY(flags & QMetaType::NeedsDestruction);
 }

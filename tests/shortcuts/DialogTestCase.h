@@ -5,6 +5,7 @@
 
 #include "EditShortcutsDialog.h"
 #include "ModalDriver.h"
+#include "QtMajor.h"
 #include "ShortcutsModel.h"
 #include "TestCase.h"
 
@@ -39,7 +40,7 @@ protected Q_SLOTS:
         save = addAction("save", "File", QKeySequence(Qt::Key_F2));
         print = addAction("print", "File", QKeySequence());
         copy = addAction("copy", "Edit", QKeySequence(Qt::Key_F3));
-        cut = addAction("cut", "Edit", QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
+        cut = addAction("cut", "Edit", VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
         m_dialog.reset(new EditShortcutsDialog(m_model.get()));
     }
 

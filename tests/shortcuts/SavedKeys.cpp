@@ -5,6 +5,8 @@
 
 #include "ShortcutsModel.h"
 
+#include <frame/QtMajor.h>
+
 #include <QAction>
 #include <QSettings>
 
@@ -52,7 +54,7 @@ QString described(const QKeySequence &key)
 {
     QStringList codes;
     for (int i = 0; i < key.count(); ++i)
-        codes.append(QStringLiteral("0x%1").arg(uint(key[uint(i)]), 8, 16, QLatin1Char('0')));
+        codes.append(QStringLiteral("0x%1").arg(uint(QtMajor::chord(key, i)), 8, 16, QLatin1Char('0')));
     return QStringLiteral("\"%1\" (%2)").arg(key.toString(), codes.join(QLatin1Char(' ')));
 }
 

@@ -199,7 +199,7 @@ bool ServerKeyboard::wait()
     return m_arrived == m_sent;
 }
 
-bool ServerKeyboard::nativeEventFilter(const QByteArray &type, void *message, long *result)
+bool ServerKeyboard::nativeEventFilter(const QByteArray &type, void *message, QtMajor::NativeResult *result)
 {
     Q_UNUSED(result)
     if (type != "xcb_generic_event_t")

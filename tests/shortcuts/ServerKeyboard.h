@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <frame/QtMajor.h>
+
 #include <QAbstractNativeEventFilter>
 #include <QVector>
 #include <QWindow>
@@ -46,7 +48,7 @@ public:
     /// Waits until all that was pressed has arrived; false when it does not.
     bool wait();
 
-    bool nativeEventFilter(const QByteArray &type, void *message, long *result) override;
+    bool nativeEventFilter(const QByteArray &type, void *message, QtMajor::NativeResult *result) override;
 
 private:
     void setLocks();

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "AssistedTestCase.h"
+#include "QtMajor.h"
 
 #include <QMainWindow>
 
@@ -212,7 +213,7 @@ void tst_AssistedRecording::takesOverFromOneAfterTheOther()
 
 void tst_AssistedRecording::takesOverThePrefixOfARecording()
 {
-    m_model->setKeySequence(row("cut"), QKeySequence(Qt::CTRL | Qt::Key_J, Qt::CTRL | Qt::Key_D));
+    m_model->setKeySequence(row("cut"), VelTest::keySequence(Qt::CTRL | Qt::Key_J, Qt::CTRL | Qt::Key_D));
     recordClash("open", str("ctrl+j"));
     XDoTool::click(lineButton(0, "Take over"));
     QTRY_COMPARE(pendingKey("cut"), QKeySequence());

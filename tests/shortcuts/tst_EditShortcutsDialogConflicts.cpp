@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "DialogTestCase.h"
+#include "QtMajor.h"
 
 /// Which keys the dialog takes and which it refuses.
 class tst_EditShortcutsDialogConflicts : public DialogTestCase
@@ -38,7 +39,7 @@ void tst_EditShortcutsDialogConflicts::takesAFreeKey()
     QVERIFY(customButton()->isChecked());
     QCOMPARE(keyWidget()->keySequence(), f9);
 
-    const QKeySequence chords(Qt::ALT | Qt::Key_A, Qt::Key_B, Qt::Key_C, Qt::Key_D);
+    const QKeySequence chords = VelTest::keySequence(Qt::ALT | Qt::Key_A, Qt::Key_B, Qt::Key_C, Qt::Key_D);
     keyWidget()->setKeySequence(chords);
     QCOMPARE(pendingKey("open"), chords);
 

@@ -3,6 +3,7 @@
 
 // The filter above the tree, as a person uses it.
 
+#include "QtMajor.h"
 #include "RecordingTestCase.h"
 
 #include <QLineEdit>
@@ -173,13 +174,14 @@ void tst_EditShortcutsFilter::presentsWhoHasThePressedKeys()
 
 void tst_EditShortcutsFilter::continuesASequenceThatIsPressed()
 {
-    m_model->setKeySequence(row("print"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
+    m_model->setKeySequence(row("print"), VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
     pressKeys("ctrl+k");
     QTRY_COMPARE(shown(), str("print cut"));
     QVERIFY(keysStay());
     XDoTool::run(str("key ctrl+k key ctrl+c"));
     QTRY_COMPARE(shown(), str("cut"));
-    QCOMPARE(filterEdit()->text(), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C).toString());
+    QCOMPARE(filterEdit()->text(),
+             VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C).toString());
 }
 
 void tst_EditShortcutsFilter::looksForKeysThatWouldDoSomethingElse()

@@ -4,6 +4,7 @@
 // Random shortcut files, looked up beside parsing all of them: VEL_TEST_ROUNDS sets another number of files,
 // VEL_TEST_SEED repeats a run.
 
+#include "QtMajor.h"
 #include "TestCase.h"
 
 #include <shortcuts/GlobalShortcuts.h>
@@ -23,9 +24,9 @@ namespace {
 
 const QVector<QKeySequence> &sequences()
 {
-    static const QVector<QKeySequence> all = {QKeySequence(Qt::Key_F1), QKeySequence(Qt::CTRL | Qt::Key_A),
-                                              QKeySequence(Qt::META | Qt::Key_B),
-                                              QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_Delete)};
+    static const QVector<QKeySequence> all = {
+        QKeySequence(Qt::Key_F1), QKeySequence(Qt::CTRL | Qt::Key_A), QKeySequence(Qt::META | Qt::Key_B),
+        VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_Delete)};
     return all;
 }
 

@@ -1,11 +1,14 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "QtMajor.h"
 #include "TestCase.h"
 
 #include <shortcuts/KeyMatcher.h>
 
 #include <X11/Xlib.h>
+
+#include <vector>
 
 namespace {
 
@@ -49,22 +52,22 @@ void tst_KeyMatcher::answersAsTheTextsDo_data()
 void tst_KeyMatcher::answersAsTheTextsDo()
 {
     QFETCH(QByteArray, prefix);
-    QVector<KeyMatcher> matchers = {KeyMatcher(QKeySequence()),
-                                    KeyMatcher(QKeySequence(Qt::CTRL | Qt::Key_K, Qt::Key_Delete)),
-                                    KeyMatcher(QKeySequence(Qt::Key_unknown)),
-                                    KeyMatcher(QKeySequence(int(Qt::KeypadModifier) | Qt::Key_5)),
-                                    KeyMatcher(QKeySequence(int(Qt::KeypadModifier) | Qt::Key_Enter))};
+    std::vector<KeyMatcher> matchers = {
+        KeyMatcher(QKeySequence()), KeyMatcher(VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::Key_Delete)),
+        KeyMatcher(QKeySequence(Qt::Key_unknown)),
+        KeyMatcher(QKeySequence(int(Qt::KeypadModifier) | Qt::Key_5)),
+        KeyMatcher(QKeySequence(int(Qt::KeypadModifier) | Qt::Key_Enter))};
     for (const int modifiers : {0, int(Qt::CTRL), int(Qt::CTRL | Qt::ALT), int(Qt::META), int(Qt::SHIFT)}) {
         for (const int key : {int(Qt::Key_A), int(Qt::Key_5), int(Qt::Key_F1), int(Qt::Key_F12),
                               int(Qt::Key_Delete), int(Qt::Key_Adiaeresis), int(Qt::Key_PageUp)})
-            matchers.append(KeyMatcher(QKeySequence(modifiers | key)));
+            matchers.push_back(KeyMatcher(QKeySequence(modifiers | key)));
     }
     const auto names = keyNames();
     for (const QByteArray &name : names) {
         // A key without its closing quote loses its last character.
         for (const QByteArray &fileKey : {prefix + name, prefix + name + '"'}) {
             // Every name with a few of them in turn; all with all would take minutes.
-            for (int i = int(qHash(fileKey) % 20); i < matchers.size(); i += 20) {
+            for (auto i = size_t(qHash(fileKey) % 20); i < matchers.size(); i += 20) {
                 const bool expected = matchers.at(i).matchesText(fileKey.constData());
                 QVERIFY2(matchers.at(i).matches(fileKey.constData()) == expected, fileKey.constData());
             }

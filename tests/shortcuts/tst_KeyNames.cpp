@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "QtMajor.h"
 #include "TestCase.h"
 
 #include <shortcuts/KeyNames.h>
@@ -50,13 +51,14 @@ void tst_KeyNames::readsNoFurtherThanTheLength()
 
 void tst_KeyNames::writesTheModifiersInOneOrder()
 {
-    QCOMPARE(KeyNames::toKeyString(Qt::META | Qt::ALT | Qt::SHIFT | Qt::CTRL | Qt::Key_F3),
-             QStringLiteral("Ctrl+Shift+Alt+Mod4+F3"));
+    QCOMPARE(
+        KeyNames::toKeyString(VelTest::keyNumber(Qt::META | Qt::ALT | Qt::SHIFT | Qt::CTRL | Qt::Key_F3)),
+        QStringLiteral("Ctrl+Shift+Alt+Mod4+F3"));
 }
 
 void tst_KeyNames::readsWhatItWrites()
 {
-    const int code = Qt::META | Qt::SHIFT | Qt::Key_F3;
+    const int code = VelTest::keyNumber(Qt::META | Qt::SHIFT | Qt::Key_F3);
     QVERIFY(KeyNames::roundTrips(code));
     QCOMPARE(KeyNames::fromKeyString(KeyNames::toKeyString(code)), KeyNames::portableText(code));
     QCOMPARE(*KeyNames::codeFromKeyString(KeyNames::toKeyString(code).toLocal8Bit()), code);

@@ -4,6 +4,7 @@
 // Keys as text, and what of that the model saves.
 
 #include "KeyTestObject.h"
+#include "QtMajor.h"
 #include "ShortcutsModel.h"
 #include "TestCase.h"
 
@@ -32,12 +33,14 @@ void tst_KeySequences::knowsWhatSurvivesSaving_data()
     QTest::addColumn<bool>("survives");
     QTest::newRow("empty") << QKeySequence() << true;
     QTest::newRow("one") << QKeySequence(Qt::META | Qt::Key_J) << true;
-    QTest::newRow("four") << QKeySequence(Qt::CTRL | Qt::Key_K, Qt::Key_F1, Qt::Key_Plus, Qt::Key_Odiaeresis)
+    QTest::newRow("four") << VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::Key_F1, Qt::Key_Plus,
+                                                  Qt::Key_Odiaeresis)
                           << true;
     QTest::newRow("Super") << QKeySequence(Qt::Key_Super_L) << false;
-    QTest::newRow("Super and a letter") << QKeySequence(Qt::Key_Super_L, Qt::META | Qt::Key_J) << false;
+    QTest::newRow("Super and a letter")
+        << VelTest::keySequence(Qt::Key_Super_L, Qt::META | Qt::Key_J) << false;
     QTest::newRow("Caps Lock in the middle")
-        << QKeySequence(Qt::Key_A, Qt::Key_unknown, Qt::CTRL | Qt::Key_A) << false;
+        << VelTest::keySequence(Qt::Key_A, Qt::Key_unknown, Qt::CTRL | Qt::Key_A) << false;
     QTest::newRow("y with diaeresis") << QKeySequence(Qt::CTRL | 0xff) << false;
     QTest::newRow("another level") << QKeySequence(int(Qt::GroupSwitchModifier) | Qt::Key_A) << false;
 }
@@ -56,8 +59,7 @@ void tst_KeySequences::knowsWhatSurvivesSavingInTheUsersLanguage()
 {
     QVERIFY(KeySequences::survivesSaving(QKeySequence(Qt::CTRL | Qt::Key_Enter)));
     QTranslator translator;
-    QVERIFY(
-        translator.load(QStringLiteral("qtbase_hu"), QLibraryInfo::location(QLibraryInfo::TranslationsPath)));
+    QVERIFY(translator.load(QStringLiteral("qtbase_hu"), VelTest::translationsPath()));
     QCoreApplication::installTranslator(&translator);
     QVERIFY(!KeySequences::survivesSaving(QKeySequence(Qt::CTRL | Qt::Key_Enter)));
     QVERIFY(KeySequences::survivesSaving(QKeySequence(Qt::CTRL | Qt::Key_Return)));
@@ -67,7 +69,7 @@ void tst_KeySequences::leavesTheSavedValueWhenAKeyWouldNotReadBack_data()
 {
     QTest::addColumn<QKeySequence>("key");
     QTest::newRow("Super") << QKeySequence(Qt::Key_Super_L);
-    QTest::newRow("Super and a letter") << QKeySequence(Qt::Key_Super_L, Qt::META | Qt::Key_J);
+    QTest::newRow("Super and a letter") << VelTest::keySequence(Qt::Key_Super_L, Qt::META | Qt::Key_J);
     QTest::newRow("unknown") << QKeySequence(Qt::Key_unknown);
 }
 

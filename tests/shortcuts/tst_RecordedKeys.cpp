@@ -3,6 +3,7 @@
 
 // What the keys of a keyboard record: as the X server sends them, held ones included.
 
+#include "QtMajor.h"
 #include "RecordingTestCase.h"
 
 #include <QKeyEvent>
@@ -105,7 +106,7 @@ void tst_RecordedKeys::recordsAKeyWithSuperAsOneChord()
 
     record("save");
     XDoTool::run(str("keydown Super_L key k key l keyup Super_L"));
-    QTRY_COMPARE(pendingKey("save"), QKeySequence(Qt::META | Qt::Key_K, Qt::META | Qt::Key_L));
+    QTRY_COMPARE(pendingKey("save"), VelTest::keySequence(Qt::META | Qt::Key_K, Qt::META | Qt::Key_L));
 }
 
 void tst_RecordedKeys::checksAKeyWithSuperAgainstGlobalKeys()
@@ -161,7 +162,7 @@ void tst_RecordedKeys::goesOnRecordingAfterAKeyThatIsNoChord()
 {
     record("open");
     XDoTool::run(str("key ctrl+k key Caps_Lock key Caps_Lock key ctrl+d"));
-    QTRY_COMPARE(pendingKey("open"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
+    QTRY_COMPARE(pendingKey("open"), VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
 }
 
 void tst_RecordedKeys::recordsAHeldKeyOnce()
@@ -181,7 +182,7 @@ void tst_RecordedKeys::keepsTheFirstChordWhileTheSecondIsHeld()
 {
     record("open");
     XDoTool::run(str("key ctrl+k keydown ctrl keydown d sleep 1.5 keyup d keyup ctrl"));
-    QTRY_COMPARE(pendingKey("open"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
+    QTRY_COMPARE(pendingKey("open"), VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_D));
     QVERIFY(keysStay());
     QCOMPARE(keyWidget()->keySequence(), pendingKey("open"));
 }
@@ -200,7 +201,7 @@ void tst_RecordedKeys::knowsAHeldKeyThatIsNotCalledRepeated()
     send(QEvent::KeyRelease, 1700);
     QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_D));
     send(QEvent::KeyPress, 1701);
-    QCOMPARE(keyWidget()->keySequence(), QKeySequence(Qt::CTRL | Qt::Key_D, Qt::CTRL | Qt::Key_D));
+    QCOMPARE(keyWidget()->keySequence(), VelTest::keySequence(Qt::CTRL | Qt::Key_D, Qt::CTRL | Qt::Key_D));
 }
 
 void tst_RecordedKeys::namesTheHolderOfAKeyAsItIsWritten()

@@ -6,6 +6,7 @@
 // VEL_TEST_LAYOUTS there are more modifiers and every character is tried.
 
 #include "KeyTakingTestCase.h"
+#include "QtMajor.h"
 
 #include <QLibraryInfo>
 #include <QMetaEnum>
@@ -78,8 +79,7 @@ void tst_RecordedQtKeys::losesNoKeyOfQt()
 {
     QFETCH(QString, language);
     QTranslator translator;
-    QVERIFY(
-        translator.load(str("qtbase_") + language, QLibraryInfo::location(QLibraryInfo::TranslationsPath)));
+    QVERIFY(translator.load(str("qtbase_") + language, VelTest::translationsPath()));
     QCoreApplication::installTranslator(&translator);
     const QVector<int> all = keys();
     for (const Qt::KeyboardModifiers modifiers : combinations(isFull())) {

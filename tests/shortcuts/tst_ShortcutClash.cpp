@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "KeyTestObject.h"
+#include "QtMajor.h"
 #include "ShortcutClash.h"
 #include "ShortcutsModelTestCase.h"
 
@@ -109,7 +110,7 @@ void tst_ShortcutClash::findsNothingForNoKey_data()
     QTest::addColumn<QKeySequence>("key");
     QTest::newRow("empty") << QKeySequence();
     QTest::newRow("unknown") << QKeySequence(Qt::Key_unknown);
-    QTest::newRow("unknown second chord") << QKeySequence(Qt::Key_F1, Qt::Key_unknown);
+    QTest::newRow("unknown second chord") << VelTest::keySequence(Qt::Key_F1, Qt::Key_unknown);
 }
 
 void tst_ShortcutClash::findsNothingForNoKey()
@@ -162,7 +163,7 @@ void tst_ShortcutClash::looksAtPendingKeys()
 
 void tst_ShortcutClash::findsPrefixesBothWays()
 {
-    add("long", "g", QKeySequence(Qt::CTRL | Qt::Key_J, Qt::CTRL | Qt::Key_D));
+    add("long", "g", VelTest::keySequence(Qt::CTRL | Qt::Key_J, Qt::CTRL | Qt::Key_D));
     add("short", "g", QKeySequence(Qt::CTRL | Qt::Key_L));
     Clashes clashes = find("Ctrl+J");
     QCOMPARE(clashes.size(), 1);
@@ -183,7 +184,7 @@ void tst_ShortcutClash::tellsOfFurtherKeys()
 {
     const QKeySequence ctrlJ(Qt::CTRL | Qt::Key_J);
     QAction *action = addAction("many", "g", QKeySequence(Qt::CTRL | Qt::Key_L));
-    action->setShortcuts({action->shortcut(), ctrlJ, QKeySequence(Qt::CTRL | Qt::Key_M, Qt::Key_F9)});
+    action->setShortcuts({action->shortcut(), ctrlJ, VelTest::keySequence(Qt::CTRL | Qt::Key_M, Qt::Key_F9)});
     Clashes clashes = find("Ctrl+J");
     QCOMPARE(clashes.size(), 1);
     QCOMPARE(clashes.at(0).kind, ShortcutClash::SameKey);
@@ -366,7 +367,7 @@ void tst_ShortcutClash::findsKeysThatTheLayoutLacks_data()
             add(layout, key, false);
     }
     QTest::newRow("second chord") << str("us")
-                                  << QKeySequence(Qt::CTRL | Qt::Key_J, Qt::CTRL | Qt::Key_Adiaeresis)
+                                  << VelTest::keySequence(Qt::CTRL | Qt::Key_J, Qt::CTRL | Qt::Key_Adiaeresis)
                                   << QString::fromUtf8("Ctrl+Ä");
     QTest::newRow("no key of X11") << str("us") << QKeySequence(Qt::Key_Camera) << QString();
 }
@@ -397,7 +398,7 @@ void tst_ShortcutClash::ordersClashesByKind()
 {
     setLayout(str("ru"));
     write(str("keyshortcutrc"), "[ShortCutKeys]\nS=\"VELWM_MENU\"\nAlt+F4=\"VELWM_CLOSE\"\n");
-    add("long", "g", QKeySequence(Qt::Key_S, Qt::Key_F9));
+    add("long", "g", VelTest::keySequence(Qt::Key_S, Qt::Key_F9));
     add("same", "g", QKeySequence(Qt::Key_S));
     QVector<int> kinds;
     for (const ShortcutClash &clash : find("S"))

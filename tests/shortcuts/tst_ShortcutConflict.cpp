@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "KeyTestObject.h"
+#include "QtMajor.h"
 #include "ShortcutsModel.h"
 #include "TestCase.h"
 
@@ -37,8 +38,9 @@ void tst_ShortcutConflict::init()
     m_model->registerShortcutObject(
         new KeyTestObject(QStringLiteral("n"), QStringLiteral("g"), QKeySequence(Qt::Key_F1)));
     m_model->registerShortcutObject(new KeyTestObject(QStringLiteral("none"), QStringLiteral("g")));
-    m_model->registerShortcutObject(new KeyTestObject(
-        QStringLiteral("k"), QStringLiteral("g"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)));
+    m_model->registerShortcutObject(
+        new KeyTestObject(QStringLiteral("k"), QStringLiteral("g"),
+                          VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)));
 }
 
 void tst_ShortcutConflict::cleanup()
@@ -96,7 +98,8 @@ void tst_ShortcutConflict::leavesEmptyAndUnknownKeysFree()
 void tst_ShortcutConflict::comparesWholeSequences()
 {
     QCOMPARE(find(QKeySequence(Qt::CTRL | Qt::Key_K)).kind, ShortcutConflict::None);
-    QCOMPARE(find(QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)).kind, ShortcutConflict::Local);
+    QCOMPARE(find(VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)).kind,
+             ShortcutConflict::Local);
 }
 
 VEL_TEST_MAIN(tst_ShortcutConflict)

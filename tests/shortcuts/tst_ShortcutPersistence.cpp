@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "KeyTestObject.h"
+#include "QtMajor.h"
 #include "ShortcutsModel.h"
 #include "TestCase.h"
 
@@ -19,7 +20,7 @@ namespace {
 const QKeySequence f1(Qt::Key_F1);
 const QKeySequence f2(Qt::Key_F2);
 const QKeySequence f3(Qt::Key_F3);
-const QKeySequence chords(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C);
+const QKeySequence chords = VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C);
 
 QString str(const char *text)
 {
@@ -347,7 +348,7 @@ void tst_ShortcutPersistence::bringsEverythingBackAfterARestart()
         QKeySequence(Qt::CTRL | Qt::Key_Comma),
         QKeySequence(Qt::CTRL | Qt::Key_Plus),
         QKeySequence(Qt::META | Qt::ALT | Qt::SHIFT | Qt::CTRL | Qt::Key_Backslash),
-        QKeySequence(Qt::Key_Comma, Qt::Key_Comma, Qt::Key_Semicolon, Qt::Key_At),
+        VelTest::keySequence(Qt::Key_Comma, Qt::Key_Comma, Qt::Key_Semicolon, Qt::Key_At),
         QKeySequence(Qt::Key_Adiaeresis),
         QKeySequence(int(Qt::KeypadModifier) | int(Qt::Key_5)),
         QKeySequence(Qt::Key_VolumeUp)};

@@ -9,6 +9,7 @@
 #include "DialogHand.h"
 #include "EditShortcutsDialog.h"
 #include "ModalDriver.h"
+#include "QtMajor.h"
 #include "ShortcutsMirror.h"
 #include "ShortcutsModel.h"
 #include "TestCase.h"
@@ -38,14 +39,14 @@ constexpr int Steps = 30;
 const int chords[] = {
     Qt::Key_F1,
     Qt::Key_F2,
-    Qt::CTRL | Qt::Key_J,
-    Qt::CTRL | Qt::Key_K,
-    Qt::META | Qt::Key_F3,
-    Qt::META | Qt::Key_F4,
-    Qt::ALT | Qt::SHIFT | Qt::Key_Up,
+    VelTest::keyNumber(Qt::CTRL | Qt::Key_J),
+    VelTest::keyNumber(Qt::CTRL | Qt::Key_K),
+    VelTest::keyNumber(Qt::META | Qt::Key_F3),
+    VelTest::keyNumber(Qt::META | Qt::Key_F4),
+    VelTest::keyNumber(Qt::ALT | Qt::SHIFT | Qt::Key_Up),
     Qt::Key_Escape,
     Qt::Key_Backspace,
-    Qt::CTRL | Qt::Key_Return,
+    VelTest::keyNumber(Qt::CTRL | Qt::Key_Return),
 };
 
 const struct
@@ -54,7 +55,7 @@ const struct
     const char *name;
     QKeySequence defaultKey;
 } actionRows[] = {
-    {"File", "close", QKeySequence(Qt::CTRL | Qt::Key_K, Qt::Key_F1)},
+    {"File", "close", VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::Key_F1)},
     {"File", "open", QKeySequence(Qt::Key_F1)},
     {"File", "save", QKeySequence(Qt::Key_F2)},
     {"Edit", "copy", QKeySequence(Qt::CTRL | Qt::Key_J)},
@@ -364,7 +365,7 @@ void tst_ShortcutSessions::typeFilter()
         m_mirror.forgetLeftRow();
     expect(m_mirror.setFilter(text), [&] {
         m_hand->clickNearStart(child<QLineEdit>("filterEdit"));
-        m_hand->press(Qt::CTRL | Qt::Key_A);
+        m_hand->press(VelTest::keyNumber(Qt::CTRL | Qt::Key_A));
         m_hand->press(Qt::Key_Delete);
         for (const QChar letter : text)
             m_hand->press(letter.toUpper().unicode());

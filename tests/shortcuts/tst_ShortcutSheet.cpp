@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "KeyTestObject.h"
+#include "QtMajor.h"
 #include "ShortcutSheet.h"
 #include "ShortcutsModelTestCase.h"
 
@@ -73,7 +74,7 @@ void tst_ShortcutSheet::alignsThePlainText()
 {
     add(str("quit"), str("File"), QKeySequence(Qt::CTRL | Qt::Key_Q));
     add(str("open"), str("File"), f1);
-    add(str("a long name"), str("Edit"), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
+    add(str("a long name"), str("Edit"), VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
     add(str("none"), str("Edit"));
     add(str("x"), QString(), f2);
     QCOMPARE(ShortcutSheet::plainText(*m_model),

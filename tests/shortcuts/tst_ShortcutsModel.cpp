@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
 #include "KeyTestObject.h"
+#include "QtMajor.h"
 #include "ShortcutsModelTestCase.h"
 
 #include <QAction>
@@ -96,14 +97,14 @@ void tst_ShortcutsModel::givesTheDataOfEachKindOfRow()
     pixmap.fill(Qt::red);
     QAction *action = addAction("a", "File", QKeySequence(Qt::CTRL | Qt::Key_S));
     action->setIcon(QIcon(pixmap));
-    m_model->setKeySequence(row(0, 0), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
+    m_model->setKeySequence(row(0, 0), VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
 
     QCOMPARE(m_model->index(0, 0).data(Qt::DisplayRole), QVariant(str("File")));
     QCOMPARE(row(0, 0).data(Qt::DisplayRole), QVariant(str("Text of a")));
     QCOMPARE(row(0, 0).data(Qt::DecorationRole).value<QIcon>().cacheKey(), action->icon().cacheKey());
     QCOMPARE(row(0, 0, 1).data(Qt::DisplayRole), QVariant(str("Ctrl+K, Ctrl+C")));
     QCOMPARE(row(0, 0, 1).data(Qt::EditRole),
-             QVariant(QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)));
+             QVariant(VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)));
     QCOMPARE(row(0, 0, 1).data(Qt::UserRole), QVariant(QKeySequence(Qt::CTRL | Qt::Key_S)));
 }
 
@@ -270,8 +271,8 @@ void tst_ShortcutsModel::findsTheFirstHolderOfAKey()
 void tst_ShortcutsModel::comparesWholeSequences()
 {
     addAction("a", "File", QKeySequence(Qt::CTRL | Qt::Key_K));
-    QVERIFY(!m_model->hasKeySequence(QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)));
-    m_model->setKeySequence(row(0, 0), QKeySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
+    QVERIFY(!m_model->hasKeySequence(VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C)));
+    m_model->setKeySequence(row(0, 0), VelTest::keySequence(Qt::CTRL | Qt::Key_K, Qt::CTRL | Qt::Key_C));
     QVERIFY(!m_model->hasKeySequence(QKeySequence(Qt::CTRL | Qt::Key_K)));
 }
 

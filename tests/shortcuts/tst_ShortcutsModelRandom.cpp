@@ -89,7 +89,7 @@ QKeySequence tst_ShortcutsModelRandom::randomKey()
     case 0:
         return {};
     case 1:
-        return QKeySequence(Qt::CTRL | Qt::Key_K, Qt::Key_A + random(4));
+        return QKeySequence(int(Qt::CTRL) | Qt::Key_K, Qt::Key_A + random(4));
     default:
         return QKeySequence((random(2) ? int(Qt::CTRL) : 0) | (Qt::Key_A + random(12)));
     }

@@ -3,6 +3,7 @@
 
 // The tree of the assisted dialog: keys in view, changes and the way back.
 
+#include "QtMajor.h"
 #include "RecordingTestCase.h"
 
 #include <QAccessible>
@@ -111,7 +112,7 @@ void tst_TreeAssistance::makesRoomForALongKey()
 {
     const int before = tree()->columnWidth(1);
     const int chord = Qt::CTRL | Qt::ALT | Qt::SHIFT | Qt::META;
-    edit("copy", QKeySequence(chord | Qt::Key_A, chord | Qt::Key_B));
+    edit("copy", VelTest::keySequence(chord | Qt::Key_A, chord | Qt::Key_B));
     QVERIFY(tree()->columnWidth(1) > before);
     QVERIFY(areColumnsInView());
     m_dialog->processButtonBox(DialogTestCase::button(QDialogButtonBox::Reset));

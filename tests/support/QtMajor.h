@@ -1,0 +1,57 @@
+// SPDX-FileCopyrightText: The veluiextra developers
+// SPDX-License-Identifier: LGPL-2.1-or-later
+
+#pragma once
+
+#include <QKeySequence>
+#include <QLibraryInfo>
+#include <QMetaType>
+
+/// What Qt 5 and Qt 6 call differently, for the tests.
+namespace VelTest {
+
+#if QT_VERSION_MAJOR >= 6
+
+/// A type whose values may be moved as bytes.
+constexpr auto RelocatableType = QMetaType::RelocatableType;
+
+/// The sequence of \a keys, each with or without modifiers.
+template<typename... Keys> QKeySequence keySequence(Keys... keys)
+{
+    return QKeySequence(QKeyCombination(keys)...);
+}
+
+/// A key with its modifiers as one number.
+constexpr int keyNumber(QKeyCombination key)
+{
+    return key.toCombined();
+}
+
+/// The folder of Qt's own translations.
+inline QString translationsPath()
+{
+    return QLibraryInfo::path(QLibraryInfo::TranslationsPath);
+}
+
+#else
+
+constexpr auto RelocatableType = QMetaType::MovableType;
+
+template<typename... Keys> QKeySequence keySequence(Keys... keys)
+{
+    return QKeySequence(int(keys)...);
+}
+
+constexpr int keyNumber(int key)
+{
+    return key;
+}
+
+inline QString translationsPath()
+{
+    return QLibraryInfo::location(QLibraryInfo::TranslationsPath);
+}
+
+#endif
+
+} // namespace VelTest
