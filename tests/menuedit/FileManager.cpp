@@ -3,6 +3,7 @@
 
 #include "FileManager.h"
 
+#include "GroupLeader.h"
 #include "XDoTool.h"
 
 #include <QClipboard>
@@ -12,13 +13,11 @@
 #include <QImage>
 #include <QMimeData>
 #include <QPixmap>
-#include <QProcess>
 #include <QScreen>
 #include <QStandardPaths>
 #include <QTest>
 
 #include <csignal>
-#include <unistd.h>
 
 namespace {
 
@@ -50,8 +49,8 @@ int geometry(const QByteArray &window, const QByteArray &name)
 
 } // namespace
 
-/// Leads a group of its own, so that the message bus ends with the program.
-class FileManager::Process : public QProcess
+/// The message bus ends with the program.
+class FileManager::Process : public GroupLeader
 {
 public:
     ~Process() override
@@ -61,9 +60,6 @@ public:
         ::kill(pid_t(-processId()), SIGKILL);
         waitForFinished();
     }
-
-protected:
-    void setupChildProcess() override { ::setpgid(0, 0); }
 };
 
 FileManager::FileManager() = default;

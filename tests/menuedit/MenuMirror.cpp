@@ -87,7 +87,7 @@ QString MenuMirror::join(const QString &folder, const QString &name)
 
 QString MenuMirror::folderOf(const QString &path)
 {
-    return path.left(std::max(0, path.lastIndexOf(QLatin1Char('/'))));
+    return path.left(std::max(0, int(path.lastIndexOf(QLatin1Char('/')))));
 }
 
 QString MenuMirror::nameOf(const QString &path)

@@ -694,7 +694,7 @@ void tst_MenuRandomOperations::takesBackAndDoesAgain()
     while (!QTest::currentTestFailed() && turn(true)) { }
     QCOMPARE(m_states.constFirst().tree.difference(ExactTree::of(menu()), {"*"}), QString());
     QVERIFY(!m_view->undoAction()->isEnabled());
-    qInfo("%d times to and fro, then back through %d states", turns, m_states.size());
+    qInfo("%d times to and fro, then back through %d states", turns, int(m_states.size()));
     finish();
 }
 

@@ -93,7 +93,7 @@ void tst_VelMenuViewActions::givesEachActionItsTextIconAndKey_data()
     row("fileNewAction", "New entry", "document-new", QKeySequence::New);
     row("editAction", "Edit", "document-properties", Qt::Key_Space);
     row("deleteAction", "Delete", "edit-delete", QKeySequence::Delete);
-    row("executeAction", "Execute", "", Qt::CTRL + Qt::Key_E);
+    row("executeAction", "Execute", "", Qt::CTRL | Qt::Key_E);
     row("findAction", "Find", "edit-find", QKeySequence::Find);
     row("findNextAction", "Find Next", "", QKeySequence::FindNext);
     row("cutAction", "Cut", "edit-cut", QKeySequence::Cut);
