@@ -311,8 +311,9 @@ void tst_MenuFormat::printsAMenuForJwm()
     QStringList seen;
     while (!xml.atEnd()) {
         if (xml.readNext() == QXmlStreamReader::StartElement)
-            seen.append(xml.name() + QLatin1Char('|') + xml.attributes().value(QLatin1String("label"))
-                        + QLatin1Char('|') + xml.attributes().value(QLatin1String("icon")));
+            seen.append(xml.name().toString() + QLatin1Char('|')
+                        + xml.attributes().value(QLatin1String("label")) + QLatin1Char('|')
+                        + xml.attributes().value(QLatin1String("icon")));
         else if (xml.isCharacters() && !xml.isWhitespace())
             seen.append(xml.text().toString());
     }

@@ -103,7 +103,8 @@ protected:
 inline bool sendMouse(QWidget *widget, QEvent::Type type, const QPointF &position, Qt::MouseButton button,
                       Qt::MouseButtons buttons)
 {
-    QMouseEvent event(type, position, button, buttons, Qt::NoModifier);
+    QMouseEvent event(type, position, widget->mapToGlobal(position.toPoint()), button, buttons,
+                      Qt::NoModifier);
     QCoreApplication::sendEvent(widget, &event);
     return event.isAccepted();
 }

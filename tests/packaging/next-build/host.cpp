@@ -110,7 +110,7 @@ void useShortcuts(const QString &file)
 {
     QSettings settings(file, QSettings::IniFormat);
     QWidget window;
-    QShortcut shortcut(QKeySequence(Qt::CTRL + Qt::Key_K), &window);
+    QShortcut shortcut(QKeySequence(Qt::CTRL | Qt::Key_K), &window);
     Derived<ShortcutsModel> model(&settings, QStringLiteral("Keys"));
     model.registerShortcut(QStringLiteral("Group"), &shortcut, QStringLiteral("Cut"), QStringLiteral("Cut"));
     Derived<EditShortcutsDialog> dialog(&model);
