@@ -3,6 +3,7 @@
 
 #include "IconPixels.h"
 #include "IconThemeFolder.h"
+#include "QtMajor.h"
 #include "TestCase.h"
 
 #include <veluiaux/VelIcon.h>
@@ -141,7 +142,7 @@ int main(int argc, char **argv)
 {
     VelTest::TestEnvironment environment;
     qputenv("QT_SCALE_FACTOR", "2");
-    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+    VelTest::useHighDpiPixmaps();
     QApplication application(argc, argv);
     tst_VelIconScaled test;
     return QTest::qExec(&test, argc, argv);

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <QCoreApplication>
 #include <QKeySequence>
 #include <QLibraryInfo>
 #include <QMetaType>
@@ -53,5 +54,13 @@ inline QString translationsPath()
 }
 
 #endif
+
+/// Has icons give as many pixels as the screen has; before the application is made.
+inline void useHighDpiPixmaps()
+{
+#if QT_VERSION_MAJOR < 6
+    QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
+#endif
+}
 
 } // namespace VelTest
