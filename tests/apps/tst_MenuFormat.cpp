@@ -312,8 +312,8 @@ void tst_MenuFormat::printsAMenuForJwm()
     while (!xml.atEnd()) {
         if (xml.readNext() == QXmlStreamReader::StartElement)
             seen.append(xml.name().toString() + QLatin1Char('|')
-                        + xml.attributes().value(QLatin1String("label")) + QLatin1Char('|')
-                        + xml.attributes().value(QLatin1String("icon")));
+                        + xml.attributes().value(QLatin1String("label")).toString() + QLatin1Char('|')
+                        + xml.attributes().value(QLatin1String("icon")).toString());
         else if (xml.isCharacters() && !xml.isWhitespace())
             seen.append(xml.text().toString());
     }

@@ -16,12 +16,6 @@ namespace VelTest {
 /// A type whose values may be moved as bytes.
 constexpr auto RelocatableType = QMetaType::RelocatableType;
 
-/// The sequence of \a keys, each with or without modifiers.
-template<typename... Keys> QKeySequence keySequence(Keys... keys)
-{
-    return QKeySequence(QKeyCombination(keys)...);
-}
-
 /// A key with its modifiers as one number.
 constexpr int keyNumber(QKeyCombination key)
 {
@@ -38,22 +32,29 @@ inline QString translationsPath()
 
 constexpr auto RelocatableType = QMetaType::MovableType;
 
-template<typename... Keys> QKeySequence keySequence(Keys... keys)
-{
-    return QKeySequence(int(keys)...);
-}
-
-constexpr int keyNumber(int key)
-{
-    return key;
-}
-
 inline QString translationsPath()
 {
     return QLibraryInfo::location(QLibraryInfo::TranslationsPath);
 }
 
 #endif
+
+constexpr int keyNumber(int key)
+{
+    return key;
+}
+
+constexpr int keyNumber(Qt::Key key)
+{
+    return key;
+}
+
+/// The sequence of \a keys, each with or without modifiers.
+template <typename... Keys>
+QKeySequence keySequence(Keys... keys)
+{
+    return QKeySequence(keyNumber(keys)...);
+}
 
 /// Has icons give as many pixels as the screen has; before the application is made.
 inline void useHighDpiPixmaps()
