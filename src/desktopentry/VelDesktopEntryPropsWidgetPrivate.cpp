@@ -229,7 +229,12 @@ void VelDesktopEntryPropsWidgetPrivate::connectChanges()
 void VelDesktopEntryPropsWidgetPrivate::keepInView(QWidget *focused)
 {
     // Moving the form under a pressed mouse would make it miss what it clicks.
-    if (focused && scrollArea->widget()->isAncestorOf(focused)
-        && QApplication::mouseButtons() == Qt::NoButton)
-        scrollArea->ensureWidgetVisible(focused);
+    if (!focused || !scrollArea->widget()->isAncestorOf(focused)
+        || QApplication::mouseButtons() != Qt::NoButton)
+        return;
+    scrollArea->ensureWidgetVisible(focused);
+    // Of a line that takes text that was its cursor only.
+    const QRect place(focused->mapTo(scrollArea->widget(), QPoint()), focused->size());
+    const QPoint center = place.center();
+    scrollArea->ensureVisible(center.x(), center.y(), place.width() / 2 + 1, place.height() / 2 + 1);
 }

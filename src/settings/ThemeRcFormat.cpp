@@ -270,7 +270,8 @@ bool write(QIODevice &device, const QSettings::SettingsMap &map)
         }
         appendKey(lines, device, it.key(), it.value());
     }
-    bytes += lines.toLocal8Bit();
+    // Half a character is a question mark in every file; Qt 6 has another sign for it in the locale's text.
+    bytes += allAtOnce ? lines.toUtf8() : lines.toLocal8Bit();
     return writeThrough(device, bytes);
 }
 

@@ -78,7 +78,7 @@ void tst_VelDesktopEntryPropsWidget::hasTheRowsInTheirOrder()
         const QObject *field = right->widget() ? static_cast<QObject *>(right->widget()) : right->layout();
         rows.append((label ? label->text() : qobject_cast<QAbstractButton *>(left)->text()) + QLatin1Char(' ')
                     + QString::fromLatin1(field->metaObject()->className()));
-        if (label && label->font().weight() == 75)
+        if (label && label->font().weight() == QFont::Bold)
             rows.last().append(QLatin1Char('*'));
     }
     const QStringList expected{

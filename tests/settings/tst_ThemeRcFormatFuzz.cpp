@@ -53,7 +53,8 @@ Map plainRead(QIODevice &device)
 {
     Map map;
     while (!device.atEnd()) {
-        const QString line = QString::fromLocal8Bit(device.readLine().trimmed());
+        // Up to the first NUL byte.
+        const QString line = QString::fromLocal8Bit(device.readLine().trimmed().constData());
         if (line.startsWith(QLatin1Char('#')) || line.startsWith(QLatin1Char(';')))
             continue;
         if (line.contains(QLatin1Char('='))) {
