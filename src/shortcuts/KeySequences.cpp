@@ -9,13 +9,25 @@
 
 namespace {
 
+int withoutModifiers(int code)
+{
+    return code & ~int(Qt::KeyboardModifierMask);
+}
+
+// Half a character is none, and no text file of Qt 6's keeps it.
+bool isKey(int code)
+{
+    const int key = withoutModifiers(code);
+    return key != Qt::Key_unknown && !QChar::isSurrogate(uint(key));
+}
+
 // Almost every key is one of these, and parsing takes its time. Other names may stand for another
 // key in the user's language: in Hungarian, Enter is the name of Return.
 bool hasOneName(int code)
 {
-    const int key = code & ~int(Qt::KeyboardModifierMask);
+    const int key = withoutModifiers(code);
     const bool isNamed = key > Qt::Key_AsciiTilde && (key < Qt::Key_F1 || key > Qt::Key_F35);
-    return !isNamed && !(code & int(Qt::GroupSwitchModifier)) && KeyNames::roundTrips(code);
+    return isKey(code) && !isNamed && !(code & int(Qt::GroupSwitchModifier)) && KeyNames::roundTrips(code);
 }
 
 } // namespace
@@ -23,7 +35,7 @@ bool hasOneName(int code)
 bool KeySequences::isKnown(const QKeySequence &sequence)
 {
     for (int i = 0; i < sequence.count(); ++i) {
-        if ((QtMajor::chord(sequence, i) & ~int(Qt::KeyboardModifierMask)) == Qt::Key_unknown)
+        if (!isKey(QtMajor::chord(sequence, i)))
             return false;
     }
     return true;

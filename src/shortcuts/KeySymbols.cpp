@@ -34,34 +34,52 @@ constexpr unsigned int LastOfKeypad = 0xffbf;
 using Keys = QHash<unsigned int, int>; // by symbol
 
 #if QT_VERSION_MAJOR >= 6
-bool symbolOfKey(int code, int *symbol)
+// A modifier is no key by itself; KDE Frameworks 6 has symbols for some.
+bool isModifier(int code)
 {
-    const QList<int> symbols = KKeyServer::keyQtToSymXs(code);
-    if (!symbols.isEmpty())
-        *symbol = symbols.first();
-    return !symbols.isEmpty();
+    const int key = code & ~int(Qt::KeyboardModifierMask);
+    return key >= Qt::Key_Shift && key <= Qt::Key_Alt;
+}
+
+QList<int> symbolsOfKey(int code)
+{
+    return isModifier(code) ? QList<int>() : KKeyServer::keyQtToSymXs(code);
+}
+
+bool keyOfSymbol(unsigned int symbol, int *key)
+{
+    return KKeyServer::symXModXToKeyQt(symbol, 0, key) && !isModifier(*key);
 }
 #else
-bool symbolOfKey(int code, int *symbol)
+QList<int> symbolsOfKey(int code)
 {
-    return KKeyServer::keyQtToSymX(code, symbol);
+    int symbol = 0;
+    return KKeyServer::keyQtToSymX(code, &symbol) ? QList<int>{symbol} : QList<int>();
+}
+
+bool keyOfSymbol(unsigned int symbol, int *key)
+{
+    return KKeyServer::symXModXToKeyQt(symbol, 0, key);
 }
 #endif
 
 void addKey(int code, Keys *keys)
 {
-    int symbol = 0;
-    if (symbolOfKey(code, &symbol) && unsigned(symbol) >= FirstOfFunctionKeys
-        && !keys->contains(unsigned(symbol)))
-        keys->insert(unsigned(symbol), code);
+    const QList<int> symbols = symbolsOfKey(code);
+    for (const int symbol : symbols) {
+        if (unsigned(symbol) >= FirstOfFunctionKeys && !keys->contains(unsigned(symbol)))
+            keys->insert(unsigned(symbol), code);
+    }
 }
 
 void addKeyOfKeypad(int key, Keys *keys)
 {
-    int symbol = 0;
     const int code = key | int(Qt::KeypadModifier);
-    if (symbolOfKey(code, &symbol) && unsigned(symbol) >= FirstOfKeypad && unsigned(symbol) <= LastOfKeypad)
-        keys->insert(unsigned(symbol), code);
+    const QList<int> symbols = symbolsOfKey(code);
+    for (const int symbol : symbols) {
+        if (unsigned(symbol) >= FirstOfKeypad && unsigned(symbol) <= LastOfKeypad)
+            keys->insert(unsigned(symbol), code);
+    }
 }
 
 // The way back from what needs no X server.
@@ -105,9 +123,12 @@ bool maskOf(int code, unsigned int *mask)
 
 std::optional<KeySymbols::Symbol> KeySymbols::ofKey(int code)
 {
+    const QList<int> symbols = symbolsOfKey(code);
     Symbol symbol;
-    const bool isKnown = symbolOfKey(code, &symbol.symbol) && maskOf(code, &symbol.mask);
-    return isKnown ? std::optional<Symbol>(symbol) : std::nullopt;
+    if (symbols.isEmpty() || !maskOf(code, &symbol.mask))
+        return std::nullopt;
+    symbol.symbol = symbols.first();
+    return symbol;
 }
 
 std::optional<int> KeySymbols::keyOf(unsigned int symbol)
@@ -115,7 +136,7 @@ std::optional<int> KeySymbols::keyOf(unsigned int symbol)
     if (!QtMajor::x11Display())
         return usualKeyOf(symbol);
     int key = 0;
-    return KKeyServer::symXModXToKeyQt(symbol, 0, &key) ? std::optional<int>(key) : std::nullopt;
+    return keyOfSymbol(symbol, &key) ? std::optional<int>(key) : std::nullopt;
 }
 
 int KeySymbols::modifiersOf(unsigned int mask)

@@ -42,6 +42,7 @@ void tst_KeySequences::knowsWhatSurvivesSaving_data()
     QTest::newRow("Caps Lock in the middle")
         << VelTest::keySequence(Qt::Key_A, Qt::Key_unknown, Qt::CTRL | Qt::Key_A) << false;
     QTest::newRow("y with diaeresis") << QKeySequence(Qt::CTRL | 0xff) << false;
+    QTest::newRow("half a character") << QKeySequence(0xd83d) << false;
     QTest::newRow("another level") << QKeySequence(int(Qt::GroupSwitchModifier) | Qt::Key_A) << false;
 }
 

@@ -43,7 +43,9 @@ void tst_KeySymbols::knowsEverySymbolAsOnX11()
             continue;
         ++named;
         int key = 0;
-        const bool isKnown = KKeyServer::symXModXToKeyQt(symbol, 0, &key);
+        // A modifier is no key by itself, also where KKeyServer has one for it.
+        const bool isKnown = KKeyServer::symXModXToKeyQt(symbol, 0, &key)
+            && (key < Qt::Key_Shift || key > Qt::Key_Alt);
         const std::optional<int> ours = KeySymbols::keyOf(symbol);
         QVERIFY2(isKnown == ours.has_value() && (!isKnown || key == *ours), XKeysymToString(symbol));
     }
