@@ -111,7 +111,7 @@ void tst_vel_wmbridge::cleanup()
     }
     m_bridge.readAll();
     m_bridge.readAllStandardError();
-    m_bridge.setProcessEnvironment(QProcessEnvironment());
+    m_bridge.setProcessEnvironment(QProcessEnvironment::systemEnvironment());
     TestCase::cleanup();
 }
 
