@@ -94,8 +94,10 @@ void RadioGroupBoxPainter::drawTitleByStyle()
         m_style->subControlRect(QStyle::CC_GroupBox, &option, QStyle::SC_GroupBoxLabel, m_widget);
     m_painter->save();
     m_painter->setClipRect(m_label);
-    m_painter->translate(m_option.direction == Qt::LeftToRight ? m_label.topLeft() - label.topLeft()
-                                                               : m_label.topRight() - label.topRight());
+    // The text is in the middle of its height, which need not be the same without an indicator.
+    m_painter->translate(m_option.direction == Qt::LeftToRight ? m_label.left() - label.left()
+                                                               : m_label.right() - label.right(),
+                         m_label.center().y() - label.center().y());
     m_style->drawComplexControl(QStyle::CC_GroupBox, &option, m_painter, m_widget);
     m_painter->restore();
 }
