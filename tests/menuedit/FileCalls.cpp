@@ -56,6 +56,7 @@ int watchedStatx(int directory, const char *path, int flags, unsigned mask, void
 int watchedAccess(const char *path, int mode) __asm__("access");
 ssize_t watchedReadlink(const char *path, char *buffer, size_t size) __asm__("readlink");
 char *watchedRealpath(const char *path, char *resolved) __asm__("realpath");
+char *watchedRealpathChk(const char *path, char *resolved, size_t size) __asm__("__realpath_chk");
 void *watchedOpendir(const char *path) __asm__("opendir");
 int watchedOpen(const char *path, int flags, unsigned mode) __asm__("open");
 int watchedOpen64(const char *path, int flags, unsigned mode) __asm__("open64");
@@ -98,6 +99,12 @@ ssize_t watchedReadlink(const char *path, char *buffer, size_t size)
 char *watchedRealpath(const char *path, char *resolved)
 {
     return pass<char *>("realpath", path, path, resolved);
+}
+
+// What the compiler makes of it where the size of the buffer is known.
+char *watchedRealpathChk(const char *path, char *resolved, size_t size)
+{
+    return pass<char *>("__realpath_chk", path, path, resolved, size);
 }
 
 void *watchedOpendir(const char *path)

@@ -4,6 +4,7 @@
 #include "EditTestCase.h"
 #include "ExactTree.h"
 #include "ModalDriver.h"
+#include "OlderListing.h"
 #include "VelMenuDialog.h"
 #include "VelMenuView.h"
 
@@ -496,9 +497,7 @@ void tst_SeveralRows::comeBackAfterAnOlderListing()
 {
     const auto view = make();
     add(*view, QStringLiteral("a b d"));
-    QVERIFY(QMetaObject::invokeMethod(
-        files(*view), "_q_directoryChanged", Q_ARG(QString, menu()),
-        Q_ARG(QStringList, QStringList({QStringLiteral("c.desktop"), QStringLiteral("games")}))));
+    QVERIFY(takeOlderListing(files(*view), menu(), {QStringLiteral("c.desktop"), QStringLiteral("games")}));
     QCOMPARE(rows(*view), QStringLiteral("Games C"));
     QCOMPARE(selected(*view), QString());
     writeEntry(QStringLiteral("e.desktop"), QStringLiteral("E"));
@@ -506,9 +505,7 @@ void tst_SeveralRows::comeBackAfterAnOlderListing()
     QTRY_COMPARE(selected(*view), QStringLiteral("A B D"));
 
     // Unless something else has been selected meanwhile.
-    QVERIFY(QMetaObject::invokeMethod(
-        files(*view), "_q_directoryChanged", Q_ARG(QString, menu()),
-        Q_ARG(QStringList, QStringList({QStringLiteral("c.desktop"), QStringLiteral("games")}))));
+    QVERIFY(takeOlderListing(files(*view), menu(), {QStringLiteral("c.desktop"), QStringLiteral("games")}));
     select(*view, pathOf(QStringLiteral("c")));
     writeEntry(QStringLiteral("f.desktop"), QStringLiteral("F"));
     QTRY_COMPARE(names(*view, menu()).size(), 7);
