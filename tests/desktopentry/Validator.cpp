@@ -171,23 +171,33 @@ bool isAboutTheEndOfAList(const QString &text)
         && !list.contains(QLatin1String(";;"));
 }
 
+// Version 0.26 knows the standard up to 1.4. What it lacks is a key of the entry, of none of its actions.
+bool isAboutANewerStandard(const QString &text)
+{
+    static const QRegularExpression complaint(
+        QStringLiteral("^value \"1\\.5\" for key \"Version\" in group .* is not a known version$|"
+                       "^file contains key \"SingleMainWindow(\\[.*\\])?\" in group \"(KDE )?Desktop "
+                       "Entry\", but keys extending"));
+    return complaint.match(text).hasMatch();
+}
+
 void read(const QByteArray &output, QVector<Complaints> *all)
 {
     static const QRegularExpression line(QStringLiteral("^(\\d{6})/[^:]*: (error|warning|hint): (.*)$"),
                                          QRegularExpression::DotMatchesEverythingOption);
     for (const QByteArray &bytes : output.split('\n')) {
         const QRegularExpressionMatch match = line.match(QString::fromUtf8(bytes));
-        if (match.hasMatch() && !isAboutTheEndOfAList(match.captured(3)))
+        if (match.hasMatch() && !isAboutTheEndOfAList(match.captured(3))
+            && !isAboutANewerStandard(match.captured(3)))
             (*all)[match.captured(1).toInt()].append(
                 meaningOf(severityOf(match.captured(2)), match.captured(3)));
     }
 }
 
-// Version 0.26 does not.
-bool looksForInterfaces()
+bool complainsAbout(const QByteArray &line)
 {
     const QTemporaryDir folder;
-    const QByteArray entry = "[Desktop Entry]\nType=Application\nName=A\nExec=true\nImplements=a\n";
+    const QByteArray entry = "[Desktop Entry]\nType=Application\nName=A\nExec=true\n" + line + '\n';
     return !Validator::check({{QStringLiteral("a.desktop"), entry}}, folder.path()).value(0).isEmpty();
 }
 
@@ -212,11 +222,15 @@ QVector<Complaints> Validator::check(const QVector<Sample> &samples, const QStri
     return all;
 }
 
-bool Validator::looksFor(EntryProblem problem)
+// Version 0.26 looks neither for interfaces nor at the values of newer keys.
+bool Validator::looksFor(const EntryFinding &finding)
 {
-    static const bool seesInterfaces = looksForInterfaces();
-    if (problem == EntryProblem::InvalidInterface)
+    static const bool seesInterfaces = complainsAbout("Implements=a");
+    static const bool seesMainWindow = complainsAbout("SingleMainWindow=a");
+    if (finding.problem == EntryProblem::InvalidInterface)
         return seesInterfaces;
+    if (finding.problem == EntryProblem::InvalidFlag && finding.key == QLatin1String("SingleMainWindow"))
+        return seesMainWindow;
     return std::any_of(std::begin(Meanings), std::end(Meanings),
-                       [problem](const Meaning &meaning) { return meaning.problem == problem; });
+                       [&](const Meaning &meaning) { return meaning.problem == finding.problem; });
 }

@@ -34,7 +34,7 @@ using Complaints = QVector<Complaint>;
 /// What the checker says about each of \a samples, written below \a folder. Empty when it cannot be run.
 QVector<Complaints> check(const QVector<Sample> &samples, const QString &folder);
 
-/// Whether the checker looks for \a problem at all.
-bool looksFor(EntryProblem problem);
+/// Whether the checker looks at all for what \a finding is about.
+bool looksFor(const EntryFinding &finding);
 
 } // namespace Validator

@@ -99,12 +99,12 @@ void tst_EntryCheck::hasNothingToSayOfAGoodEntry_data()
     const QString application = QStringLiteral("entry.desktop");
     QTest::newRow("application") << Application << application;
     QTest::newRow("all keys") << Application
-            + "# A comment\nVersion=1.4\nGenericName=Thing\nComment=Does it\nComment[de]=Macht "
+            + "# A comment\nVersion=1.5\nGenericName=Thing\nComment=Does it\nComment[de]=Macht "
               "es\nIcon=known\n"
               "NoDisplay=false\nOnlyShowIn=GNOME;X-Own;\nTryExec=run\nPath=/opt\nTerminal=false\n"
               "MimeType=text/"
               "plain;\nCategories=Utility;TextEditor;X-Own;\nKeywords=a;b;\nStartupNotify=true\n"
-              "StartupWMClass=Thing\nActions=new;\nX-Own=x\nX-Own[de]=y\n\n"
+              "StartupWMClass=Thing\nSingleMainWindow=true\nActions=new;\nX-Own=x\nX-Own[de]=y\n\n"
               "[Desktop Action new]\nName=New\nName[de]=Neu\nIcon=known\nExec=run --new "
               "%F\n\n[X-Group]\nAny=thing\n"
                               << application;
@@ -180,6 +180,8 @@ void tst_EntryCheck::finds_data()
     row("control character", command("run\x01"), P::InvalidCharacter, error, "Exec");
     row("not UTF-8", Application + "Comment=\xff\n", P::InvalidCharacter, error, "Comment");
     row("no flag", Application + "Terminal=yes\n", P::InvalidFlag, error, "Terminal");
+    row("no flag for the main window", Application + "SingleMainWindow=yes\n", P::InvalidFlag, error,
+        "SingleMainWindow");
     row("old flag", Application + "Terminal=1\n", P::DeprecatedFlag, warning, "Terminal");
     row("unknown type", "[Desktop Entry]\nType=application\nName=x\n", P::UnknownType, error, "Type");
     row("reserved type", "[Desktop Entry]\nType=FSDevice\nName=x\n", P::UnknownType, warning, "Type");
@@ -310,7 +312,7 @@ void tst_EntryCheck::repairs_data()
     row("TryExec=run --help", P::MissingTryExec, "TryExec=run");
     row("Icon=known.svg", P::IconSuffix, "Icon=known");
     row("Terminal=True", P::InvalidFlag, "Terminal=true");
-    row("Version=1.5", P::UnknownVersion, "Version=1.4");
+    row("Version=1.6", P::UnknownVersion, "Version=1.4");
     row("Categories=game;X-Own;", P::UnknownCategory, "Categories=Game;X-Own;");
     row("Categories=Game;Fun;", P::UnknownCategory, "Categories=Game;X-Fun;");
     row("Categories=Game;Application;", P::DeprecatedCategory, "Categories=Game;");

@@ -224,7 +224,7 @@ void tst_EntryCheckValidator::neverMilder()
                 missed.append(complaint.text + QLatin1Char('\n') + shown(samples.at(i)));
         }
         for (const EntryFinding &finding : findings) {
-            if (finding.severity == EntryFinding::Error && Validator::looksFor(finding.problem)
+            if (finding.severity == EntryFinding::Error && Validator::looksFor(finding)
                 && !has(complaints.at(i), finding))
                 ownErrors.append(finding.sentence + QLatin1Char('\n') + shown(samples.at(i)));
         }

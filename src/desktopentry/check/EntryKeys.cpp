@@ -42,6 +42,7 @@ constexpr Row Rows[] = {
     {"StartupWMClass", ValueType::Text, "Application"},
     {"URL", ValueType::Text, "Link"},
     {"PrefersNonDefaultGPU", ValueType::Flag},
+    {"SingleMainWindow", ValueType::Flag},
     // Of the autostart standard.
     {"AutostartCondition", ValueType::Text, "Application"},
     // Reserved for one desktop.

@@ -168,14 +168,12 @@ void ValueChecks::checkType(const CheckedValue &value)
 
 void ValueChecks::checkVersion(const CheckedValue &value)
 {
-    static const QByteArrayList known{"1.0",   "1.1",   "1.2",   "1.3",   "1.4",
+    static const QByteArrayList known{"1.0",   "1.1",   "1.2",   "1.3",   "1.4",  "1.5",
                                       "0.9.4", "0.9.5", "0.9.6", "0.9.7", "0.9.8"};
     if (known.contains(value.key.value))
         return;
-    const QString sentence = value.key.value == "1.5"
-        ? Text::tr("Programs that check entries do not know version 1.5 of the standard yet.")
-        : Text::tr("There is no version '%1' of the standard.").arg(value.text());
-    value.add(EntryProblem::UnknownVersion, EntryFinding::Error, sentence,
+    value.add(EntryProblem::UnknownVersion, EntryFinding::Error,
+              Text::tr("There is no version '%1' of the standard.").arg(value.text()),
               Text::tr("Change it to '%1'").arg(QLatin1String("1.4")), QStringLiteral("1.4"));
 }
 
