@@ -51,6 +51,8 @@ private Q_SLOTS:
     void findsAllWordsInAnyOrderWithoutCaseAndAccents_data();
     void findsAllWordsInAnyOrderWithoutCaseAndAccents();
     void putsFirstWhatTheTypedBegins();
+    void putsFirstWhatUsuallyHasTheTypedSuffix_data();
+    void putsFirstWhatUsuallyHasTheTypedSuffix();
     void findsWhatIsReadLater();
 };
 
@@ -147,6 +149,36 @@ void tst_ChoiceModel::putsFirstWhatTheTypedBegins()
     QCOMPARE(shown(filter), QStringLiteral("git|Git gui|the git"));
     filter.setTyped(QString());
     QCOMPARE(shown(filter), QStringLiteral("again|gio|git|Git gui|the git"));
+}
+
+void tst_ChoiceModel::putsFirstWhatUsuallyHasTheTypedSuffix_data()
+{
+    QTest::addColumn<QString>("typed");
+    QTest::addColumn<QString>("found");
+    QTest::newRow("suffix") << QStringLiteral(".png") << QStringLiteral("image/png|image/apng");
+    QTest::newRow("pattern") << QStringLiteral("*.PNG") << QStringLiteral("image/png|image/apng");
+    QTest::newRow("begun") << QStringLiteral(".pn") << QStringLiteral("image/apng|image/png");
+    QTest::newRow("first of two") << QStringLiteral(".htm") << QStringLiteral("text/x-first|text/html");
+    QTest::newRow("no suffix") << QStringLiteral("image") << QStringLiteral("image/apng|image/png");
+}
+
+void tst_ChoiceModel::putsFirstWhatUsuallyHasTheTypedSuffix()
+{
+    QFETCH(QString, typed);
+    QFETCH(QString, found);
+    ChoiceModel model(ChoiceModel::Kind::Several, Headers);
+    const auto type = [](const char *name, const QString &patterns) {
+        Choice choice;
+        choice.value = QLatin1String(name);
+        choice.texts = QStringList{choice.value, QStringLiteral("File"), patterns};
+        return choice;
+    };
+    model.add({type("image/apng", QStringLiteral("*.apng, *.png")),
+               type("image/png", QStringLiteral("*.png")), type("text/html", QStringLiteral("*.html, *.htm")),
+               type("text/x-first", QStringLiteral("*.htm, *.first"))});
+    ChoiceFilter filter(&model);
+    filter.setTyped(typed);
+    QCOMPARE(shown(filter), found);
 }
 
 void tst_ChoiceModel::findsWhatIsReadLater()

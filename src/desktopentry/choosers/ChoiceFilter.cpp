@@ -25,6 +25,11 @@ void ChoiceFilter::setTyped(const QString &typed)
 {
     m_words = SearchText::words(typed);
     m_beginning = SearchText::folded(typed).trimmed();
+    m_fileNames.clear();
+    if (m_beginning.startsWith(QLatin1String("*.")))
+        m_fileNames = QLatin1Char('\n') + m_beginning;
+    else if (m_beginning.startsWith(QLatin1Char('.')))
+        m_fileNames = QLatin1String("\n*") + m_beginning;
     invalidate();
 }
 
@@ -40,12 +45,22 @@ bool ChoiceFilter::filterAcceptsRow(int row, const QModelIndex &) const
                        [&text](const QString &word) { return text.contains(word); });
 }
 
+// Of the patterns of a type's file names the first is the most usual one.
+bool ChoiceFilter::hasSuffix(const QString &text) const
+{
+    const int begin = m_fileNames.isEmpty() ? -1 : int(text.indexOf(m_fileNames));
+    if (begin < 0)
+        return false;
+    const QStringView next = QStringView(text).mid(begin + m_fileNames.size(), 1);
+    return next.isEmpty() || next == QLatin1String(",") || next == QLatin1String("\n");
+}
+
 // What is found there begins with the first text, and a line feed behind that.
 int ChoiceFilter::rank(int row) const
 {
     const QString &text = m_model->searched(row);
     if (m_beginning.isEmpty() || !text.startsWith(m_beginning))
-        return 2;
+        return hasSuffix(text) ? 2 : 3;
     return QStringView(text).mid(m_beginning.size(), 1) == QLatin1String("\n") ? 0 : 1;
 }
 

@@ -11,7 +11,8 @@ namespace VelUI {
 class ChoiceModel;
 
 /// The choices that hold what a user typed. First those that were chosen from the beginning, then
-/// group by group, by their first text: before the others the ones that it begins.
+/// group by group, by their first text: before the others the ones that it begins, then those of files
+/// that usually have the suffix that was typed.
 class ChoiceFilter : public QSortFilterProxyModel
 {
     Q_OBJECT
@@ -30,11 +31,13 @@ protected:
     bool lessThan(const QModelIndex &left, const QModelIndex &right) const override;
 
 private:
+    bool hasSuffix(const QString &text) const;
     int rank(int row) const;
 
     const ChoiceModel *const m_model;
     QStringList m_words;
     QString m_beginning; // typed, folded
+    QString m_fileNames; // how the text of their pattern begins, if a suffix was typed
     QCollator m_collator;
 };
 
