@@ -192,13 +192,16 @@ void MenuDeletion::removeForGood(Outcome *outcome)
     {
         FileWork work = deletingFiles(m_view);
         for (const QString &path : paths) {
+            const QString name = m_history.nameOf(path);
             const TreeRemoval::Result result =
                 TreeRemoval::remove(QFile::encodeName(path).toStdString(), work);
             // Of a folder some may have gone.
             outcome->isChanged = outcome->isChanged || !OnDisk::exists(path) || QFileInfo(path).isDir();
             outcome->isCanceled = result.error == std::errc::operation_canceled;
-            if (outcome->isCanceled)
+            if (outcome->isCanceled) {
+                outcome->begun = {path, name};
                 break;
+            }
             if (!result.succeeded())
                 outcome->complaints.append(complaint(QFile::decodeName(result.path.c_str()), result.error));
         }
@@ -228,7 +231,7 @@ void MenuDeletion::tellWhatStays(const QStringList &paths, const Outcome &outcom
     if (!outcome.complaints.isEmpty())
         texts.append(FewLines::of(outcome.complaints));
     if (outcome.isCanceled)
-        texts.append(canceledText(paths));
+        texts.append(canceledText(paths, outcome));
     texts.removeAll(QString());
     if (!texts.isEmpty())
         m_voice.tell(texts.join(QLatin1Char('\n')),
@@ -236,12 +239,12 @@ void MenuDeletion::tellWhatStays(const QStringList &paths, const Outcome &outcom
                      m_view->currentIndex(), outcome.subject);
 }
 
-QString MenuDeletion::canceledText(const QStringList &paths) const
+QString MenuDeletion::canceledText(const QStringList &paths, const Outcome &outcome) const
 {
     QStringList names;
     for (const QString &path : paths) {
         if (OnDisk::exists(path))
-            names.append(m_history.nameOf(path));
+            names.append(path == outcome.begun.path ? outcome.begun.name : m_history.nameOf(path));
     }
     if (names.isEmpty())
         return {};

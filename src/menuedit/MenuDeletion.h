@@ -36,12 +36,20 @@ Q_SIGNALS:
     void changed();
 
 private:
+    /// What was to be removed when the user ended it. A folder may have lost the file that names it.
+    struct Begun
+    {
+        QString path;
+        QString name; ///< by which the user knows it
+    };
+
     struct Outcome
     {
         void refuse(const QString &path);
 
         QStringList untrashed; ///< what cannot be put into the trash
         QStringList complaints; ///< what cannot be deleted, and why
+        Begun begun;
         bool isCanceled = false;
         bool isChanged = false;
         MenuVoice::Subject subject = MenuVoice::Subject::Other; ///< of what is told in the end
@@ -53,7 +61,7 @@ private:
     void forget(const QStringList &paths);
     void selectWhatStays(const QStringList &paths);
     void tellWhatStays(const QStringList &paths, const Outcome &outcome);
-    QString canceledText(const QStringList &paths) const;
+    QString canceledText(const QStringList &paths, const Outcome &outcome) const;
 
     QTreeView *const m_view;
     const ShownMenu &m_menu;

@@ -372,7 +372,7 @@ void tst_LongTransfers::tellsWhatStaysOfSeveral()
     QTRY_COMPARE_WITH_TIMEOUT(told.count(), 1, 30000);
     QVERIFY(wasCanceled);
     QCOMPARE(told.constFirst().at(0).toString(),
-             QStringLiteral("The deletion was canceled. Still there, in whole or in part: sub, A, Z."));
+             QStringLiteral("The deletion was canceled. Still there, in whole or in part: Sub, A, Z."));
     QCOMPARE(told.constFirst().at(1).toInt(), 1);
     const int left = everythingIn(m_sub).size();
     QVERIFY2(left > 0 && left < Files, qPrintable(QString::number(left)));
