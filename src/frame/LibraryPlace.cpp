@@ -53,16 +53,18 @@ QString LibraryPlace::catalogs()
     return beside(VEL_CATALOGS_FROM_LIBRARY);
 }
 
-// Where nothing is installed, a build say, there are no pictures, and PATH alone says which programs are
-// the desktop's.
-static bool isInstalled()
+// Its catalogs come with the library wherever it is installed. A build has them, too, but there PATH alone
+// says which programs are the desktop's.
+static bool isInstalled(const QString &programs)
 {
-    return QFileInfo(LibraryPlace::catalogs() + QLatin1String("/../pixmaps")).isDir();
+    return QFileInfo(LibraryPlace::catalogs()).isDir()
+        && !QFileInfo::exists(programs + QLatin1String("/../CMakeCache.txt"));
 }
 
 static QString programs()
 {
-    return isInstalled() ? beside(VEL_PROGRAMS_FROM_LIBRARY) : QString();
+    const QString folder = beside(VEL_PROGRAMS_FROM_LIBRARY);
+    return isInstalled(folder) ? folder : QString();
 }
 
 #endif
