@@ -26,6 +26,11 @@ QString LibraryPlace::catalogs()
     return QStringLiteral(":/vel/translations");
 }
 
+QString LibraryPlace::icons()
+{
+    return {};
+}
+
 static QString programs()
 {
     return QCoreApplication::applicationDirPath();
@@ -51,6 +56,11 @@ static QString beside(const char *relative)
 QString LibraryPlace::catalogs()
 {
     return beside(VEL_CATALOGS_FROM_LIBRARY);
+}
+
+QString LibraryPlace::icons()
+{
+    return beside(VEL_ICONS_FROM_LIBRARY);
 }
 
 // Its catalogs come with the library wherever it is installed. A build has them, too, but there PATH alone

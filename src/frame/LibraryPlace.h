@@ -15,6 +15,10 @@ namespace LibraryPlace {
 /// the library cannot tell where it lies.
 QString catalogs();
 
+/// The folder of the icon themes that came with the library; it need not exist. Empty where the library
+/// cannot tell where it lies, and for a static one.
+QString icons();
+
 /// How the desktop's program \a name is started: by its name where PATH has it, else by its path
 /// where it was installed with the library, else by its name.
 QString program(const QString &name);

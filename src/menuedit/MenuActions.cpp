@@ -8,6 +8,8 @@
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
 
+#include <frame/OwnIcon.h>
+
 #include <QAction>
 #include <QCoreApplication>
 #include <QFileInfo>
@@ -170,8 +172,8 @@ MenuActions::~MenuActions() = default;
 void MenuActions::add(QWidget *view, Action which)
 {
     const Description &description = Descriptions[which];
-    const QLatin1String icon(description.icon);
-    QAction *action = m_menu->addAction(icon.isEmpty() ? QIcon() : QIcon::fromTheme(icon),
+    const QString icon = QLatin1String(description.icon);
+    QAction *action = m_menu->addAction(icon.isEmpty() ? QIcon() : OwnIcon::named(icon),
                                         QCoreApplication::translate("VelMenuView", description.text));
     action->setObjectName(QLatin1String(description.name));
     action->setShortcut(keyOf(which));

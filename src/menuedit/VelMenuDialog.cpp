@@ -12,6 +12,7 @@
 #include <frame/DialogSize.h>
 #include <frame/EntryPath.h>
 #include <frame/MessageBox.h>
+#include <frame/OwnIcon.h>
 
 #include <velintegration/help.h>
 
@@ -180,7 +181,7 @@ VelMenuDialog::VelMenuDialog(const QString &dir, int iconSize, bool editable, bo
                 [this](const QModelIndex &shown) { d->pick(shown); });
     d->connectButtons();
     setWindowTitle(d->title());
-    setWindowIcon(QIcon::fromTheme(QStringLiteral("velmenuedit")));
+    setWindowIcon(OwnIcon::named(QStringLiteral("velmenuedit")));
     DialogSize::restore(*this, sizeGroup(), QSize(400, 480));
 }
 

@@ -11,6 +11,11 @@ Q_DECL_EXPORT void placeOfProgram(const QString *name, QString *found)
     *found = LibraryPlace::program(*name);
 }
 
+Q_DECL_EXPORT void placeOfIcons(QString *found)
+{
+    *found = LibraryPlace::icons();
+}
+
 Q_DECL_EXPORT void placeOfCatalogs(QString *found)
 {
     *found = LibraryPlace::catalogs();

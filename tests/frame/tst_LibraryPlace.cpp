@@ -24,13 +24,14 @@ private Q_SLOTS:
     void startsNothingFromABuild();
     void startsNothingBesideALibraryThatIsAlone();
     void seesTheCatalogsOfTheLibrarysPrefix();
+    void seesTheIconsOfTheLibrarysPrefix();
     void followsALinkToTheLibrary();
 
 private:
     /// Copies the library into the prefix, and links it at \a link if that is given; loads what came last.
     void install(const QString &link = QString());
     QString program() const;
-    QString catalogs() const;
+    QString folder(const char *function) const;
     void addProgram(const QString &name, bool isExecutable = true);
 
     QByteArray m_path;
@@ -78,10 +79,10 @@ QString tst_LibraryPlace::program() const
     return found;
 }
 
-QString tst_LibraryPlace::catalogs() const
+QString tst_LibraryPlace::folder(const char *function) const
 {
     QString found;
-    reinterpret_cast<void (*)(QString *)>(m_library->resolve("placeOfCatalogs"))(&found);
+    reinterpret_cast<void (*)(QString *)>(m_library->resolve(function))(&found);
     return found;
 }
 
@@ -139,7 +140,13 @@ void tst_LibraryPlace::startsNothingBesideALibraryThatIsAlone()
 void tst_LibraryPlace::seesTheCatalogsOfTheLibrarysPrefix()
 {
     install();
-    QCOMPARE(catalogs(), path(QStringLiteral("prefix/share/translations")));
+    QCOMPARE(folder("placeOfCatalogs"), path(QStringLiteral("prefix/share/translations")));
+}
+
+void tst_LibraryPlace::seesTheIconsOfTheLibrarysPrefix()
+{
+    install();
+    QCOMPARE(folder("placeOfIcons"), path(QStringLiteral("prefix/share/icons")));
 }
 
 void tst_LibraryPlace::followsALinkToTheLibrary()
