@@ -32,8 +32,8 @@ bool isComplete(const QAbstractItemModel &model, const QModelIndex &root,
 }
 
 // Shows the tree until it has settled; opens the folders as soon as they are all there.
-double settle(ShownTree &tree, const QAbstractItemModel &model, const std::function<QModelIndex()> &root,
-              const MenuOpening::Directory &directory)
+MenuOpening::Times measure(ShownTree &tree, const QAbstractItemModel &model,
+                           const std::function<QModelIndex()> &root, const MenuOpening::Directory &directory)
 {
     tree.watch(&model);
     tree.show();
@@ -42,7 +42,16 @@ double settle(ShownTree &tree, const QAbstractItemModel &model, const std::funct
         for (int row = 0; row < directory.rows; ++row)
             tree.expand(model.index(row, 0, root()));
     }
-    return tree.settle([&] { return isComplete(model, root(), directory); });
+    const double time = tree.settle([&] { return isComplete(model, root(), directory); });
+    const double memory = MenuOpening::ownMemory();
+    tree.setModel(nullptr);
+    return {time, tree.longestFreeze(), memory};
+}
+
+void showNamesAlone(ShownTree &tree, const QAbstractItemModel &model)
+{
+    for (int column = 1; column < model.columnCount(); ++column)
+        tree.hideColumn(column);
 }
 
 } // namespace
@@ -68,10 +77,7 @@ MenuOpening::Times MenuOpening::menu(const Directory &directory)
     const auto root = [&] { return proxy.mapFromSource(model.index(directory.path)); };
     tree.setRootIndex(root());
     tree.setSortingEnabled(true);
-    const double time = settle(tree, proxy, root, directory);
-    const double memory = ownMemory();
-    tree.setModel(nullptr);
-    return {time, tree.longestFreeze(), memory};
+    return measure(tree, proxy, root, directory);
 }
 
 MenuOpening::Times MenuOpening::plain(const Directory &directory)
@@ -83,12 +89,8 @@ MenuOpening::Times MenuOpening::plain(const Directory &directory)
     tree.setModel(&model);
     const auto root = [&] { return model.index(directory.path); };
     tree.setRootIndex(root());
-    for (int column = 1; column < model.columnCount(); ++column)
-        tree.hideColumn(column);
-    const double time = settle(tree, model, root, directory);
-    const double memory = ownMemory();
-    tree.setModel(nullptr);
-    return {time, tree.longestFreeze(), memory};
+    showNamesAlone(tree, model);
+    return measure(tree, model, root, directory);
 }
 
 MenuOpening::Times MenuOpening::kDirModel(const Directory &directory)
@@ -101,13 +103,9 @@ MenuOpening::Times MenuOpening::kDirModel(const Directory &directory)
     proxy.setSourceModel(&model);
     proxy.sort(0);
     tree.setModel(&proxy);
-    for (int column = 1; column < proxy.columnCount(); ++column)
-        tree.hideColumn(column);
+    showNamesAlone(tree, proxy);
     // Without Reload it would show what it has kept from the round before.
     model.openUrl(QUrl::fromLocalFile(directory.path), KDirModel::Reload);
-    const double time = settle(
+    return measure(
         tree, proxy, [] { return QModelIndex(); }, directory);
-    const double memory = ownMemory();
-    tree.setModel(nullptr);
-    return {time, tree.longestFreeze(), memory};
 }

@@ -99,6 +99,19 @@ bool measureFind(const char *title, const QString &menu)
     return report("longest freeze", freezes, MostFreeze) && isSoon;
 }
 
+// In each round the menu is shown anew, with assistance.
+void inEachRound(const QString &menu, const std::function<void(VelMenuView *)> &use)
+{
+    for (int round = 0; round < Rounds; ++round) {
+        VelMenuView view(menu, -1, true);
+        view.setAssistance(true);
+        view.resize(400, 480);
+        view.show();
+        settle(1500);
+        use(&view);
+    }
+}
+
 // One key after the other, as somebody types and deletes again.
 bool measureFilter(const char *title, const QString &menu)
 {
@@ -106,24 +119,19 @@ bool measureFilter(const char *title, const QString &menu)
     std::vector<double> first;
     std::vector<double> keys;
     std::vector<double> freezes;
-    for (int round = 0; round < Rounds; ++round) {
-        VelMenuView view(menu, -1, true);
-        view.setAssistance(true);
-        view.resize(400, 480);
-        view.show();
-        settle(1500);
+    inEachRound(menu, [&](VelMenuView *view) {
         const QString text = QStringLiteral("entry 123");
         FreezeMeter meter;
         for (int length = 1; length <= 2 * text.size(); ++length) {
             const double before = FreezeMeter::processorMilliseconds();
-            view.setFilter(text.left(length <= text.size() ? length : 2 * text.size() - length));
+            view->setFilter(text.left(length <= text.size() ? length : 2 * text.size() - length));
             // Until it is painted, too.
             QCoreApplication::processEvents();
             (length == 1 ? first : keys).push_back(FreezeMeter::processorMilliseconds() - before);
             settle(length == 1 ? 1500 : 100);
         }
         freezes.push_back(meter.longest());
-    }
+    });
     const bool isFirstSoon = report("first key, menu not read yet", first, MostKey);
     const bool isSoon = report("each further key", keys, MostKey);
     return report("longest freeze", freezes, MostFreeze) && isFirstSoon && isSoon;
@@ -177,15 +185,10 @@ bool measureSeveral(const char *title, const QString &menu)
 {
     std::printf("%s\n", title);
     std::map<std::string, std::vector<double>> times;
-    for (int round = 0; round < Rounds; ++round) {
-        VelMenuView view(menu, -1, true);
-        view.setAssistance(true);
-        view.resize(400, 480);
-        view.show();
-        settle(1500);
+    inEachRound(menu, [&](VelMenuView *view) {
         Course course(&times);
-        useSeveral(&view, &course);
-    }
+        useSeveral(view, &course);
+    });
     bool kept = true;
     for (const auto &[what, freezes] : times)
         kept = report(("longest freeze: " + what).c_str(), freezes, MostFreeze) && kept;
