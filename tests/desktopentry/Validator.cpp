@@ -63,6 +63,7 @@ constexpr Meaning Meanings[] = {
     {"for key \"(?<key>Encoding)\" in group .*is not a registered encoding", EntryProblem::UnknownEncoding},
     {"for key \"(?<key>Icon.*)\" in group .*is an icon name with an extension", EntryProblem::IconSuffix},
     {"for key \"(?<key>Icon.*)\" in group .*looks like a relative path", EntryProblem::RelativeIcon},
+    {"for key \"(?<key>Icon.*)\" in group .*is an absolute path to a directory", EntryProblem::MissingIcon},
     {"for key \"(?<key>.*)\" in group .*does not look like an absolute path", EntryProblem::RelativePath},
     {"^DBusActivatable filename must conform", EntryProblem::UnusableBusName},
     {"for key \"(?<key>AutostartCondition)\" in group", EntryProblem::InvalidCondition},

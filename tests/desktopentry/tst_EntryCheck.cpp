@@ -191,6 +191,7 @@ void tst_EntryCheck::finds_data()
     row("relative icon", Application + "Icon=icons/known\n", P::RelativeIcon, error, "Icon");
     row("missing icon", Application + "Icon=unknown\n", P::MissingIcon, warning, "Icon");
     row("missing picture", Application + "Icon=/unknown.png\n", P::MissingIcon, warning, "Icon");
+    row("folder of pictures", Application + "Icon=/pictures/\n", P::MissingIcon, error, "Icon");
     row("relative path", Application + "Path=opt\n", P::RelativePath, warning, "Path");
     row("missing folder", Application + "Path=/nowhere\n", P::MissingFolder, warning, "Path");
     row("no scheme", Link + "www.example.org\n", P::MissingScheme, warning, "URL");

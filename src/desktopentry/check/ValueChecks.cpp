@@ -188,8 +188,10 @@ void ValueChecks::checkIcon(const CheckedEntry &entry, const CheckedValue &value
 {
     const QString name = value.text();
     if (name.startsWith(QLatin1Char('/'))) {
-        if (entry.lookups.icon(name) == Answer::No)
-            value.add(EntryProblem::MissingIcon, EntryFinding::Warning,
+        // Where there is none, there may be one some day; a folder is never one.
+        const bool isFolder = name.endsWith(QLatin1Char('/'));
+        if (isFolder || entry.lookups.icon(name) == Answer::No)
+            value.add(EntryProblem::MissingIcon, isFolder ? EntryFinding::Error : EntryFinding::Warning,
                       Text::tr("There is no picture '%1'.").arg(name));
     } else if (name.contains(QLatin1Char('/'))) {
         addRelative(EntryProblem::RelativeIcon, EntryFinding::Error,
