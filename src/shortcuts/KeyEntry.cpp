@@ -24,11 +24,11 @@ KeyEntry::KeyEntry(QDialog *dialog, const EditShortcutsForm &form, ShortcutsMode
     , m_message(dialog)
 {
     connect(form.keyWidget, &QKeySequenceEdit::keySequenceChanged, this, [this](const QKeySequence &key) {
-        if (!hold(key))
+        if (!isEcho(key) && !hold(key))
             enter(QKeySequence(key));
     });
     connect(form.keyWidget, &QKeySequenceEdit::editingFinished, this, [this] {
-        if (!m_recording.isHeld())
+        if (m_recording.isActive() && !m_recording.isHeld())
             settle();
     });
     // Meanwhile the host may have given the shortcut another key, or none.
@@ -52,8 +52,15 @@ void KeyEntry::show(const QKeySequence &key)
     if (m_recording.hasChord())
         m_buttons.setRecording(false);
     m_recording.stop();
+    m_settledKey = key;
     const QSignalBlocker blocker(m_form.keyWidget);
     m_form.keyWidget->setKeySequence(key);
+}
+
+// Qt 6 announces what stands in the field whenever it is left, also when nothing was recorded.
+bool KeyEntry::isEcho(const QKeySequence &key) const
+{
+    return !m_recording.isActive() && key == m_settledKey;
 }
 
 bool KeyEntry::watch(const QEvent &event)
@@ -62,8 +69,13 @@ bool KeyEntry::watch(const QEvent &event)
         dropWhatIsNoKey();
         return record(static_cast<const QKeyEvent &>(event));
     }
-    if (event.type() == QEvent::FocusOut)
-        leaveField(static_cast<const QFocusEvent &>(event).reason());
+    if (event.type() != QEvent::FocusOut)
+        return false;
+    const Qt::FocusReason reason = static_cast<const QFocusEvent &>(event).reason();
+    // The recording goes on beside a menu, but the field of Qt 6.4 would end it.
+    if (reason == Qt::PopupFocusReason)
+        return m_recording.isActive();
+    leaveField(reason);
     return false;
 }
 
@@ -85,8 +97,6 @@ void KeyEntry::dropWhatIsNoKey()
 // to Ok.
 void KeyEntry::leaveField(Qt::FocusReason reason)
 {
-    if (reason == Qt::PopupFocusReason)
-        return;
     if (m_assistance && (m_assistance->hasFocus() || reason == Qt::ActiveWindowFocusReason))
         pause();
     else
@@ -160,6 +170,7 @@ void KeyEntry::enter(const QKeySequence &key)
 void KeyEntry::finish(const QKeySequence &key)
 {
     m_recording.stop();
+    m_settledKey = key;
     const bool isTaken = m_model && key != m_form.treeView->currentKeySequence() && take(key);
     m_buttons.setRecording(false);
     if (!isTaken)

@@ -63,6 +63,7 @@ Q_SIGNALS:
     void entered(const QKeySequence &key);
 
 private:
+    bool isEcho(const QKeySequence &key) const;
     bool record(const QKeyEvent &event);
     void dropWhatIsNoKey();
     void leaveField(Qt::FocusReason reason);
@@ -79,6 +80,7 @@ private:
     const QPointer<ShortcutsModel> m_model;
     const KeyAssistance *m_assistance = nullptr;
     KeyRecording m_recording;
+    QKeySequence m_settledKey; // the last one that was shown or decided about
     ChangeButtons m_buttons;
     ConflictMessage m_message;
 };

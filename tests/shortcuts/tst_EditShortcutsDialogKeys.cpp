@@ -30,6 +30,8 @@ private Q_SLOTS:
     void takesAnEmptyKeyAfterARecording();
     void takesAnEmptyKeyAfterTheHostChangedTheKey();
     void goesFromFieldToFieldWithTab();
+    void keepsTheKeyWhenAnEmptyFieldIsLeft_data();
+    void keepsTheKeyWhenAnEmptyFieldIsLeft();
     void confirmsWithReturn();
 
 private:
@@ -263,6 +265,29 @@ void tst_EditShortcutsDialogKeys::goesFromFieldToFieldWithTab()
     // A programmatic empty key counts although Tab was pressed.
     keyWidget()->clear();
     QVERIFY(pendingKey("open").isEmpty());
+}
+
+void tst_EditShortcutsDialogKeys::keepsTheKeyWhenAnEmptyFieldIsLeft_data()
+{
+    QTest::addColumn<bool>("isModifierPressed");
+    QTest::newRow("untouched") << false;
+    QTest::newRow("after a modifier") << true;
+}
+
+// The field is empty while the default key is the pending one.
+void tst_EditShortcutsDialogKeys::keepsTheKeyWhenAnEmptyFieldIsLeft()
+{
+    QFETCH(bool, isModifierPressed);
+    m_model->restoreDefaults();
+    const QKeySequence key = pendingKey("save");
+    QVERIFY(!key.isEmpty());
+    record("save");
+    QVERIFY(keyWidget()->keySequence().isEmpty());
+    if (isModifierPressed)
+        press(Qt::Key_Control);
+    tree()->setFocus();
+    QCOMPARE(pendingKey("save"), key);
+    QVERIFY(!isChanged());
 }
 
 void tst_EditShortcutsDialogKeys::confirmsWithReturn()
