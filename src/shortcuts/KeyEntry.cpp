@@ -81,9 +81,22 @@ bool KeyEntry::watch(const QEvent &event)
 
 bool KeyEntry::record(const QKeyEvent &event)
 {
+    if (event.type() == QEvent::KeyPress && KeyRecording::movesTheFocus(event)
+        && event.modifiers() != Qt::NoModifier) {
+        moveFocus(event);
+        return true;
+    }
     const bool isWithheld = m_recording.withholds(event);
     m_buttons.setRecording(m_recording.hasChord());
     return isWithheld;
+}
+
+// Since Qt 6.5 the field would record such a key unless it comes without modifiers.
+void KeyEntry::moveFocus(const QKeyEvent &event)
+{
+    const bool isBack = event.key() == Qt::Key_Backtab || (event.modifiers() & Qt::ShiftModifier);
+    QKeyEvent bare(QEvent::KeyPress, isBack ? Qt::Key_Backtab : Qt::Key_Tab, Qt::NoModifier);
+    QCoreApplication::sendEvent(m_form.keyWidget, &bare);
 }
 
 // With Shift the field takes what the key gives without it, which may be a dead key.

@@ -65,6 +65,7 @@ Q_SIGNALS:
 private:
     bool isEcho(const QKeySequence &key) const;
     bool record(const QKeyEvent &event);
+    void moveFocus(const QKeyEvent &event);
     void dropWhatIsNoKey();
     void leaveField(Qt::FocusReason reason);
     void leave(Qt::FocusReason reason);

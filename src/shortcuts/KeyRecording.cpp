@@ -7,16 +7,11 @@
 
 #include <QKeyEvent>
 
-namespace {
-
-// The key editor is left with these.
-bool movesTheFocus(const QKeyEvent &event)
+bool KeyRecording::movesTheFocus(const QKeyEvent &event)
 {
     return (event.key() == Qt::Key_Tab || event.key() == Qt::Key_Backtab)
         && !(event.modifiers() & (Qt::ControlModifier | Qt::AltModifier));
 }
-
-} // namespace
 
 bool KeyRecording::withholds(const QKeyEvent &event)
 {

@@ -16,6 +16,8 @@ class KeyRecording
 public:
     /// Takes note of a key event; tells whether the key editor must not see it.
     bool withholds(const QKeyEvent &event);
+    /// Whether a key moves the focus, as in every widget: the key editor is left with it.
+    static bool movesTheFocus(const QKeyEvent &event);
 
     /// Whether a key was pressed. An empty key that the editor announces meanwhile is no key
     /// that the user chose.

@@ -30,6 +30,8 @@ private Q_SLOTS:
     void takesAnEmptyKeyAfterARecording();
     void takesAnEmptyKeyAfterTheHostChangedTheKey();
     void goesFromFieldToFieldWithTab();
+    void leavesTheFieldByTabWithModifiers_data();
+    void leavesTheFieldByTabWithModifiers();
     void keepsTheKeyWhenAnEmptyFieldIsLeft_data();
     void keepsTheKeyWhenAnEmptyFieldIsLeft();
     void confirmsWithReturn();
@@ -265,6 +267,35 @@ void tst_EditShortcutsDialogKeys::goesFromFieldToFieldWithTab()
     // A programmatic empty key counts although Tab was pressed.
     keyWidget()->clear();
     QVERIFY(pendingKey("open").isEmpty());
+}
+
+void tst_EditShortcutsDialogKeys::leavesTheFieldByTabWithModifiers_data()
+{
+    QTest::addColumn<int>("key");
+    QTest::addColumn<int>("modifiers");
+    QTest::addColumn<bool>("isBack");
+    QTest::newRow("Shift+Tab of a keyboard") << int(Qt::Key_Backtab) << int(Qt::ShiftModifier) << true;
+    QTest::newRow("Shift+Tab") << int(Qt::Key_Tab) << int(Qt::ShiftModifier) << true;
+    QTest::newRow("Backtab") << int(Qt::Key_Backtab) << int(Qt::NoModifier) << true;
+    QTest::newRow("Meta+Tab") << int(Qt::Key_Tab) << int(Qt::MetaModifier) << false;
+    QTest::newRow("Tab in the second group") << int(Qt::Key_Tab) << int(Qt::GroupSwitchModifier) << false;
+}
+
+void tst_EditShortcutsDialogKeys::leavesTheFieldByTabWithModifiers()
+{
+    QFETCH(int, key);
+    QFETCH(int, modifiers);
+    QFETCH(bool, isBack);
+    for (const bool isRecorded : {false, true}) {
+        m_model->setKeySequence(row("open"), f9);
+        record("open");
+        if (isRecorded)
+            press(Qt::Key_F8);
+        press(key, Qt::KeyboardModifiers(modifiers));
+        QVERIFY(!keyWidget()->hasFocus());
+        QCOMPARE(customButton()->hasFocus(), isBack);
+        QCOMPARE(pendingKey("open"), isRecorded ? QKeySequence(Qt::Key_F8) : f9);
+    }
 }
 
 void tst_EditShortcutsDialogKeys::keepsTheKeyWhenAnEmptyFieldIsLeft_data()
