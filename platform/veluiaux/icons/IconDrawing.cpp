@@ -7,17 +7,17 @@
 #include "QtMajor.h"
 
 #include <QBuffer>
-#include <QGuiApplication>
 #include <QImageReader>
 #include <QPainter>
 #include <QtMath>
 
 namespace {
 
-/// The pixel ratio at which QIcon::pixmap() makes its pixmaps.
-qreal ratioOfQt()
+// The logical edge that comes to that many pixels, or else to as many as are left of them.
+int logicalEdge(int pixels, qreal ratio)
 {
-    return QtMajor::hasHighDpiPixmaps() ? qGuiApp->devicePixelRatio() : 1.0;
+    const int edge = qRound(pixels / ratio);
+    return qRound(edge * ratio) > pixels ? qFloor(pixels / ratio) : edge;
 }
 
 QPixmap fitted(const QPixmap &pixmap, const QSize &pixels, IconDrawing::Fit fit)
@@ -29,19 +29,17 @@ QPixmap fitted(const QPixmap &pixmap, const QSize &pixels, IconDrawing::Fit fit)
 
 } // namespace
 
-IconDrawing::Request IconDrawing::request(const QSize &pixels)
+IconDrawing::Request IconDrawing::request(const QSize &pixels, qreal ratio)
 {
-    // Asked for a logical size, QIcon multiplies it by its own ratio.
-    const qreal ratio = ratioOfQt();
-    return {QSize(qFloor(pixels.width() / ratio), qFloor(pixels.height() / ratio)), qCeil(ratio)};
+    const QSize size(logicalEdge(pixels.width(), ratio), logicalEdge(pixels.height(), ratio));
+    return {size, ratio, QtMajor::sizeOfFile(size, ratio), qCeil(ratio)};
 }
 
-QPixmap IconDrawing::pixmap(const QIcon &icon, const QSize &pixels, Fit fit, QIcon::Mode mode,
+QPixmap IconDrawing::pixmap(const QIcon &icon, const QSize &pixels, qreal ratio, Fit fit, QIcon::Mode mode,
                             QIcon::State state)
 {
-    QPixmap pixmap = icon.pixmap(request(pixels).size, mode, state);
-    pixmap.setDevicePixelRatio(1);
-    return fitted(pixmap, pixels, fit);
+    // Another ratio would have it copied, in vain where QIcon sets the same one again.
+    return fitted(QtMajor::pixmap(icon, request(pixels, ratio).size, ratio, mode, state), pixels, fit);
 }
 
 // QIcon parses a drawing when it is made, and once more for each pixmap.
@@ -58,11 +56,12 @@ QPixmap IconDrawing::drawing(const QByteArray &bytes, const QSize &pixels, Fit f
     if (size.isEmpty())
         return QPixmap();
     reader.setScaledSize(size);
-    return fitted(QPixmap::fromImage(reader.read()), pixels, fit);
+    return fitted(QPixmap::fromImage(reader.read(), QtMajor::flagsOfDrawings()), pixels, fit);
 }
 
 void IconDrawing::overlayEmblems(QPixmap &pixmap, const QMap<Qt::Corner, QPixmap> &emblems, qreal ratio)
 {
+    pixmap.setDevicePixelRatio(1);
     QPainter painter(&pixmap);
     for (auto it = emblems.cbegin(); it != emblems.cend(); ++it) {
         const QRect square = EmblemLayout::square(pixmap.size(), ratio, it.key());
@@ -70,4 +69,6 @@ void IconDrawing::overlayEmblems(QPixmap &pixmap, const QMap<Qt::Corner, QPixmap
         emblem.setDevicePixelRatio(1);
         painter.drawPixmap(EmblemLayout::place(emblem.size(), square, it.key()), emblem);
     }
+    painter.end();
+    pixmap.setDevicePixelRatio(ratio);
 }

@@ -4,6 +4,7 @@
 #include "IconLookup.h"
 
 #include "PictureFile.h"
+#include "QtMajor.h"
 #include "ThemeState.h"
 
 #include <QDataStream>
@@ -12,6 +13,9 @@
 #include <QFileInfo>
 
 #include <algorithm>
+#include <cstring>
+
+#include <link.h>
 
 namespace {
 
@@ -38,16 +42,47 @@ QIcon iconOfFile(const QString &path)
     return icon;
 }
 
-// The platform's own theme may have its own way to find files.
-bool isFoundByQt(const QIcon &icon)
+int addPlatformTheme(dl_phdr_info *library, size_t, void *)
 {
+    return std::strstr(library->dlpi_name, "/platformthemes/") ? 1 : 0; // other than 0 ends the search
+}
+
+bool isPlatformThemeOfAPlugin()
+{
+    static const bool isLoaded = dl_iterate_phdr(&addPlatformTheme, nullptr) != 0;
+    return isLoaded;
+}
+
+bool isUnsorted(const ThemeFiles::File &file)
+{
+    return file.folder.kind == ThemeFolder::Kind::Unsorted;
+}
+
+// Since Qt 6 does not say who finds the files, it is another one unless all of it shows that it is not.
+bool isAsFoundByQt(const QIcon &icon, const QVector<ThemeFiles::File> &files)
+{
+    if (isPlatformThemeOfAPlugin() || std::any_of(files.cbegin(), files.cend(), isUnsorted))
+        return false;
+    const QList<QSize> sizes = icon.availableSizes();
+    const auto isSame = [](const ThemeFiles::File &file, const QSize &size) {
+        return QSize(file.folder.size, file.folder.size) == size;
+    };
+    return std::equal(files.cbegin(), files.cend(), sizes.cbegin(), sizes.cend(), isSame);
+}
+
+// The platform's own theme may have its own way to find files.
+bool isFoundByQt(const QIcon &icon, const QVector<ThemeFiles::File> &files)
+{
+    if (!QtMajor::areThemeRulesKnown())
+        return false;
     QByteArray bytes;
     QDataStream out(&bytes, QIODevice::WriteOnly);
     out << icon;
     QDataStream in(bytes);
     QString engine;
     in >> engine;
-    return engine == QLatin1String("QIconLoaderEngine");
+    return engine == QLatin1String("QIconLoaderEngine")
+        || (engine == QLatin1String("QThemeIconEngine") && isAsFoundByQt(icon, files));
 }
 
 bool isSafe(const ThemeFiles::File &file)
@@ -56,27 +91,36 @@ bool isSafe(const ThemeFiles::File &file)
 }
 
 // The same for all icons, so that one has to be made to tell.
-bool isQtTheFinder(const QString &nameOfOne)
+bool isQtTheFinder(const QString &nameOfOne, const QVector<ThemeFiles::File> &files)
 {
     static quint64 generation = 0;
-    static bool isQt = false;
     if (generation == ThemeState::generation())
-        return isQt;
+        return true;
     const QIcon icon = QIcon::fromTheme(nameOfOne);
-    if (icon.isNull())
+    if (icon.isNull() || !isFoundByQt(icon, files))
         return false;
-    isQt = isFoundByQt(icon);
     generation = ThemeState::generation();
-    return isQt;
+    return true;
+}
+
+// Where it is not sure how Qt looks for files, those of any way are what it may take.
+QVector<ThemeFiles::File> filesThatQtMayTake(const QString &name)
+{
+    QVector<ThemeFiles::File> files = ThemeFiles::find(name);
+    if (!QtMajor::areThemeRulesKnown()) {
+        files += ThemeFiles::find(name, QtMajor::ThemeRules::NamesFirst);
+        files += ThemeFiles::find(name, QtMajor::ThemeRules::ParentsFirst);
+    }
+    return files;
 }
 
 IconLookup::Found iconOfTheme(const QString &name)
 {
     IconLookup::Found found;
-    found.files = ThemeFiles::find(name);
+    found.files = filesThatQtMayTake(name);
     found.themeName = name;
-    found.isChosenByQt = !found.files.isEmpty() && isQtTheFinder(name);
-    if (found.isChosenByQt && found.files.constFirst().folder.kind != ThemeFolder::Kind::Unsorted)
+    found.isChosenByQt = !found.files.isEmpty() && isQtTheFinder(name, found.files);
+    if (found.isOfFiles())
         return found;
     // To tell the sizes of such a one, the file itself is read.
     if (!std::all_of(found.files.cbegin(), found.files.cend(), isSafe))
@@ -93,6 +137,23 @@ bool IconLookup::Found::mayBeDrawn(const QSize &size, int scale) const
         return std::all_of(files.cbegin(), files.cend(), isSafe);
     const ThemeFiles::File *const file = ThemeFiles::forSize(files, size, scale);
     return !file || isSafe(*file);
+}
+
+bool IconLookup::Found::isOfFiles() const
+{
+    return isChosenByQt && !files.isEmpty() && !isUnsorted(files.constFirst());
+}
+
+std::optional<QSize> IconLookup::Found::actualSize(const QSize &size) const
+{
+    const ThemeFiles::File *const file = isOfFiles() ? ThemeFiles::forSize(files, size) : nullptr;
+    if (!file)
+        return std::nullopt;
+    if (file->folder.kind == ThemeFolder::Kind::Scalable)
+        return size;
+    const int edge = QtMajor::edgeOfFile(file->folder.size, file->folder.scale);
+    const int least = std::min({edge, size.width(), size.height()});
+    return QSize(least, least);
 }
 
 const ThemeFiles::File *IconLookup::Found::drawing(const QSize &size) const

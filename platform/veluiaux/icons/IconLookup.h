@@ -9,6 +9,8 @@
 #include <QString>
 #include <QVector>
 
+#include <optional>
+
 /// Finds icons by the names that desktop entries use.
 namespace IconLookup {
 
@@ -24,6 +26,12 @@ struct Found
     /// Whether the file that is drawn in \a size, in pixels of the ratio \a scale, may be read. Until
     /// then none of the theme's files was looked at.
     bool mayBeDrawn(const QSize &size, int scale) const;
+
+    /// Whether Qt chooses one of its files, each of which a folder of a theme says the size of.
+    bool isOfFiles() const;
+
+    /// The size that Qt says that the icon has where \a size is asked for; none where only the file tells.
+    std::optional<QSize> actualSize(const QSize &size) const;
 
     /// The drawing that Qt takes for \a size at the ratio 1; null where it takes something else.
     const ThemeFiles::File *drawing(const QSize &size) const;

@@ -47,20 +47,22 @@ void LazyIconEngine::lookUp() const
     m_baseGeneration = generation;
 }
 
-QPixmap LazyIconEngine::basePixmap(const QSize &pixels, IconDrawing::Fit fit, QIcon::Mode mode,
+QPixmap LazyIconEngine::basePixmap(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
                                    QIcon::State state) const
 {
     lookUp();
-    const IconDrawing::Request request = IconDrawing::request(pixels);
+    const bool isPainted = fit == IconDrawing::Fit::Exactly && m_base.isOfFiles();
+    const qreal asked = isPainted ? QtMajor::paintedRatio(ratio) : QtMajor::askedRatio(ratio);
+    const IconDrawing::Request request = IconDrawing::request(pixels, asked);
     // Other modes are made by the style, which only QIcon asks.
     const bool isPlain = request.scale == 1 && mode == QIcon::Normal;
     if (const ThemeFiles::File *const file = isPlain ? m_base.drawing(pixels) : nullptr) {
         const auto bytes = PictureFile::readSafeDrawing(file->path);
         return bytes ? IconDrawing::drawing(*bytes, pixels, fit) : QPixmap();
     }
-    if (!m_base.mayBeDrawn(request.size, request.scale))
+    if (!m_base.mayBeDrawn(request.sizeOfFile, request.scale))
         return QPixmap();
-    return IconDrawing::pixmap(base(), pixels, fit, mode, state);
+    return IconDrawing::pixmap(base(), pixels, asked, fit, mode, state);
 }
 
 const QString &LazyIconEngine::baseKey() const
@@ -99,14 +101,13 @@ QPixmap LazyIconEngine::scaledPixmap(const QSize &pixels, qreal ratio, IconDrawi
     QPixmap pixmap;
     if (memory.findPixmap(key, &pixmap))
         return pixmap;
-    pixmap = basePixmap(pixels, fit, mode, state);
+    pixmap = basePixmap(pixels, ratio, fit, mode, state);
     if (pixmap.isNull())
-        pixmap = IconDrawing::pixmap(m_plain, pixels, fit, mode, state);
+        pixmap = IconDrawing::pixmap(m_plain, pixels, QtMajor::askedRatio(ratio), fit, mode, state);
     if (pixmap.isNull())
         return pixmap;
     if (!m_emblems.isEmpty())
         IconDrawing::overlayEmblems(pixmap, emblemPixmaps(pixmap.size(), ratio, mode), ratio);
-    pixmap.setDevicePixelRatio(ratio);
     memory.keepPixmap(key, pixmap);
     return pixmap;
 }
@@ -144,7 +145,10 @@ QSize LazyIconEngine::actualSize(const QSize &size, QIcon::Mode mode, QIcon::Sta
     const QString key = sizedKey(size, mode, state);
     if (const QSize *known = memory.findSize(key))
         return *known;
-    const QSize actual = base().actualSize(size, mode, state);
+    lookUp();
+    // QIcon, which has asked for pixels, would take them for a logical size.
+    const auto ofFiles = QtMajor::ratioOfSizes() > 1 ? m_base.actualSize(size) : std::nullopt;
+    const QSize actual = ofFiles ? *ofFiles : base().actualSize(size, mode, state);
     memory.keepSize(key, actual);
     return actual;
 }
@@ -187,8 +191,8 @@ void LazyIconEngine::virtual_hook(int id, void *data)
         *static_cast<bool *>(data) = isEmpty();
     } else if (id == QIconEngine::ScaledPixmapHook) {
         auto *argument = static_cast<QIconEngine::ScaledPixmapArgument *>(data);
-        argument->pixmap = scaledPixmap(argument->size, argument->scale, IconDrawing::Fit::AtMost,
-                                        argument->mode, argument->state);
+        argument->pixmap = scaledPixmap(QtMajor::pixelsOf(*argument), argument->scale,
+                                        IconDrawing::Fit::AtMost, argument->mode, argument->state);
     } else {
         QIconEngine::virtual_hook(id, data);
     }

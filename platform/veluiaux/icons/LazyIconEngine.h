@@ -39,7 +39,7 @@ protected:
     LazyIconEngine(const LazyIconEngine &other) = default;
 
 private:
-    /// A pixmap for \a pixels, drawn for and with the pixel ratio \a ratio.
+    /// A pixmap for \a pixels, drawn for the pixel ratio \a ratio.
     QPixmap scaledPixmap(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
                          QIcon::State state) const;
     /// The pixmaps of the emblems for a pixmap of \a size; null ones where the theme lacks them.
@@ -49,7 +49,8 @@ private:
     /// Looks up what it is made of, unless that is known for the theme as it is now.
     void lookUp() const;
     /// A pixmap of it; null where the file for it is damaged or too large to be read.
-    QPixmap basePixmap(const QSize &pixels, IconDrawing::Fit fit, QIcon::Mode mode, QIcon::State state) const;
+    QPixmap basePixmap(const QSize &pixels, qreal ratio, IconDrawing::Fit fit, QIcon::Mode mode,
+                       QIcon::State state) const;
     bool isEmpty() const;
     /// Names the parts, without the emblems, for what is remembered.
     const QString &baseKey() const;

@@ -35,6 +35,9 @@ ThemeFolder folderOf(const QSettings &description, const QString &path, int size
     folder.largest = number("MaxSize", size);
     folder.threshold = number("Threshold", 2);
     folder.scale = number("Scale", 1);
+    const QString context = description.value(path + QLatin1String("/Context")).toString();
+    folder.isForWholeNames =
+        context == QLatin1String("Applications") || context == QLatin1String("MimeTypes");
     return folder;
 }
 
@@ -59,10 +62,16 @@ bool ThemeFolder::isFor(int wanted, int wantedScale) const
 
 int ThemeFolder::distanceTo(int wanted, int wantedScale) const
 {
+    const int difference = differenceFrom(wanted, wantedScale);
+    return kind == Kind::Fixed ? std::abs(difference) : difference;
+}
+
+int ThemeFolder::differenceFrom(int wanted, int wantedScale) const
+{
     const int pixels = wanted * wantedScale;
     switch (kind) {
     case Kind::Fixed:
-        return std::abs(size * scale - pixels);
+        return size * scale - pixels;
     case Kind::Scalable:
         if (pixels < smallest * scale)
             return smallest * scale - pixels;
@@ -105,12 +114,23 @@ void ThemeFolders::readDescription(const QString &path)
         if (size != 0)
             m_folders.append(folderOf(description, key.chopped(sizeKey.size()), size));
     }
-    m_parents = description.value(QStringLiteral("Icon Theme/Inherits")).toStringList();
-    m_parents.removeAll(QString());
-    if (m_parents.isEmpty() && !QIcon::fallbackThemeName().isEmpty())
-        m_parents.append(QIcon::fallbackThemeName());
-    if (!m_parents.contains(LastParent))
-        m_parents.append(LastParent);
+    m_inherited = description.value(QStringLiteral("Icon Theme/Inherits")).toStringList();
+    m_inherited.removeAll(QString());
+}
+
+QStringList ThemeFolders::parents(QtMajor::ThemeRules rules) const
+{
+    if (!m_isValid)
+        return {};
+    const bool isOld = rules == QtMajor::ThemeRules::NamesFirst;
+    QStringList parents = m_inherited;
+    if (!QIcon::fallbackThemeName().isEmpty() && (parents.isEmpty() || !isOld))
+        parents.append(QIcon::fallbackThemeName());
+    if (!isOld)
+        parents.removeAll(LastParent);
+    if (!parents.contains(LastParent))
+        parents.append(LastParent);
+    return parents;
 }
 
 QVector<ThemeFolders::Place> ThemeFolders::placesOf(const QString &name) const

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "QtMajor.h"
 #include "ThemeCache.h"
 
 #include <QSize>
@@ -30,9 +31,12 @@ struct ThemeFolder
     int largest = 0;
     int threshold = 2;
     int scale = 1;
+    bool isForWholeNames = false; ///< an icon of a shorter name than the wanted one would be a wrong one
 
     /// Whether its icons are meant for \a size, at the pixel ratio \a scale.
     bool isFor(int size, int scale) const;
+    /// How far from it they are, and for what has but one size, above 0 when they are larger.
+    int differenceFrom(int size, int scale) const;
     /// How far from it they are.
     int distanceTo(int size, int scale) const;
 };
@@ -49,7 +53,7 @@ public:
     /// Whether there is such a theme.
     bool isValid() const { return m_isValid; }
     /// The themes to look at when this one lacks an icon.
-    const QStringList &parents() const { return m_parents; }
+    QStringList parents(QtMajor::ThemeRules rules) const;
 
     /// A folder on disk with its place in the theme.
     struct Place
@@ -72,5 +76,5 @@ private:
     bool m_isValid = false;
     std::vector<Root> m_roots;
     QVector<ThemeFolder> m_folders;
-    QStringList m_parents;
+    QStringList m_inherited;
 };
