@@ -191,6 +191,9 @@ void tst_ThemeFiles::takesTheFilesThatQtTakesFromInstalledThemes()
             const QIcon icon = QIcon::fromTheme(name);
             const auto files = ThemeFiles::find(name);
             QVERIFY2(files.isEmpty() == icon.isNull(), qPrintable(name));
+            // Qt 6 takes no shorter name for that of an application or of a kind of files.
+            if (QT_VERSION_MAJOR >= 6 && files.isEmpty() && name.endsWith(QLatin1String("-more")))
+                continue;
             for (const int size : {16, 22, 32, 48, 100}) {
                 const auto *const file = ThemeFiles::forSize(files, QSize(size, size));
                 QVERIFY2(file && icon.pixmap(size).toImage() == QIcon(file->path).pixmap(size).toImage(),

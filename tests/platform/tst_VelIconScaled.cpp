@@ -25,11 +25,16 @@ private Q_SLOTS:
     void laysEmblemsInTheirLogicalSize();
     void paintsOnADeviceOfAnotherRatio();
     void tellsTheSizesThatQtTells();
+    void tellsTheSizesOfFilesForOtherRatios();
+    void paintsTheFileThatQtPaints();
     void looksAtTheFileForTheScreen();
     void drawsEveryPixelAsQtDoes_data();
     void drawsEveryPixelAsQtDoes();
 
 private:
+    /// A theme of few sizes, some of them for two pixels for one, with the icons "far" and "twice".
+    void makeOddSizes();
+    static QImage painted(const QIcon &icon, int size, qreal ratio);
     QIcon icon() const
     {
         return VelIcon::fromTheme(QStringLiteral("by-size"),
@@ -47,6 +52,30 @@ void tst_VelIconScaled::init()
     theme.add(QStringLiteral("emblem"), Qt::blue);
     theme.use();
     QCOMPARE(qApp->devicePixelRatio(), 2.0);
+}
+
+void tst_VelIconScaled::makeOddSizes()
+{
+    write(QStringLiteral("odd/index.theme"),
+          "[Icon Theme]\nName=Odd\n[8]\nSize=8\nType=Fixed\n[48]\nSize=48\nType=Fixed\n"
+          "[16@2]\nSize=16\nScale=2\nType=Fixed\n[24]\nSize=24\nType=Threshold\n");
+    int color = 0;
+    for (const char *name : {"8/far", "48/far", "16@2/twice", "24/twice"}) {
+        QImage image(24, 24, QImage::Format_RGB32);
+        image.fill(QColor::fromHsv(++color * 60, 255, 255));
+        QVERIFY(image.save(write(QStringLiteral("odd/%1.png").arg(QLatin1String(name)), QByteArray())));
+    }
+    QIcon::setThemeName(QStringLiteral("odd"));
+}
+
+QImage tst_VelIconScaled::painted(const QIcon &icon, int size, qreal ratio)
+{
+    QImage image(QSize(size, size) * ratio, QImage::Format_ARGB32_Premultiplied);
+    image.setDevicePixelRatio(ratio);
+    image.fill(Qt::white);
+    QPainter painter(&image);
+    icon.paint(&painter, QRect(0, 0, size, size));
+    return image;
 }
 
 void tst_VelIconScaled::makesPixmapsForTheScreen()
@@ -86,6 +115,33 @@ void tst_VelIconScaled::tellsTheSizesThatQtTells()
         QCOMPARE(icon().actualSize(QSize(size, size)), qt.actualSize(QSize(size, size)));
         QCOMPARE(icon().pixmap(size).size(), qt.pixmap(size).size());
         QCOMPARE(icon().pixmap(size).devicePixelRatio(), qt.pixmap(size).devicePixelRatio());
+    }
+}
+
+// Where a size asked for twice as large would have another file.
+void tst_VelIconScaled::tellsTheSizesOfFilesForOtherRatios()
+{
+    makeOddSizes();
+    for (const char *name : {"far", "twice"}) {
+        const QIcon ours = VelIcon::fromTheme(QLatin1String(name), QMap<Qt::Corner, QString>(), QIcon());
+        const QIcon qt = QIcon::fromTheme(QLatin1String(name));
+        for (int size = 4; size <= 128; size += 4)
+            QCOMPARE(ours.actualSize(QSize(size, size)), qt.actualSize(QSize(size, size)));
+    }
+}
+
+void tst_VelIconScaled::paintsTheFileThatQtPaints()
+{
+    if (QT_VERSION_MAJOR < 6)
+        QSKIP("Qt 5 has no way to ask for the pixmap that it paints");
+    makeOddSizes();
+    for (const char *name : {"far", "twice"}) {
+        const QIcon ours = VelIcon::fromTheme(QLatin1String(name), QMap<Qt::Corner, QString>(), QIcon());
+        const QIcon qt = QIcon::fromTheme(QLatin1String(name));
+        for (int size = 4; size <= 128; size += 4) {
+            for (const qreal ratio : {1.0, 1.5, 2.0, 3.0})
+                QCOMPARE(painted(ours, size, ratio), painted(qt, size, ratio));
+        }
     }
 }
 
