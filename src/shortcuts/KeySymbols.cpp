@@ -86,7 +86,7 @@ void addKeyOfKeypad(int key, Keys *keys)
 Keys allKeys()
 {
     Keys keys = {{XK_KP_Equal, Qt::Key_Equal}, {XF86XK_Clear, Qt::Key_Clear}};
-    for (int key = Qt::Key_Escape; key <= Qt::Key_MicMute; ++key)
+    for (int key = Qt::Key_Escape; key <= Qt::Key_Redo; ++key)
         addKey(key, &keys);
     addKey(Qt::Key_Select, &keys);
     addKey(Qt::Key_Sleep, &keys);
