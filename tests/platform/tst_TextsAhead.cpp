@@ -77,7 +77,9 @@ void tst_TextsAhead::readsWhatAModelOfTheFolderAsksFor()
     write(QStringLiteral("m/last.desktop"), "last");
     settle(QStringLiteral("m/last.desktop"));
     const std::string m = folder("m");
+    QVERIFY(TextsAhead::instance().isEmpty());
     const auto ticket = readAll(m + '/');
+    QVERIFY(!TextsAhead::instance().isEmpty());
     QCOMPARE(taken(m + "/a.desktop"), QByteArray("a"));
     QCOMPARE(taken(m + "/.directory"), QByteArray("record"));
     QCOMPARE(taken(m + "/sub/.directory"), QByteArray("sub"));
@@ -85,6 +87,7 @@ void tst_TextsAhead::readsWhatAModelOfTheFolderAsksFor()
     QVERIFY(taken(m + "/sub/b.desktop").isEmpty());
     QVERIFY(taken(m + "/plain").isEmpty());
     QVERIFY2(taken(m + "/a.desktop").isEmpty(), "it is taken once");
+    QVERIFY2(TextsAhead::instance().isEmpty(), "and nobody asks for it any more");
     QCOMPARE(TextsAhead::instance().cost(), std::size_t(0));
 }
 
@@ -187,6 +190,7 @@ void tst_TextsAhead::forgetsWhatIsGivenUp()
             TextsAhead::instance().wait();
         TextsAhead::instance().giveUp(ticket);
         QCOMPARE(TextsAhead::instance().cost(), std::size_t(0));
+        QVERIFY(TextsAhead::instance().isEmpty());
         QVERIFY(taken(folder("m") + "/499.desktop").isEmpty());
     }
     QTRY_COMPARE(TextsAhead::instance().threads(), 0);

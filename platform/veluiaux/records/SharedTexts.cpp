@@ -26,7 +26,8 @@ std::optional<FileText> SharedTexts::findOrRead(const QByteArray &path, Reader r
 {
     if (auto known = find(path))
         return known;
-    auto file = TextsAhead::instance().take(path.toStdString());
+    auto &ahead = TextsAhead::instance();
+    auto file = ahead.isEmpty() ? std::nullopt : ahead.take(path.toStdString());
     if (!file)
         file = read(path);
     if (file && file->settled && isKnown(path))
@@ -38,8 +39,7 @@ std::optional<FileText> SharedTexts::findOrRead(const QByteArray &path, Reader r
 bool SharedTexts::isKnown(const QByteArray &path)
 {
     const std::size_t hash = std::hash<std::string_view>()({path.constData(), std::size_t(path.size())}) | 1U;
-    const std::lock_guard<std::mutex> lock(m_mutex);
-    return std::exchange(m_seen[hash / 2 % m_seen.size()], hash) == hash;
+    return m_seen[hash / 2 % m_seen.size()].exchange(hash, std::memory_order_relaxed) == hash;
 }
 
 std::optional<FileText> SharedTexts::find(const QByteArray &path)
@@ -95,7 +95,8 @@ void SharedTexts::clear()
     const std::lock_guard<std::mutex> lock(m_mutex);
     m_index.clear();
     m_items.clear();
-    m_seen = {};
+    for (auto &seen : m_seen)
+        seen = 0;
     m_cost = 0;
 }
 

@@ -9,6 +9,7 @@
 #include <QHash>
 
 #include <array>
+#include <atomic>
 #include <cstddef>
 #include <list>
 #include <mutex>
@@ -62,5 +63,5 @@ private:
     Items m_items;
     QHash<QByteArray, Items::iterator> m_index;
     std::size_t m_cost = 0;
-    std::array<std::size_t, 4096> m_seen{}; // hashes of paths that were read before
+    std::array<std::atomic<std::size_t>, 4096> m_seen{}; // hashes of paths that were read before
 };

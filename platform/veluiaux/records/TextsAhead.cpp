@@ -142,6 +142,7 @@ void TextsAhead::list(Folder &folder, Lock &lock)
         if (m_files.emplace(file, File{&folder, State::Waiting, std::nullopt, 0}).second)
             folder.files.push_back(std::move(file));
     }
+    m_count.store(m_files.size(), std::memory_order_release);
     constexpr std::size_t FilesForAThread = 32;
     const std::size_t wanted = folder.files.size() / FilesForAThread;
     while (std::size_t(m_threads) < std::min<std::size_t>(wanted, MostThreads)) {
@@ -166,7 +167,7 @@ void TextsAhead::readNext(Folder &folder, Lock &lock)
     file = m_files.find(path);
     const std::size_t cost = text ? sizeof(DesktopEntryText) + text->text->bytes().size() : 0;
     if (!text || !text->settled || m_cost + cost > Limit || folder.isGivenUp) {
-        m_files.erase(file);
+        erase(file);
         return;
     }
     file->second.state = State::Read;
@@ -178,8 +179,6 @@ void TextsAhead::readNext(Folder &folder, Lock &lock)
 std::optional<FileText> TextsAhead::take(const std::string &path)
 {
     Lock lock(m_mutex);
-    if (m_files.empty())
-        return std::nullopt;
     auto file = m_files.find(path);
     while (file != m_files.end() && file->second.state == State::Reading) {
         m_progress.wait(lock);
@@ -214,7 +213,13 @@ void TextsAhead::forget(const std::string &path)
 {
     const auto file = m_files.find(path);
     m_cost -= file->second.cost;
+    erase(file);
+}
+
+void TextsAhead::erase(std::unordered_map<std::string, File>::iterator file)
+{
     m_files.erase(file);
+    m_count.store(m_files.size(), std::memory_order_release);
 }
 
 std::size_t TextsAhead::cost() const

@@ -5,6 +5,7 @@
 
 #include "FileText.h"
 
+#include <atomic>
 #include <condition_variable>
 #include <cstddef>
 #include <list>
@@ -42,6 +43,8 @@ public:
 
     /// Has the entries and the record file of \a folder read, and the record files of its folders.
     Ticket read(std::string folder);
+    /// Whether no file is known that take() could give: nothing is being read ahead. Waits for nobody.
+    bool isEmpty() const { return m_count.load(std::memory_order_acquire) == 0; }
     /// Gives up what of the folder was not taken. Nothing of it is being read any more afterwards.
     void giveUp(const Ticket &folder);
     /// The text of \a path as it still is on disk, if it was read ahead; it is here no longer. Waits
@@ -72,11 +75,13 @@ private:
     void list(Folder &folder, Lock &lock);
     void readNext(Folder &folder, Lock &lock);
     void forget(const std::string &path);
+    void erase(std::unordered_map<std::string, File>::iterator file);
 
     mutable std::mutex m_mutex;
     std::condition_variable m_progress; // a file was read or listed, or a thread ended
     std::list<Ticket> m_folders; // those with files that wait
     std::unordered_map<std::string, File> m_files;
+    std::atomic<std::size_t> m_count{0}; // of the files, to be looked at without the mutex
     std::size_t m_cost = 0;
     int m_threads = 0;
 };
