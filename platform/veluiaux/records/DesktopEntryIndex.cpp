@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 #include <cstring>
+#include <utility>
 
 namespace {
 
@@ -200,6 +201,16 @@ DesktopEntryIndex::DesktopEntryIndex(std::string_view bytes, std::string_view la
     indexer.run();
     m_groups = indexer.groups();
     m_runs = indexer.runs();
+    if (m_groups.size() >= ManyGroups)
+        nameGroups();
+}
+
+DesktopEntryIndex::DesktopEntryIndex(std::string_view bytes, Tag language, Places places)
+    : m_bytes(bytes)
+    , m_language(language)
+    , m_groups(std::move(places.groups))
+    , m_runs(std::move(places.runs))
+{
     if (m_groups.size() >= ManyGroups)
         nameGroups();
 }

@@ -74,6 +74,15 @@ public:
     /// language is \a language; for any other the index only takes longer.
     DesktopEntryIndex(std::string_view bytes, std::string_view language);
 
+    /// What was found in the bytes.
+    struct Places
+    {
+        std::vector<Group> groups;
+        std::vector<Run> runs;
+    };
+    /// The same without a look at the \a bytes: the \a places were found in such bytes, for that \a language.
+    DesktopEntryIndex(std::string_view bytes, Tag language, Places places);
+
     const std::vector<Group> &groups() const { return m_groups; }
     const std::vector<Run> &runs() const { return m_runs; }
     /// The user's language, or 0.

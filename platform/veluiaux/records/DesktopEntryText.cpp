@@ -12,12 +12,25 @@ DesktopEntryText::DesktopEntryText(QByteArray bytes)
 {
 }
 
-void DesktopEntryText::makeIndex() const
+DesktopEntryText::DesktopEntryText(QByteArray bytes, DesktopEntryIndex::Tag language,
+                                   DesktopEntryIndex::Places places)
+    : m_bytes(std::move(bytes))
+    , m_isIndexed(true)
+    , m_index(this->bytes(), language, std::move(places))
+{
+}
+
+void DesktopEntryText::makeIndexNow() const
+{
+    makeIndex(MessageLocale::current().language());
+}
+
+void DesktopEntryText::makeIndex(std::string_view language) const
 {
     const std::lock_guard<std::mutex> lock(m_indexing);
     if (m_isIndexed.load(std::memory_order_relaxed))
         return;
-    m_index = DesktopEntryIndex(bytes(), MessageLocale::current().language());
+    m_index = DesktopEntryIndex(bytes(), language);
     m_isIndexed.store(true, std::memory_order_release);
 }
 

@@ -33,6 +33,8 @@ public:
     static constexpr int NoGroup = DesktopEntryIndex::NoGroup;
 
     explicit DesktopEntryText(QByteArray bytes = {});
+    /// With an index that was made before, see DesktopEntryIndex.
+    DesktopEntryText(QByteArray bytes, DesktopEntryIndex::Tag language, DesktopEntryIndex::Places places);
     DesktopEntryText(const DesktopEntryText &) = delete;
     DesktopEntryText &operator=(const DesktopEntryText &) = delete;
 
@@ -85,6 +87,16 @@ public:
         });
     }
 
+    /// Makes it, if it was never asked for, for the user of now.
+    const DesktopEntryIndex &index() const
+    {
+        if (!m_isIndexed.load(std::memory_order_acquire))
+            makeIndexNow();
+        return m_index;
+    }
+    /// Makes the index now, for a user of that \a language, unless there is one.
+    void makeIndex(std::string_view language) const;
+
     /// The memory this object takes, in bytes.
     std::size_t cost() const { return sizeof(*this) + std::size_t(m_bytes.size()) + index().cost(); }
 
@@ -131,13 +143,7 @@ private:
         return {m_bytes.constData() + at, length};
     }
 
-    const DesktopEntryIndex &index() const
-    {
-        if (!m_isIndexed.load(std::memory_order_acquire))
-            makeIndex();
-        return m_index;
-    }
-    void makeIndex() const;
+    void makeIndexNow() const;
 
     const QByteArray m_bytes;
     // Not std::call_once, which asks the kernel to wake other threads though none waits.
