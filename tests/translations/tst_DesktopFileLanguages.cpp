@@ -51,10 +51,10 @@ void tst_DesktopFileLanguages::addPrograms()
     QTest::addColumn<QString>("desktopFile");
     QTest::addColumn<QString>("metadata");
     for (const QString &program :
-         {QStringLiteral("vel-entryedit"), QStringLiteral("vel-gallery"), QStringLiteral("vel-menuedit")}) {
+         {QStringLiteral("entryedit"), QStringLiteral("gallery"), QStringLiteral("menuedit")}) {
         QTest::newRow(qPrintable(program))
-            << QStringLiteral(VEL_SOURCE_DIR "/apps/%1/%1.desktop").arg(program)
-            << QStringLiteral(VEL_SOURCE_DIR "/data/metainfo/%1.metainfo.xml").arg(program);
+            << QStringLiteral(VEL_SOURCE_DIR "/apps/vel-%1/vel-%1.desktop").arg(program)
+            << QStringLiteral(VEL_SOURCE_DIR "/data/metainfo/org.veluiextra.%1.metainfo.xml").arg(program);
     }
 }
 
