@@ -43,9 +43,38 @@ else()
 endif()
 set(VEL_QT "Qt${VEL_QT_MAJOR}")
 
-# vel_find_qt(<component>...): modules of the chosen Qt. A macro, for what Qt tells by variables.
+# vel_require(<package> <version> [<component>...]): finds what the chosen Qt needs, or stops and says what is
+# missing. A macro, for what Qt tells by variables.
+macro(vel_require package version)
+    find_package(${package} ${version} QUIET COMPONENTS ${ARGN})
+    if(NOT ${package}_FOUND)
+        vel_say_what_is_missing(${package} ${version} "${ARGN}" "${${package}_NOT_FOUND_MESSAGE}"
+            "${${package}_CONSIDERED_VERSIONS}")
+    endif()
+endmacro()
+
+function(vel_say_what_is_missing package version components reason versions)
+    if(components)
+        list(JOIN components ", " components)
+        string(PREPEND components ": ")
+    endif()
+    if(versions AND NOT reason)
+        list(REMOVE_DUPLICATES versions)
+        list(JOIN versions ", " versions)
+        set(reason "There is version ${versions}.")
+    endif()
+    string(STRIP "${reason}" reason)
+    set(group build)
+    if(VEL_QT_MAJOR STREQUAL "6")
+        set(group build-qt6)
+    endif()
+    message(FATAL_ERROR "VEL_QT_MAJOR is ${VEL_QT_MAJOR}, and ${package} ${version} or later is missing${components}.\n${reason}\n"
+        "Its packages stand in packaging/dependencies under [${group}]; CMAKE_PREFIX_PATH names another place to look in.")
+endfunction()
+
+# vel_find_qt(<component>...): modules of the chosen Qt.
 macro(vel_find_qt)
-    find_package(${VEL_QT} ${VEL_QT_VERSION} REQUIRED COMPONENTS ${ARGN})
+    vel_require(${VEL_QT} ${VEL_QT_VERSION} ${ARGN})
 endmacro()
 
 # vel_add_translations(<variable> <file>...): compiles catalogs; <variable> names the results.
@@ -61,11 +90,11 @@ endmacro()
 vel_find_qt(Core Gui Widgets DBus)
 if(VEL_QT_MAJOR STREQUAL "5")
     vel_find_qt(X11Extras)
-    find_package(KF5IconThemes 5.100 REQUIRED)
-    find_package(KF5WindowSystem 5.100 REQUIRED)
+    vel_require(KF5IconThemes 5.100)
+    vel_require(KF5WindowSystem 5.100)
     set(VEL_QT_LIBRARIES Qt5::Widgets Qt5::DBus Qt5::X11Extras KF5::IconThemes KF5::WindowSystem)
 else()
-    find_package(KF6IconThemes 6.0 REQUIRED)
-    find_package(KF6WindowSystem 6.0 REQUIRED)
+    vel_require(KF6IconThemes 6.0)
+    vel_require(KF6WindowSystem 6.0)
     set(VEL_QT_LIBRARIES Qt6::Widgets Qt6::DBus KF6::IconWidgets KF6::WindowSystem)
 endif()
