@@ -75,8 +75,10 @@ Names filesOf(const std::string &folder)
 // It is held for a moment only, unless who holds it has to wait for a processor.
 bool tryLock(std::unique_lock<std::mutex> &lock)
 {
-    for (int i = 0; i < Tries && !lock.owns_lock(); ++i)
-        lock.try_lock();
+    for (int i = 0; i < Tries; ++i) {
+        if (lock.owns_lock() || lock.try_lock())
+            return true;
+    }
     return lock.owns_lock();
 }
 
