@@ -14,12 +14,12 @@
 namespace {
 
 // A member in older versions, a pointer in newer ones.
-QObject *objectOf(QFileInfoGatherer &gatherer)
+[[maybe_unused]] QObject *objectOf(QFileInfoGatherer &gatherer)
 {
     return &gatherer;
 }
 
-QObject *objectOf(const std::unique_ptr<QFileInfoGatherer> &gatherer)
+[[maybe_unused]] QObject *objectOf(const std::unique_ptr<QFileInfoGatherer> &gatherer)
 {
     return gatherer.get();
 }
