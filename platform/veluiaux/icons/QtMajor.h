@@ -22,7 +22,7 @@ namespace QtMajor {
 /// How Qt looks for the files of an icon, and which it takes for a size.
 enum class ThemeRules {
     NamesFirst, ///< a shorter name in the theme comes before the theme's parents
-    ParentsFirst, ///< the parents come before a shorter name, which some folders have no part in
+    ParentsFirst, ///< the parents come before a shorter name, under which some folders are left out
     LargerFirst ///< as before, and a picture that is too large comes before one that is too small
 };
 
