@@ -512,10 +512,6 @@
         <translation>Die Art muss „Application“, „Link“ oder „Directory“ sein, nicht „%1“.</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Programme, die Einträge prüfen, kennen Version 1.5 des Standards noch nicht.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>Eine Version „%1“ des Standards gibt es nicht.</translation>
     </message>

@@ -512,10 +512,6 @@
         <translation>El tipo tiene que ser «Application», «Link» o «Directory», no «%1».</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Los programas que comprueban entradas aún no conocen la versión 1.5 del estándar.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>La versión «%1» del estándar no existe.</translation>
     </message>

@@ -512,10 +512,6 @@
         <translation>Le type doit être «&#xa0;Application&#xa0;», «&#xa0;Link&#xa0;» ou «&#xa0;Directory&#xa0;», pas «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Les programmes qui vérifient les entrées ne connaissent pas encore la version 1.5 du standard.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>La version «&#xa0;%1&#xa0;» du standard n&apos;existe pas.</translation>
     </message>

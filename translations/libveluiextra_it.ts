@@ -512,10 +512,6 @@
         <translation>Il tipo deve essere «Application», «Link» o «Directory», non «%1».</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>I programmi che controllano le voci non conoscono ancora la versione 1.5 dello standard.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>La versione «%1» dello standard non esiste.</translation>
     </message>

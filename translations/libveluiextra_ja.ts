@@ -512,10 +512,6 @@
         <translation>タイプは「%1」ではなく、「Application」、「Link」、「Directory」のいずれかにする必要があります。</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>エントリを検査するプログラムは、規格のバージョン 1.5 にまだ対応していません。</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>規格にバージョン「%1」はありません。</translation>
     </message>

@@ -512,10 +512,6 @@
         <translation>Rodzajem musi być „Application”, „Link” lub „Directory”, a nie „%1”.</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Programy sprawdzające wpisy nie znają jeszcze wersji 1.5 standardu.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>Nie ma wersji „%1” standardu.</translation>
     </message>

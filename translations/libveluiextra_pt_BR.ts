@@ -512,10 +512,6 @@
         <translation>O tipo deve ser &quot;Application&quot;, &quot;Link&quot; ou &quot;Directory&quot;, não &quot;%1&quot;.</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Os programas que verificam entradas ainda não conhecem a versão 1.5 do padrão.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>Não existe a versão &quot;%1&quot; do padrão.</translation>
     </message>

@@ -512,10 +512,6 @@
         <translation>Тип должен быть «Application», «Link» или «Directory», а не «%1».</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Программы, проверяющие записи, ещё не знают версии 1.5 стандарта.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>Версии «%1» стандарта не существует.</translation>
     </message>

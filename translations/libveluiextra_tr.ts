@@ -512,10 +512,6 @@
         <translation>Tür &apos;Application&apos;, &apos;Link&apos; veya &apos;Directory&apos; olmalıdır, &apos;%1&apos; değil.</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Girdileri denetleyen programlar standardın 1.5 sürümünü henüz tanımıyor.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>Standardın &apos;%1&apos; diye bir sürümü yok.</translation>
     </message>

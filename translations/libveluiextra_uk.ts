@@ -512,10 +512,6 @@
         <translation>Тип має бути «Application», «Link» або «Directory», а не «%1».</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>Програми, які перевіряють записи, ще не знають версії 1.5 стандарту.</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>Версії «%1» стандарту не існує.</translation>
     </message>

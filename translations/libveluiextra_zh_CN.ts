@@ -512,10 +512,6 @@
         <translation>类型必须是“Application”、“Link”或“Directory”，而不是“%1”。</translation>
     </message>
     <message>
-        <source>Programs that check entries do not know version 1.5 of the standard yet.</source>
-        <translation>检查条目的程序尚不支持该标准的 1.5 版。</translation>
-    </message>
-    <message>
         <source>There is no version &apos;%1&apos; of the standard.</source>
         <translation>该标准没有“%1”版。</translation>
     </message>
