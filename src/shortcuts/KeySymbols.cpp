@@ -41,9 +41,16 @@ bool isModifier(int code)
     return key >= Qt::Key_Shift && key <= Qt::Key_Alt;
 }
 
+// The one first that keyboards have: KDE Frameworks 6 has a misspelled one for a calculator before it.
 QList<int> symbolsOfKey(int code)
 {
-    return isModifier(code) ? QList<int>() : KKeyServer::keyQtToSymXs(code);
+    if (isModifier(code))
+        return {};
+    QList<int> symbols = KKeyServer::keyQtToSymXs(code);
+    const auto calculator = symbols.indexOf(XF86XK_Calculator);
+    if (calculator > 0)
+        symbols.move(calculator, 0);
+    return symbols;
 }
 
 bool keyOfSymbol(unsigned int symbol, int *key)

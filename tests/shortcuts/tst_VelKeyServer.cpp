@@ -55,7 +55,9 @@ bool mayLeadElsewhere(unsigned long symbol)
     const unsigned long keypadEqual = 0xffbd;
     // The maker's key Clear has the code of the common one, whose symbol is the keypad's.
     const unsigned long makersClear = 0x1008ff55;
-    return isSmallLatinLetter || isOtherAlphabet || symbol == keypadEqual || symbol == makersClear;
+    // KDE Frameworks 6 has two symbols for the keys of a calculator and of media.
+    const bool isOfTwo = QT_VERSION_MAJOR >= 6 && (symbol == 0x1008ff54 || symbol == 0x1008ff33);
+    return isSmallLatinLetter || isOtherAlphabet || isOfTwo || symbol == keypadEqual || symbol == makersClear;
 }
 
 } // namespace
