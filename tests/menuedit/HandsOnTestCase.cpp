@@ -73,7 +73,7 @@ void HandsOnTestCase::pickInDropMenu(ModalDriver &modal, const QString &text)
                 continue;
             // To a mouse that did not move since the menu opened, Qt 6 closes it and does no more.
             const QPoint place = menu->actionGeometry(action).center();
-            XDoTool::run(XDoTool::at(menu, place + QPoint(12, 0)));
+            XDoTool::run(QStringLiteral("mousemove ") + XDoTool::at(menu, place + QPoint(12, 0)));
             return XDoTool::click(menu, place);
         }
         QFAIL(qPrintable(QLatin1String("no entry ") + text));
