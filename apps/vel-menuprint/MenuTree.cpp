@@ -5,6 +5,7 @@
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
+#include <frame/FolderListing.h>
 #include <menuedit/EntryDisplay.h>
 #include <menuedit/EntryState.h>
 #include <menuedit/ItemOrder.h>
@@ -12,7 +13,6 @@
 
 #include <QDateTime>
 #include <QDir>
-#include <QDirIterator>
 #include <QFileInfo>
 #include <QSet>
 
@@ -148,15 +148,14 @@ std::optional<MenuItem> itemOf(const QFileInfo &info, Walk *walk)
 QVector<Child> childrenOf(const QString &path, const SortOrder::Index &order, Walk *walk)
 {
     QVector<Child> children;
-    QDirIterator files(path, QDir::AllEntries | QDir::NoDotAndDotDot);
-    while (files.hasNext()) {
-        files.next();
+    FolderListing files(path);
+    while (const std::optional<FolderListing::Item> file = files.next()) {
         if (walk->items >= MenuTree::MostItems || walk->above.size() >= MenuTree::MostLevels) {
             walk->isWhole = false;
             break;
         }
         ++walk->items;
-        const QFileInfo info = files.fileInfo();
+        const QFileInfo info(file->path);
         const std::optional<MenuItem> item = itemOf(info, walk);
         if (item)
             children.append({*item, info, order.mention(info.fileName())});

@@ -5,15 +5,13 @@
 
 #include <velcore/home.h>
 
-#include <QDir>
-#include <QDirIterator>
-#include <QFile>
-#include <QString>
+#include <filesystem>
+#include <system_error>
 
 bool VelTrash::isEmpty()
 {
-    // Hidden files and dangling links can be thrown away too.
-    const QDir::Filters everything = QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot;
-    const QString data = QFile::decodeName(Vel::dataHome().c_str());
-    return !QDirIterator(data + QStringLiteral("/Trash/files"), everything).hasNext();
+    // Hidden files and dangling links can be thrown away too, and names that are no text.
+    namespace fs = std::filesystem;
+    std::error_code error;
+    return fs::directory_iterator(Vel::dataHome() + "/Trash/files", error) == fs::directory_iterator();
 }

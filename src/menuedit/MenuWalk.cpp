@@ -31,17 +31,15 @@ MenuWalk::~MenuWalk() = default;
 
 std::optional<MenuWalk::Item> MenuWalk::next()
 {
-    while (!m_files || !m_files->hasNext()) {
+    std::optional<FolderListing::Item> found = m_files ? m_files->next() : std::nullopt;
+    while (!found) {
         if (!enterNextFolder())
             return std::nullopt;
+        found = m_files->next();
     }
-    Item item;
-    item.path = m_files->next();
-    const QFileInfo info = m_files->fileInfo();
-    item.isFolder = info.isDir();
-    if (item.isFolder)
-        note(info);
-    return item;
+    if (found->isFolder)
+        note(*found);
+    return Item{found->path, found->isFolder};
 }
 
 // One folder is listed to its end before the next is opened, however deep they lie.
@@ -51,25 +49,23 @@ bool MenuWalk::enterNextFolder()
     if (m_current + 1 >= m_folders.size())
         return false;
     ++m_current;
-    m_files =
-        std::make_unique<QDirIterator>(m_folders.at(m_current).path, QDir::AllEntries | QDir::NoDotAndDotDot);
+    m_files.emplace(m_folders.at(m_current).path);
     return true;
 }
 
-void MenuWalk::note(const QFileInfo &folder)
+void MenuWalk::note(const FolderListing::Item &folder)
 {
     const Folder &here = m_folders.at(m_current);
-    const bool isLink = folder.isSymLink();
     const QString canonical =
-        isLink ? folder.canonicalFilePath() : asPrefix(here.canonical) + folder.fileName();
-    const bool isOutside = here.isOutside || (isLink && !isWithin(canonical));
-    if (canonical.isEmpty() || isGoneThrough(canonical) || (isOutside && !m_isOpened(folder.filePath())))
+        folder.isLink ? QFileInfo(folder.path).canonicalFilePath() : asPrefix(here.canonical) + folder.name;
+    const bool isOutside = here.isOutside || (folder.isLink && !isWithin(canonical));
+    if (canonical.isEmpty() || isGoneThrough(canonical) || (isOutside && !m_isOpened(folder.path)))
         return;
     if (m_folders.size() >= m_mostFolders) {
         m_isWhole = false;
         return;
     }
-    m_folders.append({folder.filePath(), canonical, m_current, isOutside});
+    m_folders.append({folder.path, canonical, m_current, isOutside});
 }
 
 bool MenuWalk::isWithin(const QString &canonical) const

@@ -3,12 +3,12 @@
 
 #pragma once
 
-#include <QDirIterator>
+#include <frame/FolderListing.h>
+
 #include <QString>
 #include <QVector>
 
 #include <functional>
-#include <memory>
 #include <optional>
 
 /**
@@ -54,7 +54,7 @@ private:
     };
 
     bool enterNextFolder();
-    void note(const QFileInfo &folder);
+    void note(const FolderListing::Item &folder);
     bool isWithin(const QString &canonical) const;
     bool isGoneThrough(const QString &canonical) const;
 
@@ -62,6 +62,6 @@ private:
     const int m_mostFolders;
     QVector<Folder> m_folders;
     int m_current = -1;
-    std::unique_ptr<QDirIterator> m_files;
+    std::optional<FolderListing> m_files;
     bool m_isWhole = true;
 };

@@ -8,12 +8,12 @@
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
+#include <frame/FolderListing.h>
 #include <frame/MessageBox.h>
 
 #include <velcore/dirs.h>
 #include <velintegration/startmenu.h>
 
-#include <QDirIterator>
 #include <QFile>
 #include <QPointer>
 #include <QStandardPaths>
@@ -41,6 +41,30 @@ QString failureText(int error)
         .arg(directory, qt_error_string(error));
 }
 
+bool isApplication(const QString &file)
+{
+    if (!EntryPath::isEntry(file))
+        return false;
+    const VelUIDesktopEntry entry(file);
+    return entry.getType() == QLatin1String("Application") && entry.isDisplayable(nullptr);
+}
+
+// Links to folders are not followed.
+bool isAnyApplicationIn(const QString &top)
+{
+    QStringList folders{top};
+    while (!folders.isEmpty()) {
+        FolderListing files(folders.takeLast());
+        while (const std::optional<FolderListing::Item> file = files.next()) {
+            if (file->isFolder && !file->isLink)
+                folders.append(file->path);
+            else if (!file->isFolder && isApplication(file->path))
+                return true;
+        }
+    }
+    return false;
+}
+
 } // namespace
 
 QString StartMenu::directory()
@@ -52,15 +76,8 @@ bool StartMenu::isAnyApplicationInstalled()
 {
     const QStringList folders = QStandardPaths::standardLocations(QStandardPaths::ApplicationsLocation);
     for (const QString &folder : folders) {
-        QDirIterator files(folder, QDir::Files, QDirIterator::Subdirectories);
-        while (files.hasNext()) {
-            const QString file = files.next();
-            if (!EntryPath::isEntry(file))
-                continue;
-            const VelUIDesktopEntry entry(file);
-            if (entry.getType() == QLatin1String("Application") && entry.isDisplayable(nullptr))
-                return true;
-        }
+        if (isAnyApplicationIn(folder))
+            return true;
     }
     return false;
 }

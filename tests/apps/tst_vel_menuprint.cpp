@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OddName.h"
 #include "TestCase.h"
 
 #include <MenuFormat.h>
@@ -99,6 +100,7 @@ private Q_SLOTS:
     void followsTheSortOrder();
     void putsTheNewestFirstInRecents();
     void leavesOutWhatIsNotShown();
+    void showsAllBesideANameThatIsNoText();
     void doesNotFollowALinkIntoItself();
     void endsWhereLinksMakeAMenuWithoutEnd();
     void endsWhereFoldersLieTooDeep();
@@ -217,6 +219,24 @@ void tst_vel_menuprint::leavesOutWhatIsNotShown()
 
     QCOMPARE(names(MenuTree::read(path(QStringLiteral("menu"))).children),
              QStringList{QStringLiteral("No display")});
+}
+
+void tst_vel_menuprint::showsAllBesideANameThatIsNoText()
+{
+    QStringList expected;
+    for (int i = 0; i < 8; ++i) {
+        write(QStringLiteral("menu/e%1.desktop").arg(i), entry("E" + QByteArray::number(i)));
+        writeOddName(path(QStringLiteral("menu")), i);
+        expected << QStringLiteral("E%1").arg(i);
+    }
+    const Result result = print({QStringLiteral("--format=json"), path(QStringLiteral("menu"))});
+    QCOMPARE(result.err, QByteArray());
+    bool isWhole = false;
+    const MenuItem menu = MenuTree::read(path(QStringLiteral("menu")), &isWhole);
+    QVERIFY(isWhole);
+    QCOMPARE(names(menu.children), expected);
+    for (const QString &name : qAsConst(expected))
+        QVERIFY2(result.out.contains('"' + name.toUtf8() + '"'), result.out.constData());
 }
 
 void tst_vel_menuprint::doesNotFollowALinkIntoItself()

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OddName.h"
 #include "TestCase.h"
 
 #include <desktopentry/choosers/ChoiceModel.h>
@@ -50,6 +51,7 @@ private Q_SLOTS:
     void tellsWhatMimeTypesAre();
     void knowsMimeTypesByTheirAliases();
     void listsProgramsByName();
+    void listsProgramsBesideANameThatIsNoText();
     void listsNoProgramsOfMissingFolders_data();
     void listsNoProgramsOfMissingFolders();
 
@@ -115,6 +117,20 @@ void tst_ChoiceSources::listsProgramsByName()
     QCOMPARE(texts(model),
              (QStringList{QStringLiteral("both ") + path(QStringLiteral("one")),
                           QStringLiteral("my program ") + path(QStringLiteral("two"))}));
+}
+
+void tst_ChoiceSources::listsProgramsBesideANameThatIsNoText()
+{
+    for (int i = 0; i < 8; ++i) {
+        const QString file = write(QStringLiteral("bin/p%1").arg(i), "");
+        QVERIFY(QFile::setPermissions(file, QFile::ReadOwner | QFile::ExeOwner));
+        writeOddName(path(QStringLiteral("bin")), i);
+    }
+    qputenv("PATH", QFile::encodeName(path(QStringLiteral("bin"))));
+    ProgramSource source;
+    ChoiceModel model(ChoiceModel::Kind::One, ProgramSource::headers());
+    readAll(&source, &model);
+    QCOMPARE(model.rowCount(), 8);
 }
 
 void tst_ChoiceSources::listsNoProgramsOfMissingFolders_data()

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OddName.h"
 #include "TestCase.h"
 #include <menuedit/MenuWalk.h>
 
@@ -15,6 +16,7 @@ private Q_SLOTS:
     void meetsNothingWithoutADirectory();
     void meetsFoldersBeforeWhatTheyHold();
     void leavesOutDotFilesAndDanglingLinks();
+    void meetsAllBesideANameThatIsNoText();
     void followsLinksWithinButNotInCircles();
     void goesWhereTheUserWentBehindALink();
     void endsAtItsLimit();
@@ -68,6 +70,18 @@ void tst_MenuWalk::leavesOutDotFilesAndDanglingLinks()
     QVERIFY(QFile::link(QStringLiteral("nowhere"), path(QStringLiteral("dangling"))));
     write(QStringLiteral("a.desktop"), "");
     QCOMPARE(all(folder()), QStringList{QStringLiteral("a.desktop")});
+}
+
+void tst_MenuWalk::meetsAllBesideANameThatIsNoText()
+{
+    QStringList expected;
+    for (int i = 0; i < 8; ++i) {
+        write(QStringLiteral("f%1/x.desktop").arg(i), "");
+        writeOddName(folder(), i);
+        writeOddName(path(QStringLiteral("f%1").arg(i)), i);
+        expected << QStringLiteral("f%1/").arg(i) << QStringLiteral("f%1/x.desktop").arg(i);
+    }
+    QCOMPARE(all(folder()), expected);
 }
 
 void tst_MenuWalk::followsLinksWithinButNotInCircles()

@@ -1,6 +1,7 @@
 // SPDX-FileCopyrightText: The veluiextra developers
 // SPDX-License-Identifier: LGPL-2.1-or-later
 
+#include "OddName.h"
 #include "TestCase.h"
 
 #include <veluiaux/VelTrash.h>
@@ -56,7 +57,7 @@ void tst_VelTrash::isEmptyWithoutThrownAwayFiles()
 void tst_VelTrash::holdsWhatLiesInIt_data()
 {
     QTest::addColumn<QString>("kind");
-    for (const char *kind : {"file", "hidden file", "folder", "dangling link"})
+    for (const char *kind : {"file", "hidden file", "folder", "dangling link", "a name that is no text"})
         QTest::newRow(kind) << QString::fromLatin1(kind);
 }
 
@@ -71,6 +72,8 @@ void tst_VelTrash::holdsWhatLiesInIt()
         write(QStringLiteral("data/Trash/files/.a"), "x");
     else if (kind == QLatin1String("folder"))
         QVERIFY(QDir(files).mkdir(QStringLiteral("a")));
+    else if (kind == QLatin1String("a name that is no text"))
+        writeOddName(files);
     else
         QVERIFY(QFile::link(QStringLiteral("/nowhere"), files + QStringLiteral("/a")));
     QVERIFY(!VelTrash::isEmpty());

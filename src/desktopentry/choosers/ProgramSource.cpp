@@ -39,8 +39,7 @@ bool ProgramSource::openNextFolder()
 {
     if (m_folders.isEmpty())
         return false;
-    m_files =
-        std::make_unique<QDirIterator>(m_folders.takeFirst(), QDir::Files | QDir::Executable | QDir::Hidden);
+    m_files.emplace(m_folders.takeFirst(), FolderListing::With);
     return true;
 }
 
@@ -51,18 +50,17 @@ bool ProgramSource::read(ChoiceModel *model)
     QVector<Choice> choices;
     bool isMore = true;
     while (isMore && timer.elapsed() < MostMilliseconds) {
-        if (!m_files || !m_files->hasNext()) {
+        const std::optional<FolderListing::Item> file = m_files ? m_files->next() : std::nullopt;
+        if (!file) {
             isMore = openNextFolder();
             continue;
         }
-        const QString file = m_files->next();
-        const QString name = m_files->fileName();
-        if (m_names.contains(name))
+        if (m_names.contains(file->name) || file->isFolder || !QFileInfo(file->path).isExecutable())
             continue;
-        m_names.insert(name);
+        m_names.insert(file->name);
         Choice choice;
-        choice.value = name;
-        choice.texts = QStringList{name, QFileInfo(file).path()};
+        choice.value = file->name;
+        choice.texts = QStringList{file->name, QFileInfo(file->path).path()};
         choices.append(choice);
     }
     model->add(choices);

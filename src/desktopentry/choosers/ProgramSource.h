@@ -5,12 +5,13 @@
 
 #include "ChoiceSource.h"
 
+#include <frame/FolderListing.h>
+
 #include <QCoreApplication>
-#include <QDirIterator>
 #include <QSet>
 #include <QStringList>
 
-#include <memory>
+#include <optional>
 
 namespace VelUI {
 
@@ -30,7 +31,7 @@ private:
     bool openNextFolder();
 
     QStringList m_folders; // that are to be read
-    std::unique_ptr<QDirIterator> m_files;
+    std::optional<FolderListing> m_files;
     QSet<QString> m_names; // that were read
 };
 
