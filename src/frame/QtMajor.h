@@ -61,6 +61,12 @@ QPointF positionOf(const QDropEvent &event);
 /// The connection to the X server; null where the application is shown in another way.
 _XDisplay *x11Display();
 
+/// Whether the listing of a folder ends at a name that is no text, where Qt 5 leaves that one out.
+constexpr bool listingStopsAtOddNames()
+{
+    return QT_VERSION_MAJOR >= 6;
+}
+
 /// Whether the encoding of the locale is UTF-8, as it always is for Qt 6.
 bool isLocaleUtf8();
 /// Has \a settings read and write texts in the encoding of the locale.

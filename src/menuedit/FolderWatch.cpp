@@ -56,8 +56,11 @@ void FolderWatch::setOn(bool on)
 void FolderWatch::noticeRemoval(const QModelIndex &parent, int first, int last)
 {
     QStringList gone;
-    for (int row = first; row <= last && gone.isEmpty(); ++row)
-        collect(m_model->index(row, 0, parent), gone);
+    for (int row = first; row <= last && gone.isEmpty(); ++row) {
+        const QModelIndex folder = m_model->index(row, 0, parent);
+        if (!m_isInPlace || !m_isInPlace(m_model->filePath(folder)))
+            collect(folder, gone);
+    }
     if (!gone.isEmpty())
         m_timer.start();
 }

@@ -7,6 +7,9 @@
 #include <QStringList>
 #include <QTimer>
 
+#include <functional>
+#include <utility>
+
 class QFileSystemModel;
 class QModelIndex;
 
@@ -31,6 +34,11 @@ public:
     QStringList release(const QStringList &paths);
     /// Watches those of the \a folders again that are still there.
     void watchAgain(const QStringList &folders);
+    /// Of rows for whose paths \a isInPlace holds, going does not tell that a folder was moved.
+    void leaveAlone(std::function<bool(const QString &path)> isInPlace)
+    {
+        m_isInPlace = std::move(isInPlace);
+    }
     /// Off, the model notices nothing; on again, it reads anew what it had read.
     void setOn(bool on);
 
@@ -43,4 +51,5 @@ private:
     QFileSystemModel *m_model;
     QTimer m_timer;
     bool m_isOn = true;
+    std::function<bool(const QString &path)> m_isInPlace;
 };

@@ -11,9 +11,11 @@
 #include "MenuIconProvider.h"
 #include "ReadingAhead.h"
 #include "RowLook.h"
+#include "UnlistedFiles.h"
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
+#include <frame/QtMajor.h>
 
 #include <QCoreApplication>
 #include <QDir>
@@ -64,6 +66,10 @@ VelMenuModel::VelMenuModel(const QString &rootDirectory, VelMenuView *view, QObj
     // It comes behind the last of the rows.
     connect(this, &QFileSystemModel::directoryLoaded, this,
             [this](const QString &path) { m_ahead->end(path); });
+    if (QtMajor::listingStopsAtOddNames()) {
+        m_unlisted = new UnlistedFiles(this);
+        m_watch->leaveAlone([this](const QString &path) { return m_unlisted->mayGoAndCome(path); });
+    }
     setRootPath(rootDir);
 }
 
@@ -359,6 +365,11 @@ QVariant VelMenuModel::lookOf(const QModelIndex &index, int role) const
     const QString path = pathOf(index);
     const EntryState::Kind state = m_cache->display(path).value_or(RowCache::Display()).state;
     return RowLook::data({path, state, m_cut.contains(path)}, role);
+}
+
+bool VelMenuModel::isGone(const QModelIndex &index) const
+{
+    return m_unlisted && m_unlisted->keepsGone() && m_unlisted->isGone(pathOf(index));
 }
 
 bool VelMenuModel::isHidden(const QModelIndex &index) const

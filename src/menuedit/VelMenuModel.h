@@ -18,6 +18,7 @@ class FolderWatch;
 class MenuDropHost;
 class MenuIconProvider;
 class ReadingAhead;
+class UnlistedFiles;
 class VelMenuView;
 struct DropResult;
 
@@ -69,6 +70,9 @@ public:
     /// The items at \a paths are to be dimmed, and no others. Who says so has the rows painted anew.
     void setCut(const QStringList &paths) { m_cut = QSet<QString>(paths.begin(), paths.end()); }
 
+    /// Whether the row stands for a file that is gone, which no menu may show.
+    bool isGone(const QModelIndex &index) const;
+
     /// Forgets the name of \a path and whether it is hidden: both are read again when asked for.
     void forgetItemInfo(const QString &path);
     /// The same for the \a paths. A few that have come to be have their rows at once.
@@ -114,6 +118,7 @@ private:
     std::unique_ptr<MenuDropHost> m_dropHost;
     QString rootDir;
     FolderWatch *m_watch;
+    UnlistedFiles *m_unlisted = nullptr; // there where a listing may end too early
     std::unique_ptr<RowCache> m_cache;
     // The base class uses the provider to its own end, which is behind that of this class.
     QPointer<MenuIconProvider> m_icons;

@@ -158,6 +158,8 @@ void VelMenuProxyModel::forgetNames()
 
 bool VelMenuProxyModel::isLeftOut(const QModelIndex &index) const
 {
+    if (m_files && m_files->isGone(index))
+        return true;
     return !m_isHiddenShown && index.data(VelMenuModel::HiddenRole).toBool();
 }
 
