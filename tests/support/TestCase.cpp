@@ -9,6 +9,9 @@
 #include <QMutexLocker>
 #include <QSettings>
 
+#include <filesystem>
+#include <system_error>
+
 namespace {
 
 // What the running test function logged and announced. Messages may come from any thread.
@@ -136,6 +139,10 @@ void TestCase::cleanup()
     QMutexLocker lock(&log.mutex);
     qInstallMessageHandler(log.previous);
     log.previous = nullptr;
+    // Qt removes no file whose name is no text.
+    std::error_code left;
+    if (m_folder)
+        std::filesystem::remove_all(QFile::encodeName(m_folder->path()).toStdString(), left);
     m_folder.reset();
 
     if (QTest::currentTestFailed())
