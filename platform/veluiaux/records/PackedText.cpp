@@ -6,12 +6,17 @@
 #include <algorithm>
 #include <cstring>
 #include <new>
+#include <type_traits>
 #include <utility>
 
 namespace {
 
 using Group = DesktopEntryIndex::Group;
 using Run = DesktopEntryIndex::Run;
+
+// They are copied as bytes, one array behind the other.
+static_assert(std::is_trivially_copyable_v<Group> && std::is_trivially_copyable_v<Run>);
+static_assert(sizeof(Group) % alignof(Run) == 0);
 
 } // namespace
 
