@@ -12,6 +12,9 @@
 #include <QStyleOption>
 #include <QVBoxLayout>
 
+#include <algorithm>
+#include <cstdlib>
+
 namespace {
 
 QString s(const char *utf8)
@@ -147,6 +150,24 @@ struct Form
     OpenBox *const one;
     OpenBox *const two;
 };
+
+// Where a clip has several rectangles, as around the title, Qt 6 rounds a blended color in another way.
+constexpr int Rounding = QT_VERSION_MAJOR >= 6 ? 1 : 0;
+
+// Of one channel of one pixel.
+int largestDifference(const QImage &one, const QImage &other)
+{
+    int largest = 0;
+    for (int y = 0; y < one.height(); ++y) {
+        for (int x = 0; x < one.width(); ++x) {
+            const QRgb a = one.pixel(x, y);
+            const QRgb b = other.pixel(x, y);
+            largest = std::max({largest, std::abs(qRed(a) - qRed(b)), std::abs(qGreen(a) - qGreen(b)),
+                                std::abs(qBlue(a) - qBlue(b)), std::abs(qAlpha(a) - qAlpha(b))});
+        }
+    }
+    return largest;
+}
 
 QImage picture(QGroupBox &box)
 {
@@ -365,7 +386,7 @@ void tst_RadioGroupBoxDrawing::looksLikeTheNativeBoxOutsideOfItsTitle()
     QVERIFY(title.bottom() < 40);
     const QRect below(0, title.bottom() + 1, radioPicture.width(),
                       radioPicture.height() - title.bottom() - 1);
-    QCOMPARE(radioPicture.copy(below), nativePicture.copy(below));
+    QVERIFY(largestDifference(radioPicture.copy(below), nativePicture.copy(below)) <= Rounding);
     QVERIFY(radioPicture != nativePicture);
 }
 
