@@ -74,8 +74,12 @@ private:
             QCOMPARE(child<QComboBox>(window, "newLanguageBox")->currentText(), language);
             XDoTool::click(okButton(window));
         });
-        // What the box offers to complete.
-        modal.handle([](QWidget *popup) { popup->hide(); });
+        // What the box offers to complete; it would come again at the next letter.
+        modal.handle([language](QWidget *popup) {
+            const auto *box = child<QComboBox>(QApplication::activeModalWidget(), "newLanguageBox");
+            QTRY_COMPARE_WITH_TIMEOUT(box->currentText(), language, Patience);
+            popup->hide();
+        });
         XDoTool::click(child<QToolButton>(&dialog, "newLanguageButton"));
         QTRY_COMPARE_WITH_TIMEOUT(languages(dialog)->currentData().toString(), language, Patience);
         QVERIFY(modal.finished());
