@@ -13,10 +13,46 @@
 #include <QLabel>
 #include <QLayout>
 #include <QMenu>
-#include <QProcess>
 #include <QUrl>
 
+#include <csignal>
+#include <cstdio>
 #include <memory>
+
+#include <sys/types.h>
+
+/// A session bus for this program alone. Qt 6.5 asks for it when the application object is made, once for
+/// all.
+class SessionBus
+{
+public:
+    SessionBus()
+    {
+        std::FILE *daemon = ::popen("dbus-daemon --session --fork --print-address=1 --print-pid=1", "r");
+        char address[1024] = "";
+        int pid = 0;
+        if (daemon && std::fscanf(daemon, "%1023s %d", address, &pid) == 2) {
+            m_pid = pid;
+            s_address = address;
+            qputenv("DBUS_SESSION_BUS_ADDRESS", s_address);
+        }
+        if (daemon)
+            ::pclose(daemon);
+    }
+    ~SessionBus()
+    {
+        if (m_pid > 0)
+            ::kill(m_pid, SIGTERM);
+    }
+    Q_DISABLE_COPY_MOVE(SessionBus)
+
+    /// Empty when there is none.
+    static QByteArray address() { return s_address; }
+
+private:
+    static inline QByteArray s_address;
+    pid_t m_pid = 0;
+};
 
 /// The desktop's file manager as it is on the bus.
 class FileManagerService : public QObject, protected QDBusContext
@@ -25,8 +61,9 @@ class FileManagerService : public QObject, protected QDBusContext
     Q_CLASSINFO("D-Bus Interface", "org.freedesktop.FileManager1")
 
 public:
-    FileManagerService(const QString &address, bool refuses)
-        : m_bus(QDBusConnection::connectToBus(address, QStringLiteral("file manager")))
+    explicit FileManagerService(bool refuses)
+        : m_bus(QDBusConnection::connectToBus(QString::fromLatin1(SessionBus::address()),
+                                              QStringLiteral("file manager")))
         , m_refuses(refuses)
     {
         if (!m_bus.registerObject(QStringLiteral("/org/freedesktop/FileManager1"), this,
@@ -80,27 +117,17 @@ private:
     void choose();
     QAction *openAction() const;
     QString log() const { return path(QStringLiteral("log")); }
-
-    QString m_address;
-    QProcess m_bus;
 };
 
 void tst_ContainingFolder::initTestCase()
 {
-    m_bus.start(QStringLiteral("dbus-daemon"),
-                {QStringLiteral("--session"), QStringLiteral("--nofork"), QStringLiteral("--nopidfile"),
-                 QStringLiteral("--print-address=1")});
-    QByteArray address;
-    while (!address.endsWith('\n') && m_bus.waitForReadyRead(20000))
-        address += m_bus.readAllStandardOutput();
-    m_address = QString::fromLatin1(address.trimmed());
-    QVERIFY(!m_address.isEmpty());
+    QVERIFY(!SessionBus::address().isEmpty());
 }
 
 void tst_ContainingFolder::init()
 {
     HandsOnTestCase::init();
-    qputenv("DBUS_SESSION_BUS_ADDRESS", m_address.toLatin1());
+    qputenv("DBUS_SESSION_BUS_ADDRESS", SessionBus::address());
     installOpener("printf '%s|' \"$@\" >'" + QFile::encodeName(log()) + ".part'\nmv '"
                   + QFile::encodeName(log()) + ".part' '" + QFile::encodeName(log()) + "'\n");
 }
@@ -167,7 +194,7 @@ void tst_ContainingFolder::asksTheFileManagerOnTheBus()
 {
     QFETCH(QString, item);
     QFETCH(QString, url);
-    const FileManagerService service(m_address, false);
+    const FileManagerService service(false);
     openAssisted();
     clickItem(menu() + QLatin1Char('/') + item);
     choose();
@@ -193,8 +220,7 @@ void tst_ContainingFolder::opensTheFolderWhereThereIsNone()
     QFETCH(bool, hasService);
     if (!hasBus)
         qunsetenv("DBUS_SESSION_BUS_ADDRESS");
-    const std::unique_ptr<FileManagerService> service(hasService ? new FileManagerService(m_address, true)
-                                                                 : nullptr);
+    const std::unique_ptr<FileManagerService> service(hasService ? new FileManagerService(true) : nullptr);
     openAssisted();
     clickItem(menu() + QString::fromUtf8("/my folder/\xc3\xa4 %41#.desktop"));
     choose();
@@ -239,8 +265,7 @@ void tst_ContainingFolder::showsSeveralItemsAtOnce()
 {
     QFETCH(bool, hasService);
     installOpener("echo \"$2\" >>'" + QFile::encodeName(log()) + "'\n");
-    const std::unique_ptr<FileManagerService> service(hasService ? new FileManagerService(m_address, false)
-                                                                 : nullptr);
+    const std::unique_ptr<FileManagerService> service(hasService ? new FileManagerService(false) : nullptr);
     for (const char *name : {"b", "c", "d"})
         writeEntry(QStringLiteral("%1.desktop").arg(QLatin1String(name)), QLatin1String(name));
     openAssisted(4);
@@ -283,5 +308,14 @@ void tst_ContainingFolder::isThereWithAssistanceOnly()
     QVERIFY(!openAction());
 }
 
-VEL_TEST_MAIN(tst_ContainingFolder)
+int main(int argc, char **argv)
+{
+    VelTest::TestEnvironment environment;
+    const SessionBus bus;
+    QApplication application(argc, argv);
+    tst_ContainingFolder test;
+    QTEST_SET_MAIN_SOURCE_PATH
+    return QTest::qExec(&test, argc, argv);
+}
+
 #include "tst_ContainingFolder.moc"
