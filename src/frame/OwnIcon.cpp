@@ -9,20 +9,29 @@
 #include <QFile>
 #include <QIcon>
 
+namespace {
+
 // Qt looks for themes where the desktop has them, which knows nothing of the library's prefix.
-QIcon OwnIcon::named(const QString &name)
+QIcon installed(const QString &name)
 {
-    const QIcon ofTheme = QIcon::fromTheme(name);
-    const QString icons = LibraryPlace::icons();
-    if (!ofTheme.isNull() || icons.isEmpty())
-        return ofTheme;
-    QIcon installed;
-    const QDir theme(icons + QLatin1String("/hicolor"));
+    QIcon icon;
+    const QString folder = LibraryPlace::icons();
+    if (folder.isEmpty())
+        return icon;
+    const QDir theme(folder + QLatin1String("/hicolor"));
     const QStringList sizes = theme.entryList({QStringLiteral("*x*")}, QDir::Dirs);
     for (const QString &size : sizes) {
         const QString file = theme.filePath(size + QLatin1String("/apps/") + name + QLatin1String(".png"));
         if (QFile::exists(file))
-            installed.addFile(file);
+            icon.addFile(file);
     }
-    return installed;
+    return icon;
+}
+
+} // namespace
+
+QIcon OwnIcon::named(const QString &name)
+{
+    const QIcon ofTheme = QIcon::fromTheme(name);
+    return ofTheme.isNull() ? installed(name) : ofTheme;
 }
