@@ -69,11 +69,6 @@ void Program::loadCatalogs()
         loadCatalog(name, QStringLiteral(VEL_TRANSLATIONS_DIR));
 }
 
-QString Program::iconFolder()
-{
-    return besideProgram(QStringLiteral(VEL_ICONS_FROM_PROGRAM));
-}
-
 bool Program::mayWantNoWindow(int argc, char **argv)
 {
     return std::any_of(argv + 1, argv + argc, [](const char *argument) {

@@ -32,9 +32,6 @@ void describe(const QString &name);
  */
 void loadCatalogs();
 
-/// The folder of the icon themes in the prefix that the program itself lies in; it need not exist.
-QString iconFolder();
-
 /// Whether help or the version may be asked for, which are to be had without a display.
 bool mayWantNoWindow(int argc, char **argv);
 

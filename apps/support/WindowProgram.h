@@ -6,17 +6,8 @@
 #include "Program.h"
 
 #include <QApplication>
-#include <QIcon>
 
 namespace Program {
-
-/// Has icons found in the program's own prefix, too, which the desktop may not know of.
-inline void findOwnIcons()
-{
-    const QStringList folders = QIcon::themeSearchPaths();
-    if (!folders.contains(iconFolder()))
-        QIcon::setThemeSearchPaths(folders + QStringList{iconFolder()});
-}
 
 /**
  * The whole main() of the program \a name, which opens windows.
@@ -39,10 +30,7 @@ int runWithWindows(int &argc, char **argv, const QString &name, int wrongUsage, 
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps); // as it is always in Qt 6
 #endif
     QGuiApplication::setDesktopFileName(name);
-    return runAs<QApplication>(argc, argv, wrongUsage, parse, [run](const auto &options) {
-        findOwnIcons();
-        return run(options);
-    });
+    return runAs<QApplication>(argc, argv, wrongUsage, parse, run);
 }
 
 } // namespace Program

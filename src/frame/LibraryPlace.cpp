@@ -28,7 +28,8 @@ QString LibraryPlace::catalogs()
 
 QString LibraryPlace::icons()
 {
-    return {};
+    return QDir::cleanPath(QCoreApplication::applicationDirPath()
+                           + QLatin1String("/" VEL_ICONS_FROM_PROGRAM));
 }
 
 static QString programs()

@@ -15,8 +15,8 @@ namespace LibraryPlace {
 /// the library cannot tell where it lies.
 QString catalogs();
 
-/// The folder of the icon themes that came with the library; it need not exist. Empty where the library
-/// cannot tell where it lies, and for a static one.
+/// The folder of the icon themes that came with the library, and with its programs; it need not exist.
+/// Empty where the library cannot tell where it lies.
 QString icons();
 
 /// How the desktop's program \a name is started: by its name where PATH has it, else by its path

@@ -4,6 +4,14 @@
 // Where a library finds what is installed with it, for a test that installs it in many places.
 #include "LibraryPlace.cpp"
 
+#ifdef VELUIEXTRA_STATIC_DEFINE
+// Linked into a program, the library has its catalogs there.
+int qInitResources_veluiextra_catalogs()
+{
+    return 0;
+}
+#endif
+
 extern "C" {
 
 Q_DECL_EXPORT void placeOfProgram(const QString *name, QString *found)

@@ -25,6 +25,7 @@ private Q_SLOTS:
     void startsNothingBesideALibraryThatIsAlone();
     void seesTheCatalogsOfTheLibrarysPrefix();
     void seesTheIconsOfTheLibrarysPrefix();
+    void seesTheIconsOfTheProgramsPrefixWherePartOfIt();
     void followsALinkToTheLibrary();
 
 private:
@@ -147,6 +148,14 @@ void tst_LibraryPlace::seesTheIconsOfTheLibrarysPrefix()
 {
     install();
     QCOMPARE(folder("placeOfIcons"), path(QStringLiteral("prefix/share/icons")));
+}
+
+void tst_LibraryPlace::seesTheIconsOfTheProgramsPrefixWherePartOfIt()
+{
+    m_library.reset(new QLibrary(QStringLiteral(VEL_PLACE_IN_PROGRAM)));
+    QVERIFY2(m_library->load(), qPrintable(m_library->errorString()));
+    QCOMPARE(folder("placeOfIcons"),
+             QFileInfo(QCoreApplication::applicationDirPath()).path() + QLatin1String("/share/icons"));
 }
 
 void tst_LibraryPlace::followsALinkToTheLibrary()
