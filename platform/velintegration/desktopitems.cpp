@@ -133,7 +133,7 @@ bool SaveDesktopItemPosition(const char *fileName, int x, int y)
         QSaveFile file(path);
         if (!writeLines(&file, *lines))
             return false;
-        if (!lock)
+        if (!lock || !lock->isHeld())
             lock.emplace(encoded(root));
         if (attempt == MostAttempts || old.isUnchanged())
             return file.commit();

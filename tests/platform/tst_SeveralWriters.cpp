@@ -11,6 +11,7 @@
 #include <QDir>
 #include <QElapsedTimer>
 
+#include <fcntl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -31,6 +32,9 @@ private Q_SLOTS:
     void losesNoDesktopItem();
     void goesOnWithoutALockThatIsHeldForGood_data();
     void goesOnWithoutALockThatIsHeldForGood();
+    void waitsAsLongAsOthersGetOn();
+    void waitsAgainWhenAnotherWasFaster_data();
+    void waitsAgainWhenAnotherWasFaster();
     void readsWhateverIsLocked();
     void isFreeAgainWhenTheHolderIsKilled();
     void holdsNoLockOnAFolderThatIsNone();
@@ -88,6 +92,72 @@ int missingKeys(const QByteArray &path, int writers)
             missing += document.text(Main, keyOf(writer, save)) == QString::number(save) ? 0 : 1;
     }
     return missing;
+}
+
+// A process that holds the lock on a folder for three times as long as others wait for one that does not get
+// on, and does something every millisecond.
+class BusyHolder
+{
+public:
+    BusyHolder(const QString &folder, const std::function<void(int turn)> &work)
+    {
+        int answers[2];
+        if (::pipe(answers) != 0)
+            return;
+        m_child = ::fork();
+        if (m_child == 0)
+            run(folder, work, answers[1]);
+        ::close(answers[1]);
+        m_answers = answers[0];
+        int turn = -1;
+        m_isHeld = ::read(m_answers, &turn, sizeof turn) == sizeof turn;
+    }
+    ~BusyHolder()
+    {
+        if (m_child <= 0)
+            return;
+        ::kill(m_child, SIGKILL);
+        ::waitpid(m_child, nullptr, 0);
+        ::close(m_answers);
+    }
+    Q_DISABLE_COPY(BusyHolder)
+
+    bool isHeld() const { return m_isHeld; }
+    /// Waits for its end; how often it did something.
+    int turns() const
+    {
+        int turns = -1;
+        return ::read(m_answers, &turns, sizeof turns) == sizeof turns ? turns : -1;
+    }
+
+private:
+    [[noreturn]] static void run(const QString &folder, const std::function<void(int turn)> &work,
+                                 int answers)
+    {
+        const Vel::FolderLock lock(QFile::encodeName(folder).toStdString());
+        QElapsedTimer timer;
+        timer.start();
+        int turn = 0;
+        bool good = lock.isHeld() && ::write(answers, &turn, sizeof turn) == sizeof turn;
+        for (; good && !timer.hasExpired(3000); ++turn) {
+            work(turn);
+            ::usleep(1000);
+        }
+        good = good && ::write(answers, &turn, sizeof turn) == sizeof turn;
+        ::_exit(good ? 0 : 1);
+    }
+
+    pid_t m_child = -1;
+    int m_answers = -1;
+    bool m_isHeld = false;
+};
+
+void append(const QByteArray &path, const QByteArray &line)
+{
+    const int file = ::open(path.constData(), O_WRONLY | O_APPEND | O_CLOEXEC);
+    if (file < 0 || ::write(file, line.constData(), std::size_t(line.size())) != line.size())
+        ::_exit(1);
+    ::close(file);
 }
 
 // A process that holds the lock on a folder until it is killed.
@@ -239,6 +309,48 @@ void tst_SeveralWriters::goesOnWithoutALockThatIsHeldForGood()
     QVERIFY2(timer.elapsed() < 3000, "it waited for too long");
     QCOMPARE(read(path(QStringLiteral("x.desktop"))).contains("Icon=i\n"), isRecord);
     QCOMPARE(QFile::exists(path(QStringLiteral("desktopitems"))), !isRecord);
+}
+
+// A long queue, as one that waits sees it: the lock is always held, and files are replaced.
+void tst_SeveralWriters::waitsAsLongAsOthersGetOn()
+{
+    const QByteArray file = QFile::encodeName(path(QStringLiteral("x")));
+    const BusyHolder queue(folder(), [&file](int turn) {
+        if (turn % 2 == 0)
+            ::close(::open(file.constData(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600));
+        else
+            ::unlink(file.constData());
+    });
+    QVERIFY(queue.isHeld());
+    QVERIFY(Vel::FolderLock(QFile::encodeName(folder()).toStdString()).isHeld());
+    QVERIFY(queue.turns() > 0);
+}
+
+void tst_SeveralWriters::waitsAgainWhenAnotherWasFaster_data()
+{
+    goesOnWithoutALockThatIsHeldForGood_data();
+}
+
+// The file changes in its place, and the folder does not.
+void tst_SeveralWriters::waitsAgainWhenAnotherWasFaster()
+{
+    QFETCH(bool, isRecord);
+    qputenv("VEL_CONFIG_HOME", QFile::encodeName(folder()));
+    const QByteArray file =
+        QFile::encodeName(isRecord ? write(QStringLiteral("x.desktop"), "[Desktop Entry]\nName=A\n")
+                                   : write(QStringLiteral("desktopitems"), "0 0 a\n"));
+    const BusyHolder other(folder(), [&](int turn) {
+        for (int i = turn * 5; i < turn * 5 + 5; ++i)
+            append(file,
+                   isRecord ? "X-0-" + QByteArray::number(i) + "=1\n"
+                            : "0 0 " + QByteArray::number(i) + '\n');
+    });
+    QVERIFY(other.isHeld());
+    QVERIFY(isRecord ? setKey(file, "Icon", QStringLiteral("i")) : SaveDesktopItemPosition("b", 1, 2));
+    const int lines = other.turns() * 5;
+    const QByteArray text = read(QFile::decodeName(file));
+    QVERIFY(text.contains(isRecord ? "Icon=i\n" : "1 2 b\n"));
+    QCOMPARE(text.count(isRecord ? "\nX-0-" : "\n0 0 "), lines);
 }
 
 void tst_SeveralWriters::readsWhateverIsLocked()

@@ -332,10 +332,9 @@ EntryDocument::Outcome EntryDocument::replace(const AtomicFile::Target &target, 
     AtomicFile::Replacement replacement(target, {bytes.constData(), std::size_t(bytes.size())});
     if (!replacement.isReady())
         return Outcome::Failed;
-    if (!*locked) {
-        Vel::lockFolder(target.folder->get());
+    // Whoever was faster while this waited in vain has got on: then it is worth waiting again.
+    if (!*locked && Vel::lockFolder(target.folder->get()))
         *locked = target.folder;
-    }
     if (!isLast && !AtomicFile::isUnchanged(target))
         return Outcome::Overtaken;
     if (!replacement.commit())

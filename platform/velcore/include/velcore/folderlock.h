@@ -14,7 +14,8 @@ namespace Vel {
  *
  * It is a lock on the folder itself, which leaves nothing behind, also when its holder is killed.
  * Take it for the moment between a last look at the old file and the renaming of the new one, never
- * for reading. Who holds a lock must not stop others for good: after a second they go on without.
+ * for reading. Who holds a lock must not stop others for good: they go on without when nothing in the
+ * folder has changed for a second. A queue of writers that get on is waited for, ten seconds at most.
  *
  * Different objects may be used in different threads; one object may not.
  *
@@ -23,7 +24,7 @@ namespace Vel {
 class VELCORE_EXPORT FolderLock
 {
 public:
-    /// Waits for the lock on \a folder, at most a second; no text is the current folder.
+    /// Waits for the lock on \a folder, as said above; no text is the current folder.
     explicit FolderLock(const std::string &folder);
     /// Releases the lock.
     ~FolderLock();
