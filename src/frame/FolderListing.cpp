@@ -6,45 +6,86 @@
 #include <QByteArray>
 #include <QFile>
 
-#include <system_error>
+#include <cerrno>
+#include <cstring>
 
-namespace fs = std::filesystem;
+#include <fcntl.h>
+#include <sys/stat.h>
+
+namespace {
+
+// Its kind and rights; 0 where there is nothing.
+mode_t modeOf(DIR *folder, const char *name, int flags)
+{
+    struct stat status = {};
+    return ::fstatat(::dirfd(folder), name, &status, flags) == 0 ? status.st_mode : 0;
+}
+
+// Of most files no more is asked than what stands in the folder; but not every file system tells it there.
+mode_t kindOf(DIR *folder, const dirent &entry)
+{
+    return entry.d_type != DT_UNKNOWN ? DTTOIF(entry.d_type)
+                                      : modeOf(folder, entry.d_name, AT_SYMLINK_NOFOLLOW);
+}
+
+} // namespace
+
+FolderListing::Stream FolderListing::open(const QString &folder)
+{
+    return Stream(::opendir(QFile::encodeName(folder).constData()), ::closedir);
+}
+
+// Null at the end, and with errno set where it cannot be read on.
+const dirent *FolderListing::read(DIR *folder)
+{
+    const dirent *entry = nullptr;
+    do {
+        errno = 0;
+        entry = ::readdir(folder);
+    } while (entry && (std::strcmp(entry->d_name, ".") == 0 || std::strcmp(entry->d_name, "..") == 0));
+    return entry;
+}
+
+// A QDir would ask for the status of every file.
+std::optional<QSet<QString>> FolderListing::namesIn(const QString &folder)
+{
+    const Stream stream = open(folder);
+    if (!stream)
+        return std::nullopt;
+    QSet<QString> names;
+    while (const dirent *entry = read(stream.get()))
+        names.insert(QFile::decodeName(entry->d_name));
+    return errno == 0 ? std::optional<QSet<QString>>(names) : std::nullopt;
+}
 
 FolderListing::FolderListing(const QString &folder, DotFiles dotFiles)
     : m_prefix(folder.endsWith(QLatin1Char('/')) ? folder : folder + QLatin1Char('/'))
     , m_dotFiles(dotFiles)
+    , m_folder(open(folder))
 {
-    std::error_code error;
-    if (!folder.isEmpty())
-        m_entries = fs::directory_iterator(QFile::encodeName(folder).toStdString(), error);
 }
 
 std::optional<FolderListing::Item> FolderListing::next()
 {
     std::optional<Item> item;
-    std::error_code error;
-    while (!item && m_entries != fs::directory_iterator()) {
-        item = itemOf(*m_entries);
-        m_entries.increment(error);
-    }
+    while (const dirent *entry = !item && m_folder ? read(m_folder.get()) : nullptr)
+        item = itemOf(*entry);
     return item;
 }
 
-// Of most files no more is asked than what stands in the folder.
-std::optional<FolderListing::Item> FolderListing::itemOf(const fs::directory_entry &entry) const
+std::optional<FolderListing::Item> FolderListing::itemOf(const dirent &entry) const
 {
-    const std::string bytes = entry.path().filename().string();
-    if (m_dotFiles == Without && bytes.front() == '.')
+    if (m_dotFiles == Without && entry.d_name[0] == '.')
         return std::nullopt;
-    const QByteArray raw = QByteArray::fromStdString(bytes);
     Item item;
-    item.name = QFile::decodeName(raw);
-    if (QFile::encodeName(item.name) != raw)
+    item.name = QFile::decodeName(entry.d_name);
+    if (QFile::encodeName(item.name) != entry.d_name)
         return std::nullopt;
     item.path = m_prefix + item.name;
-    std::error_code error;
-    item.isLink = entry.is_symlink(error);
-    item.isFolder = entry.is_directory(error);
-    const bool isShown = item.isFolder || (item.isLink ? entry.exists(error) : entry.is_regular_file(error));
+    const mode_t kind = kindOf(m_folder.get(), entry);
+    item.isLink = S_ISLNK(kind);
+    const mode_t target = item.isLink ? modeOf(m_folder.get(), entry.d_name, 0) : kind;
+    item.isFolder = S_ISDIR(target);
+    const bool isShown = item.isFolder || S_ISREG(target) || (item.isLink && target != 0);
     return isShown ? std::optional<Item>(item) : std::nullopt;
 }

@@ -3,10 +3,13 @@
 
 #pragma once
 
+#include <QSet>
 #include <QString>
 
-#include <filesystem>
+#include <memory>
 #include <optional>
+
+#include <dirent.h>
 
 /**
  * What a folder holds, item by item, in the order of the file system: files, folders, and links
@@ -27,6 +30,10 @@ public:
         bool isLink = false;
     };
 
+    /// The names of all that \a folder holds: dot files, links that lead nowhere, and what stands for
+    /// names that are no text are among them; nothing when it cannot be listed. Looks at no file.
+    static std::optional<QSet<QString>> namesIn(const QString &folder);
+
     /// Lists nothing if \a folder cannot be read.
     explicit FolderListing(const QString &folder, DotFiles dotFiles = Without);
 
@@ -34,9 +41,14 @@ public:
     std::optional<Item> next();
 
 private:
-    std::optional<Item> itemOf(const std::filesystem::directory_entry &entry) const;
+    using Stream = std::unique_ptr<DIR, int (*)(DIR *)>;
+
+    static Stream open(const QString &folder);
+    static const dirent *read(DIR *folder);
+
+    std::optional<Item> itemOf(const dirent &entry) const;
 
     QString m_prefix;
     DotFiles m_dotFiles;
-    std::filesystem::directory_iterator m_entries;
+    Stream m_folder; // null where it cannot be read
 };

@@ -17,6 +17,7 @@
 #include "TreeRemoval.h"
 #include "VelMenuModel.h"
 
+#include <frame/FolderListing.h>
 #include <frame/MessageBox.h>
 
 #include <QCoreApplication>
@@ -74,7 +75,7 @@ bool isFixed(const QString &path)
 {
     const QFileInfo info(path);
     return info.isDir() && !info.isSymLink() && !info.isWritable()
-        && !OnDisk::namesIn(path).value_or(QSet<QString>{path}).isEmpty();
+        && !FolderListing::namesIn(path).value_or(QSet<QString>{path}).isEmpty();
 }
 
 FileWork deletingFiles(QWidget *view)

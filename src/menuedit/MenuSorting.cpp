@@ -9,7 +9,6 @@
 #include "MenuReordering.h"
 #include "MenuSelection.h"
 #include "MenuVoice.h"
-#include "OnDisk.h"
 #include "ShownMenu.h"
 #include "StepRecorder.h"
 #include "VelMenuModel.h"
@@ -17,6 +16,7 @@
 
 #include <frame/DesktopEntryRecord.h>
 #include <frame/EntryPath.h>
+#include <frame/FolderListing.h>
 
 #include <QAction>
 #include <QCoreApplication>
@@ -82,7 +82,7 @@ QString MenuSorting::folder() const
 QVector<NameOrder::Child> MenuSorting::childrenOf(const QString &folder) const
 {
     QVector<NameOrder::Child> children;
-    const QSet<QString> names = OnDisk::namesIn(folder).value_or(QSet<QString>());
+    const QSet<QString> names = FolderListing::namesIn(folder).value_or(QSet<QString>());
     for (const QString &name : names) {
         const QString path = folder + QLatin1Char('/') + name;
         const QFileInfo info(path);

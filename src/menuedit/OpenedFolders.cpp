@@ -5,10 +5,11 @@
 
 #include "LoadedFolders.h"
 #include "MenuSelection.h"
-#include "OnDisk.h"
 #include "ShownMenu.h"
 #include "VelMenuModel.h"
 #include "VelMenuProxyModel.h"
+
+#include <frame/FolderListing.h>
 
 #include <QDir>
 #include <QFileInfo>
@@ -144,7 +145,7 @@ bool OpenedFolders::isWithin(const QString &path) const
 
 bool OpenedFolders::takeItems(const QString &path)
 {
-    const int count = OnDisk::namesIn(path).value_or(QSet<QString>()).size();
+    const int count = FolderListing::namesIn(path).value_or(QSet<QString>()).size();
     if (count > MostItems - m_items)
         return false;
     m_items += count;

@@ -3,9 +3,10 @@
 
 #include "ShownOrder.h"
 
-#include "OnDisk.h"
 #include "SortOrder.h"
 #include "VelMenuProxyModel.h"
+
+#include <frame/FolderListing.h>
 
 #include <QFileSystemModel>
 #include <QSortFilterProxyModel>
@@ -44,7 +45,7 @@ QStringList ShownOrder::with(const QSortFilterProxyModel &proxy, const QStringLi
 {
     // The row of a file that went stands for a moment longer.
     const std::optional<QSet<QString>> present =
-        OnDisk::namesIn(folder.data(QFileSystemModel::FilePathRole).toString());
+        FolderListing::namesIn(folder.data(QFileSystemModel::FilePathRole).toString());
     QStringList children;
     int place = -1;
     for (const QModelIndex &child : childrenOf(proxy, folder)) {

@@ -5,6 +5,8 @@
 
 #include "OnDisk.h"
 
+#include <frame/FolderListing.h>
+
 #include <QDir>
 #include <QFileInfo>
 #include <QFileSystemModel>
@@ -39,7 +41,7 @@ bool UnlistedFiles::mayGoAndCome(const QString &path) const
 void UnlistedFiles::complete(const QString &path)
 {
     const QString folder = QDir::cleanPath(path);
-    const std::optional<QSet<QString>> names = path.isEmpty() ? std::nullopt : OnDisk::namesIn(folder);
+    const std::optional<QSet<QString>> names = path.isEmpty() ? std::nullopt : FolderListing::namesIn(folder);
     const bool isWhole = !names || std::none_of(names->begin(), names->end(), mayBeNoText);
     if (isWhole && !m_folders.remove(folder))
         return;

@@ -16,8 +16,6 @@ private Q_SLOTS:
 
     void tellsWhetherThereIsAnything_data();
     void tellsWhetherThereIsAnything();
-    void namesAllThatAFolderHolds();
-    void namesNothingWhereItCannotLook();
 };
 
 void tst_OnDisk::init()
@@ -45,26 +43,6 @@ void tst_OnDisk::tellsWhetherThereIsAnything()
     QFETCH(bool, isThere);
     QCOMPARE(OnDisk::exists(path(QLatin1String(QTest::currentDataTag()))), isThere);
     QVERIFY(!OnDisk::exists(QString()));
-}
-
-void tst_OnDisk::namesAllThatAFolderHolds()
-{
-    write(QString::fromUtf8("\u00e4"), "");
-    QCOMPARE(OnDisk::namesIn(folder()),
-             (QSet<QString>{QStringLiteral("file"), QStringLiteral("folder"), QStringLiteral("link to file"),
-                            QStringLiteral("link to folder"), QStringLiteral("link to missing"),
-                            QString::fromUtf8("\u00e4")}));
-    QCOMPARE(OnDisk::namesIn(path(QStringLiteral("link to folder"))),
-             QSet<QString>{QStringLiteral(".hidden")});
-    QVERIFY(QFile::remove(path(QStringLiteral("folder/.hidden"))));
-    QCOMPARE(OnDisk::namesIn(path(QStringLiteral("folder"))), QSet<QString>());
-}
-
-void tst_OnDisk::namesNothingWhereItCannotLook()
-{
-    for (const char *name : {"missing", "file", "link to missing"})
-        QVERIFY2(!OnDisk::namesIn(path(QLatin1String(name))), name);
-    QVERIFY(!OnDisk::namesIn(QString()));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_OnDisk)
