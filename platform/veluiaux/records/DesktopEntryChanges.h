@@ -26,6 +26,15 @@ public:
         std::string key;
         std::string locale; ///< empty for the key without a language
         std::optional<std::string> value; ///< as it is to stand in the file; none: the key goes
+
+        Change(std::string_view inGroup, std::string_view ofKey, std::string_view inLocale,
+               std::optional<std::string_view> toValue)
+            : group(inGroup)
+            , key(ofKey)
+            , locale(inLocale)
+            , value(toValue)
+        {
+        }
     };
 
     bool isEmpty() const { return m_changes.empty() && m_removedGroups.empty(); }
@@ -33,6 +42,8 @@ public:
 
     const Change *find(std::string_view group, std::string_view key, std::string_view locale) const;
     void set(Change change);
+    /// The same, made in its place; what is handed over may not lie in these changes.
+    void set(std::string_view group, std::string_view key, std::string_view locale, std::string_view value);
     /// Makes room for so many changes at once.
     void reserve(std::size_t count);
     /// Sets all that \a others has; they have no removed groups.

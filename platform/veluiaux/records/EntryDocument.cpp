@@ -25,7 +25,7 @@ namespace {
 // So often a save starts anew because another program was faster.
 constexpr int MostAttempts = 10;
 
-constexpr std::size_t UsualLine = 40; // bytes
+constexpr std::size_t UsualLine = 32; // bytes, rather less: to make more room costs more than to have some
 constexpr std::size_t MostReserved = 1024;
 
 std::string encode(const QString &text)
@@ -91,8 +91,8 @@ void EntryDocument::write(std::string_view group, std::string_view key, std::str
     if (asInFile)
         m_changes.drop(group, key, locale);
     else
-        m_changes.set({std::string(group), std::string(key), std::string(locale),
-                       value.isEmpty() ? std::nullopt : std::make_optional(encode(value))});
+        m_changes.set(
+            {group, key, locale, value.isEmpty() ? std::nullopt : std::make_optional(encode(value))});
 }
 
 template <typename T>
@@ -197,7 +197,7 @@ void EntryDocument::setFlag(std::string_view group, std::string_view key, bool v
     if (base ? DesktopEntryValue::toFlag(*base) == value : !value)
         m_changes.drop(group, key, {});
     else
-        m_changes.set({std::string(group), std::string(key), {}, std::string(value ? "true" : "false")});
+        m_changes.set(group, key, {}, value ? "true" : "false");
 }
 
 void EntryDocument::removeKey(std::string_view group, std::string_view key)
@@ -209,7 +209,7 @@ void EntryDocument::removeKey(std::string_view group, std::string_view key)
         return change.group == group && change.key == key && inFile.count(change.locale) == 0;
     });
     for (const std::string &locale : inFile)
-        m_changes.set({std::string(group), std::string(key), locale, std::nullopt});
+        m_changes.set({group, key, locale, std::nullopt});
 }
 
 void EntryDocument::removeGroups(const std::unordered_set<std::string> &groups)
@@ -232,7 +232,7 @@ void EntryDocument::copyGroups(const std::unordered_map<std::string, std::string
         [&](std::string_view group, std::string_view key, std::string_view locale, std::string_view value) {
             const auto name = names.find(*taken.emplace(group).first);
             if (name != names.end())
-                copies.set({name->second, std::string(key), std::string(locale), std::string(value)});
+                copies.set(name->second, key, locale, value);
         });
     for (const auto &copy : copies.all()) {
         if (taken.count(copy.group) == 0)
@@ -273,7 +273,7 @@ void EntryDocument::inheritFrom(const EntryDocument &other)
     other.forEachValue(
         [&](std::string_view group, std::string_view key, std::string_view locale, std::string_view value) {
             if (inherited.has(group, key, locale))
-                taken.set({std::string(group), std::string(key), std::string(locale), std::string(value)});
+                taken.set(group, key, locale, value);
         });
     m_valid = m_valid || (other.m_valid && !taken.isEmpty());
     m_changes.add(std::move(taken));
