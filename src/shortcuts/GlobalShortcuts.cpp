@@ -12,7 +12,7 @@
 #include <QFile>
 #include <QKeySequence>
 
-#include <algorithm>
+#include <cstring>
 #include <string_view>
 
 #include <fcntl.h>
@@ -48,11 +48,6 @@ QByteArray contents(const QString &path)
     return bytes;
 }
 
-bool isEndOfLine(char character)
-{
-    return character == '\n' || character == '\r' || character == '\0';
-}
-
 bool isBlank(char character)
 {
     return character == ' ' || character == '\t';
@@ -80,7 +75,8 @@ bool mayMatch(const QByteArray &bytes, const KeyMatcher &matcher)
     if (bytes.startsWith("\xef\xbb\xbf"))
         begin += 3;
     while (begin < end) {
-        const char *const lineEnd = std::find_if(begin, end, isEndOfLine);
+        // Stops at a zero, too: one inside, or the one behind the bytes.
+        const char *const lineEnd = begin + std::strcspn(begin, "\n\r");
         const std::string_view key = keyOf({begin, std::size_t(lineEnd - begin)});
         if (!key.empty() && matcher.matches(key))
             return true;
