@@ -84,14 +84,31 @@ void RadioGroupBoxPainter::drawIndicator()
     m_style->drawPrimitive(QStyle::PE_IndicatorRadioButton, &button, m_painter, m_widget);
 }
 
+// A style sheet draws the frame unasked, and replaces the clip region to do it: a box without an inside
+// has none. Makes \a option one, if its title is as large as in the whole box; returns where the title is.
+QRect RadioGroupBoxPainter::shrink(QStyleOptionGroupBox *option) const
+{
+    const auto labelOf = [this](const QStyleOptionGroupBox &box) {
+        return m_style->subControlRect(QStyle::CC_GroupBox, &box, QStyle::SC_GroupBoxLabel, m_widget);
+    };
+    const QRect whole = labelOf(*option);
+    QStyleOptionGroupBox shrunk(*option);
+    // As high as the margins, which would be filled otherwise.
+    shrunk.rect.setSize(QSize(0, m_option.rect.height() - rectOf(QStyle::SC_GroupBoxFrame).height()));
+    const QRect label = labelOf(shrunk);
+    if (label.size() != whole.size())
+        return whole;
+    *option = shrunk;
+    return label;
+}
+
 // Lets the style draw a box that has nothing but a title, and shows no more of it than that.
 void RadioGroupBoxPainter::drawTitleByStyle()
 {
     QStyleOptionGroupBox option(m_option);
     option.subControls = QStyle::SC_GroupBoxLabel;
     option.state &= ~QStyle::State_HasFocus;
-    const QRect label =
-        m_style->subControlRect(QStyle::CC_GroupBox, &option, QStyle::SC_GroupBoxLabel, m_widget);
+    const QRect label = shrink(&option);
     m_painter->save();
     m_painter->setClipRect(m_label);
     // The text is in the middle of its height, which need not be the same without an indicator.

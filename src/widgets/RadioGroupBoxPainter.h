@@ -26,6 +26,7 @@ public:
 
 private:
     QRect rectOf(QStyle::SubControl part) const;
+    QRect shrink(QStyleOptionGroupBox *option) const;
     void drawTitleByStyle();
     Qt::AlignmentFlag titleAlignment() const;
 

@@ -26,11 +26,12 @@ class OpenBox : public VelRadioGroupBox
 public:
     using VelRadioGroupBox::VelRadioGroupBox;
 
-    QRect labelRect() const
+    QRect labelRect() const { return rectOf(QStyle::SC_GroupBoxLabel); }
+    QRect rectOf(QStyle::SubControl part) const
     {
         QStyleOptionGroupBox option;
         initStyleOption(&option);
-        return style()->subControlRect(QStyle::CC_GroupBox, &option, QStyle::SC_GroupBoxLabel, this);
+        return style()->subControlRect(QStyle::CC_GroupBox, &option, part, this);
     }
 };
 
@@ -81,6 +82,8 @@ private Q_SLOTS:
     void hasTheColorsOfAStyleSheet_data();
     void hasTheColorsOfAStyleSheet();
     void liesWhereTheStyleHasItUnderAStyleSheet();
+    void hasOneFrameUnderAStyleSheet_data();
+    void hasOneFrameUnderAStyleSheet();
 };
 
 void tst_RadioGroupBoxTitle::liesWhereTheStyleHasIt_data()
@@ -156,6 +159,55 @@ void tst_RadioGroupBoxTitle::liesWhereTheStyleHasItUnderAStyleSheet()
     pair.window.setStyleSheet(s("QGroupBox { border: 1px solid gray; margin-top: 20px; }"
                                 "QGroupBox::title { subcontrol-origin: margin; color: blue; left: 12px; }"));
     QCOMPARE(pair.label(pair.radio), pair.label(pair.native));
+}
+
+void tst_RadioGroupBoxTitle::hasOneFrameUnderAStyleSheet_data()
+{
+    QTest::addColumn<QString>("sheet");
+    QTest::addColumn<Qt::LayoutDirection>("direction");
+    const QPair<const char *, const char *> sheets[] = {
+        {"border", "QGroupBox { border: 2px solid #ff0000; }"},
+        {"border, margin", "QGroupBox { border: 1px solid #ff0000; margin-top: 12px; }"},
+        {"border, margins, corners",
+         "QGroupBox { border: 3px solid #ff0000; border-radius: 5px; margin: 14px 6px 5px 7px; }"},
+        {"border, title",
+         "QGroupBox { border: 1px solid #ff0000; margin-top: 8px; }"
+         "QGroupBox::title { subcontrol-origin: margin; left: 10px; padding: 0 3px; }"},
+        {"border, title in the middle",
+         "QGroupBox { border: 1px solid #ff0000; margin-top: 8px; }"
+         "QGroupBox::title { subcontrol-position: top center; }"},
+        {"border, title with a background",
+         "QGroupBox { border: 1px solid #ff0000; margin-top: 10px; }"
+         "QGroupBox::title { background: #00ff00; }"},
+    };
+    for (const auto &sheet : sheets) {
+        QTest::addRow("%s", sheet.first) << s(sheet.second) << Qt::LeftToRight;
+        QTest::addRow("%s, right to left", sheet.first) << s(sheet.second) << Qt::RightToLeft;
+    }
+}
+
+void tst_RadioGroupBoxTitle::hasOneFrameUnderAStyleSheet()
+{
+    QFETCH(QString, sheet);
+    QFETCH(Qt::LayoutDirection, direction);
+    Pair pair(s("A &title"), direction);
+    pair.window.setStyleSheet(sheet);
+    const QImage radio = pair.radio.grab().toImage();
+    const QImage native = pair.native.grab().toImage();
+    // The frame is cut out around the title, too.
+    const QRect title =
+        (pair.radio.labelRect() | pair.radio.rectOf(QStyle::SC_GroupBoxCheckBox)).adjusted(-4, 0, 4, 0);
+    int lines = 0;
+    for (int y = 0; y < native.height(); ++y) {
+        for (int x = 0; x < native.width(); ++x) {
+            if (title.contains(x, y))
+                continue;
+            lines += native.pixelColor(x, y) == QColor(Qt::red);
+            if (radio.pixel(x, y) != native.pixel(x, y))
+                QFAIL(qPrintable(s("another color at %1, %2").arg(x).arg(y)));
+        }
+    }
+    QVERIFY(lines > 300);
 }
 
 VEL_TEST_MAIN(tst_RadioGroupBoxTitle)
