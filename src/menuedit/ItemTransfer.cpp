@@ -9,13 +9,16 @@
 #include "VelMenuModel.h"
 #include "WebAddress.h"
 
+#include <frame/QtMajor.h>
+
+#include <QApplication>
 #include <QClipboard>
 #include <QCoreApplication>
 #include <QDropEvent>
-#include <QGuiApplication>
 #include <QIcon>
 #include <QMenu>
 #include <QMimeData>
+#include <QMouseEvent>
 #include <QPersistentModelIndex>
 #include <QPointer>
 #include <QUrl>
@@ -36,6 +39,38 @@ void ItemTransfer::put(const QStringList &paths, Qt::DropAction action)
 }
 
 namespace {
+
+constexpr int ManyMoves = 10; // after which a menu takes any click for one that is meant
+
+/// The menu of a drop. A menu of Qt 6 closes at a click of a mouse that has not moved since it opened, and
+/// measures that from where the mouse was last seen: one that drags something of another program is not seen.
+class DropMenu : public QMenu
+{
+public:
+    DropMenu(QWidget *view, const QPoint &position)
+        : QMenu(view)
+        , m_position(position)
+    {
+    }
+
+protected:
+    void mousePressEvent(QMouseEvent *event) override
+    {
+        const QPointF place = QtMajor::positionOf(*event);
+        const QPoint onScreen = mapToGlobal(place.toPoint());
+        const int distance = (onScreen - m_position).manhattanLength();
+        if (rect().contains(place.toPoint()) && distance > QApplication::startDragDistance()) {
+            QMouseEvent move(QEvent::MouseMove, place, place, onScreen, Qt::NoButton, Qt::NoButton,
+                             event->modifiers());
+            for (int i = 0; i < ManyMoves; ++i)
+                mouseMoveEvent(&move);
+        }
+        QMenu::mousePressEvent(event);
+    }
+
+private:
+    const QPoint m_position;
+};
 
 // Whether what is on the clipboard can be had without a long wait; tells when it cannot.
 bool isToBeHad(ClipboardContents *contents, const QModelIndex &item, MenuVoice &voice)
@@ -90,7 +125,7 @@ Qt::DropAction ItemTransfer::actionForAddresses(const QDropEvent &drop)
 
 Qt::DropAction ItemTransfer::askForDropAction(QWidget *view, const QPoint &position, Qt::DropActions possible)
 {
-    const QPointer<QMenu> menu(new QMenu(view));
+    const QPointer<QMenu> menu(new DropMenu(view, position));
     QAction *const move = menu->addAction(QCoreApplication::translate("VelMenuView", "Move"));
     move->setEnabled(possible & Qt::MoveAction);
     QAction *const copy = menu->addAction(QCoreApplication::translate("VelMenuView", "Copy"));

@@ -25,6 +25,7 @@ private Q_SLOTS:
     void offersWhatTheSourceAllows_data();
     void offersWhatTheSourceAllows();
     void offersTheChoiceAtTheDrop();
+    void takesAClickOfAMouseThatWasNotSeen();
     void goesAwayWhileItAsksWhatToDo();
     void removesNothingAfterADrag();
 
@@ -203,6 +204,28 @@ void tst_VelMenuViewDrop::offersTheChoiceAtTheDrop()
     view.dropEvent(&event);
     QVERIFY(modal.finished());
     QVERIFY(!event.isAccepted() || event.dropAction() == Qt::IgnoreAction);
+}
+
+// It has dragged the file out of another program's window.
+void tst_VelMenuViewDrop::takesAClickOfAMouseThatWasNotSeen()
+{
+    VelMenuView view(menu(), -1, true);
+    view.show();
+    QVERIFY(open(view, menu(), 2));
+    QMimeData data;
+    data.setUrls({QUrl::fromLocalFile(m_a)});
+    QDropEvent event(view.visualRect(shown(view, m_sub)).center(), Qt::CopyAction, &data, Qt::LeftButton,
+                     Qt::NoModifier);
+    ModalDriver modal;
+    modal.handle([](QWidget *window) {
+        auto *choices = qobject_cast<QMenu *>(window);
+        QVERIFY(choices);
+        QTest::mouseClick(choices, Qt::LeftButton, Qt::NoModifier,
+                          choices->actionGeometry(choices->actions().at(1)).center());
+    });
+    view.dropEvent(&event);
+    QVERIFY(modal.finished());
+    QCOMPARE(event.dropAction(), Qt::CopyAction);
 }
 
 void tst_VelMenuViewDrop::goesAwayWhileItAsksWhatToDo()
