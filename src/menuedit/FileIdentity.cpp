@@ -53,9 +53,14 @@ quint64 FileIdentity::mark() const
     return mark;
 }
 
-bool FileIdentity::isSettled() const
+bool FileIdentity::isSettledAt(qint64 time) const
 {
-    timespec now = {};
-    clock_gettime(CLOCK_REALTIME, &now);
-    return std::max(m_modified, m_changed) + LongEnough < nanoseconds(now);
+    return std::max(m_modified, m_changed) + LongEnough < time;
+}
+
+qint64 FileIdentity::now()
+{
+    timespec time = {};
+    clock_gettime(CLOCK_REALTIME, &time);
+    return nanoseconds(time);
 }

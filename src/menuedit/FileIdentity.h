@@ -23,7 +23,11 @@ public:
 
     bool isRegularFile() const { return m_isRegularFile; }
     /// Whether the last change is long enough ago that another would have another time.
-    bool isSettled() const;
+    bool isSettled() const { return isSettledAt(now()); }
+    /// The same of a moment in the past, behind which the file has not changed then.
+    bool isSettledAt(qint64 time) const;
+    /// This moment, in nanoseconds.
+    static qint64 now();
 
 private:
     quint64 m_device = 0;

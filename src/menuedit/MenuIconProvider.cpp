@@ -3,7 +3,7 @@
 
 #include "MenuIconProvider.h"
 
-#include "FileIdentity.h"
+#include "NewIcons.h"
 #include "RowCache.h"
 #include "VelMimeTypeIconProvider.h"
 
@@ -22,6 +22,7 @@ class Provider : public VelMimeTypeIconProvider
 public:
     explicit Provider(RowCache *cache)
         : m_cache(cache)
+        , m_new(new NewIcons(cache))
     {
     }
 
@@ -71,19 +72,28 @@ private:
 
     QIcon entryIcon(const QString &path) const
     {
-        const FileIdentity identity(path);
-        m_regularFile = identity.isRegularFile() ? path : QString();
-        const std::optional<QIcon> known = m_cache->icon(path, identity);
-        if (known)
+        m_regularFile = path;
+        if (const std::optional<QIcon> known = knownIcon(path))
             return *known;
+        // A dot file has no row with which its icon would be forgotten.
+        const bool isKept = !isDotFile(path);
+        if (isKept)
+            m_new->begin(path);
         const VelUIDesktopEntry entry(path);
         if (!m_cache->display(path))
             m_cache->prefetch(path, RowCache::Display::of(entry));
         const QIcon icon = sharedIcon(entry);
-        // A dot file has no row with which its icon would be forgotten.
-        if (identity.isSettled() && !isDotFile(path))
-            m_cache->setIcon(path, identity, icon);
+        if (isKept)
+            m_new->end(icon);
         return icon;
+    }
+
+    // Of a row that is listed for the first time no file need be looked at.
+    std::optional<QIcon> knownIcon(const QString &path) const
+    {
+        if (m_cache->hasNewIcon(path))
+            m_new->finish(path);
+        return m_cache->hasIcon(path) ? m_cache->icon(path, FileIdentity(path)) : std::nullopt;
     }
 
     // Most rows of a folder have one of few icons.
@@ -101,7 +111,8 @@ private:
     }
 
     const QPointer<RowCache> m_cache;
-    // The file that was just looked at for its icon, if it is a regular one.
+    NewIcons *m_new; // as long as the cache is there
+    // The regular file that was just looked at for its icon.
     mutable QString m_regularFile;
 };
 

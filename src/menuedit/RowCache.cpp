@@ -100,7 +100,7 @@ std::optional<RowCache::Display> RowCache::takePrefetched(const QString &path)
 std::optional<QIcon> RowCache::icon(const QString &path, const FileIdentity &identity) const
 {
     const Row *const row = find(path);
-    if (!row || !row->hasIcon || row->mark != identity.mark())
+    if (!row || row->origin != IconOrigin::Known || row->mark != identity.mark())
         return std::nullopt;
     return row->icon;
 }
@@ -110,7 +110,38 @@ void RowCache::setIcon(const QString &path, const FileIdentity &identity, const 
     Row &row = make(path);
     row.mark = identity.mark();
     row.icon = icon;
-    row.hasIcon = true;
+    row.origin = IconOrigin::Known;
+}
+
+void RowCache::setNewIcon(const QString &path, const QIcon &icon)
+{
+    Row &row = make(path);
+    row.icon = icon;
+    row.origin = IconOrigin::New;
+}
+
+bool RowCache::hasNewIcon(const QString &path) const
+{
+    const Row *const row = find(path);
+    return row && row->origin == IconOrigin::New;
+}
+
+void RowCache::keepNewIcon(const QString &path, const FileIdentity &identity)
+{
+    setIcon(path, identity, make(path).icon);
+}
+
+void RowCache::dropNewIcon(const QString &path)
+{
+    Row &row = make(path);
+    row.icon = QIcon();
+    row.origin = IconOrigin::None;
+}
+
+bool RowCache::hasIcon(const QString &path) const
+{
+    const Row *const row = find(path);
+    return row && row->origin != IconOrigin::None;
 }
 
 std::optional<QIcon> RowCache::sharedIcon(const QString &name) const

@@ -57,6 +57,16 @@ public:
     /// The icon that was made of the entry at \a path when it had that \a identity.
     std::optional<QIcon> icon(const QString &path, const FileIdentity &identity) const;
     void setIcon(const QString &path, const FileIdentity &identity, const QIcon &icon);
+    /// Remembers the \a icon of a row that is new: of which file it was made is still to be asked. Until
+    /// then icon() does not give it.
+    void setNewIcon(const QString &path, const QIcon &icon);
+    bool hasNewIcon(const QString &path) const;
+    /// The new icon of \a path was made of the file with that \a identity.
+    void keepNewIcon(const QString &path, const FileIdentity &identity);
+    /// Or nobody knows of which.
+    void dropNewIcon(const QString &path);
+    /// Whether an icon of \a path is remembered, be it new or not.
+    bool hasIcon(const QString &path) const;
 
     /// The icon that a row just got for the icon name \a name; rows that come together share it.
     std::optional<QIcon> sharedIcon(const QString &name) const;
@@ -86,6 +96,8 @@ public:
 private:
     void forgetAtTheNextTurn();
 
+    enum class IconOrigin : quint8 { None, New, Known };
+
     struct Row
     {
         QString name;
@@ -94,7 +106,7 @@ private:
         EntryState::Kind state = EntryState::Kind::Shown;
         bool isNamed = false;
         bool isHidden = false;
-        bool hasIcon = false;
+        IconOrigin origin = IconOrigin::None;
     };
 
     using Folder = QHash<QString, Row>; // by the paths of the rows

@@ -73,6 +73,8 @@ void tst_FileIdentity::settlesAMomentAfterAChange()
 {
     const QString file = write(QStringLiteral("a"), "a");
     QTRY_VERIFY(FileIdentity(file).isSettled());
+    QVERIFY(FileIdentity(file).isSettledAt(FileIdentity::now()));
+    QVERIFY(!FileIdentity(file).isSettledAt(FileIdentity::now() - qint64(3600) * 1000000000));
 
     // From now on for longer than this takes.
     QFile changed(file);

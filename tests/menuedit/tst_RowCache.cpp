@@ -17,6 +17,7 @@ private Q_SLOTS:
     void dropsWhatWasPrefetchedWhenTheEventLoopTurns();
     void givesWhatWasPrefetchedOnce();
     void givesAnIconOnlyOfTheSameFile();
+    void givesNoNewIconBeforeItsFileIsKnown();
     void sharesAnIconUntilTheEventLoopTurns();
     void takesTheListedIconOfAnEditedRow();
     void learnsThatAFolderHasARecordFile();
@@ -112,6 +113,26 @@ void tst_RowCache::givesAnIconOnlyOfTheSameFile()
     write(QStringLiteral("a.desktop"), "another");
     QVERIFY(!cache.icon(file, FileIdentity(file)));
     QVERIFY(cache.icon(file, before));
+}
+
+void tst_RowCache::givesNoNewIconBeforeItsFileIsKnown()
+{
+    RowCache cache;
+    const QIcon first = icon();
+    QVERIFY(!cache.hasIcon(Entry));
+    cache.setNewIcon(Entry, first);
+    QVERIFY(cache.hasIcon(Entry) && cache.hasNewIcon(Entry));
+    QVERIFY(!cache.icon(Entry, FileIdentity()));
+
+    cache.keepNewIcon(Entry, FileIdentity());
+    QVERIFY(!cache.hasNewIcon(Entry));
+    QCOMPARE(cache.icon(Entry, FileIdentity())->cacheKey(), first.cacheKey());
+
+    cache.setDisplay(Entry, {QStringLiteral("A"), false});
+    cache.setNewIcon(Entry, icon());
+    cache.dropNewIcon(Entry);
+    QVERIFY(!cache.hasIcon(Entry));
+    QCOMPARE(cache.display(Entry)->name, QStringLiteral("A"));
 }
 
 void tst_RowCache::sharesAnIconUntilTheEventLoopTurns()

@@ -29,6 +29,8 @@ private Q_SLOTS:
     void looksAtNoFileToSortAgain();
     void showsAnEditedIcon();
     void showsTheIconOfAFileThatWasReplacedAfterAnEdit();
+    void showsTheIconOfAnEntryThatChangedAtOnce();
+    void looksAtNoEntryBehindItsEnd();
     void showsTheNameOfARecordFileThatComes_data();
     void showsTheNameOfARecordFileThatComes();
     void forgetsARowThatGoes();
@@ -234,6 +236,32 @@ void tst_VelMenuModelPaint::showsTheIconOfAFileThatWasReplacedAfterAnEdit()
     QVERIFY(other.commit());
 
     QTRY_COMPARE(iconName(indexOf(QStringLiteral("menu/a.desktop"))), QStringLiteral("go-up"));
+}
+
+void tst_VelMenuModelPaint::showsTheIconOfAnEntryThatChangedAtOnce()
+{
+    write(QStringLiteral("menu/a.desktop"), entry("Name=A\nIcon=folder\n"));
+    QTRY_VERIFY(FileIdentity(path(QStringLiteral("menu"))).isSettled());
+    show(1);
+
+    // In place, so that only the entry tells of it, and not before the folder is listed again.
+    write(QStringLiteral("menu/a.desktop"), entry("Name=A\nIcon=go-up\n"));
+    write(QStringLiteral("menu/b.desktop"), entry("Name=B\n"));
+    QTRY_COMPARE(m_model->rowCount(indexOf(QStringLiteral("menu"))), 2);
+
+    QTRY_COMPARE(iconName(indexOf(QStringLiteral("menu/a.desktop"))), QStringLiteral("go-up"));
+}
+
+void tst_VelMenuModelPaint::looksAtNoEntryBehindItsEnd()
+{
+    const QString file = write(QStringLiteral("menu/a.desktop"), entry("Name=A\nIcon=folder\n"));
+    QTRY_VERIFY(FileIdentity(path(QStringLiteral("menu"))).isSettled());
+    show(1);
+    m_model.reset();
+
+    const FileCalls calls;
+    QTest::qWait(200);
+    QVERIFY(!calls.all().join('\n').contains(QFile::encodeName(file)));
 }
 
 void tst_VelMenuModelPaint::showsTheNameOfARecordFileThatComes_data()
