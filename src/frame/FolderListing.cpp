@@ -6,8 +6,10 @@
 #include <QByteArray>
 #include <QFile>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
+#include <string_view>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -26,6 +28,14 @@ mode_t kindOf(DIR *folder, const dirent &entry)
 {
     return entry.d_type != DT_UNKNOWN ? DTTOIF(entry.d_type)
                                       : modeOf(folder, entry.d_name, AT_SYMLINK_NOFOLLOW);
+}
+
+bool isOdd(const char *name)
+{
+    const auto isAscii = [](char byte) { return static_cast<unsigned char>(byte) < 0x80; };
+    const std::string_view bytes(name);
+    return !std::all_of(bytes.begin(), bytes.end(), isAscii)
+        && QString::fromUtf8(name).contains(QChar(QChar::ReplacementCharacter));
 }
 
 } // namespace
@@ -56,6 +66,16 @@ std::optional<QSet<QString>> FolderListing::namesIn(const QString &folder)
     while (const dirent *entry = read(stream.get()))
         names.insert(QFile::decodeName(entry->d_name));
     return errno == 0 ? std::optional<QSet<QString>>(names) : std::nullopt;
+}
+
+bool FolderListing::holdsOddName(const QString &folder)
+{
+    const Stream stream = open(folder);
+    while (const dirent *entry = stream ? read(stream.get()) : nullptr) {
+        if (isOdd(entry->d_name))
+            return true;
+    }
+    return false;
 }
 
 FolderListing::FolderListing(const QString &folder, DotFiles dotFiles)

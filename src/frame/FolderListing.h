@@ -34,6 +34,10 @@ public:
     /// names that are no text are among them; nothing when it cannot be listed. Looks at no file.
     static std::optional<QSet<QString>> namesIn(const QString &folder);
 
+    /// Whether a name that \a folder holds may be no text in UTF-8; a text with the character that stands for
+    /// such bytes counts as well. Looks no further than the first one.
+    static bool holdsOddName(const QString &folder);
+
     /// Lists nothing if \a folder cannot be read.
     explicit FolderListing(const QString &folder, DotFiles dotFiles = Without);
 

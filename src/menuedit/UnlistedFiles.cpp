@@ -11,18 +11,6 @@
 #include <QFileInfo>
 #include <QFileSystemModel>
 
-#include <algorithm>
-
-namespace {
-
-// What stands for bytes that are no text. A text may have it, too: that costs only time.
-bool mayBeNoText(const QString &name)
-{
-    return name.contains(QChar(QChar::ReplacementCharacter));
-}
-
-} // namespace
-
 UnlistedFiles::UnlistedFiles(QFileSystemModel *model)
     : QObject(model)
     , m_model(model)
@@ -41,16 +29,16 @@ bool UnlistedFiles::mayGoAndCome(const QString &path) const
 void UnlistedFiles::complete(const QString &path)
 {
     const QString folder = QDir::cleanPath(path);
-    const std::optional<QSet<QString>> names = path.isEmpty() ? std::nullopt : FolderListing::namesIn(folder);
-    const bool isWhole = !names || std::none_of(names->begin(), names->end(), mayBeNoText);
+    const bool isWhole = path.isEmpty() || !FolderListing::holdsOddName(folder);
     if (isWhole && !m_folders.remove(folder))
         return;
+    const QSet<QString> names = FolderListing::namesIn(folder).value_or(QSet<QString>());
     const QSet<QString> shown = shownIn(folder);
-    markGone(folder, names.value_or(QSet<QString>()), shown);
+    markGone(folder, names, shown);
     if (isWhole)
         return;
     m_folders.insert(folder);
-    const QSet<QString> lacking = *names - shown;
+    const QSet<QString> lacking = names - shown;
     QStringList sorted(lacking.begin(), lacking.end());
     sorted.sort();
     for (const QString &name : qAsConst(sorted)) {

@@ -14,7 +14,7 @@ class QFileSystemModel;
  * where a name is no text.
  *
  * Each time that the model has read such a folder, the rows that it took away again come back.
- * Of a folder whose names are all text, they are read once more, and no file is looked at.
+ * Of a folder whose names are all text, they are only read once more, and no file is looked at.
  */
 class UnlistedFiles : public QObject
 {

@@ -45,6 +45,7 @@ private Q_SLOTS:
     void namesAllThatAFolderHolds();
     void namesWhatIsNoText();
     void namesNothingWhereItCannotLook();
+    void tellsWhetherANameIsNoText();
 
 private:
     QString below(const char *name) const { return path(s("folder/") + s(name)); }
@@ -129,6 +130,14 @@ void tst_FolderListing::namesNothingWhereItCannotLook()
     for (const char *name : {"missing", "file", "link to missing"})
         QVERIFY2(!FolderListing::namesIn(below(name)), name);
     QVERIFY(!FolderListing::namesIn(QString()));
+}
+
+void tst_FolderListing::tellsWhetherANameIsNoText()
+{
+    QVERIFY(!FolderListing::holdsOddName(path(s("folder"))));
+    QVERIFY(!FolderListing::holdsOddName(below("missing")));
+    QVERIFY(mknod((QFile::encodeName(below("sub/bad")) + "\xff").constData(), S_IFREG | 0600, 0) == 0);
+    QVERIFY(FolderListing::holdsOddName(below("sub")));
 }
 
 VEL_TEST_GUILESS_MAIN(tst_FolderListing)
