@@ -93,6 +93,14 @@ QModelIndex VelMenuModel::index(int row, int column, const QModelIndex &parent) 
     return known;
 }
 
+// The base class looks for the row of the folder among all of its siblings, by its name.
+QModelIndex VelMenuModel::parent(const QModelIndex &index) const
+{
+    const bool isHeld =
+        index.isValid() && index.row() < m_heldRows.size() && m_heldRows[index.row()] == index;
+    return isHeld ? m_heldFolder : QFileSystemModel::parent(index);
+}
+
 // The base class finds the row of a number by its name; a sort asks for each row very often.
 void VelMenuModel::holdRows(const QModelIndex &folder)
 {

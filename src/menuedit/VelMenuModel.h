@@ -43,6 +43,8 @@ public:
 
     using QFileSystemModel::index;
     QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
+    using QFileSystemModel::parent;
+    QModelIndex parent(const QModelIndex &index) const override;
     int columnCount(const QModelIndex &parent = QModelIndex()) const override;
     QVariant data(const QModelIndex &index, int role = Qt::DisplayRole) const override;
     bool dropMimeData(const QMimeData *data, Qt::DropAction action, int row, int column,
@@ -51,7 +53,8 @@ public:
     void fetchMore(const QModelIndex &parent) override;
     void sort(int column, Qt::SortOrder order = Qt::AscendingOrder) override;
 
-    /// No row of \a folder comes, goes or moves until releaseRows(): each is looked up once then.
+    /// No row of \a folder comes, goes or moves until releaseRows(): each is looked up once then, and
+    /// the folder not at all.
     void holdRows(const QModelIndex &folder);
     void releaseRows();
 

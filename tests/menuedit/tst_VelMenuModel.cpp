@@ -21,6 +21,7 @@ private Q_SLOTS:
     void hidesDotFiles();
     void announcesAChangeOnDisk();
     void readsAnIconAnewOnlyForAChangedEntry();
+    void tellsTheFolderOfRowsThatAreHeld();
     void livesWithOddFiles();
     void survivesAFolderThatVanishes();
     void leavesRemovingRowsToNobody();
@@ -102,6 +103,32 @@ void tst_VelMenuModel::readsAnIconAnewOnlyForAChangedEntry()
     QVERIFY(icon().cacheKey() != before.cacheKey());
     QVERIFY(QFile::remove(file));
     QVERIFY(icon().cacheKey() != before.cacheKey());
+}
+
+void tst_VelMenuModel::tellsTheFolderOfRowsThatAreHeld()
+{
+    for (const char *name : {"menu/a/x", "menu/a/y", "menu/b/x", "menu/b/y"})
+        write(QLatin1String(name), "x");
+    m_model = modelOf(path(QStringLiteral("menu")), 2);
+    const QModelIndex held = indexOf(QStringLiteral("menu/a"));
+    const QModelIndex other = indexOf(QStringLiteral("menu/b"));
+    for (const QModelIndex &folder : {held, other}) {
+        m_model->fetchMore(folder);
+        QTRY_COMPARE(m_model->rowCount(folder), 2);
+    }
+    m_model->holdRows(held);
+    for (int row = 0; row < 2; ++row) {
+        QCOMPARE(m_model->index(row, 0, held).parent(), held);
+        QCOMPARE(m_model->index(row, 0, other).parent(), other);
+    }
+    QCOMPARE(other.parent(), indexOf(QStringLiteral("menu")));
+    const QPersistentModelIndex row = m_model->index(1, 0, held);
+
+    // The folder gets another row.
+    write(QStringLiteral("menu/0/x"), "x");
+    QTRY_COMPARE(m_model->rowCount(indexOf(QStringLiteral("menu"))), 3);
+    m_model->sort(0);
+    QCOMPARE(QModelIndex(row).parent(), indexOf(QStringLiteral("menu/a")));
 }
 
 void tst_VelMenuModel::livesWithOddFiles()
