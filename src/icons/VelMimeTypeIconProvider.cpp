@@ -124,8 +124,8 @@ QString VelMimeTypeIconProvider::regularFileType(const QFileInfo &info) const
 
 QIcon VelMimeTypeIconProvider::directoryIcon(const QFileInfo &info, const Emblems &emblems) const
 {
-    const QString path = EntryPath::recordFileOf(info.absoluteFilePath());
-    const QString name = QFile::exists(path) ? VelUIDesktopEntry(path).getIcon() : QString();
+    // Without a record file it is empty.
+    const QString name = VelUIDesktopEntry(EntryPath::recordFileOf(info.absoluteFilePath())).getIcon();
     return name.isEmpty() ? VelIcon::withEmblems(folderIcon, emblems)
                           : VelIcon::fromTheme(name, emblems, folderIcon);
 }

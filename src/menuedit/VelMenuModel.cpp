@@ -304,20 +304,24 @@ bool VelMenuModel::loadItemInfo(const QString &path, bool isFolder) const
 {
     if (isFolder && m_cache->isPlain(path))
         return false;
-    const QString file = EntryDisplay::describingFile(path, isFolder);
+    // Where the record file of a folder gives a name, nobody need ask whether there is one.
+    const QString recordFile = isFolder ? EntryPath::recordFileOf(path) : QString();
+    RowCache::Display display = isFolder ? readDisplay(recordFile) : RowCache::Display();
+    const QString file = display.name.isEmpty() ? EntryDisplay::describingFile(path, isFolder) : recordFile;
     if (file.isEmpty()) {
         if (isFolder)
             m_cache->setPlain(path);
         return false;
     }
 
-    std::optional<RowCache::Display> display = m_cache->takePrefetched(file);
-    if (!display)
-        display = readDisplay(file);
+    if (file != recordFile) {
+        const std::optional<RowCache::Display> prefetched = m_cache->takePrefetched(file);
+        display = prefetched ? *prefetched : readDisplay(file);
+    }
     // The row of a file that is gone stands until the base class sees it. What is asked for then
     // must not be remembered of the next file that comes to this path.
-    if (!display->name.isEmpty() || QFileInfo::exists(file))
-        m_cache->setDisplay(path, *display);
+    if (!display.name.isEmpty() || QFileInfo::exists(file))
+        m_cache->setDisplay(path, display);
     return true;
 }
 

@@ -307,10 +307,8 @@ QStringList VelMenuProxyModel::sortOrderOf(const QString &folderPath) const
     const auto known = sortOrders.constFind(folderPath);
     if (known != sortOrders.constEnd())
         return *known;
-    QStringList list;
-    const QString file = EntryPath::recordFileOf(folderPath);
-    if (QFileInfo::exists(file))
-        list = VelUIDesktopEntry(file).getSortOrder();
+    // Without a record file it is empty.
+    const QStringList list = VelUIDesktopEntry(EntryPath::recordFileOf(folderPath)).getSortOrder();
     sortOrders.insert(folderPath, list);
     return list;
 }
