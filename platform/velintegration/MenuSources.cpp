@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cctype>
+#include <utility>
 
 namespace {
 
@@ -15,6 +16,13 @@ constexpr std::string_view Heading =
     "version 1\n";
 constexpr std::string_view Digits = "0123456789abcdef";
 constexpr std::string_view Nothing = "-";
+constexpr std::size_t MostWords = 6; // of a line that is as it should be
+
+bool standsAsIs(char c)
+{
+    const auto byte = static_cast<unsigned char>(c);
+    return byte > ' ' && byte != 0x7f && c != '%';
+}
 
 // A word without blanks and control characters; "-" stands for no text at all.
 std::string escaped(std::string_view text)
@@ -24,7 +32,7 @@ std::string escaped(std::string_view text)
     std::string result;
     for (const char c : text) {
         const auto byte = static_cast<unsigned char>(c);
-        if (byte > ' ' && byte != 0x7f && c != '%' && !(c == '-' && text.size() == 1)) {
+        if (standsAsIs(c) && !(c == '-' && text.size() == 1)) {
             result += c;
             continue;
         }
@@ -45,6 +53,9 @@ std::optional<std::string> unescaped(std::string_view word)
 {
     if (word == Nothing)
         return std::string();
+    // Nearly every word. Those of a menu with hundreds of entries are read at each look at it.
+    if (!word.empty() && std::all_of(word.begin(), word.end(), standsAsIs))
+        return std::string(word);
     std::string result;
     for (std::size_t i = 0; i < word.size(); ++i) {
         if (word[i] != '%') {
@@ -86,11 +97,12 @@ std::string_view taken(std::string_view *text, char end)
 std::optional<std::vector<std::string>> wordsOf(std::string_view line)
 {
     std::vector<std::string> words;
+    words.reserve(MostWords);
     while (!line.empty()) {
-        const std::optional<std::string> word = unescaped(taken(&line, ' '));
+        std::optional<std::string> word = unescaped(taken(&line, ' '));
         if (!word)
             return {};
-        words.push_back(*word);
+        words.push_back(std::move(*word));
     }
     return words;
 }
@@ -123,7 +135,12 @@ bool readEntry(const std::vector<std::string> &words, MenuSources *sources)
         ? (isVersion(entry.made) && (isVersion(entry.next) || isNone(entry.next)))
             || (isNone(entry.made) && isVersion(entry.next))
         : isVersion(entry.made);
-    return isSound && sources->entries.emplace(words.back(), entry).second;
+    if (!isSound)
+        return false;
+    // They were written in this order.
+    const std::size_t known = sources->entries.size();
+    sources->entries.emplace_hint(sources->entries.end(), words.back(), std::move(entry));
+    return sources->entries.size() > known;
 }
 
 bool isFolderName(std::string_view name)
