@@ -13,6 +13,7 @@
 #include <cstdio>
 #include <cstring>
 #include <limits>
+#include <utility>
 
 namespace {
 
@@ -106,12 +107,12 @@ public:
     {
     }
 
-    void add(const QString &key, const QVariant &value)
+    void add(const QString &key, QVariant &&value)
     {
         if (key == sectionKey())
-            m_section = value;
-        else // at the end; the place is looked for only when it is not there
-            m_map.insert(m_map.constEnd(), key, value);
+            m_section = std::move(value);
+        else // at the end; the place is looked for only when it is not there; no value is copied
+            *m_map.insert(m_map.constEnd(), key, QVariant()) = std::move(value);
     }
 
     void finish()
