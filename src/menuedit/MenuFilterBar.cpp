@@ -37,7 +37,7 @@ MenuFilterBar::MenuFilterBar(VelMenuView *view, QWidget *parent)
     connect(m_line, &QLineEdit::textChanged, m_view, &VelMenuView::setFilter);
     connect(m_hiddenButton, &QCheckBox::toggled, m_view, &VelMenuView::setHiddenShown);
     m_line->installEventFilter(this);
-    m_view->installEventFilter(this);
+    parent->installEventFilter(this);
 }
 
 MenuFilterBar::~MenuFilterBar() = default;
@@ -55,6 +55,7 @@ void MenuFilterBar::focusLine()
     m_line->selectAll();
 }
 
+// What no widget of the window has a use for comes to the window.
 bool MenuFilterBar::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() != QEvent::KeyPress)
@@ -62,17 +63,15 @@ bool MenuFilterBar::eventFilter(QObject *watched, QEvent *event)
     const auto *press = static_cast<QKeyEvent *>(event);
     if (press->modifiers() & ~Qt::KeypadModifier)
         return false;
-    if (watched == m_line)
-        return lineKey(press->key());
-    return press->key() == Qt::Key_Escape && clear();
+    if (press->key() == Qt::Key_Escape)
+        return clear();
+    return watched == m_line && lineKey(press->key());
 }
 
-// In a dialog Return presses a button, and Escape closes.
+// In a dialog Return presses a button.
 bool MenuFilterBar::lineKey(int key)
 {
     switch (key) {
-    case Qt::Key_Escape:
-        return clear();
     case Qt::Key_Return:
     case Qt::Key_Enter:
         m_view->slotFindNext();

@@ -13,15 +13,15 @@ class VelMenuView;
  * The line above a menu that says what of it is shown: the words to filter by, and whether what
  * the menu leaves out is shown.
  *
- * Escape clears the words, in the line and in the view. Return and F3 go to the next match, Down
- * goes over to the view.
+ * Escape clears the words, wherever in the window the keyboard is. Return and F3 go to the next match,
+ * Down goes over to the view.
  */
 class MenuFilterBar : public QWidget
 {
     Q_OBJECT
 
 public:
-    /// Filters \a view.
+    /// Filters \a view; \a parent is the window of both.
     MenuFilterBar(VelMenuView *view, QWidget *parent);
     ~MenuFilterBar() override;
 

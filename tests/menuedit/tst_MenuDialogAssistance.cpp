@@ -53,6 +53,8 @@ private Q_SLOTS:
     void isReachedByTheTabKey();
     void goesFromMatchToMatch();
     void clearsByEscapeAndStaysOpen();
+    void clearsByEscapeWhereverTheKeyboardIs_data();
+    void clearsByEscapeWhereverTheKeyboardIs();
     void showsHiddenEntries();
     void hidesAnEntryAndShowsItAgain();
     void tellsWhatTheViewTells_data();
@@ -191,6 +193,41 @@ void tst_MenuDialogAssistance::clearsByEscapeAndStaysOpen()
         QVERIFY(filterEdit()->text().isEmpty());
         QVERIFY(dialog()->isVisible());
     }
+    XDoTool::press(QStringLiteral("Escape"));
+    QTRY_VERIFY(!dialog()->isVisible());
+}
+
+void tst_MenuDialogAssistance::clearsByEscapeWhereverTheKeyboardIs_data()
+{
+    QTest::addColumn<QString>("keys");
+    QTest::addColumn<QString>("place");
+    QTest::newRow("line") << QString() << QStringLiteral("QLineEdit");
+    QTest::newRow("switch") << QStringLiteral("Tab") << QStringLiteral("QCheckBox");
+    QTest::newRow("tree") << QStringLiteral("Tab Tab") << QStringLiteral("VelMenuView");
+    QTest::newRow("tree, an item selected") << QStringLiteral("Return Down") << QStringLiteral("VelMenuView");
+    QTest::newRow("button") << QStringLiteral("Tab Tab Tab") << QStringLiteral("QPushButton");
+    QTest::newRow("tool button") << QStringLiteral("shift+Tab") << QStringLiteral("QToolButton");
+}
+
+void tst_MenuDialogAssistance::clearsByEscapeWhereverTheKeyboardIs()
+{
+    QFETCH(QString, keys);
+    QFETCH(QString, place);
+    writeEntry(QStringLiteral("a.desktop"), QStringLiteral("A"));
+    writeEntry(QStringLiteral("b.desktop"), QStringLiteral("B"));
+    openAssisted(2);
+    XDoTool::press(QStringLiteral("ctrl+f"));
+    QTRY_VERIFY(filterEdit()->hasFocus());
+    XDoTool::run(QStringLiteral("type --delay 30 b"));
+    QTRY_COMPARE(names(view(), menu()).size(), 1);
+    if (!keys.isEmpty())
+        XDoTool::run(QLatin1String("key --delay 50 ") + keys);
+    QTRY_COMPARE(QLatin1String(dialog()->focusWidget()->metaObject()->className()), place);
+
+    XDoTool::press(QStringLiteral("Escape"));
+    QTRY_COMPARE(names(view(), menu()).size(), 2);
+    QVERIFY(filterEdit()->text().isEmpty());
+    QVERIFY(dialog()->isVisible());
     XDoTool::press(QStringLiteral("Escape"));
     QTRY_VERIFY(!dialog()->isVisible());
 }
