@@ -35,7 +35,8 @@ QList<QKeySequence> ActionObject::furtherKeys() const
     if (!m_wrapped)
         return {};
     QList<QKeySequence> keys = keysAfterTheFirst();
-    keys.removeAll(keySequence());
+    if (!keys.isEmpty())
+        keys.removeAll(keySequence());
     return keys;
 }
 
@@ -46,7 +47,9 @@ QList<QKeySequence> ActionObject::keysAfterTheFirst() const
     QList<QKeySequence> keys = m_wrapped->shortcuts();
     if (!keys.isEmpty() && keys.constFirst() == first)
         keys.removeFirst();
-    keys.removeAll(QKeySequence());
+    // Hardly an action has more keys, and a dialog asks all of them.
+    if (!keys.isEmpty())
+        keys.removeAll(QKeySequence());
     if (!m_doubled.isEmpty() && first == m_doubled && !keys.contains(m_doubled))
         keys.insert(qMin(m_placeOfDoubled, int(keys.size())), m_doubled);
     return keys;

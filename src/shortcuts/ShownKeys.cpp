@@ -21,7 +21,8 @@ int lengthOfKey(int key)
 int lengthOf(const QKeySequence &keys)
 {
     int length = 0;
-    for (int i = 0; i < keys.count(); ++i) {
+    const int count = int(keys.count());
+    for (int i = 0; i < count; ++i) {
         const int chord = QtMajor::chord(keys, i);
         length += lengthOfKey(chord & ~int(Qt::KeyboardModifierMask)) + 2;
         length += (chord & int(Qt::CTRL) ? 5 : 0) + (chord & int(Qt::ALT) ? 4 : 0)
