@@ -20,20 +20,24 @@ protected Q_SLOTS:
     {
         DialogTestCase::init();
         m_dialog->show();
-        m_dialog->activateWindow();
-        QVERIFY(QTest::qWaitForWindowActive(m_dialog.get()));
+        activate();
     }
 
 protected:
     // Longer than the key editor waits for one more chord.
     static constexpr int LongerThanARecording = 1500;
 
+    // Asks again, as a message may just have closed, and the window manager takes its time.
+    void activate()
+    {
+        QTRY_VERIFY_WITH_TIMEOUT(
+            (m_dialog->activateWindow(), QTest::qWaitForWindowActive(m_dialog.get(), 1000)), 20000);
+    }
+
     // Makes the action current and its key editor ready.
     void record(const char *name)
     {
-        // A message may just have closed, and the window manager takes its time.
-        m_dialog->activateWindow();
-        QVERIFY(QTest::qWaitForWindowActive(m_dialog.get()));
+        activate();
         select(name);
         customButton()->setChecked(true);
         keyWidget()->setFocus();
