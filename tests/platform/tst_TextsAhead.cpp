@@ -11,6 +11,7 @@
 
 #include <fcntl.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 /// Texts that are read before anybody asks for them.
 class tst_TextsAhead : public TestCase
@@ -22,6 +23,7 @@ private Q_SLOTS:
 
     void readsWhatAModelOfTheFolderAsksFor();
     void endsItsThreads();
+    void readsWhatIsNotInMemory();
     void handsATextOverToTheFirstLoad();
     void leavesOutWhatIsTooYoung();
     void givesNothingThatHasChanged_data();
@@ -48,6 +50,16 @@ TextsAhead::Ticket readAll(const std::string &folder)
     TextsAhead::Ticket ticket = TextsAhead::instance().read(folder);
     TextsAhead::instance().wait();
     return ticket;
+}
+
+// Where the file system is one in memory, it stays there.
+void sendToDisk(const QString &path)
+{
+    const int file = ::open(QFile::encodeName(path).constData(), O_RDONLY | O_CLOEXEC);
+    QVERIFY(file >= 0);
+    QCOMPARE(::fdatasync(file), 0);
+    QCOMPARE(::posix_fadvise(file, 0, 0, POSIX_FADV_DONTNEED), 0);
+    QCOMPARE(::close(file), 0);
 }
 
 QByteArray taken(const std::string &path)
@@ -103,6 +115,29 @@ void tst_TextsAhead::endsItsThreads()
     QVERIFY(TextsAhead::instance().threads() <= TextsAhead::MostThreads);
     QTRY_COMPARE(TextsAhead::instance().threads(), 0);
     TextsAhead::instance().giveUp(ticket);
+}
+
+void tst_TextsAhead::readsWhatIsNotInMemory()
+{
+    constexpr int Files = int(TextsAhead::Limit / 20000) * 2;
+    const auto name = [](int number) { return QStringLiteral("m/%1.desktop").arg(number); };
+    for (int i = 0; i < Files; ++i)
+        write(name(i), QByteArray(20000, '#'));
+    settle(name(Files - 1));
+    for (int i = 0; i < Files; ++i)
+        sendToDisk(path(name(i)));
+
+    // They are more than there is room for.
+    const auto ticket = readAll(folder("m"));
+    QCOMPARE(TextsAhead::instance().threads(), 0);
+    QVERIFY(TextsAhead::instance().cost() <= TextsAhead::Limit);
+    int read = 0;
+    for (int i = 0; i < Files; ++i)
+        read += taken(QFile::encodeName(path(name(i))).toStdString()).size() == 20000 ? 1 : 0;
+    QVERIFY2(read > Files / 4, qPrintable(QString::number(read)));
+    TextsAhead::instance().giveUp(ticket);
+    QTRY_COMPARE(TextsAhead::instance().threads(), 0);
+    QVERIFY(TextsAhead::instance().isEmpty());
 }
 
 void tst_TextsAhead::handsATextOverToTheFirstLoad()

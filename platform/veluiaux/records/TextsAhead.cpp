@@ -9,6 +9,7 @@
 #include <RecordFile.h>
 
 #include <dirent.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
 
 #include <algorithm>
@@ -23,6 +24,8 @@ namespace {
 constexpr std::string_view EntrySuffix = ".desktop";
 constexpr std::size_t FilesForAThread = 32;
 constexpr int Tries = 200;
+// So many files have to be in memory, one after another, before those behind are taken to be.
+constexpr int FilesInMemory = 32;
 
 bool isEntry(std::string_view name)
 {
@@ -93,6 +96,15 @@ std::optional<FileText> readFile(const std::string &path)
     return EntryFile::read(QByteArray::fromRawData(path.data(), int(path.size())));
 }
 
+// Whether this thread had anything read from a disk since it asked last.
+bool hasReadFromDisk()
+{
+    thread_local long before = 0;
+    rusage usage = {};
+    return ::getrusage(RUSAGE_THREAD, &usage) == 0
+        && usage.ru_inblock != std::exchange(before, usage.ru_inblock);
+}
+
 bool isUnchanged(const std::string &path, const FileText &file)
 {
     struct stat status;
@@ -124,11 +136,11 @@ public:
 
     std::string file(std::size_t number) const { return path + std::string(files.at(number)); }
     bool isDone() const { return isListed && next == files.size(); }
-    bool hasWork(bool hasRoom) const
+    bool hasWork(bool hasRoom, bool isOnDisk) const
     {
         if (isGivenUp || !isListed)
             return !isGivenUp && working == 0;
-        return (hasRoom ? next : std::max(next, later)) < files.size();
+        return (hasRoom && next < files.size()) || (isOnDisk && std::max(next, later) < files.size());
     }
 };
 
@@ -160,7 +172,7 @@ TextsAhead::Lock TextsAhead::locked() const
 // Without threads everybody reads by himself.
 void TextsAhead::startThread()
 {
-    if (m_threads == MostThreads)
+    if (m_threads >= threadsWanted())
         return;
     try {
         std::thread(&TextsAhead::work, this).detach();
@@ -173,16 +185,15 @@ void TextsAhead::startThread()
 
 TextsAhead::Ticket TextsAhead::nextFolder() const
 {
-    const auto next =
-        std::find_if(m_folders.begin(), m_folders.end(),
-                     [hasRoom = this->hasRoom()](const Ticket &folder) { return folder->hasWork(hasRoom); });
+    const auto next = std::find_if(m_folders.begin(), m_folders.end(),
+                                   [this](const Ticket &folder) { return hasWork(*folder); });
     return next == m_folders.end() ? nullptr : *next;
 }
 
 void TextsAhead::work()
 {
     Lock lock = locked();
-    while (const Ticket folder = nextFolder()) {
+    while (const Ticket folder = m_threads <= threadsWanted() ? nextFolder() : nullptr) {
         ++folder->working;
         if (!folder->isListed)
             list(*folder, lock);
@@ -202,7 +213,7 @@ void TextsAhead::work()
 // So that nobody looks through folders in which there is nothing to be done.
 void TextsAhead::leave(const Ticket &folder)
 {
-    if (folder->isGivenUp || !folder->isListed || folder->hasWork(hasRoom()))
+    if (folder->isGivenUp || !folder->isListed || hasWork(*folder))
         return;
     if (folder->isDone())
         return dismiss(folder);
@@ -244,7 +255,7 @@ void TextsAhead::list(Folder &folder, Lock &lock)
     folder.files = std::move(files);
     for (std::size_t i = 0; i < folder.files.size(); ++i)
         add(folder, folder.file(i));
-    const std::size_t wanted = std::min<std::size_t>(folder.files.size() / FilesForAThread, MostThreads);
+    const auto wanted = std::min(folder.files.size() / FilesForAThread, std::size_t(threadsWanted()));
     for (auto i = std::size_t(m_threads); i < wanted; ++i)
         startThread();
 }
@@ -271,7 +282,9 @@ void TextsAhead::readNext(Folder &folder, Lock &lock)
     const bool isKept = text && text->settled;
     if (isKept)
         text->text->makeIndex(folder.language);
+    const bool wasOnDisk = hasReadFromDisk();
     lockSoon(lock);
+    noteReading(wasOnDisk);
     file = m_files.find(path);
     if (file == m_files.end() || file->second.folder != &folder)
         return; // It was asked for meanwhile.
@@ -291,7 +304,22 @@ void TextsAhead::readForLater(Folder &folder, Lock &lock)
         return;
     lock.unlock();
     readFile(path);
+    const bool wasOnDisk = hasReadFromDisk();
     lockSoon(lock);
+    noteReading(wasOnDisk);
+}
+
+// Who waits for a disk leaves the processors to others, and a disk serves several sooner than one.
+void TextsAhead::noteReading(bool wasOnDisk)
+{
+    m_onDisk = wasOnDisk ? FilesInMemory : std::max(m_onDisk - 1, 0);
+    if (wasOnDisk)
+        startThread();
+}
+
+bool TextsAhead::hasWork(const Folder &folder) const
+{
+    return folder.hasWork(hasRoom(), isOnDisk());
 }
 
 bool TextsAhead::isRead(const std::string &path) const

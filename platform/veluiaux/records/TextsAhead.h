@@ -21,17 +21,19 @@
 /**
  * The texts of entries that are about to be asked for, read in a few threads of its own.
  *
- * A text stays until it is taken or its folder is given up. While there is no more room, what comes
- * behind is read all the same, so that the file is in the system's memory by then, and once more when
- * half of the texts were taken. Who asks for a text that is not here reads it himself. The threads end
- * when there is nothing to be read, or no room for it; they look at no environment and touch nothing
- * but files and this object. May be used from any thread.
+ * A text stays until it is taken or its folder is given up. While there is no more room, nothing is
+ * read until half of the texts were taken; but where files come from a disk, what comes behind is read all
+ * the same, so that the file is in the system's memory by then. Who asks for a text that is not here reads it
+ * himself. The threads end when there is nothing to be read, or no room for it; they look at no environment
+ * and touch nothing but files and this object. May be used from any thread.
  */
 class TextsAhead
 {
 public:
-    /// So many threads read at a time.
-    static constexpr int MostThreads = 3;
+    /// So many threads read at a time: where files come from a disk, for which threads wait.
+    static constexpr int MostThreads = 8;
+    /// And where files are in the system's memory.
+    static constexpr int MostThreadsInMemory = 3;
     /// The memory that texts may take until they are taken, in bytes.
     static constexpr std::size_t Limit = std::size_t(6) * 1024 * 1024;
     /// So many files of a folder are read ahead.
@@ -77,6 +79,10 @@ private:
     void startThread();
     void work();
     bool hasRoom() const { return m_cost < Limit / 8 * 7; }
+    bool isOnDisk() const { return m_onDisk > 0; }
+    int threadsWanted() const { return isOnDisk() ? MostThreads : MostThreadsInMemory; }
+    bool hasWork(const Folder &folder) const;
+    void noteReading(bool wasOnDisk);
     Ticket nextFolder() const;
     void list(Folder &folder, Lock &lock);
     void readNext(Folder &folder, Lock &lock);
@@ -99,4 +105,5 @@ private:
     std::atomic<std::size_t> m_count{0}; // of the files, to be looked at without the mutex
     std::size_t m_cost = 0;
     int m_threads = 0;
+    int m_onDisk = 0; // above zero where files come from a disk
 };
