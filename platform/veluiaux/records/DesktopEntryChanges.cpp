@@ -51,7 +51,7 @@ void DesktopEntryChanges::set(Change change)
 {
     if (m_slots.size() < 2 * (m_changes.size() + 1))
         makeSlots(m_changes.size() + 1);
-    Slot &slot = slotOf(change.group, change.key, change.locale);
+    Slot &slot = slotOf(change.group(), change.key, change.locale);
     if (slot) {
         m_changes[slot - 1].value = std::move(change.value);
         return;
@@ -70,7 +70,10 @@ void DesktopEntryChanges::set(std::string_view group, std::string_view key, std:
         m_changes[slot - 1].value = value;
         return;
     }
-    m_changes.emplace_back(group, key, locale, value);
+    // Keys come group by group, so one name serves many.
+    const bool isSameGroup = !m_changes.empty() && m_changes.back().group() == group;
+    m_changes.emplace_back(isSameGroup ? m_changes.back().sharedGroup : Change::makeGroup(group), key, locale,
+                           value);
     slot = Slot(m_changes.size());
 }
 
@@ -105,7 +108,7 @@ void DesktopEntryChanges::removeGroups(const std::unordered_set<std::string> &gr
     m_removedGroups.insert(groups.begin(), groups.end());
     const auto gone =
         std::stable_partition(m_changes.begin(), m_changes.end(),
-                              [&groups](const Change &change) { return groups.count(change.group) == 0; });
+                              [&groups](const Change &change) { return groups.count(change.group()) == 0; });
     std::move(gone, m_changes.end(), std::back_inserter(m_goneWithGroups));
     m_changes.erase(gone, m_changes.end());
     reindex();
@@ -115,10 +118,11 @@ void DesktopEntryChanges::restoreGroup(const std::string &group)
 {
     if (m_removedGroups.erase(group) == 0)
         return;
-    const auto back = std::stable_partition(m_goneWithGroups.begin(), m_goneWithGroups.end(),
-                                            [&group](const Change &change) { return change.group != group; });
+    const auto back =
+        std::stable_partition(m_goneWithGroups.begin(), m_goneWithGroups.end(),
+                              [&group](const Change &change) { return change.group() != group; });
     for (auto change = back; change != m_goneWithGroups.end(); ++change) {
-        if (!find(change->group, change->key, change->locale))
+        if (!find(change->group(), change->key, change->locale))
             set(std::move(*change));
     }
     m_goneWithGroups.erase(back, m_goneWithGroups.end());
@@ -139,7 +143,7 @@ DesktopEntryChanges::Slot &DesktopEntryChanges::slotOf(std::string_view group, s
         if (!slot)
             return slot;
         const Change &change = m_changes[slot - 1];
-        if (change.locale == locale && change.key == key && change.group == group)
+        if (change.locale == locale && change.key == key && change.group() == group)
             return slot;
     }
 }
@@ -160,6 +164,6 @@ void DesktopEntryChanges::reindex()
     std::fill(m_slots.begin(), m_slots.end(), 0);
     for (std::size_t i = 0; i < m_changes.size(); ++i) {
         const Change &change = m_changes[i];
-        slotOf(change.group, change.key, change.locale) = Slot(i + 1);
+        slotOf(change.group(), change.key, change.locale) = Slot(i + 1);
     }
 }

@@ -5,10 +5,12 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
 /**
@@ -22,19 +24,29 @@ class DesktopEntryChanges
 public:
     struct Change
     {
-        std::string group;
+        using Group = std::shared_ptr<const std::string>;
+
+        Group sharedGroup; ///< never null
         std::string key;
         std::string locale; ///< empty for the key without a language
         std::optional<std::string> value; ///< as it is to stand in the file; none: the key goes
 
-        Change(std::string_view inGroup, std::string_view ofKey, std::string_view inLocale,
+        Change(Group inGroup, std::string_view ofKey, std::string_view inLocale,
                std::optional<std::string_view> toValue)
-            : group(inGroup)
+            : sharedGroup(std::move(inGroup))
             , key(ofKey)
             , locale(inLocale)
             , value(toValue)
         {
         }
+        Change(std::string_view inGroup, std::string_view ofKey, std::string_view inLocale,
+               std::optional<std::string_view> toValue)
+            : Change(makeGroup(inGroup), ofKey, inLocale, toValue)
+        {
+        }
+
+        static Group makeGroup(std::string_view name) { return std::make_shared<const std::string>(name); }
+        const std::string &group() const { return *sharedGroup; }
     };
 
     bool isEmpty() const { return m_changes.empty() && m_removedGroups.empty(); }

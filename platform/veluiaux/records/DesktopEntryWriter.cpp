@@ -147,13 +147,13 @@ NewKeys &Writer::newGroup(const std::string &name)
 
 void Writer::place(const Change &change)
 {
-    const int group = m_changes.isRemoved(change.group) ? Text::NoGroup : m_text.group(change.group);
+    const int group = m_changes.isRemoved(change.group()) ? Text::NoGroup : m_text.group(change.group());
     if (!change.value) {
-        m_goneLocales[{change.group, change.key}].insert(change.locale);
+        m_goneLocales[{change.group(), change.key}].insert(change.locale);
         return;
     }
     if (group == Text::NoGroup) {
-        newGroup(change.group).add(change);
+        newGroup(change.group()).add(change);
         return;
     }
     if (const auto key = m_text.key(group, change.key, change.locale))

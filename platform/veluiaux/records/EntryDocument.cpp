@@ -151,7 +151,7 @@ QStringList EntryDocument::languages(std::string_view group, std::string_view ke
             add(m_text->locale(line));
     });
     for (const auto &change : m_changes.all()) {
-        if (change.value && change.group == group && change.key == key)
+        if (change.value && change.group() == group && change.key == key)
             add(change.locale);
     }
     return found;
@@ -206,7 +206,7 @@ void EntryDocument::removeKey(std::string_view group, std::string_view key)
     m_text->forEachLine(this->group(group).group(), key,
                         [&](const DesktopEntryText::Key &line) { inFile.emplace(m_text->locale(line)); });
     m_changes.dropIf([&](const DesktopEntryChanges::Change &change) {
-        return change.group == group && change.key == key && inFile.count(change.locale) == 0;
+        return change.group() == group && change.key == key && inFile.count(change.locale) == 0;
     });
     for (const std::string &locale : inFile)
         m_changes.set({group, key, locale, std::nullopt});
@@ -235,7 +235,7 @@ void EntryDocument::copyGroups(const std::unordered_map<std::string, std::string
                 copies.set(name->second, key, locale, value);
         });
     for (const auto &copy : copies.all()) {
-        if (taken.count(copy.group) == 0)
+        if (taken.count(copy.group()) == 0)
             m_changes.set(copy);
     }
 }
@@ -258,7 +258,7 @@ void EntryDocument::forEachValue(Visitor visit) const
     }
     for (const auto &change : m_changes.all()) {
         if (change.value)
-            visit(std::string_view(change.group), std::string_view(change.key),
+            visit(std::string_view(change.group()), std::string_view(change.key),
                   std::string_view(change.locale), std::string_view(*change.value));
     }
 }

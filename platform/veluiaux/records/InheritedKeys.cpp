@@ -21,7 +21,9 @@ InheritedKeys::InheritedKeys(const Entry &own, const Entry &other)
 
 bool InheritedKeys::has(std::string_view group, std::string_view key, std::string_view locale)
 {
-    if (group != m_group || key != m_key)
+    // The name of a group is the same view for all of its keys.
+    const bool isSameGroup = group.data() == m_group.data() && group.size() == m_group.size();
+    if (!isSameGroup || key != m_key)
         turnTo(group, key);
     if (locale.empty())
         return m_hasKey;
