@@ -109,7 +109,8 @@ std::optional<std::vector<std::string>> wordsOf(std::string_view line)
 
 bool isDigest(std::string_view text)
 {
-    return !text.empty() && text.find_first_not_of(Digits) == std::string_view::npos;
+    const auto isDigit = [](char c) { return (c >= '0' && c <= '9') || (c >= 'a' && c <= 'f'); };
+    return !text.empty() && std::all_of(text.begin(), text.end(), isDigit);
 }
 
 bool isVersion(const MenuSources::Version &version)
