@@ -166,32 +166,25 @@ void MenuSelection::show(const QStringList &paths)
 
 void MenuSelection::add(const QModelIndexList &rows)
 {
-    QItemSelection selection;
-    for (const QModelIndex &row : TreeOrder::fromTop(rows)) {
-        const QModelIndex above =
-            selection.isEmpty() ? QModelIndex() : QModelIndex(selection.constLast().bottomRight());
-        if (above.isValid() && above.parent() == row.parent() && above.row() + 1 == row.row())
-            selection.last() = QItemSelectionRange(selection.constLast().topLeft(), row);
-        else
-            selection.append(QItemSelectionRange(row));
-    }
     m_isSelecting = true;
-    m_view->selectionModel()->select(selection, QItemSelectionModel::Select);
+    m_view->selectionModel()->select(TreeOrder::ranges(rows), QItemSelectionModel::Select);
     m_isSelecting = false;
 }
 
 void MenuSelection::deselect(const std::function<bool(const QModelIndex &)> &isToGo)
 {
-    QItemSelection going;
+    QModelIndexList going;
+    QModelIndexList staying;
     const QModelIndexList selected = all();
-    for (const QModelIndex &index : selected) {
-        if (isToGo(index))
-            going.append(QItemSelectionRange(index));
-    }
-    if (going.size() == selected.size())
-        clear();
+    for (const QModelIndex &index : selected)
+        (isToGo(index) ? going : staying).append(index);
+    if (staying.isEmpty())
+        return clear();
+    // Each range is compared with all that are selected.
+    if (staying.size() < going.size())
+        m_view->selectionModel()->select(TreeOrder::ranges(staying), QItemSelectionModel::ClearAndSelect);
     else if (!going.isEmpty())
-        m_view->selectionModel()->select(going, QItemSelectionModel::Deselect);
+        m_view->selectionModel()->select(TreeOrder::ranges(going), QItemSelectionModel::Deselect);
 }
 
 void MenuSelection::leave(const QString &path)

@@ -58,6 +58,21 @@ QModelIndexList TreeOrder::fromTop(const QModelIndexList &items)
     return result;
 }
 
+QItemSelection TreeOrder::ranges(const QModelIndexList &items)
+{
+    QItemSelection result;
+    for (const PlacedItem &placedItem : placed(items)) {
+        const QModelIndex &item = placedItem.second;
+        const QModelIndex above =
+            result.isEmpty() ? QModelIndex() : QModelIndex(result.constLast().bottomRight());
+        if (above.isValid() && above.parent() == item.parent() && above.row() + 1 == item.row())
+            result.last() = QItemSelectionRange(result.constLast().topLeft(), item);
+        else
+            result.append(QItemSelectionRange(item));
+    }
+    return result;
+}
+
 // What lies in an item follows it at once.
 QModelIndexList TreeOrder::outermost(const QModelIndexList &items)
 {

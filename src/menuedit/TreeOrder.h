@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <QItemSelection>
 #include <QModelIndexList>
 
 /**
@@ -16,5 +17,8 @@ QModelIndexList fromTop(const QModelIndexList &items);
 
 /// The same, without those that lie in others of them.
 QModelIndexList outermost(const QModelIndexList &items);
+
+/// The same as fromTop(), neighbors together.
+QItemSelection ranges(const QModelIndexList &items);
 
 } // namespace TreeOrder

@@ -22,6 +22,8 @@ private Q_SLOTS:
     void ordersFromTheTop();
     void leavesOutWhatLiesInOthers_data();
     void leavesOutWhatLiesInOthers();
+    void putsNeighborsTogether_data();
+    void putsNeighborsTogether();
     void agreesWithTheObviousWay();
     void isQuickWithManyItems();
 
@@ -122,6 +124,30 @@ void tst_TreeOrder::leavesOutWhatLiesInOthers()
 }
 
 // Any items of a tree of four levels.
+void tst_TreeOrder::putsNeighborsTogether_data()
+{
+    QTest::addColumn<QString>("given");
+    QTest::addColumn<QString>("expected");
+    QTest::newRow("none") << QString() << QString();
+    QTest::newRow("one") << QStringLiteral("b") << QStringLiteral("b-b");
+    QTest::newRow("neighbors, from below") << QStringLiteral("c b a") << QStringLiteral("a-c");
+    QTest::newRow("a gap") << QStringLiteral("a c") << QStringLiteral("a-a c-c");
+    QTest::newRow("of two folders") << QStringLiteral("by2 bx by1 a by")
+                                    << QStringLiteral("a-a bx-by by1-by2");
+}
+
+void tst_TreeOrder::putsNeighborsTogether()
+{
+    QFETCH(QString, given);
+    QFETCH(QString, expected);
+    QStringList ranges;
+    const QItemSelection selection = TreeOrder::ranges(items(given));
+    for (const QItemSelectionRange &range : selection)
+        ranges.append(range.topLeft().data().toString() + QLatin1Char('-')
+                      + range.bottomRight().data().toString());
+    QCOMPARE(ranges.join(QLatin1Char(' ')), expected);
+}
+
 void tst_TreeOrder::agreesWithTheObviousWay()
 {
     for (int i = 0; i < 60; ++i) {
