@@ -23,6 +23,8 @@ MenuSelection::MenuSelection(QTreeView *view, const ShownMenu &menu)
 {
     connect(&menu.proxy(), &QAbstractItemModel::rowsAboutToBeRemoved, this, &MenuSelection::leaveRows);
     connect(&menu.proxy(), &QAbstractItemModel::rowsInserted, this, &MenuSelection::awaitRows);
+    // Before the selection hears of it, which is made with the view's model.
+    connect(&menu.proxy(), &QAbstractItemModel::layoutAboutToBeChanged, this, &MenuSelection::keepEachRow);
 }
 
 MenuSelection::~MenuSelection() = default;
@@ -185,6 +187,16 @@ void MenuSelection::deselect(const std::function<bool(const QModelIndex &)> &isT
         m_view->selectionModel()->select(TreeOrder::ranges(staying), QItemSelectionModel::ClearAndSelect);
     else if (!going.isEmpty())
         m_view->selectionModel()->select(TreeOrder::ranges(going), QItemSelectionModel::Deselect);
+}
+
+// Of all rows of a large folder Qt keeps the first and the last while rows come and go, and what comes
+// between them is selected. A second range has it keep each row.
+void MenuSelection::keepEachRow()
+{
+    QItemSelectionModel *const model = m_view->selectionModel();
+    const QItemSelection selection = model ? model->selection() : QItemSelection();
+    if (selection.size() == 1 && selection.constFirst().height() > 1)
+        model->select(selection.constFirst().topLeft(), QItemSelectionModel::Select);
 }
 
 void MenuSelection::leave(const QString &path)

@@ -76,6 +76,7 @@ private:
     QModelIndex shownFolder(const QString &path) const;
     void openFolder(const QModelIndex &folder);
     void add(const QModelIndexList &rows);
+    void keepEachRow();
     void awaitGoing(const QModelIndex &parent, int first, int last);
     void leaveRows(const QModelIndex &parent, int first, int last);
     void awaitRows(const QModelIndex &parent, int first, int last);

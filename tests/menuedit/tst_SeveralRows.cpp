@@ -84,6 +84,8 @@ private Q_SLOTS:
     void loseWhatIsHiddenAgain();
     void comeBackAfterAnOlderListing();
     void areManyAtOnce();
+    void staySelectedAloneWhereOthersCome_data();
+    void staySelectedAloneWhereOthersCome();
     void moveWithinOneFolder();
     void moveWhileAFilterIsSet();
     void pickNoEntry();
@@ -549,6 +551,49 @@ void tst_SeveralRows::areManyAtOnce()
     view->redoAction()->trigger();
     lap("redo");
     QCOMPARE(QDir(many).count(), 2U);
+}
+
+void tst_SeveralRows::staySelectedAloneWhereOthersCome_data()
+{
+    QTest::addColumn<bool>("isFiltered");
+    QTest::newRow("a filter is taken away") << true;
+    QTest::newRow("hidden entries are shown") << false;
+}
+
+// All of a folder, and so many that they are not remembered one by one
+void tst_SeveralRows::staySelectedAloneWhereOthersCome()
+{
+    QFETCH(bool, isFiltered);
+    const int count = 1100;
+    for (int i = 0; i < count; ++i) {
+        const QString number = QStringLiteral("%1").arg(i, 4, 10, QLatin1Char('0'));
+        writeEntry(QLatin1String("many/") + number + QLatin1String("a.desktop"),
+                   number + QLatin1String(" hit"));
+        if (i % 4 == 0)
+            writeEntry(QLatin1String("many/") + number + QLatin1String("b.desktop"),
+                       number + QLatin1String(" miss"), isFiltered ? "" : "Hidden=true\n");
+    }
+    const auto view = make(6);
+    const QString many = in(QStringLiteral("many"));
+    const int all = count + count / 4;
+    QVERIFY(open(*view, many, isFiltered ? all : count));
+    if (isFiltered)
+        view->setFilter(QStringLiteral("hit"));
+    QTRY_COMPARE_WITH_TIMEOUT(view->model()->rowCount(shown(*view, many)), count, 20000);
+    const QModelIndex folder = shown(*view, many);
+    view->selectionModel()->select(
+        QItemSelection(view->model()->index(0, 0, folder), view->model()->index(count - 1, 0, folder)),
+        QItemSelectionModel::ClearAndSelect);
+
+    if (isFiltered)
+        view->setFilter(QString());
+    else
+        view->setHiddenShown(true);
+    QTRY_COMPARE_WITH_TIMEOUT(view->model()->rowCount(shown(*view, many)), all, 20000);
+    const QModelIndexList rows = view->selectionModel()->selectedIndexes();
+    QCOMPARE(rows.size(), count);
+    for (const QModelIndex &row : rows)
+        QVERIFY(row.data().toString().endsWith(QLatin1String("hit")));
 }
 
 void tst_SeveralRows::moveWithinOneFolder()
