@@ -7,6 +7,7 @@
 #include <ctime>
 #include <memory>
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include <dirent.h>
@@ -56,8 +57,8 @@ void removeChildren(const Folder &folder)
     for (const std::string &name : folder.names()) {
         if (unlinkat(folder.descriptor(), name.c_str(), 0) == 0 || errno != EISDIR)
             continue;
-        // A folder that may not even be read cannot be opened before that is changed.
-        fchmodat(folder.descriptor(), name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
+        // A folder that may not even be read has to be changed to be opened, which shows whether it was.
+        std::ignore = fchmodat(folder.descriptor(), name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
         const Folder child = folder.child(name.c_str());
         if (child.isOpen())
             removeChildren(child);

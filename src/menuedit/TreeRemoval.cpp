@@ -8,6 +8,7 @@
 #include "OpenFolder.h"
 
 #include <cerrno>
+#include <tuple>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -51,8 +52,9 @@ void Removal::removeAt(int parent, const std::string &name, const Path &path)
         return m_progress.advance();
     if (errno != EISDIR)
         return note(lastError(), path);
+    // Whether they could be taken shows when the folder is opened.
     if (m_takesRights)
-        ::fchmodat(parent, name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
+        std::ignore = ::fchmodat(parent, name.c_str(), S_IRWXU, AT_SYMLINK_NOFOLLOW);
     const OpenFolder::Stream folder = OpenFolder::open(parent, name.c_str());
     const std::error_code closed = folder ? std::error_code() : lastError();
     if (folder) {
