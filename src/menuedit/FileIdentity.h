@@ -17,6 +17,11 @@ public:
     explicit FileIdentity(const QString &path);
 
     bool operator==(const FileIdentity &other) const;
+    /// Whether it is the same file, be it changed or not.
+    bool isSameFile(const FileIdentity &other) const
+    {
+        return m_device == other.m_device && m_inode == other.m_inode;
+    }
 
     /// A number that another identity has by a chance of one in 2^64 only, where thousands are kept.
     quint64 mark() const;

@@ -40,10 +40,6 @@ void NewIcons::begin(const QString &path)
 {
     m_begun = path;
     look(path);
-    // Of a folder that was changed a moment ago, the next change might not be seen.
-    m_identity.reset();
-    if (!m_folder->identity.isSettledAt(m_folder->time))
-        m_identity.emplace(path);
 }
 
 // Rows come folder by folder.
@@ -63,12 +59,8 @@ void NewIcons::look(const QString &path)
 
 void NewIcons::end(const QIcon &icon)
 {
-    if (!m_identity) {
-        m_cache.setNewIcon(m_begun, icon);
-        m_folder->paths.append(m_begun);
-    } else if (m_identity->isSettled()) {
-        m_cache.setIcon(m_begun, *m_identity, icon);
-    }
+    m_cache.setNewIcon(m_begun, icon);
+    m_folder->paths.append(m_begun);
 }
 
 void NewIcons::finish(const QString &path)
@@ -91,7 +83,8 @@ void NewIcons::askSome()
         m_turn.stop();
 }
 
-// The folder comes last: had another file come to one of the paths, it would be another one.
+// A file that comes to a path has changed by that, but in another folder that does all may be old. The
+// folder comes last, so that it was the same all the time.
 void NewIcons::ask(Folders::iterator folder, int most)
 {
     QVector<QPair<QString, FileIdentity>> files;
@@ -100,7 +93,7 @@ void NewIcons::ask(Folders::iterator folder, int most)
         if (m_cache.hasNewIcon(path))
             files.append({path, FileIdentity(path)});
     }
-    const bool isSame = !files.isEmpty() && FileIdentity(folder.key()) == folder->identity;
+    const bool isSame = !files.isEmpty() && FileIdentity(folder.key()).isSameFile(folder->identity);
     for (const auto &[path, identity] : qAsConst(files)) {
         if (isSame && identity.isRegularFile() && identity.isSettledAt(folder->time))
             m_cache.keepNewIcon(path, identity);

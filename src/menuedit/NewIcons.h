@@ -11,8 +11,6 @@
 #include <QTimer>
 #include <QVector>
 
-#include <optional>
-
 class QIcon;
 class RowCache;
 
@@ -20,8 +18,8 @@ class RowCache;
  * Finds out of which files the icons of rows were made, for a RowCache.
  *
  * That is needed when a folder is listed again and not before, so thousands of rows need not wait for
- * it: the files are asked when the rows stand, bit by bit. An icon whose file, or whose folder, has
- * changed since it was made is not kept.
+ * it: the files are asked when the rows stand, bit by bit. An icon is not kept when its file has changed
+ * since it was made, or came to its path, or when its folder is another one.
  */
 class NewIcons : public QObject
 {
@@ -57,7 +55,6 @@ private:
     Folders m_folders; // by their paths with the "/"
     QString m_begun;
     Folder *m_folder = nullptr; // of what was begun
-    std::optional<FileIdentity> m_identity; // of that, where the folder was just changed
     bool m_isGrowing = false;
     QTimer m_turn;
 };

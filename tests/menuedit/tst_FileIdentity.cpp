@@ -42,6 +42,7 @@ void tst_FileIdentity::seesAChange()
 
     QVERIFY(!(FileIdentity(file) == before));
     QVERIFY(FileIdentity(file).mark() != before.mark());
+    QVERIFY(FileIdentity(file).isSameFile(before));
 }
 
 void tst_FileIdentity::seesThatAFileWasReplaced()
@@ -56,6 +57,7 @@ void tst_FileIdentity::seesThatAFileWasReplaced()
 
     QVERIFY(!(FileIdentity(file) == before));
     QVERIFY(FileIdentity(file).mark() != before.mark());
+    QVERIFY(!FileIdentity(file).isSameFile(before));
 }
 
 void tst_FileIdentity::tellsRegularFiles()

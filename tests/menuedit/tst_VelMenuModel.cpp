@@ -110,16 +110,16 @@ void tst_VelMenuModel::tellsTheFolderOfRowsThatAreHeld()
     for (const char *name : {"menu/a/x", "menu/a/y", "menu/b/x", "menu/b/y"})
         write(QLatin1String(name), "x");
     m_model = modelOf(path(QStringLiteral("menu")), 2);
-    const QModelIndex held = indexOf(QStringLiteral("menu/a"));
-    const QModelIndex other = indexOf(QStringLiteral("menu/b"));
-    for (const QModelIndex &folder : {held, other}) {
+    const QPersistentModelIndex held = indexOf(QStringLiteral("menu/a"));
+    const QPersistentModelIndex other = indexOf(QStringLiteral("menu/b"));
+    for (const QModelIndex &folder : {QModelIndex(held), QModelIndex(other)}) {
         m_model->fetchMore(folder);
         QTRY_COMPARE(m_model->rowCount(folder), 2);
     }
     m_model->holdRows(held);
     for (int row = 0; row < 2; ++row) {
-        QCOMPARE(m_model->index(row, 0, held).parent(), held);
-        QCOMPARE(m_model->index(row, 0, other).parent(), other);
+        QCOMPARE(m_model->index(row, 0, held).parent(), QModelIndex(held));
+        QCOMPARE(m_model->index(row, 0, other).parent(), QModelIndex(other));
     }
     QCOMPARE(other.parent(), indexOf(QStringLiteral("menu")));
     const QPersistentModelIndex row = m_model->index(1, 0, held);
