@@ -6,10 +6,20 @@
 #include <QFileInfo>
 #include <QFileSystemModel>
 
+#include <algorithm>
+#include <utility>
+
 namespace {
 
 // Long enough that a tree which is moved or deleted folder by folder counts once.
 constexpr int Milliseconds = 200;
+
+QStringList existing(QStringList folders)
+{
+    const auto isGone = [](const QString &folder) { return !QFileInfo::exists(folder); };
+    folders.erase(std::remove_if(folders.begin(), folders.end(), isGone), folders.end());
+    return folders;
+}
 
 } // namespace
 
@@ -21,6 +31,7 @@ FolderWatch::FolderWatch(QFileSystemModel *model)
     m_timer.setInterval(Milliseconds);
     connect(&m_timer, &QTimer::timeout, this, &FolderWatch::renew);
     connect(model, &QAbstractItemModel::rowsAboutToBeRemoved, this, &FolderWatch::noticeRemoval);
+    connect(model, &QFileSystemModel::directoryLoaded, this, &FolderWatch::noticeReading);
 }
 
 FolderWatch::~FolderWatch() = default;
@@ -38,10 +49,37 @@ QStringList FolderWatch::release(const QStringList &paths)
 
 void FolderWatch::watchAgain(const QStringList &folders)
 {
-    for (const QString &folder : folders) {
-        if (QFileInfo::exists(folder))
-            m_model->fetchMore(m_model->index(folder));
-    }
+    const QStringList there = existing(folders);
+    expectReading(there);
+    read(there);
+}
+
+void FolderWatch::read(const QStringList &folders)
+{
+    for (const QString &folder : folders)
+        m_model->fetchMore(m_model->index(folder));
+}
+
+// What the model has still to tell of earlier readings comes before what is asked for from now on.
+void FolderWatch::expectReading(const QStringList &folders)
+{
+    const auto expect = [this, folders] { m_expected += QSet<QString>(folders.begin(), folders.end()); };
+    QMetaObject::invokeMethod(this, expect, Qt::QueuedConnection);
+}
+
+// When all were read, nothing is left of what waited before them.
+void FolderWatch::noticeReading(const QString &folder)
+{
+    if (!m_expected.remove(folder))
+        return;
+    m_readOnce.append(folder);
+    if (!m_expected.isEmpty())
+        return;
+    const QStringList folders = existing(std::exchange(m_readOnce, {}));
+    if (!m_isOn || !QFileInfo::exists(m_model->rootPath()))
+        return;
+    forget(folders);
+    read(folders);
 }
 
 void FolderWatch::setOn(bool on)
@@ -76,8 +114,12 @@ void FolderWatch::renew()
     collect(m_model->index(m_model->rootPath()), watched);
     m_model->setOption(QFileSystemModel::DontWatchForChanges, true);
     m_model->setOption(QFileSystemModel::DontWatchForChanges, false);
+    m_expected.clear();
+    m_readOnce.clear();
+    const QStringList there = existing(watched);
+    expectReading(there);
     forget(watched);
-    watchAgain(watched);
+    read(there);
 }
 
 // All that were read, by their rows being known in full.

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <QObject>
+#include <QSet>
 #include <QStringList>
 #include <QTimer>
 
@@ -19,6 +20,9 @@ class QModelIndex;
  * The model watches every folder that it has read, and the watch goes along with a folder that
  * moves. The model does not notice: it would take what happens at the new place for news of the
  * old one, and never show it.
+ *
+ * What is watched again is read twice: a folder that waits for its turn to be read when the model is told
+ * to read it is not watched.
  */
 class FolderWatch : public QObject
 {
@@ -45,11 +49,16 @@ public:
 private:
     void noticeRemoval(const QModelIndex &parent, int first, int last);
     void renew();
+    void expectReading(const QStringList &folders);
+    void noticeReading(const QString &folder);
+    void read(const QStringList &folders);
     void collect(const QModelIndex &folder, QStringList &paths) const;
     void forget(const QStringList &folders);
 
     QFileSystemModel *m_model;
     QTimer m_timer;
     bool m_isOn = true;
+    QSet<QString> m_expected; // folders that are being read once
+    QStringList m_readOnce;
     std::function<bool(const QString &path)> m_isInPlace;
 };
