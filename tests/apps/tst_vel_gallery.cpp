@@ -292,11 +292,19 @@ void tst_vel_gallery::fitsOnASmallScreen()
     gallery.setProcessEnvironment(environment);
     gallery.start(s(VEL_GALLERY), {s("--page"), s("radio-group-box")});
     QVERIFY(gallery.waitForStarted());
-    const QByteArray window =
-        XDoTool::ask(s("search --sync --onlyvisible --pid %1").arg(gallery.processId()));
-    const QByteArray geometry =
-        XDoTool::ask(s("getwindowgeometry ") + QString::fromLatin1(window.split('\n').constLast()));
+    // The window that was found may be another one by the time that it is asked.
+    QByteArray geometry;
+    const bool isKnown = QTest::qWaitFor(
+        [&] {
+            const QByteArray window =
+                XDoTool::ask(s("search --sync --onlyvisible --pid %1").arg(gallery.processId()));
+            geometry =
+                XDoTool::ask(s("getwindowgeometry ") + QString::fromLatin1(window.split('\n').constLast()));
+            return geometry.contains("Geometry");
+        },
+        20000);
     gallery.terminate();
+    QVERIFY(isKnown);
     QVERIFY(gallery.waitForFinished());
     const QRegularExpressionMatch size =
         QRegularExpression(s("Geometry: (\\d+)x(\\d+)")).match(QString::fromLatin1(geometry));
